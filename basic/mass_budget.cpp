@@ -1,0 +1,63 @@
+#include "basic/mass_budget.h"
+
+#include <algorithm>
+
+#include "basic/bathymetry.h"
+#include "core/global_kvs.h"
+
+namespace gridbay {
+
+void CMassBudgetItemKvs::CornersRow::save(const CMassBudgetItemKvs& polygon, KvsFile& file, const std::string&) const {
+  kvsPutParam(file, count, static_cast<std::int32_t>(polygon.corners.size()));
+  int number = 0;
+  for (const GridPoint& point : polygon.corners) {
+    kvsPutListParam(file, formatted(corner, ++number), "ii", point.j, point.k);
+  }
+}
+
+void CMassBudgetItemKvs::CornersRow::load(CMassBudgetItemKvs& polygon, KvsSection from, const std::string&) const {
+  std::int32_t stated = 0;
+  kvsGetParam(from, count, &stated, 1, 1);
+  polygon.corners.clear();
+  for (int number = 1; number <= std::min(stated, kvsGetNoKeywords(from)); ++number) {
+    GridPoint point;
+    kvsGetListParam(from, formatted(corner, number), 1, "ii", &point.j, &point.k);
+    polygon.corners.push_back(point);
+  }
+}
+
+unsigned CMassBudgetItemKvs::Validate(ValidationList& messages, int) {
+  CGlobalKvs* root = model();
+  const int areas = root == nullptr ? 0 : root->bathymetry->GetCount();
+  const auto fault = [&messages](const Text& text) {
+    return report(messages, PageId::massBudget, Severity::fault, text);
+  };
+  unsigned faults = 0;
+  if (associatedArea > areas) faults += fault(texts::invalidAssociatedArea);
+  if (corners.empty()) faults += fault(texts::tooFewCorners);
+  const CBathymetryObjectKvs* area = root == nullptr ? nullptr : root->bathymetry->GetArea(associatedArea);
+  if (area == nullptr) return faults;
+  for (const GridPoint& point : corners) {
+    const bool inside = 1 <= point.j && point.j < area->noJ - 1 && 1 <= point.k && point.k < area->noK - 1;
+    if (!inside) faults += fault(texts::pointOutsideGrid);
+  }
+  return faults;
+}
+
+void CMassBudgetKvs::initialise(CMassBudgetItemKvs& polygon, int) {
+  CGlobalKvs* root = model();
+  const CBathymetryObjectKvs* area = root == nullptr ? nullptr : root->bathymetry->GetArea(1);
+  polygon.corners = {{1, 1}};
+  if (area == nullptr) return;
+  const std::int32_t lastJ = area->noJ - 2;
+  const std::int32_t lastK = area->noK - 2;
+  polygon.corners = {{1, 1}, {1, lastK}, {lastJ, lastK}, {lastJ, 1}};
+}
+
+int CMassBudgetKvs::GetMaxCorners() const {
+  std::size_t most = 0;
+  for (int number = 1; number <= GetCount(); ++number) most = std::max(most, GetItem(number)->corners.size());
+  return static_cast<int>(most);
+}
+
+}  // namespace gridbay

@@ -1,0 +1,79 @@
+#include "basic/nesting.h"
+
+#include <algorithm>
+#include <cmath>
+#include <ranges>
+
+namespace gridbay {
+namespace {
+
+constexpr float kRatioTolerance = 0.005F;
+constexpr std::int64_t kNearBorder = 3;  // an edge nearer than this to the outer border must be land
+
+bool hasWrongRatio(float outer, float inner) {
+  return std::abs(outer / (inner * static_cast<float>(kNestingRatio)) - 1.0F) > kRatioTolerance;
+}
+
+// Whether every edge of the inner area that comes near the outer border is all land.
+bool landRuleHolds(const CBathymetryObjectKvs& inner, const CBathymetryObjectKvs& outer, std::int64_t jextr,
+                   std::int64_t kextr) {
+  const auto columnIsLand = [&inner](int j) {
+    return std::ranges::all_of(std::views::iota(0, inner.noK), [&](int k) { return inner.isLand(j, k); });
+  };
+  const auto rowIsLand = [&inner](int k) {
+    return std::ranges::all_of(std::views::iota(0, inner.noJ), [&](int j) { return inner.isLand(j, k); });
+  };
+  if (inner.origin.j < kNearBorder && !columnIsLand(0)) return false;
+  if (inner.origin.k < kNearBorder && !rowIsLand(0)) return false;
+  if (inner.origin.j + jextr > outer.noJ - kNearBorder - 1 && !columnIsLand(inner.noJ - 1)) return false;
+  return inner.origin.k + kextr <= outer.noK - kNearBorder - 1 || rowIsLand(inner.noK - 1);
+}
+
+// A closed rectangle in grid units of the areas inside one enclosing area.
+struct Rectangle {
+  std::int64_t firstJ;
+  std::int64_t lastJ;
+  std::int64_t firstK;
+  std::int64_t lastK;
+
+  bool contains(std::int64_t j, std::int64_t k) const {
+    return firstJ <= j && j <= lastJ && firstK <= k && k <= lastK;
+  }
+  bool containsCornerOf(const Rectangle& other) const {
+    return contains(other.firstJ, other.firstK) || contains(other.lastJ, other.firstK) ||
+           contains(other.firstJ, other.lastK) || contains(other.lastJ, other.lastK);
+  }
+};
+
+Rectangle footprint(const CBathymetryObjectKvs& area) {
+  const std::int64_t firstJ = std::int64_t{kNestingRatio} * area.origin.j;
+  const std::int64_t firstK = std::int64_t{kNestingRatio} * area.origin.k;
+  return {firstJ, firstJ + area.noJ - 1, firstK, firstK + area.noK - 1};
+}
+
+}  // namespace
+
+unsigned CheckNesting(const CBathymetryObjectKvs& inner, const CBathymetryObjectKvs& outer, ValidationList& messages) {
+  const auto refuse = [&](const Text& text) {
+    return report(messages, PageId::bathymetry, Severity::fault, text, inner.fileName.text(), outer.fileName.text());
+  };
+  if (hasWrongRatio(outer.dx, inner.dx) || hasWrongRatio(outer.dy, inner.dy)) return refuse(texts::nestRatio);
+  if ((inner.noJ - 1) % kNestingRatio != 0) return refuse(texts::nestJextr);
+  if ((inner.noK - 1) % kNestingRatio != 0) return refuse(texts::nestKextr);
+  const std::int64_t jextr = (inner.noJ - 1) / kNestingRatio;
+  const std::int64_t kextr = (inner.noK - 1) / kNestingRatio;
+  const bool inside = inner.origin.j >= 1 && inner.origin.k >= 1 && inner.origin.j + jextr <= outer.noJ - 2 &&
+                      inner.origin.k + kextr <= outer.noK - 2;
+  if (!inside || !landRuleHolds(inner, outer, jextr, kextr)) return refuse(texts::nestPosition);
+  return 0;
+}
+
+unsigned CheckOverlap(const CBathymetryObjectKvs& a, const CBathymetryObjectKvs& b, ValidationList& messages) {
+  if (&a == &b || a.enclosingArea != b.enclosingArea) return 0;
+  const Rectangle first = footprint(a);
+  const Rectangle second = footprint(b);
+  if (!first.containsCornerOf(second) && !second.containsCornerOf(first)) return 0;
+  return report(messages, PageId::bathymetry, Severity::fault, texts::overlap, a.fileName.text(), b.fileName.text());
+}
+
+}  // namespace gridbay

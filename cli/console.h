@@ -1,0 +1,46 @@
+#pragma once
+
+#include <map>
+#include <ostream>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "core/message.h"
+#include "core/setup_file.h"
+
+namespace gridbay::cli {
+
+// The exit statuses of every command.
+enum ExitStatus : int { kClean = 0, kFaultsFound = 1, kCouldNotDoIt = 2 };
+
+// Where a command writes: results to `out`, all else to `err`.
+struct Console {
+  std::ostream& out;
+  std::ostream& err;
+
+  int fail(std::string_view why) const;
+  void note(std::string_view text) const;
+};
+
+// What a load has to say, on standard error: each text once, on one line, with how often it came.
+class ConsoleMessageHost : public MessageHost {
+ public:
+  explicit ConsoleMessageHost(const Console& console) : console_(console) {}
+  ConsoleMessageHost(const ConsoleMessageHost&) = delete;
+  ConsoleMessageHost& operator=(const ConsoleMessageHost&) = delete;
+  ~ConsoleMessageHost() override { flush(); }
+
+  void show(const std::string& text) override;
+  void flush();
+
+ private:
+  const Console& console_;
+  std::vector<std::string> order_;
+  std::map<std::string, int> counts_;
+};
+
+// Saves a setup to its own file, and says which of its sections this version does not know and leaves out.
+int saveSetup(SetupFile& setup, const std::string& path, const Console& console);
+
+}  // namespace gridbay::cli

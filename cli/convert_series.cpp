@@ -1,0 +1,178 @@
+#include <fmt/format.h>
+
+#include <cmath>
+#include <filesystem>
+#include <string_view>
+#include <vector>
+
+#include "cli/commands.h"
+#include "core/date_time.h"
+#include "core/number_text.h"
+#include "platform/files/read_file.h"
+#include "platform/result.h"
+#include "platform/tsb/tsb_writer.h"
+#include "platform/units/units.h"
+
+namespace gridbay::cli {
+namespace {
+
+// How far times may be off an even step and still count as one, in parts of the step.
+constexpr double kEvenTolerance = 1e-3;
+
+struct Options {
+  std::string in;
+  std::string out;
+  int itemType = item::kUndefined;
+  std::string start;
+  std::string timeUnit = "s";
+  int skipLines = 0;
+};
+
+struct Table {
+  std::vector<std::string> names;
+  std::vector<double> times;
+  std::vector<std::vector<double>> columns;
+};
+
+// Fields between commas, semicolons or tabs, or else between blanks (in a heading two at least, as its words have
+// single ones).
+std::vector<std::string_view> fieldsOf(std::string_view line, std::size_t leastBlanks) {
+  const char separator = line.find_first_of(",;\t") == line.npos ? ' ' : line[line.find_first_of(",;\t")];
+  std::vector<std::string_view> fields;
+  const auto trim = [](std::string_view text) {
+    const std::size_t first = text.find_first_not_of(" \r\t");
+    if (first == text.npos) return std::string_view();
+    return text.substr(first, text.find_last_not_of(" \r\t") - first + 1);
+  };
+  if (separator != ' ') {
+    for (std::size_t start = 0; start <= line.size();) {
+      const std::size_t end = std::min(line.find(separator, start), line.size());
+      fields.push_back(trim(line.substr(start, end - start)));
+      start = end + 1;
+    }
+    return fields;
+  }
+  const std::string gap(leastBlanks, ' ');
+  for (line = trim(line); !line.empty();) {
+    const std::size_t end = std::min(line.find(gap), line.size());
+    fields.push_back(line.substr(0, end));
+    line = trim(line.substr(end));
+  }
+  return fields;
+}
+
+Result<Table> readTable(const Options& options) {
+  const Result<FileText> text = readFile(options.in);
+  if (!text) return Failure{text.error()};
+  const auto fail = [&](int line, const std::string& why) {
+    return Failure{fmt::format("cannot read \"{}\": line {}: {}", options.in, line, why)};
+  };
+  Table table;
+  std::string_view heading;
+  std::string_view rest = text->view();
+  for (int number = 1; !rest.empty(); ++number) {
+    const std::size_t end = std::min(rest.find('\n'), rest.size());
+    const std::string_view line = rest.substr(0, end);
+    rest.remove_prefix(std::min(end + 1, rest.size()));
+    if (number <= options.skipLines) {
+      heading = line;
+      continue;
+    }
+    const std::vector<std::string_view> fields = fieldsOf(line, 1);
+    if (fields.empty() || (fields.size() == 1 && fields[0].empty())) continue;
+    if (fields.size() < 2) return fail(number, "a time and at least one value are expected");
+    if (table.columns.empty()) table.columns.resize(fields.size() - 1);
+    if (fields.size() != table.columns.size() + 1) {
+      return fail(number, fmt::format("{} fields, where the lines before have {}", fields.size(), table.columns.size() + 1));
+    }
+    for (std::size_t i = 0; i < fields.size(); ++i) {
+      const std::optional<double> value = doubleOfText(fields[i]);
+      if (!value) {
+        const char* hint = table.times.empty() ? " (are there heading lines? --skip-lines N passes over them)" : "";
+        return fail(number, fmt::format("\"{}\" is no number{}", fields[i], hint));
+      }
+      (i == 0 ? table.times : table.columns[i - 1]).push_back(*value);
+    }
+    if (table.times.size() > 1 && !(table.times.back() > table.times[table.times.size() - 2])) {
+      return fail(number, "the time does not rise");
+    }
+  }
+  if (table.times.empty()) return Failure{fmt::format("cannot read \"{}\": there are no values", options.in)};
+  const std::vector<std::string_view> names = fieldsOf(heading, 2);
+  if (names.size() == table.columns.size() + 1) table.names.assign(names.begin() + 1, names.end());
+  return table;
+}
+
+TsbTimeAxis timeAxisOf(const Table& table, const Options& options, const DateTime& start) {
+  TsbTimeAxis axis;
+  axis.start = *start.parts();
+  axis.unit = options.timeUnit;
+  axis.count = table.times.size();
+  axis.first = table.times.front();
+  const auto intervals = static_cast<double>(axis.count - 1);
+  // The mean step may have picked up the last digit of a time; a step of few digits that fits as well is meant.
+  axis.step = axis.count > 1 ? (table.times.back() - table.times.front()) / intervals : 1;
+  const double plain = std::stod(fmt::format("{:.6g}", axis.step));
+  if (std::abs(plain - axis.step) * intervals <= kEvenTolerance * axis.step) axis.step = plain;
+  for (std::size_t i = 0; i < axis.count; ++i) {
+    if (std::abs(table.times[i] - axis.at(i)) <= kEvenTolerance * axis.step) continue;
+    axis.type = TsbTimeAxisType::calendar;
+    axis.values = table.times;
+    break;
+  }
+  return axis;
+}
+
+int convertSeries(const Options& options, const Console& console) {
+  const QunItem* quantity = qunFindItem(options.itemType);
+  if (quantity == nullptr) return console.fail(fmt::format("There is no item type {}", options.itemType));
+  const std::optional<DateTime> start = dateTimeOfText(options.start);
+  if (!start) return console.fail(fmt::format("\"{}\" is no moment of the form YYYY-MM-DD hh:mm:ss", options.start));
+  if (!qunAreEquivalent(options.timeUnit, "s")) {
+    return console.fail(fmt::format("\"{}\" is no unit of time (s, min, h, d)", options.timeUnit));
+  }
+  const Result<Table> table = readTable(options);
+  if (!table) return console.fail(table.error());
+
+  TsbDefinition definition;
+  definition.title = std::filesystem::path(options.in).stem().string();
+  definition.time = timeAxisOf(*table, options, *start);
+  for (std::size_t i = 0; i < table->columns.size(); ++i) {
+    std::string name = i < table->names.size() ? table->names[i] : std::string(quantity->name);
+    if (table->names.empty() && table->columns.size() > 1) name += fmt::format(" {}", i + 1);
+    definition.items.push_back({std::move(name), quantity->code, std::string(qunBaseUnit(quantity->code)->text), true});
+  }
+  Result<TsbWriter> writer = TsbWriter::create(options.out, definition);
+  if (!writer) return console.fail(writer.error());
+  for (std::size_t i = 0; i < table->columns.size(); ++i) {
+    for (std::size_t step = 0; step < table->times.size(); ++step) {
+      const std::span<const double> value(&table->columns[i][step], 1);
+      if (const Outcome written = writer->write(i + 1, step, value); !written) return console.fail(written.error());
+    }
+  }
+  if (const Outcome written = writer->commit(); !written) return console.fail(written.error());
+  const bool even = definition.time.isEquidistant();
+  console.out << fmt::format("{}: {} of {} time steps{} from {}\n", options.out, definition.items.front().name,
+                             definition.time.count,
+                             even ? fmt::format(", {:g} {} apart,", definition.time.step, options.timeUnit) : "",
+                             dateTimeText(*start));
+  return kClean;
+}
+
+}  // namespace
+
+void addConvertSeries(CLI::App& convert, Action& action) {
+  std::shared_ptr<Options> options;
+  CLI::App& command = addCommand(convert, action, "series", "Makes a time series (tsb0) from delimited text",
+                                 convertSeries, options);
+  command.add_option("IN", options->in, "Lines of a time and values, between commas, semicolons, tabs or blanks")->required();
+  command.add_option("OUT", options->out, "The time series to write (*.tsb0)")->required();
+  command.add_option("--item-type", options->itemType, "Item code of the values, in base units")->required();
+  command.add_option("--start", options->start, "The moment of time 0, \"YYYY-MM-DD hh:mm:ss\"")->required();
+  command.add_option("--time-unit", options->timeUnit, "Unit of the times")->capture_default_str();
+  command.add_option("--skip-lines", options->skipLines, "Heading lines; the last one names the columns")
+      ->check(CLI::NonNegativeNumber)
+      ->capture_default_str();
+}
+
+}  // namespace gridbay::cli

@@ -1,0 +1,249 @@
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <cmath>
+#include <nlohmann/json.hpp>
+
+#include "basic/area_description.h"
+#include "basic/bathymetry.h"
+#include "basic/boundary.h"
+#include "basic/mass_budget.h"
+#include "basic/simulation_period.h"
+#include "basic/source_sink.h"
+#include "cli/commands.h"
+#include "core/module_selection.h"
+#include "platform/cartography/cartography.h"
+#include "platform/files/read_file.h"
+#include "platform/tsb/tsb_file.h"
+#include "platform/units/units.h"
+
+namespace gridbay::cli {
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+struct Options {
+  std::string file;
+  bool json = false;
+};
+
+std::string_view typeName(int code) {
+  const QunItem* found = qunFindItem(code);
+  return found == nullptr ? "unknown quantity" : found->name;
+}
+
+Json describeTime(const TsbTimeAxis& time) {
+  Json axis{{"steps", time.count}, {"unit", time.unit}, {"equidistant", time.isEquidistant()}};
+  if (time.isCalendar()) axis["start"] = dateTimeText(DateTime::of(time.start));
+  axis["first"] = time.at(0);
+  axis["last"] = time.at(time.count - 1);
+  if (time.isEquidistant()) axis["step"] = time.step;
+  return axis;
+}
+
+// Least and greatest value of an item at the first step, missing values left out.
+Json describeValues(const TsbFile& file, std::size_t item) {
+  const TsbDefinition& definition = file.definition();
+  std::vector<float> values(definition.pointCount());
+  if (!file.read(item, 0, std::span<float>(values))) return nullptr;
+  const auto missing = static_cast<float>(definition.items[item - 1].deleteValue);
+  std::erase_if(values, [missing](float value) { return std::isnan(value) || value == missing; });
+  if (values.empty()) return nullptr;
+  const auto [least, greatest] = std::ranges::minmax(values);
+  return Json{{"least", least}, {"greatest", greatest}};
+}
+
+Json describeDataFile(const TsbFile& file) {
+  const TsbDefinition& definition = file.definition();
+  Json report{{"kind", "data file"},
+              {"title", definition.title},
+              {"data_type", definition.dataType},
+              {"dimensions", definition.axes.size()},
+              {"time", describeTime(definition.time)},
+              {"axes", Json::array()},
+              {"items", Json::array()},
+              {"custom_blocks", Json::object()}};
+  for (const TsbGridAxis& axis : definition.axes) {
+    report["axes"].push_back(
+        {{"points", axis.points}, {"first", axis.first}, {"spacing", axis.spacing}, {"unit", axis.unit}});
+  }
+  for (std::size_t i = 0; i < definition.items.size(); ++i) {
+    const TsbItem& item = definition.items[i];
+    report["items"].push_back({{"number", i + 1},
+                               {"name", item.name},
+                               {"type", item.type},
+                               {"quantity", typeName(item.type)},
+                               {"unit", item.unit},
+                               {"first_step", describeValues(file, i + 1)}});
+  }
+  for (const TsbCustomBlock& block : definition.customBlocks) report["custom_blocks"][block.name] = block.values;
+  if (definition.geography) {
+    const TsbGeography& place = *definition.geography;
+    report["geography"] = {{"projection", CVdMapProjection(place.projection).Name()},
+                           {"longitude", place.longitude},
+                           {"latitude", place.latitude},
+                           {"rotation", place.rotation}};
+  }
+  return report;
+}
+
+void printDataFile(const Json& report, const Console& console) {
+  const auto line = [&console](std::string_view label, const std::string& text) {
+    console.out << fmt::format("{:<12} {}\n", label, text);
+  };
+  line("Data file", fmt::format("{} (data type {})", report["title"].get<std::string>(), report["data_type"].get<int>()));
+  const Json& time = report["time"];
+  line("Time", fmt::format("{} step{}{}, {:g} to {:g} {}", time["steps"].get<std::size_t>(),
+                           time["steps"] == 1 ? "" : "s",
+                           time.contains("start") ? " from " + time["start"].get<std::string>() : "",
+                           time["first"].get<double>(), time["last"].get<double>(), time["unit"].get<std::string>()));
+  for (std::size_t i = 0; i < report["axes"].size(); ++i) {
+    const Json& axis = report["axes"][i];
+    line(fmt::format("Axis {}", "XY"[i]), fmt::format("{} points, {:.6g} {} apart, from {:.10g}", axis["points"].get<std::size_t>(),
+                                                      axis["spacing"].get<double>(), axis["unit"].get<std::string>(),
+                                                      axis["first"].get<double>()));
+  }
+  for (const Json& item : report["items"]) {
+    const Json& range = item["first_step"];
+    const std::string values =
+        range.is_null() ? "" : fmt::format(", {:g} to {:g}", range["least"].get<double>(), range["greatest"].get<double>());
+    line(fmt::format("Item {}", item["number"].get<int>()),
+         fmt::format("{}: {} (type {}) in {}{}", item["name"].get<std::string>(), item["quantity"].get<std::string>(),
+                     item["type"].get<int>(), item["unit"].get<std::string>(), values));
+  }
+  for (const auto& [name, values] : report["custom_blocks"].items()) {
+    line("Block", fmt::format("{}: {}", name, fmt::join(values.get<std::vector<float>>(), ", ")));
+  }
+  if (report.contains("geography")) {
+    const Json& place = report["geography"];
+    line("Projection", place["projection"].get<std::string>());
+    line("First point", fmt::format("longitude {:.6f}, latitude {:.6f}", place["longitude"].get<double>(),
+                                    place["latitude"].get<double>()));
+  } else {
+    line("Projection", "none");
+  }
+}
+
+Json describeSetup(CGlobalKvs& model) {
+  const CSimulationPeriodKvs& period = *model.simulationPeriod;
+  Json report{{"kind", "setup"},
+              {"simulation_type", model.moduleSelection->simulationType},
+              {"start", dateTimeText(period.start)},
+              {"end", dateTimeText(period.End())},
+              {"time_step", period.timeStepInterval},
+              {"steps", std::int64_t{period.noPointsInTime} - 1},
+              {"hot_start", model.bathymetry->hotStart != 0},
+              {"projection", CVdMapProjection(model.bathymetry->projection).Name()},
+              {"areas", Json::array()},
+              {"boundaries", Json::array()},
+              {"sources", Json::array()},
+              {"polygons", model.massBudget->GetCount()},
+              {"drying_depth", model.areaDescription->dryingDepth},
+              {"flooding_depth", model.areaDescription->floodingDepth}};
+  for (int number = 1; number <= model.bathymetry->GetCount(); ++number) {
+    CBathymetryObjectKvs& area = *model.bathymetry->GetArea(number);
+    Json entry{{"number", number}, {"file", area.fileName.text()}};
+    if (number > 1) {
+      entry["origin"] = {area.origin.j, area.origin.k};
+      entry["enclosing_area"] = area.enclosingArea;
+    }
+    ValidationList messages;
+    if (area.ReadGrid(messages, number) == 0) {
+      entry["points"] = {area.noJ, area.noK};
+      entry["spacing"] = {area.dx, area.dy};
+      entry["land_value"] = area.landValue;
+    } else {
+      entry["fault"] = messages.empty() ? "" : messages.front().text;
+    }
+    report["areas"].push_back(std::move(entry));
+  }
+  double courant = 0;
+  int courantArea = 0;
+  model.bathymetry->GetMaxCourant(period.timeStepInterval, &courant, &courantArea);
+  report["greatest_courant_number"] = {{"value", courant}, {"area", courantArea}};
+  for (int number = 1; number <= model.boundary->GetCount(); ++number) {
+    report["boundaries"].push_back(model.boundary->GetItem(number)->Text());
+  }
+  for (int number = 1; number <= model.sourceSink->GetCount(); ++number) {
+    report["sources"].push_back(model.sourceSink->GetItem(number)->Text());
+  }
+  return report;
+}
+
+void printSetup(const Json& report, const Console& console) {
+  const auto line = [&console](std::string_view label, const std::string& text) {
+    console.out << fmt::format("{:<16} {}\n", label, text);
+  };
+  line("Setup", fmt::format("module code {}{}", report["simulation_type"].get<int>(),
+                            report["hot_start"].get<bool>() ? ", hot start" : ""));
+  line("Period", fmt::format("{} to {}, {} steps of {:g} s", report["start"].get<std::string>(),
+                             report["end"].get<std::string>(), report["steps"].get<std::int64_t>(),
+                             report["time_step"].get<double>()));
+  line("Projection", report["projection"].get<std::string>().empty() ? "none" : report["projection"].get<std::string>());
+  for (const Json& area : report["areas"]) {
+    std::string text = area["file"].get<std::string>();
+    if (area.contains("origin")) {
+      text += fmt::format(", at ({},{}) of area {}", area["origin"][0].get<int>(), area["origin"][1].get<int>(),
+                          area["enclosing_area"].get<int>());
+    }
+    if (area.contains("points")) {
+      text += fmt::format(", {} x {} points, {:.6g} x {:.6g} m apart, land at {:g} m", area["points"][0].get<int>(),
+                          area["points"][1].get<int>(), area["spacing"][0].get<double>(), area["spacing"][1].get<double>(),
+                          area["land_value"].get<double>());
+    } else {
+      text += fmt::format(": {}", area["fault"].get<std::string>());
+    }
+    line(fmt::format("Area {}", area["number"].get<int>()), text);
+  }
+  const Json& courant = report["greatest_courant_number"];
+  if (courant["area"] != 0) {
+    line("Courant number", fmt::format("at most {:.6g}, in area {}", courant["value"].get<double>(), courant["area"].get<int>()));
+  }
+  for (std::size_t i = 0; i < report["boundaries"].size(); ++i) {
+    line(fmt::format("Boundary {}", i + 1), report["boundaries"][i].get<std::string>());
+  }
+  for (std::size_t i = 0; i < report["sources"].size(); ++i) {
+    line(fmt::format("Source {}", i + 1), report["sources"][i].get<std::string>());
+  }
+  if (report["polygons"] != 0) line("Polygons", std::to_string(report["polygons"].get<int>()));
+  line("Flood and dry", fmt::format("drying at {:g} m, flooding at {:g} m", report["drying_depth"].get<double>(),
+                                    report["flooding_depth"].get<double>()));
+}
+
+int print(const Json& report, const Options& options, void (*readable)(const Json&, const Console&),
+          const Console& console) {
+  if (options.json) {
+    console.out << report.dump(2, ' ', false, Json::error_handler_t::replace) << '\n';
+  } else {
+    readable(report, console);
+  }
+  return kClean;
+}
+
+bool looksLikeDataFile(std::string_view text) { return text.starts_with("\x89HDF") || text.starts_with("CDF"); }
+
+int info(const Options& options, const Console& console) {
+  const Result<FileText> text = readFile(options.file);
+  if (!text) return console.fail(text.error());
+  if (looksLikeDataFile(text->view())) {
+    const Result<TsbFile> file = TsbFile::open(options.file);
+    if (!file) return console.fail(file.error());
+    return print(describeDataFile(*file), options, printDataFile, console);
+  }
+  ConsoleMessageHost host(console);
+  Result<SetupFile> setup = SetupFile::open(options.file, &host);
+  if (!setup) return console.fail(setup.error());
+  host.flush();
+  return print(describeSetup(setup->model()), options, printSetup, console);
+}
+
+}  // namespace
+
+void addInfo(CLI::App& tool, Action& action) {
+  std::shared_ptr<Options> options;
+  CLI::App& command = addCommand(tool, action, "info", "Tells what a setup or a data file holds", info, options);
+  command.add_option("FILE", options->file, "The setup or data file")->required();
+  command.add_flag("--json", options->json, "The same as JSON");
+}
+
+}  // namespace gridbay::cli

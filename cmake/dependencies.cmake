@@ -1,0 +1,11 @@
+# Everything here is a Debian package named in scripts/packages.txt.
+find_package(PkgConfig REQUIRED)
+find_package(fmt REQUIRED)
+find_package(FastFloat REQUIRED)
+find_package(CLI11 REQUIRED)
+find_package(nlohmann_json REQUIRED)
+pkg_check_modules(NETCDF REQUIRED IMPORTED_TARGET netcdf)
+pkg_check_modules(PROJ REQUIRED IMPORTED_TARGET proj)
+pkg_check_modules(GDAL REQUIRED IMPORTED_TARGET gdal)
+find_library(UDUNITS2_LIBRARY udunits2 REQUIRED)
+find_path(UDUNITS2_INCLUDE_DIR udunits2.h PATH_SUFFIXES udunits2 REQUIRED)

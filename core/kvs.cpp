@@ -1,0 +1,254 @@
+#include "core/kvs.h"
+
+#include <optional>
+
+#include "core/kdl_reader.h"
+#include "core/kdl_writer.h"
+#include "core/number_text.h"
+#include "platform/files/read_file.h"
+#include "platform/files/save_file.h"
+
+namespace gridbay {
+namespace {
+
+struct PendingError {
+  int code = kKvsNoError;
+  int line = 0;
+  int column = 0;
+  std::string text;
+};
+
+// The library's interface has one error for the whole process; here it is one for each thread.
+PendingError& pendingError() {
+  thread_local PendingError error;
+  return error;
+}
+
+class FileSink : public TextSink {
+ public:
+  explicit FileSink(FileSave& save) : save_(save) {}
+  Outcome write(std::string_view text) override { return save_.write(text); }
+
+ private:
+  FileSave& save_;
+};
+
+Outcome writeFile(const Node& root, const std::string& path) {
+  Result<FileSave> save = FileSave::begin(path);
+  if (!save) return Failure{save.error()};
+  FileSink sink(*save);
+  if (Outcome written = writeKdl(root, sink); !written) return written;
+  return save->commit();
+}
+
+bool isNumber(ValueKind kind) { return kind == ValueKind::integer || kind == ValueKind::real; }
+
+std::optional<std::int32_t> valueOf(const Value& value, std::int32_t) {
+  return isNumber(value.kind()) ? int32OfText(value.text()) : std::nullopt;
+}
+std::optional<float> valueOf(const Value& value, float) {
+  return isNumber(value.kind()) ? floatOfText(value.text()) : std::nullopt;
+}
+std::optional<double> valueOf(const Value& value, double) {
+  return isNumber(value.kind()) ? doubleOfText(value.text()) : std::nullopt;
+}
+std::optional<bool> valueOf(const Value& value, bool) {
+  return value.kind() == ValueKind::boolean ? std::optional(value.text() == "true") : std::nullopt;
+}
+std::optional<std::string> textOf(const Value& value, ValueKind kind) {
+  return value.kind() == kind ? std::optional(std::string(value.text())) : std::nullopt;
+}
+
+KvsParam paramOf(KvsSection section, std::string_view keyword, int occurrence, int number) {
+  const KvsKeyword found = kvsKeywordByNameNum(section, keyword, occurrence);
+  return found == nullptr ? nullptr : kvsParamByNum(found, number);
+}
+
+template <class T>
+void getNumber(KvsSection section, std::string_view keyword, T* value, int occurrence, int number) {
+  const KvsParam param = paramOf(section, keyword, occurrence, number);
+  if (param == nullptr) return;
+  if (const auto got = valueOf(*param, T())) *value = *got;
+}
+
+void getText(KvsSection section, std::string_view keyword, ValueKind kind, std::string* value, int occurrence,
+             int number) {
+  const KvsParam param = paramOf(section, keyword, occurrence, number);
+  if (param == nullptr) return;
+  if (auto got = textOf(*param, kind)) *value = *std::move(got);
+}
+
+template <class Add, class T>
+void putParam(KvsFile& file, std::string_view keyword, Add add, T value) {
+  kvsAddKeyword(file, keyword);
+  add(file, value);
+}
+
+}  // namespace
+
+KvsFile::KvsFile(std::unique_ptr<ParameterTree> tree) : tree_(std::move(tree)) {
+  open_.push_back({&tree_->root(), nullptr});
+}
+
+void KvsFile::append(Node& node) {
+  ParameterTree::append(*open_.back().section, open_.back().last, node);
+  open_.back().last = &node;
+}
+
+void KvsFile::settle() {
+  if (!inKeyword_) return;
+  inKeyword_ = false;
+  append(*tree_->makeKeyword(keyword_, tree_->keep(std::span<const Value>(values_))));
+  values_.clear();
+}
+
+void KvsFile::open(std::string_view name) {
+  settle();
+  Node* section = tree_->makeSection(tree_->keep(name));
+  append(*section);
+  open_.push_back({section, nullptr});
+}
+
+void KvsFile::close() {
+  settle();
+  if (open_.size() > 1) open_.pop_back();
+}
+
+void KvsFile::startKeyword(std::string_view name) {
+  settle();
+  keyword_ = tree_->keep(name);
+  inKeyword_ = true;
+}
+
+void KvsFile::add(ValueKind kind, std::string_view text) { values_.emplace_back(kind, tree_->keep(text)); }
+
+KvsHandle kvsCreate() { return std::make_unique<KvsFile>(); }
+
+KvsHandle kvsLoadFile(const std::string& path, int) {
+  pendingError() = {};
+  Result<FileText> text = readFile(path);
+  if (!text) {
+    pendingError() = {kKvsCannotRead, 0, 0, text.error()};
+    return kvsCreate();
+  }
+  ReadText read = readKdl(std::move(*text));
+  if (read.tree == nullptr) {
+    pendingError() = {kKvsSyntaxError, static_cast<int>(read.error.line), static_cast<int>(read.error.column),
+                      "Syntax error in \"" + path + "\", " + read.error.text()};
+    return kvsCreate();
+  }
+  return std::make_unique<KvsFile>(std::move(read.tree));
+}
+
+bool kvsWrite(KvsFile& file, const std::string& path) {
+  file.settle();
+  if (const Outcome written = writeFile(file.tree().root(), path); !written) {
+    pendingError() = {kKvsCannotWrite, 0, 0, written.error()};
+    return false;
+  }
+  return true;
+}
+
+void kvsClose(KvsHandle* file) { file->reset(); }
+
+int kvsPeekErrorGlb() { return pendingError().code; }
+
+int kvsGetErrorGlb() {
+  const int code = pendingError().code;
+  pendingError().code = kKvsNoError;
+  return code;
+}
+
+void kvsGetSyntaxErr(const KvsFile*, int* line, int* column, std::string* text) {
+  *line = pendingError().line;
+  *column = pendingError().column;
+  *text = pendingError().text;
+}
+
+const std::string& kvsGetErrorText() { return pendingError().text; }
+
+void kvsAddTarget(KvsFile& file, std::string_view name) { file.open(name); }
+void kvsAddSection(KvsFile& file, std::string_view name) { file.open(name); }
+void kvsEndSection(KvsFile& file) { file.close(); }
+void kvsAddKeyword(KvsFile& file, std::string_view name) { file.startKeyword(name); }
+void kvsAddBool(KvsFile& file, bool value) { file.add(ValueKind::boolean, value ? "true" : "false"); }
+void kvsAddInt(KvsFile& file, std::int32_t value) { file.add(ValueKind::integer, numberText(std::int64_t{value})); }
+void kvsAddFloat(KvsFile& file, float value) { file.add(ValueKind::real, numberText(value)); }
+void kvsAddDouble(KvsFile& file, double value) { file.add(ValueKind::real, numberText(value)); }
+void kvsAddString(KvsFile& file, std::string_view value) { file.add(ValueKind::string, value); }
+void kvsAddFilename(KvsFile& file, std::string_view path) { file.add(ValueKind::fileName, path); }
+void kvsAddResultFilename(KvsFile& file, std::string_view path) { file.add(ValueKind::resultFileName, path); }
+
+void kvsPutParam(KvsFile& file, std::string_view keyword, std::int32_t value) {
+  putParam(file, keyword, kvsAddInt, value);
+}
+void kvsPutParam(KvsFile& file, std::string_view keyword, float value) { putParam(file, keyword, kvsAddFloat, value); }
+void kvsPutParam(KvsFile& file, std::string_view keyword, double value) {
+  putParam(file, keyword, kvsAddDouble, value);
+}
+void kvsPutParam(KvsFile& file, std::string_view keyword, bool value) { putParam(file, keyword, kvsAddBool, value); }
+void kvsPutParam(KvsFile& file, std::string_view keyword, std::string_view value) {
+  putParam(file, keyword, kvsAddString, value);
+}
+void kvsPutParam(KvsFile& file, std::string_view keyword, const char* value) {
+  putParam(file, keyword, kvsAddString, std::string_view(value));
+}
+void kvsPutParamFilename(KvsFile& file, std::string_view keyword, std::string_view path) {
+  putParam(file, keyword, kvsAddFilename, path);
+}
+void kvsPutParamResultFilename(KvsFile& file, std::string_view keyword, std::string_view path) {
+  putParam(file, keyword, kvsAddResultFilename, path);
+}
+
+KvsSection kvsTargetByNameNum(const KvsFile& file, std::string_view name, int occurrence) {
+  return kvsSectionByNameNum(&file.tree().root(), name, occurrence);
+}
+
+KvsSection kvsSectionByNameNum(KvsSection parent, std::string_view name, int occurrence) {
+  return occurrence < 1 ? nullptr : parent->section(name, static_cast<std::uint32_t>(occurrence));
+}
+
+KvsKeyword kvsKeywordByNameNum(KvsSection section, std::string_view name, int occurrence) {
+  return occurrence < 1 ? nullptr : section->keyword(name, static_cast<std::uint32_t>(occurrence));
+}
+
+int kvsGetNoKeywords(KvsSection section) { return static_cast<int>(section->keywordCount()); }
+int kvsGetNoParams(KvsKeyword keyword) { return static_cast<int>(keyword->values().size()); }
+
+KvsParam kvsParamByNum(KvsKeyword keyword, int number) {
+  return number < 1 || number > kvsGetNoParams(keyword) ? nullptr : &keyword->values()[static_cast<std::size_t>(number) - 1];
+}
+
+bool kvsGetBool(KvsParam param) { return valueOf(*param, bool()).value_or(false); }
+std::int32_t kvsGetInt(KvsParam param) { return valueOf(*param, std::int32_t()).value_or(0); }
+float kvsGetFloat(KvsParam param) { return valueOf(*param, float()).value_or(0.0F); }
+double kvsGetDouble(KvsParam param) { return valueOf(*param, double()).value_or(0.0); }
+std::string kvsGetString(KvsParam param) { return textOf(*param, ValueKind::string).value_or(""); }
+std::string kvsGetFilename(KvsParam param) { return textOf(*param, ValueKind::fileName).value_or(""); }
+std::string kvsGetResultFilename(KvsParam param) { return textOf(*param, ValueKind::resultFileName).value_or(""); }
+
+void kvsGetParam(KvsSection section, std::string_view keyword, std::int32_t* value, int occurrence, int number) {
+  getNumber(section, keyword, value, occurrence, number);
+}
+void kvsGetParam(KvsSection section, std::string_view keyword, float* value, int occurrence, int number) {
+  getNumber(section, keyword, value, occurrence, number);
+}
+void kvsGetParam(KvsSection section, std::string_view keyword, double* value, int occurrence, int number) {
+  getNumber(section, keyword, value, occurrence, number);
+}
+void kvsGetParam(KvsSection section, std::string_view keyword, bool* value, int occurrence, int number) {
+  getNumber(section, keyword, value, occurrence, number);
+}
+void kvsGetParam(KvsSection section, std::string_view keyword, std::string* value, int occurrence, int number) {
+  getText(section, keyword, ValueKind::string, value, occurrence, number);
+}
+void kvsGetParamFilename(KvsSection section, std::string_view keyword, std::string* value, int occurrence,
+                         int number) {
+  getText(section, keyword, ValueKind::fileName, value, occurrence, number);
+}
+void kvsGetParamResultFilename(KvsSection section, std::string_view keyword, std::string* value, int occurrence,
+                               int number) {
+  getText(section, keyword, ValueKind::resultFileName, value, occurrence, number);
+}
+
+}  // namespace gridbay

@@ -1,0 +1,43 @@
+#include "core/kvs_base.h"
+
+#include "core/global_kvs.h"
+#include "platform/files/paths.h"
+
+namespace gridbay {
+
+unsigned CKvsBase::Validate(ValidationList&, int) { return 0; }
+
+void CKvsBase::CopyFrom(const CKvsBase&) {}
+
+CKvsBase* CKvsBase::GetParent() { return parent_; }
+
+CKvsBase* CKvsBase::GetRoot() {
+  CKvsBase* top = this;
+  while (top->parent_ != nullptr) top = top->parent_;
+  return top;
+}
+
+CKvsBase* CKvsBase::FindChildKvs() { return nullptr; }
+
+bool CKvsBase::IsValidPathName(const char* path) { return path != nullptr && isUsablePathName(path); }
+
+void CKvsBase::CopySection(KvsSection source, KvsFile& destination) {
+  for (const Node* node = source->first(); node != nullptr; node = node->next()) {
+    if (node->isSection()) {
+      kvsAddSection(destination, node->name());
+      CopySection(node, destination);
+      kvsEndSection(destination);
+    } else {
+      kvsAddKeyword(destination, node->name());
+      for (const Value& value : node->values()) destination.add(value.kind(), value.text());
+    }
+  }
+}
+
+CGlobalKvs* CKvsBase::model() { return dynamic_cast<CGlobalKvs*>(GetRoot()); }
+
+void CKvsBase::ShowMessage(const std::string& text) {
+  if (parent_ != nullptr) parent_->ShowMessage(text);
+}
+
+}  // namespace gridbay

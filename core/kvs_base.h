@@ -1,0 +1,48 @@
+#pragma once
+
+#include <string>
+
+#include "core/kvs.h"
+#include "core/message.h"
+
+namespace gridbay {
+
+class CGlobalKvs;
+
+// Base of all parts of a model. An object knows its parameters with their defaults, writes itself under the
+// cursor of a parameter file, reads itself from a section, checks itself and copies itself from a like object.
+class CKvsBase {
+ public:
+  // The parent owns the object and never changes; the root has none.
+  explicit CKvsBase(CKvsBase* parent) : parent_(parent) {}
+  CKvsBase(const CKvsBase&) = delete;
+  CKvsBase& operator=(const CKvsBase&) = delete;
+  virtual ~CKvsBase() = default;
+
+  // Appends a message for each fault and returns how many. With `deep` 0 a list leaves out its items.
+  virtual unsigned Validate(ValidationList& messages, int deep);
+  virtual void Save(KvsFile& file, const std::string& documentPath) = 0;
+  // Reads the object from the section that holds it. What the file lacks keeps its value.
+  virtual void Load(KvsSection section, const std::string& documentPath) = 0;
+  // Takes over the values of another object of the same class.
+  virtual void CopyFrom(const CKvsBase& other);
+  virtual CKvsBase* GetParent();
+  virtual CKvsBase* GetRoot();
+  virtual CKvsBase* FindChildKvs();
+
+  // Whether a text is a usable path name; the file need not exist.
+  static bool IsValidPathName(const char* path);
+  // Copies all that a section of a loaded file holds, in order, under the cursor of a file in writing.
+  static void CopySection(KvsSection source, KvsFile& destination);
+
+ protected:
+  // The model that this object is a part of; null where the object stands alone.
+  CGlobalKvs* model();
+  // Shows a text to the user through the root's host and returns.
+  virtual void ShowMessage(const std::string& text);
+
+ private:
+  CKvsBase* parent_;
+};
+
+}  // namespace gridbay

@@ -1,0 +1,39 @@
+#pragma once
+
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "core/global_kvs.h"
+#include "core/kvs.h"
+#include "platform/result.h"
+
+namespace gridbay {
+
+// A model with the file it came from, which stays open so that a save can pass on what the editor does not know.
+class SetupFile {
+ public:
+  // A new default model. The host, which must outlive it, is shown what a load has to say.
+  explicit SetupFile(MessageHost* host);
+
+  // Reads a setup; a file that is no setup is an error, so that it cannot be saved over by accident.
+  static Result<SetupFile> open(const std::string& path, MessageHost* host);
+  // Reads a setup from a tree in memory that stands for the file at the path.
+  static SetupFile fromTree(KvsHandle tree, const std::string& path, MessageHost* host);
+
+  CGlobalKvs& model() { return *model_; }
+  // The file as it was read; empty for a new model.
+  const KvsFile& source() const { return *source_; }
+  // What a save to the path would write.
+  KvsHandle tree(const std::string& path);
+  Outcome save(const std::string& path);
+  // Sections of the file, as paths, that this model holds nothing of and a save leaves out. What belongs to a
+  // module that is not selected is left out on purpose and is not among them.
+  std::vector<std::string> unknownSections(const std::string& path);
+
+ private:
+  KvsHandle source_;
+  std::unique_ptr<CGlobalKvs> model_;
+};
+
+}  // namespace gridbay

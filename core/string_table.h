@@ -1,0 +1,42 @@
+#pragma once
+
+#include <fmt/printf.h>
+
+#include <string>
+#include <string_view>
+
+namespace gridbay {
+
+// A text that the program shows, with printf placeholders; odd forms are meant. The id is that of the string
+// resource, 0 where none is known outside.
+struct Text {
+  std::string_view format;
+  int id = 0;
+};
+
+template <class... Args>
+std::string formatted(const Text& text, const Args&... args) {
+  return fmt::sprintf(text.format, args...);
+}
+
+namespace texts {
+
+inline constexpr Text dataFileNotValid{"Data file  \" %s\"  is not valid"};
+inline constexpr Text errorMessage{"  Error Message: "};
+inline constexpr Text countNotBorneOut{
+    "Error in the KVS-FILE\nSection %s says %d, which is far more than the %d sections that follow; %d are kept"};
+
+// Help file, default name, new-file name, filter label, filter extension, registry type id, type name.
+inline constexpr Text flowModelDocument{
+    "V27Nested.chm\nUntitled\nVANE 27 Flow model\nVANE 27 Flow Model (*.v27)\n.v27\nVANE27FlowModel.Document\n"
+    "Flow Model",
+    18951};
+inline constexpr Text wetlandSweepKitDocument{
+    "V27WSK.chm\nUntitled\nVANE 27 Wetland Sweep Kit\nVANE 27 Wetland Sweep Kit (*.v27wsk)\n.v27wsk\n"
+    "VANE27FlowModelWSK.Document\nWetland Sweep Kit",
+    19200};
+inline constexpr Text flowModel{"Flow Model", 19276};
+inline constexpr Text wetlandSweepKit{"Wetland Sweep Kit"};
+
+}  // namespace texts
+}  // namespace gridbay

@@ -1,0 +1,151 @@
+#include "platform/cartography/cartography.h"
+
+#include <proj.h>
+
+#include <charconv>
+#include <cmath>
+#include <numbers>
+
+namespace gridbay {
+namespace {
+
+constexpr std::string_view kLocal = "Local Coordinates";
+constexpr int kLocalId = 1;
+constexpr int kLongitudeLatitudeId = 2;
+
+struct FreeContext {
+  void operator()(PJ_CONTEXT* context) const { proj_context_destroy(context); }
+};
+struct FreeProjection {
+  void operator()(PJ* projection) const { proj_destroy(projection); }
+};
+using Projection = std::unique_ptr<PJ, FreeProjection>;
+
+void ignoreLog(void*, int, const char*) {}
+
+// "UTM-32" and "UTM-32S" as the code of the projection on WGS 84; other texts as they are.
+std::string libraryText(std::string_view text) {
+  constexpr std::string_view kPrefix = "UTM-";
+  if (!text.starts_with(kPrefix)) return std::string(text);
+  const std::string_view rest = text.substr(kPrefix.size());
+  int zone = 0;
+  const auto [end, error] = std::from_chars(rest.data(), rest.data() + rest.size(), zone);
+  const std::string_view side(end, static_cast<std::size_t>(rest.data() + rest.size() - end));
+  if (error != std::errc() || zone < 1 || zone > 60 || (!side.empty() && side != "N" && side != "S")) return {};
+  return "EPSG:" + std::to_string((side == "S" ? 32700 : 32600) + zone);
+}
+
+}  // namespace
+
+struct CVdMapProjection::State {
+  std::string text;
+  std::unique_ptr<PJ_CONTEXT, FreeContext> context;
+  Projection crs;
+  Projection fromGeographic;
+};
+
+CVdMapProjection::CVdMapProjection(std::string_view text) : state_(std::make_unique<State>()) {
+  state_->text = text;
+  if (IsLocal(text)) return;
+  state_->context.reset(proj_context_create());
+  PJ_CONTEXT* context = state_->context.get();
+  proj_log_func(context, nullptr, ignoreLog);
+  Projection crs(proj_create(context, libraryText(text).c_str()));
+  if (!crs || proj_is_crs(crs.get()) == 0) return;
+  const Projection geographic(proj_crs_get_geodetic_crs(context, crs.get()));
+  if (geographic) {
+    const Projection there(proj_create_crs_to_crs_from_pj(context, geographic.get(), crs.get(), nullptr, nullptr));
+    if (there) state_->fromGeographic.reset(proj_normalize_for_visualization(context, there.get()));
+  }
+  state_->crs = std::move(crs);
+}
+
+CVdMapProjection::CVdMapProjection(CVdMapProjection&&) noexcept = default;
+CVdMapProjection& CVdMapProjection::operator=(CVdMapProjection&&) noexcept = default;
+CVdMapProjection::~CVdMapProjection() = default;
+
+std::string CVdMapProjection::IDtoProjectionString(int id) {
+  if (id == kLocalId) return std::string(kLocal);
+  return id == kLongitudeLatitudeId ? CVdMapProjection("EPSG:4326").GetProjectionString() : std::string();
+}
+
+bool CVdMapProjection::IsLocal(std::string_view text) {
+  return text.empty() || text == kLocal || text.starts_with("LOCAL_CS");
+}
+
+bool CVdMapProjection::IsLocal() const { return IsLocal(state_->text); }
+bool CVdMapProjection::IsValid() const { return IsLocal() || state_->crs != nullptr; }
+
+std::string CVdMapProjection::Name() const {
+  if (!state_->crs) return IsLocal() ? std::string(kLocal) : std::string();
+  const char* name = proj_get_name(state_->crs.get());
+  return name == nullptr ? std::string() : name;
+}
+
+std::string CVdMapProjection::GetProjectionString() const {
+  if (!state_->crs) return IsLocal() ? std::string(kLocal) : std::string();
+  const char* options[] = {"MULTILINE=NO", nullptr};
+  const char* wkt = proj_as_wkt(state_->context.get(), state_->crs.get(), PJ_WKT1_ESRI, options);
+  return wkt == nullptr ? Wkt() : wkt;
+}
+
+std::string CVdMapProjection::Wkt() const {
+  if (!state_->crs) return {};
+  const char* options[] = {"MULTILINE=NO", nullptr};
+  for (const PJ_WKT_TYPE type : {PJ_WKT1_GDAL, PJ_WKT2_2019}) {
+    if (const char* wkt = proj_as_wkt(state_->context.get(), state_->crs.get(), type, options)) return wkt;
+  }
+  return {};
+}
+
+bool CVdMapProjection::Geo2Proj(double longitude, double latitude, double* east, double* north) const {
+  if (!state_->fromGeographic) return false;
+  const PJ_COORD there =
+      proj_trans(state_->fromGeographic.get(), PJ_FWD, proj_coord(longitude, latitude, 0, HUGE_VAL));
+  if (!std::isfinite(there.xy.x) || !std::isfinite(there.xy.y)) return false;
+  *east = there.xy.x;
+  *north = there.xy.y;
+  return true;
+}
+
+bool CVdMapProjection::Proj2Geo(double east, double north, double* longitude, double* latitude) const {
+  if (!state_->fromGeographic) return false;
+  const PJ_COORD there = proj_trans(state_->fromGeographic.get(), PJ_INV, proj_coord(east, north, 0, HUGE_VAL));
+  if (!std::isfinite(there.lp.lam) || !std::isfinite(there.lp.phi)) return false;
+  *longitude = there.lp.lam;
+  *latitude = there.lp.phi;
+  return true;
+}
+
+CVdCartography::CVdCartography(std::string_view projection, double originEast, double originNorth, double rotation)
+    : projection_(projection),
+      originEast_(originEast),
+      originNorth_(originNorth),
+      cosine_(std::cos(rotation * std::numbers::pi / 180)),
+      sine_(std::sin(rotation * std::numbers::pi / 180)) {}
+
+bool CVdCartography::Proj2Geo(double east, double north, double* longitude, double* latitude) const {
+  return projection_.Proj2Geo(east, north, longitude, latitude);
+}
+
+bool CVdCartography::Geo2Proj(double longitude, double latitude, double* east, double* north) const {
+  return projection_.Geo2Proj(longitude, latitude, east, north);
+}
+
+void CVdCartography::Xy2Proj(double x, double y, double* east, double* north) const {
+  *east = originEast_ + x * cosine_ + y * sine_;
+  *north = originNorth_ - x * sine_ + y * cosine_;
+}
+
+void CVdCartography::Proj2Xy(double east, double north, double* x, double* y) const {
+  const double e = east - originEast_;
+  const double n = north - originNorth_;
+  *x = e * cosine_ - n * sine_;
+  *y = e * sine_ + n * cosine_;
+}
+
+std::string CVdPRJParser::Format(std::string_view projection) {
+  return CVdMapProjection(projection).GetProjectionString();
+}
+
+}  // namespace gridbay

@@ -1,0 +1,130 @@
+#include "platform/files/save_file.h"
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstdlib>
+#include <filesystem>
+#include <optional>
+
+#include "platform/files/file_descriptor.h"
+
+namespace gridbay {
+namespace {
+
+constexpr std::size_t kBufferSize = 1 << 16;
+
+// The file that a save replaces: the end of a chain of links, whether or not it exists yet.
+std::filesystem::path linkEnd(std::filesystem::path path) {
+  constexpr int kMostLinks = 40;
+  std::error_code error;
+  for (int i = 0; i < kMostLinks && std::filesystem::is_symlink(path, error); ++i) {
+    std::filesystem::path next = std::filesystem::read_symlink(path, error);
+    if (error) break;
+    path = next.is_absolute() ? std::move(next) : path.parent_path() / next;
+  }
+  return path;
+}
+
+std::string folderOf(const std::filesystem::path& path) {
+  const std::string folder = path.parent_path().string();
+  return folder.empty() ? "." : folder;
+}
+
+}  // namespace
+
+struct FileSave::State {
+  std::string shownPath;
+  std::string target;
+  std::string folder;
+  std::string temporary;
+  FileDescriptor file{-1};
+  std::string buffer;
+
+  State(std::string shown, std::string end, std::string in, std::string temp, FileDescriptor descriptor)
+      : shownPath(std::move(shown)),
+        target(std::move(end)),
+        folder(std::move(in)),
+        temporary(std::move(temp)),
+        file(std::move(descriptor)) {}
+  State(const State&) = delete;
+  State& operator=(const State&) = delete;
+  ~State() {
+    if (!temporary.empty()) ::unlink(temporary.c_str());
+  }
+
+  Failure failure() const { return {systemError("cannot save", shownPath) + ". The old file is unchanged."}; }
+};
+
+FileSave::FileSave(std::unique_ptr<State> state) : state_(std::move(state)) {}
+FileSave::FileSave(FileSave&&) noexcept = default;
+FileSave::~FileSave() = default;
+
+Result<FileSave> FileSave::begin(const std::string& path) {
+  const std::filesystem::path target = linkEnd(path);
+  const std::string folder = folderOf(target);
+
+  struct stat old {};
+  const bool replaces = ::stat(target.c_str(), &old) == 0;
+  const auto refuse = [&path](std::string_view why) {
+    return Failure{"cannot save \"" + path + "\": " + std::string(why)};
+  };
+  if (replaces && !S_ISREG(old.st_mode)) return refuse("a folder or a device has that name");
+  if (replaces && ::access(target.c_str(), W_OK) != 0) return refuse("the file is read-only");
+
+  std::string temporary = folder + "/." + target.filename().string() + ".XXXXXX";
+  FileDescriptor file(::mkostemp(temporary.data(), O_CLOEXEC));
+  if (!file) return Failure{systemError("cannot save", path)};
+
+  auto state = std::make_unique<State>(path, target.string(), folder, temporary, std::move(file));
+  if (replaces) {
+    // Ownership goes first: giving a file away clears its set-id bits. Only a privileged user may do it.
+    if (::fchown(state->file.get(), old.st_uid, old.st_gid) != 0) errno = 0;
+    if (::fchmod(state->file.get(), old.st_mode & 07777U) != 0) return state->failure();
+  } else {
+    const mode_t mask = ::umask(0);
+    ::umask(mask);
+    if (::fchmod(state->file.get(), 0666U & ~mask) != 0) return state->failure();
+  }
+  return FileSave(std::move(state));
+}
+
+Outcome FileSave::flush() {
+  std::string_view rest = state_->buffer;
+  while (!rest.empty()) {
+    const ssize_t n = ::write(state_->file.get(), rest.data(), rest.size());
+    if (n < 0 && errno == EINTR) continue;
+    if (n < 0) return state_->failure();
+    rest.remove_prefix(static_cast<std::size_t>(n));
+  }
+  state_->buffer.clear();
+  return {};
+}
+
+Outcome FileSave::write(std::string_view text) {
+  state_->buffer.append(text);
+  return state_->buffer.size() < kBufferSize ? Outcome() : flush();
+}
+
+Outcome FileSave::commit() {
+  if (Outcome flushed = flush(); !flushed) return flushed;
+  if (::fsync(state_->file.get()) != 0) return state_->failure();
+  if (::close(state_->file.release()) != 0) return state_->failure();
+  if (::rename(state_->temporary.c_str(), state_->target.c_str()) != 0) return state_->failure();
+  state_->temporary.clear();
+  // The new name is durable once its folder is; a file system that cannot flush folders keeps the old rule.
+  const FileDescriptor folder(::open(state_->folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
+  if (folder && ::fsync(folder.get()) != 0) errno = 0;
+  return {};
+}
+
+Outcome saveFile(const std::string& path, std::string_view text) {
+  Result<FileSave> save = FileSave::begin(path);
+  if (!save) return Failure{save.error()};
+  if (Outcome written = save->write(text); !written) return written;
+  return save->commit();
+}
+
+}  // namespace gridbay

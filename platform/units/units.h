@@ -1,0 +1,80 @@
+#pragma once
+
+#include <memory>
+#include <optional>
+#include <span>
+#include <string>
+#include <string_view>
+
+namespace gridbay {
+
+// A unit of the library. Units are known by their codes; the text is UDUNITS-2's, and what data files hold.
+struct QunUnit {
+  int code;
+  std::string_view symbol;  // as shown: "m³/s"
+  std::string_view name;    // "cubic metre per second"
+  std::string_view text;    // "m3 s-1"
+};
+
+enum class UnitSystem { metric, us };
+
+// A quantity that a value or an item of a data file can be. The first unit is the base unit, in which models
+// and setups hold the value.
+struct QunItem {
+  int code;
+  std::string_view name;
+  std::span<const int> units;
+  int usUnit;  // the unit to show where US units are chosen
+};
+
+namespace unit {
+inline constexpr int kMetre = 1000;
+inline constexpr int kSecond = 1400;
+inline constexpr int kDay = 1403;
+}  // namespace unit
+
+namespace item {
+inline constexpr int kUndefined = 999;
+inline constexpr int kWaterLevel = 100000;
+inline constexpr int kDischarge = 100001;
+inline constexpr int kSurfaceElevation = 100078;
+inline constexpr int kBathymetry = 100079;
+inline constexpr int kTimeStep = 100212;
+inline constexpr int kFloodDepth = 100280;
+}  // namespace item
+
+// The catalogues, by rising code.
+std::span<const QunItem> qunItems();
+std::span<const QunUnit> qunUnits();
+// The entry of a code, or null.
+const QunItem* qunFindItem(int code);
+const QunUnit* qunFindUnit(int code);
+// The base unit of an item; null for an item that is not in the catalogue.
+const QunUnit* qunBaseUnit(int itemCode);
+
+// A value of one unit in another. Units of different dimensions give nothing.
+std::optional<double> qunConvertUnit(int fromUnit, int toUnit, double value);
+// Whether two unit texts name the same dimension; false for a text that is no unit.
+bool qunAreEquivalent(std::string_view unitText, std::string_view otherText);
+bool qunIsUnit(std::string_view unitText);
+
+// Converts between two units, found once.
+class CVdUnitConverter {
+ public:
+  CVdUnitConverter(int fromUnit, int toUnit);
+  // Between units by their texts, as data files have them.
+  CVdUnitConverter(std::string_view fromText, std::string_view toText);
+  CVdUnitConverter(CVdUnitConverter&&) noexcept;
+  CVdUnitConverter& operator=(CVdUnitConverter&&) noexcept;
+  ~CVdUnitConverter();
+
+  // False when there is no way from the one unit to the other; such a converter changes nothing.
+  bool IsValid() const;
+  double Convert(double value) const;
+
+ private:
+  struct State;
+  std::unique_ptr<State> state_;
+};
+
+}  // namespace gridbay
