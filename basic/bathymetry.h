@@ -4,11 +4,11 @@
 #include <span>
 #include <string>
 
+#include "basic/texts.h"
 #include "core/array2d.h"
 #include "core/file_name.h"
 #include "core/file_selector.h"
 #include "core/list_kvs.h"
-#include "basic/texts.h"
 
 namespace gridbay {
 
@@ -18,14 +18,14 @@ class CBathymetryObjectKvs final : public TableKvs<CBathymetryObjectKvs> {
  public:
   using TableKvs::TableKvs;
 
-  GridPoint origin{3, 3};           // the point of the enclosing grid that holds this area's first point
-  std::int32_t enclosingArea = 0;   // from 1; 0 for Area 1
-  std::int32_t noJ = 0;             // grid points along x
-  std::int32_t noK = 0;             // and along y
-  float dx = 0;                     // metres
+  GridPoint origin{3, 3};          // the point of the enclosing grid that holds this area's first point
+  std::int32_t enclosingArea = 0;  // from 1; 0 for Area 1
+  std::int32_t noJ = 0;            // grid points along x
+  std::int32_t noK = 0;            // and along y
+  float dx = 0;                    // metres
   float dy = 0;
-  float landValue = 0;              // a point at or above it is land
-  CVdArray2D<float> grid;           // elevations in metres, upwards: a depth is minus the value
+  float landValue = 0;     // a point at or above it is land
+  CVdArray2D<float> grid;  // elevations in metres, upwards: a depth is minus the value
   UFileName fileName;
 
   static constexpr auto table() {
@@ -34,9 +34,9 @@ class CBathymetryObjectKvs final : public TableKvs<CBathymetryObjectKvs> {
                     keyword("Enclosing_Area", &CBathymetryObjectKvs::enclosingArea));
   }
 
-  // Reads the area's file into the object; areaNumber from 1. Returns the number of errors, with a message for
-  // each; then the grid is empty and its dimensions are 0. A hot start file also sets where the area lies and,
-  // for area 1, start and time step of the simulation.
+  // Reads the area's file into the object; areaNumber from 1. Returns the number of errors, with a message
+  // for each; then the grid is empty and its dimensions are 0. A hot start file also sets where the area lies
+  // and, for area 1, start and time step of the simulation.
   unsigned ReadGrid(ValidationList& messages, int areaNumber);
   // Origin, enclosing area and file name, and what was read from the file.
   void copyWhole(const CBathymetryObjectKvs& other);
@@ -69,14 +69,11 @@ class CBathymetryKvs final : public ListKvs<CBathymetryKvs, CBathymetryObjectKvs
   };
 
   static constexpr auto table() {
-    return section("BATHYMETRY_SELECTION",
-                   notCopied(keyword("Projection", &CBathymetryKvs::projection)),
+    return section("BATHYMETRY_SELECTION", notCopied(keyword("Projection", &CBathymetryKvs::projection)),
                    notCopied(pinned(keyword("CoriolisForce", &CBathymetryKvs::coriolis), false)),
                    notCopied(pinned(keyword("Land_Slides", &CBathymetryKvs::landSlides), false)),
-                   notCopied(keyword("Overland_Solver", &CBathymetryKvs::overlandSolver)),
-                   OverlandFileRow{},
-                   pinnedCount("No_Of_Areas", 1),
-                   keyword("Hot_Start", &CBathymetryKvs::hotStart),
+                   notCopied(keyword("Overland_Solver", &CBathymetryKvs::overlandSolver)), OverlandFileRow{},
+                   pinnedCount("No_Of_Areas", 1), keyword("Hot_Start", &CBathymetryKvs::hotStart),
                    items("AREA_%d", texts::bathymetrySectionMissing));
   }
 
@@ -94,8 +91,8 @@ class CBathymetryKvs final : public ListKvs<CBathymetryKvs, CBathymetryObjectKvs
   // The greatest Courant number, timeStep x sqrt(g x depth) / dx, and the area it is in; both 0 where no grid
   // has been read. Time step in seconds.
   void GetMaxCourant(double timeStep, double* maxCourant, int* areaNumber) const;
-  // The projection that holds, from Area 1's file where it is stale or missing, and the Coriolis flag. Returns 1
-  // when Area 1's file has a place on a map; else the projection becomes that of local coordinates.
+  // The projection that holds, from Area 1's file where it is stale or missing, and the Coriolis flag.
+  // Returns 1 when Area 1's file has a place on a map; else the projection becomes that of local coordinates.
   int GetProjection(std::string* text, int* flag);
   // The projection of Area 1's file and the place of its first point (metres). Returns 1 when it has one.
   int GetGeoReference(std::string* projectionName, double* easting, double* northing) const;

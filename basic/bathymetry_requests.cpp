@@ -10,7 +10,9 @@ namespace {
 constexpr int kHotStartDataType = 11;
 constexpr double kSpacingTolerance = 0.01;
 
-bool isMultiple(int fine, int coarse) { return coarse > 0 && fine % coarse == 0; }
+bool isMultiple(int fine, int coarse) {
+  return coarse > 0 && fine % coarse == 0;
+}
 
 // Whether cells of the fine spacing fill those of the coarse one; the counts are multiples by then.
 bool spacingFits(double coarse, int coarseCells, double fine, int fineCells) {

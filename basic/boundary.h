@@ -41,8 +41,7 @@ class CBoundaryKvs final : public ListKvs<CBoundaryKvs, CBoundaryObjectKvs> {
   std::int32_t defaultPosition = 1;  // 0 user specified, 1 program detected
 
   static constexpr auto table() {
-    return section("OPEN_BOUNDARY",
-                   count("Number_Of_Boundaries"),
+    return section("OPEN_BOUNDARY", count("Number_Of_Boundaries"),
                    keyword("Default_Position", &CBoundaryKvs::defaultPosition),
                    items("BOUNDARY_%d", texts::boundarySectionMissing));
   }
@@ -50,8 +49,8 @@ class CBoundaryKvs final : public ListKvs<CBoundaryKvs, CBoundaryObjectKvs> {
   static std::span<const Follower> followers();
 
   void SetNoBoundaries(int n) { SetCount(n); }
-  // Finds the boundaries along the border of Area 1, whose file it reads. All that was set for the old ones is
-  // lost, also when the file cannot be read.
+  // Finds the boundaries along the border of Area 1, whose file it reads. All that was set for the old ones
+  // is lost, also when the file cannot be read.
   void RecalculateBoundaries();
 };
 

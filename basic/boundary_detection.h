@@ -15,8 +15,8 @@ struct BoundaryLine {
   bool operator==(const BoundaryLine&) const = default;
 };
 
-// The runs of water (values below the land value) along the border of a grid: west, north, east, south, and on
-// each edge by rising index. A wet corner is a part of both its edges. Only the border is looked at.
+// The runs of water (values below the land value) along the border of a grid: west, north, east, south, and
+// on each edge by rising index. A wet corner is a part of both its edges. Only the border is looked at.
 std::vector<BoundaryLine> findOpenBoundaries(const CVdArray2D<float>& grid, float landValue);
 
 }  // namespace gridbay

@@ -7,7 +7,8 @@
 
 namespace gridbay {
 
-void CMassBudgetItemKvs::CornersRow::save(const CMassBudgetItemKvs& polygon, KvsFile& file, const std::string&) const {
+void CMassBudgetItemKvs::CornersRow::save(const CMassBudgetItemKvs& polygon, KvsFile& file,
+                                          const std::string&) const {
   kvsPutParam(file, count, static_cast<std::int32_t>(polygon.corners.size()));
   int number = 0;
   for (const GridPoint& point : polygon.corners) {
@@ -15,7 +16,8 @@ void CMassBudgetItemKvs::CornersRow::save(const CMassBudgetItemKvs& polygon, Kvs
   }
 }
 
-void CMassBudgetItemKvs::CornersRow::load(CMassBudgetItemKvs& polygon, KvsSection from, const std::string&) const {
+void CMassBudgetItemKvs::CornersRow::load(CMassBudgetItemKvs& polygon, KvsSection from,
+                                          const std::string&) const {
   std::int32_t stated = 0;
   kvsGetParam(from, count, &stated, 1, 1);
   polygon.corners.clear();

@@ -24,7 +24,9 @@ class CMassBudgetItemKvs final : public TableKvs<CMassBudgetItemKvs> {
 
     void save(const CMassBudgetItemKvs& polygon, KvsFile& file, const std::string& documentPath) const;
     void load(CMassBudgetItemKvs& polygon, KvsSection from, const std::string& documentPath) const;
-    void copy(CMassBudgetItemKvs& polygon, const CMassBudgetItemKvs& other) const { polygon.corners = other.corners; }
+    void copy(CMassBudgetItemKvs& polygon, const CMassBudgetItemKvs& other) const {
+      polygon.corners = other.corners;
+    }
   };
 
   static constexpr auto table() {
@@ -42,8 +44,7 @@ class CMassBudgetKvs final : public ListKvs<CMassBudgetKvs, CMassBudgetItemKvs> 
   using ListKvs::ListKvs;
 
   static constexpr auto table() {
-    return section("MASS_BUDGET",
-                   pinnedCount("NoOfPolygons", 0),
+    return section("MASS_BUDGET", pinnedCount("NoOfPolygons", 0),
                    items("POLYGON_%d", texts::polygonSectionMissing));
   }
 

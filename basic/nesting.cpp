@@ -53,9 +53,11 @@ Rectangle footprint(const CBathymetryObjectKvs& area) {
 
 }  // namespace
 
-unsigned CheckNesting(const CBathymetryObjectKvs& inner, const CBathymetryObjectKvs& outer, ValidationList& messages) {
+unsigned CheckNesting(const CBathymetryObjectKvs& inner, const CBathymetryObjectKvs& outer,
+                      ValidationList& messages) {
   const auto refuse = [&](const Text& text) {
-    return report(messages, PageId::bathymetry, Severity::fault, text, inner.fileName.text(), outer.fileName.text());
+    return report(messages, PageId::bathymetry, Severity::fault, text, inner.fileName.text(),
+                  outer.fileName.text());
   };
   if (hasWrongRatio(outer.dx, inner.dx) || hasWrongRatio(outer.dy, inner.dy)) return refuse(texts::nestRatio);
   if ((inner.noJ - 1) % kNestingRatio != 0) return refuse(texts::nestJextr);
@@ -68,12 +70,14 @@ unsigned CheckNesting(const CBathymetryObjectKvs& inner, const CBathymetryObject
   return 0;
 }
 
-unsigned CheckOverlap(const CBathymetryObjectKvs& a, const CBathymetryObjectKvs& b, ValidationList& messages) {
+unsigned CheckOverlap(const CBathymetryObjectKvs& a, const CBathymetryObjectKvs& b,
+                      ValidationList& messages) {
   if (&a == &b || a.enclosingArea != b.enclosingArea) return 0;
   const Rectangle first = footprint(a);
   const Rectangle second = footprint(b);
   if (!first.containsCornerOf(second) && !second.containsCornerOf(first)) return 0;
-  return report(messages, PageId::bathymetry, Severity::fault, texts::overlap, a.fileName.text(), b.fileName.text());
+  return report(messages, PageId::bathymetry, Severity::fault, texts::overlap, a.fileName.text(),
+                b.fileName.text());
 }
 
 }  // namespace gridbay

@@ -75,7 +75,8 @@ unsigned CBathymetryObjectKvs::ReadGrid(ValidationList& messages, int areaNumber
   CGlobalKvs* root = model();
   const bool hotStart = root != nullptr && root->bathymetry->hotStart == 1;
   const auto notValid = [&] {
-    return report(messages, PageId::bathymetry, Severity::dependedUpon, texts::dataFileNotValid, fileName.text());
+    return report(messages, PageId::bathymetry, Severity::dependedUpon, texts::dataFileNotValid,
+                  fileName.text());
   };
   unsigned faults = 0;
   GridFile file;
@@ -85,7 +86,8 @@ unsigned CBathymetryObjectKvs::ReadGrid(ValidationList& messages, int areaNumber
   RequestBathymetry(selector, hotStart);
   std::string errorText;
   TsbHeader header;
-  if (!selector.IsTsbFileValid(fileName.absolute(), &errorText) || tsbFileRead(fileName.absolute(), &header) != 0) {
+  if (!selector.IsTsbFileValid(fileName.absolute(), &errorText) ||
+      tsbFileRead(fileName.absolute(), &header) != 0) {
     grid = {};
     noJ = noK = 0;
     dx = dy = 0;

@@ -20,11 +20,13 @@ std::int32_t saturated(std::int64_t number) {
 
 }  // namespace
 
-void CSimulationPeriodKvs::StepsRow::save(const CSimulationPeriodKvs& period, KvsFile& file, const std::string&) const {
+void CSimulationPeriodKvs::StepsRow::save(const CSimulationPeriodKvs& period, KvsFile& file,
+                                          const std::string&) const {
   kvsPutParam(file, name, saturated(std::int64_t{period.noPointsInTime} - 1));
 }
 
-void CSimulationPeriodKvs::StepsRow::load(CSimulationPeriodKvs& period, KvsSection from, const std::string&) const {
+void CSimulationPeriodKvs::StepsRow::load(CSimulationPeriodKvs& period, KvsSection from,
+                                          const std::string&) const {
   kvsGetParam(from, name, &period.noPointsInTime, 1, 1);
   period.noPointsInTime = saturated(std::int64_t{period.noPointsInTime} + 1);
 }

@@ -31,8 +31,7 @@ class CSimulationPeriodKvs final : public TableKvs<CSimulationPeriodKvs> {
   };
 
   static constexpr auto table() {
-    return section("SIMULATION_PERIOD",
-                   StepsRow{"Number_Of_Timesteps"},
+    return section("SIMULATION_PERIOD", StepsRow{"Number_Of_Timesteps"},
                    keyword("Time_Step_Interval", &CSimulationPeriodKvs::timeStepInterval),
                    keyword("Warm_Up_Period", &CSimulationPeriodKvs::warmUpPeriod),
                    keyword("Start_Time", &CSimulationPeriodKvs::start));

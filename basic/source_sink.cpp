@@ -16,7 +16,8 @@ struct PointTexts {
   const Text& onLand;
 };
 
-constexpr PointTexts kSource{texts::sourceNoArea, texts::sourceOutside, texts::sourceCovered, texts::sourceOnLand};
+constexpr PointTexts kSource{texts::sourceNoArea, texts::sourceOutside, texts::sourceCovered,
+                             texts::sourceOnLand};
 constexpr PointTexts kSink{texts::sinkNoArea, texts::sinkOutside, texts::sinkCovered, texts::sinkOnLand};
 
 // What is wrong with a point, or null.
@@ -46,10 +47,14 @@ unsigned CSourceSinkObjectKvs::Validate(ValidationList& messages, int, int numbe
 
 std::string CSourceSinkObjectKvs::Text() const {
   switch (type) {
-    case kIsolatedSource: return formatted(texts::sourceText, source.j, source.k);
-    case kIsolatedSink: return formatted(texts::sinkText, sink.j, sink.k);
-    case kPair: return formatted(texts::sourceSinkText, source.j, source.k, sink.j, sink.k);
-    default: return {};
+    case kIsolatedSource:
+      return formatted(texts::sourceText, source.j, source.k);
+    case kIsolatedSink:
+      return formatted(texts::sinkText, sink.j, sink.k);
+    case kPair:
+      return formatted(texts::sourceSinkText, source.j, source.k, sink.j, sink.k);
+    default:
+      return {};
   }
 }
 

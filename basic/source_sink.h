@@ -48,8 +48,7 @@ class CSourceSinkKvs final : public ListKvs<CSourceSinkKvs, CSourceSinkObjectKvs
   using ListKvs::ListKvs;
 
   static constexpr auto table() {
-    return section("SOURCE_AND_SINK",
-                   count("Number_Of_Sources"),
+    return section("SOURCE_AND_SINK", count("Number_Of_Sources"),
                    items("SOURCE_SINK_%d", texts::sourceSectionMissing));
   }
 

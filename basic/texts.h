@@ -16,12 +16,14 @@ inline constexpr Text warmUpTooLong{"Warm up period exceeds the simulation perio
 
 // Bathymetries.
 inline constexpr Text bathymetrySectionMissing{
-    "Error in the KVS-FILE\nThe number of Bathymetry sections does not correspond to the number of sub domaines"};
+    "Error in the KVS-FILE\nThe number of Bathymetry sections does not correspond to the number of sub "
+    "domaines"};
 inline constexpr Text landBelowZero{"True land defined in the bathymetry is less than zero"};
 inline constexpr Text bathymetryCount{"Number of bathymetries should be between 1 and 9"};
 inline constexpr Text outerNotValid{"Not a valid outer bathymetry chosen"};
 inline constexpr Text overlap{"Bathymetries%s and %s Overlap"};
-inline constexpr Text nestRatio{"Can not nest file %s in file %s.  Ratio between gridpoint spacing is not 3."};
+inline constexpr Text nestRatio{
+    "Can not nest file %s in file %s.  Ratio between gridpoint spacing is not 3."};
 inline constexpr Text nestJextr{"Can not nest file %s in file %s.  Grid dimension incorrect (jextr)."};
 inline constexpr Text nestKextr{"Can not nest file %s in file %s.  Grid dimension incorrect (kextr)."};
 inline constexpr Text nestPosition{"Can not nest file %s in file %s.  Illegal position of area."};
@@ -37,13 +39,16 @@ inline constexpr Text fineCellsJ{
     "The number of cells in J-dir. must be a multiple of the number of cells in area1."};
 inline constexpr Text fineCellsK{
     "The number of cells in K-dir. must be a multiple of the number of cells in area1."};
-inline constexpr Text fineSpacingJ{"The grid spacing in J-dir. must be a multiple of the grid spacing in area1."};
-inline constexpr Text fineSpacingK{"The grid spacing in K-dir. must be a multiple of the grid spacing in area1."};
+inline constexpr Text fineSpacingJ{
+    "The grid spacing in J-dir. must be a multiple of the grid spacing in area1."};
+inline constexpr Text fineSpacingK{
+    "The grid spacing in K-dir. must be a multiple of the grid spacing in area1."};
 
 // Open boundaries.
 inline constexpr Text boundaryText{"(%d,%d) - (%d,%d)"};
 inline constexpr Text boundarySectionMissing{
-    "Error in the KVS-FILE\nThe number of Boundary sections does not correspond to the number of sub domaines"};
+    "Error in the KVS-FILE\nThe number of Boundary sections does not correspond to the number of sub "
+    "domaines"};
 inline constexpr Text firstPointNegative{"First point coordinates can not be negative"};
 inline constexpr Text lastPointNegative{"Last point coordinates can not be negative"};
 inline constexpr Text lineNotParallel{"Line must be parallel to either X- or Y-axis"};

@@ -25,7 +25,8 @@ int boundaries(const Options& options, const Console& console) {
     if (area == nullptr) return console.fail("The setup has no area");
     if (area->ReadGrid(messages, 1) != 0) {
       for (const CMessage& message : messages) console.note(message.text);
-      return console.fail("The boundaries cannot be found without the grid of Area 1; the setup is unchanged");
+      return console.fail(
+          "The boundaries cannot be found without the grid of Area 1; the setup is unchanged");
     }
     list.defaultPosition = 1;
     list.RecalculateBoundaries();
@@ -42,7 +43,8 @@ int boundaries(const Options& options, const Console& console) {
 
 void addBoundaries(CLI::App& tool, Action& action) {
   std::shared_ptr<Options> options;
-  CLI::App& command = addCommand(tool, action, "boundaries", "Lists the open boundaries", boundaries, options);
+  CLI::App& command =
+      addCommand(tool, action, "boundaries", "Lists the open boundaries", boundaries, options);
   command.add_option("FILE", options->file, "The setup")->required();
   command.add_flag("--detect", options->detect, "Find them along the border of Area 1 and store them");
 }

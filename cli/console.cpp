@@ -9,7 +9,9 @@ int Console::fail(std::string_view why) const {
   return kCouldNotDoIt;
 }
 
-void Console::note(std::string_view text) const { err << text << '\n' << std::flush; }
+void Console::note(std::string_view text) const {
+  err << text << '\n' << std::flush;
+}
 
 void ConsoleMessageHost::show(const std::string& text) {
   std::string line = text;
@@ -28,7 +30,8 @@ void ConsoleMessageHost::flush() {
 
 int saveSetup(SetupFile& setup, const std::string& path, const Console& console) {
   for (const std::string& section : setup.unknownSections(path)) {
-    console.note("Warning: this version does not know section " + section + ", which is left out of the saved file");
+    console.note("Warning: this version does not know section " + section +
+                 ", which is left out of the saved file");
   }
   if (const Outcome saved = setup.save(path); !saved) return console.fail(saved.error());
   return kClean;

@@ -48,7 +48,8 @@ Result<std::unique_ptr<Raster>> openRaster(const std::string& path) {
   const std::string module = (program.parent_path() / "v27raster.so").string();
   void* library = ::dlopen(module.c_str(), RTLD_NOW | RTLD_LOCAL);
   void* entry = library == nullptr ? nullptr : ::dlsym(library, kOpenRaster);
-  if (entry == nullptr) return Failure{fmt::format("The raster reader \"{}\" cannot be loaded: {}", module, ::dlerror())};
+  if (entry == nullptr)
+    return Failure{fmt::format("The raster reader \"{}\" cannot be loaded: {}", module, ::dlerror())};
   std::string why;
   std::unique_ptr<Raster> raster(reinterpret_cast<OpenRaster>(entry)(path.c_str(), &why));
   if (raster == nullptr) return Failure{fmt::format("cannot read \"{}\": {}", path, why)};
@@ -63,8 +64,8 @@ Result<Selection> select(const Options& options, const Raster& raster) {
     const int j1 = options.window[2];
     const int k1 = options.window[3];
     if (j0 < 0 || k0 < 0 || j1 < j0 || k1 < k0 || j1 >= raster.columns() || k1 >= raster.rows()) {
-      return Failure{fmt::format("The window {},{},{},{} does not lie in the raster, which goes to {},{}", j0, k0, j1,
-                                 k1, raster.columns() - 1, raster.rows() - 1)};
+      return Failure{fmt::format("The window {},{},{},{} does not lie in the raster, which goes to {},{}", j0,
+                                 k0, j1, k1, raster.columns() - 1, raster.rows() - 1)};
     }
     all = {j0, k0, j1 - j0 + 1, k1 - k0 + 1, options.coarsen};
   }
@@ -74,7 +75,9 @@ Result<Selection> select(const Options& options, const Raster& raster) {
 }
 
 // Rows of the raster count from its first one; K counts from the southernmost.
-int rowOf(const Raster& raster, int k) { return raster.stepY() < 0 ? raster.rows() - 1 - k : k; }
+int rowOf(const Raster& raster, int k) {
+  return raster.stepY() < 0 ? raster.rows() - 1 - k : k;
+}
 
 Result<TsbDefinition> define(const Options& options, const Raster& raster, const Selection& chosen) {
   const QunItem* quantity = qunFindItem(options.itemType);
@@ -85,22 +88,24 @@ Result<TsbDefinition> define(const Options& options, const Raster& raster, const
 
   const double dx = std::abs(raster.stepX());
   const double dy = std::abs(raster.stepY());
-  const double south = raster.stepY() < 0 ? raster.firstY() + (raster.rows() - 1) * raster.stepY() : raster.firstY();
+  const double south =
+      raster.stepY() < 0 ? raster.firstY() + (raster.rows() - 1) * raster.stepY() : raster.firstY();
   TsbDefinition definition;
   definition.title = std::filesystem::path(options.in).stem().string();
   definition.time.type = TsbTimeAxisType::relativeEquidistant;
-  definition.axes = {
-      {static_cast<std::size_t>(chosen.noJ), options.originX.value_or(raster.firstX() + chosen.firstJ * dx),
-       dx * chosen.every, "m"},
-      {static_cast<std::size_t>(chosen.noK), options.originY.value_or(south + chosen.firstK * dy), dy * chosen.every,
-       "m"}};
-  definition.items = {{std::string(quantity->name), quantity->code, std::string(qunBaseUnit(quantity->code)->text)}};
+  definition.axes = {{static_cast<std::size_t>(chosen.noJ),
+                      options.originX.value_or(raster.firstX() + chosen.firstJ * dx), dx * chosen.every, "m"},
+                     {static_cast<std::size_t>(chosen.noK),
+                      options.originY.value_or(south + chosen.firstK * dy), dy * chosen.every, "m"}};
+  definition.items = {
+      {std::string(quantity->name), quantity->code, std::string(qunBaseUnit(quantity->code)->text)}};
   definition.customBlocks = {{"V27_Misc", {0, 0, 0, options.land}}};
   if (!map.IsLocal()) {
     TsbGeography place{projection, 0, 0, 0};
-    if (!map.Proj2Geo(definition.axes[0].first, definition.axes[1].first, &place.longitude, &place.latitude)) {
-      return Failure{fmt::format("The point {}, {} does not lie in the projection \"{}\"", definition.axes[0].first,
-                                 definition.axes[1].first, map.Name())};
+    if (!map.Proj2Geo(definition.axes[0].first, definition.axes[1].first, &place.longitude,
+                      &place.latitude)) {
+      return Failure{fmt::format("The point {}, {} does not lie in the projection \"{}\"",
+                                 definition.axes[0].first, definition.axes[1].first, map.Name())};
     }
     definition.geography = place;
   }
@@ -108,8 +113,8 @@ Result<TsbDefinition> define(const Options& options, const Raster& raster, const
 }
 
 // Copies the chosen points, some rows at a time; returns how many values were missing.
-Result<std::size_t> copyValues(const Options& options, Raster& raster, const Selection& chosen, TsbWriter& writer,
-                               const Console& console) {
+Result<std::size_t> copyValues(const Options& options, Raster& raster, const Selection& chosen,
+                               TsbWriter& writer, const Console& console) {
   const auto columns = static_cast<std::size_t>(raster.columns());
   const int rowsAtOnce = static_cast<int>(std::max<std::size_t>(kPointsAtOnce / columns, 1));
   const float missingAs = options.missingAs.value_or(options.land);
@@ -131,7 +136,8 @@ Result<std::size_t> copyValues(const Options& options, Raster& raster, const Sel
       blockCount = std::min(rowsAtOnce, raster.rows() - blockFirst);
       block.resize(columns * static_cast<std::size_t>(blockCount));
       std::string why;
-      if (!raster.read(blockFirst, block, &why)) return Failure{fmt::format("cannot read \"{}\": {}", options.in, why)};
+      if (!raster.read(blockFirst, block, &why))
+        return Failure{fmt::format("cannot read \"{}\": {}", options.in, why)};
     }
     const float* source = block.data() + static_cast<std::size_t>(wanted - blockFirst) * columns;
     for (int j = 0; j < chosen.noJ; ++j) {
@@ -155,9 +161,11 @@ int convertRaster(const Options& options, const Console& console) {
     return console.fail("The raster is turned on the map. Turn it north up first, as with gdalwarp");
   }
   if ((*raster)->isInDegrees() && options.crs.empty()) {
-    return console.fail("The raster is in degrees. Bring it to a projection in metres first, as with gdalwarp -t_srs");
+    return console.fail(
+        "The raster is in degrees. Bring it to a projection in metres first, as with gdalwarp -t_srs");
   }
-  if (!(*raster)->hasPlace()) console.note("The raster does not say where it lies: its points are taken 1 m apart");
+  if (!(*raster)->hasPlace())
+    console.note("The raster does not say where it lies: its points are taken 1 m apart");
   const Result<Selection> chosen = select(options, **raster);
   if (!chosen) return console.fail(chosen.error());
   const Result<TsbDefinition> definition = define(options, **raster, *chosen);
@@ -170,8 +178,9 @@ int convertRaster(const Options& options, const Console& console) {
 
   const TsbGridAxis& x = definition->axes[0];
   const TsbGridAxis& y = definition->axes[1];
-  console.out << fmt::format("{}: {} x {} points, {:.6g} x {:.6g} m apart, from {:.10g}, {:.10g}; land at {:g}\n",
-                             options.out, x.points, y.points, x.spacing, y.spacing, x.first, y.first, options.land);
+  console.out << fmt::format(
+      "{}: {} x {} points, {:.6g} x {:.6g} m apart, from {:.10g}, {:.10g}; land at {:g}\n", options.out,
+      x.points, y.points, x.spacing, y.spacing, x.first, y.first, options.land);
   if (*missing > 0) {
     console.out << fmt::format("{} missing values written as {:g}\n", *missing,
                                options.missingAs.value_or(options.land));
@@ -186,17 +195,22 @@ void addConvertRaster(CLI::App& convert, Action& action) {
   CLI::App& command = addCommand(convert, action, "raster", "Makes a map (tsb2) from a raster of any kind",
                                  convertRaster, options);
   command.add_option("IN", options->in, "The raster; its first band is taken")->required();
-  command.add_option("OUT", options->out, "The map to write (*.tsb2), rows turned so that K runs north")->required();
+  command.add_option("OUT", options->out, "The map to write (*.tsb2), rows turned so that K runs north")
+      ->required();
   command.add_option("--land", options->land, "Points at or above this value are land")->required();
   command.add_option("--item-type", options->itemType, "Item code of the values")->capture_default_str();
-  command.add_option("--nodata-as", options->missingAs, "What stands for missing values (default: the land value)");
-  command.add_option("--crs", options->crs, "The projection, as EPSG:28356, UTM-32 or a full text, over the raster's own");
+  command.add_option("--nodata-as", options->missingAs,
+                     "What stands for missing values (default: the land value)");
+  command.add_option("--crs", options->crs,
+                     "The projection, as EPSG:28356, UTM-32 or a full text, over the raster's own");
   command.add_option("--origin-x", options->originX, "Easting of the first point written (m)");
   command.add_option("--origin-y", options->originY, "Northing of the first point written (m)");
   command.add_option("--coarsen", options->coarsen, "Take every N-th point")
       ->check(CLI::Range(1, 1000000))
       ->capture_default_str();
-  command.add_option("--window", options->window, "j0,k0,j1,k1: only these points, both ends counted, K from the south")
+  command
+      .add_option("--window", options->window,
+                  "j0,k0,j1,k1: only these points, both ends counted, K from the south")
       ->delimiter(',')
       ->expected(4);
 }

@@ -34,8 +34,8 @@ struct Table {
   std::vector<std::vector<double>> columns;
 };
 
-// Fields between commas, semicolons or tabs, or else between blanks (in a heading two at least, as its words have
-// single ones).
+// Fields between commas, semicolons or tabs, or else between blanks (in a heading two at least, as its words
+// have single ones).
 std::vector<std::string_view> fieldsOf(std::string_view line, std::size_t leastBlanks) {
   const char separator = line.find_first_of(",;\t") == line.npos ? ' ' : line[line.find_first_of(",;\t")];
   std::vector<std::string_view> fields;
@@ -83,12 +83,14 @@ Result<Table> readTable(const Options& options) {
     if (fields.size() < 2) return fail(number, "a time and at least one value are expected");
     if (table.columns.empty()) table.columns.resize(fields.size() - 1);
     if (fields.size() != table.columns.size() + 1) {
-      return fail(number, fmt::format("{} fields, where the lines before have {}", fields.size(), table.columns.size() + 1));
+      return fail(number, fmt::format("{} fields, where the lines before have {}", fields.size(),
+                                      table.columns.size() + 1));
     }
     for (std::size_t i = 0; i < fields.size(); ++i) {
       const std::optional<double> value = doubleOfText(fields[i]);
       if (!value) {
-        const char* hint = table.times.empty() ? " (are there heading lines? --skip-lines N passes over them)" : "";
+        const char* hint =
+            table.times.empty() ? " (are there heading lines? --skip-lines N passes over them)" : "";
         return fail(number, fmt::format("\"{}\" is no number{}", fields[i], hint));
       }
       (i == 0 ? table.times : table.columns[i - 1]).push_back(*value);
@@ -110,7 +112,8 @@ TsbTimeAxis timeAxisOf(const Table& table, const Options& options, const DateTim
   axis.count = table.times.size();
   axis.first = table.times.front();
   const auto intervals = static_cast<double>(axis.count - 1);
-  // The mean step may have picked up the last digit of a time; a step of few digits that fits as well is meant.
+  // The mean step may have picked up the last digit of a time; a step of few digits that fits as well is
+  // meant.
   axis.step = axis.count > 1 ? (table.times.back() - table.times.front()) / intervals : 1;
   const double plain = std::stod(fmt::format("{:.6g}", axis.step));
   if (std::abs(plain - axis.step) * intervals <= kEvenTolerance * axis.step) axis.step = plain;
@@ -127,7 +130,8 @@ int convertSeries(const Options& options, const Console& console) {
   const QunItem* quantity = qunFindItem(options.itemType);
   if (quantity == nullptr) return console.fail(fmt::format("There is no item type {}", options.itemType));
   const std::optional<DateTime> start = dateTimeOfText(options.start);
-  if (!start) return console.fail(fmt::format("\"{}\" is no moment of the form YYYY-MM-DD hh:mm:ss", options.start));
+  if (!start)
+    return console.fail(fmt::format("\"{}\" is no moment of the form YYYY-MM-DD hh:mm:ss", options.start));
   if (!qunAreEquivalent(options.timeUnit, "s")) {
     return console.fail(fmt::format("\"{}\" is no unit of time (s, min, h, d)", options.timeUnit));
   }
@@ -140,22 +144,25 @@ int convertSeries(const Options& options, const Console& console) {
   for (std::size_t i = 0; i < table->columns.size(); ++i) {
     std::string name = i < table->names.size() ? table->names[i] : std::string(quantity->name);
     if (table->names.empty() && table->columns.size() > 1) name += fmt::format(" {}", i + 1);
-    definition.items.push_back({std::move(name), quantity->code, std::string(qunBaseUnit(quantity->code)->text), true});
+    definition.items.push_back(
+        {std::move(name), quantity->code, std::string(qunBaseUnit(quantity->code)->text), true});
   }
   Result<TsbWriter> writer = TsbWriter::create(options.out, definition);
   if (!writer) return console.fail(writer.error());
   for (std::size_t i = 0; i < table->columns.size(); ++i) {
     for (std::size_t step = 0; step < table->times.size(); ++step) {
       const std::span<const double> value(&table->columns[i][step], 1);
-      if (const Outcome written = writer->write(i + 1, step, value); !written) return console.fail(written.error());
+      if (const Outcome written = writer->write(i + 1, step, value); !written)
+        return console.fail(written.error());
     }
   }
   if (const Outcome written = writer->commit(); !written) return console.fail(written.error());
   const bool even = definition.time.isEquidistant();
-  console.out << fmt::format("{}: {} of {} time steps{} from {}\n", options.out, definition.items.front().name,
-                             definition.time.count,
-                             even ? fmt::format(", {:g} {} apart,", definition.time.step, options.timeUnit) : "",
-                             dateTimeText(*start));
+  console.out << fmt::format(
+      "{}: {} of {} time steps{} from {}\n", options.out, definition.items.front().name,
+      definition.time.count,
+      even ? fmt::format(", {:g} {} apart,", definition.time.step, options.timeUnit) : "",
+      dateTimeText(*start));
   return kClean;
 }
 
@@ -165,7 +172,9 @@ void addConvertSeries(CLI::App& convert, Action& action) {
   std::shared_ptr<Options> options;
   CLI::App& command = addCommand(convert, action, "series", "Makes a time series (tsb0) from delimited text",
                                  convertSeries, options);
-  command.add_option("IN", options->in, "Lines of a time and values, between commas, semicolons, tabs or blanks")->required();
+  command
+      .add_option("IN", options->in, "Lines of a time and values, between commas, semicolons, tabs or blanks")
+      ->required();
   command.add_option("OUT", options->out, "The time series to write (*.tsb0)")->required();
   command.add_option("--item-type", options->itemType, "Item code of the values, in base units")->required();
   command.add_option("--start", options->start, "The moment of time 0, \"YYYY-MM-DD hh:mm:ss\"")->required();

@@ -39,7 +39,8 @@ class BlockedSignals {
 };
 
 // Starts the program in a process group of its own, with the signals as they were.
-int spawn(const std::string& program, const std::vector<std::string>& arguments, const sigset_t& mask, pid_t& child) {
+int spawn(const std::string& program, const std::vector<std::string>& arguments, const sigset_t& mask,
+          pid_t& child) {
   std::vector<std::string> words{program};
   words.insert(words.end(), arguments.begin(), arguments.end());
   std::vector<char*> argv;
@@ -47,7 +48,8 @@ int spawn(const std::string& program, const std::vector<std::string>& arguments,
   argv.push_back(nullptr);
   posix_spawnattr_t attributes;
   ::posix_spawnattr_init(&attributes);
-  ::posix_spawnattr_setflags(&attributes, POSIX_SPAWN_SETPGROUP | POSIX_SPAWN_SETSIGMASK | POSIX_SPAWN_SETSIGDEF);
+  ::posix_spawnattr_setflags(&attributes,
+                             POSIX_SPAWN_SETPGROUP | POSIX_SPAWN_SETSIGMASK | POSIX_SPAWN_SETSIGDEF);
   ::posix_spawnattr_setpgroup(&attributes, 0);
   ::posix_spawnattr_setsigmask(&attributes, &mask);
   sigset_t defaults;

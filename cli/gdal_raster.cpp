@@ -18,7 +18,8 @@ using Dataset = std::unique_ptr<void, CloseDataset>;
 
 class GdalRaster final : public Raster {
  public:
-  explicit GdalRaster(Dataset dataset) : dataset_(std::move(dataset)), band_(GDALGetRasterBand(dataset_.get(), 1)) {
+  explicit GdalRaster(Dataset dataset)
+      : dataset_(std::move(dataset)), band_(GDALGetRasterBand(dataset_.get(), 1)) {
     hasPlace_ = GDALGetGeoTransform(dataset_.get(), transform_) == CE_None;
     int given = 0;
     const double missing = GDALGetRasterNoDataValue(band_, &given);
@@ -48,14 +49,15 @@ class GdalRaster final : public Raster {
   bool read(int firstRow, std::span<float> values, std::string* error) override {
     const int count = static_cast<int>(values.size() / static_cast<std::size_t>(columns()));
     CPLErrorReset();
-    if (GDALRasterIO(band_, GF_Read, 0, firstRow, columns(), count, values.data(), columns(), count, GDT_Float32, 0,
-                     0) != CE_None) {
+    if (GDALRasterIO(band_, GF_Read, 0, firstRow, columns(), count, values.data(), columns(), count,
+                     GDT_Float32, 0, 0) != CE_None) {
       *error = CPLGetLastErrorMsg();
       return false;
     }
     if (scale_ == 1 && offset_ == 0) return true;
     for (float& value : values) {
-      if (!missing_ || value != static_cast<float>(*missing_)) value = static_cast<float>(value * scale_ + offset_);
+      if (!missing_ || value != static_cast<float>(*missing_))
+        value = static_cast<float>(value * scale_ + offset_);
     }
     return true;
   }
@@ -76,7 +78,8 @@ class GdalRaster final : public Raster {
 extern "C" gridbay::cli::Raster* gridbayOpenRaster(const char* path, std::string* error) {
   GDALAllRegister();
   CPLSetErrorHandler(CPLQuietErrorHandler);
-  gridbay::cli::Dataset dataset(GDALOpenEx(path, GDAL_OF_RASTER | GDAL_OF_READONLY, nullptr, nullptr, nullptr));
+  gridbay::cli::Dataset dataset(
+      GDALOpenEx(path, GDAL_OF_RASTER | GDAL_OF_READONLY, nullptr, nullptr, nullptr));
   if (!dataset || GDALGetRasterCount(dataset.get()) < 1) {
     *error = CPLGetLastErrorMsg();
     if (error->empty()) *error = "it has no raster band";

@@ -34,7 +34,8 @@ int get(const GetOptions& options, const Console& console) {
   ConsoleMessageHost host(console);
   Result<SetupFile> setup = SetupFile::open(options.file, &host);
   if (!setup) return console.fail(setup.error());
-  if (const Result<const Node*> found = findPath(setup->source(), options.path)) return show(**found, console);
+  if (const Result<const Node*> found = findPath(setup->source(), options.path))
+    return show(**found, console);
   const KvsHandle effective = setup->tree(options.file);
   const Result<const Node*> found = findPath(*effective, options.path);
   if (!found) return console.fail(found.error());
@@ -58,12 +59,14 @@ int set(const SetOptions& options, const Console& console) {
   SetupFile setup = std::move(*opened);
   for (const std::string& setting : options.settings) {
     const std::size_t equals = setting.find('=');
-    if (equals == setting.npos) return console.fail(fmt::format("\"{}\" is not of the form PATH=VALUE", setting));
+    if (equals == setting.npos)
+      return console.fail(fmt::format("\"{}\" is not of the form PATH=VALUE", setting));
     const std::string path = setting.substr(0, equals);
     const KvsHandle now = setup.tree(options.file);
     const Result<const Node*> keyword = findPath(*now, path);
     if (!keyword) return console.fail(keyword.error());
-    if ((*keyword)->isSection()) return console.fail(fmt::format("\"{}\" is a section; name a keyword in it", path));
+    if ((*keyword)->isSection())
+      return console.fail(fmt::format("\"{}\" is a section; name a keyword in it", path));
     ParameterTree keeper;
     const Result<std::vector<Value>> values = valuesOfText(**keyword, setting.substr(equals + 1), keeper);
     if (!values) return console.fail(values.error());
@@ -77,7 +80,8 @@ int set(const SetOptions& options, const Console& console) {
                                       there ? shownValues(**there) : std::string("unset")));
     }
     for (const std::string& section : setup.unknownSections(options.file)) {
-      console.note("Warning: this version does not know section " + section + ", which is left out of the saved file");
+      console.note("Warning: this version does not know section " + section +
+                   ", which is left out of the saved file");
     }
     setup = std::move(changed);
   }
@@ -99,7 +103,8 @@ void addSet(CLI::App& tool, Action& action) {
   command.add_option("FILE", options->file, "The setup")->required();
   command
       .add_option("PATH=VALUE", options->settings,
-                  "As NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.01; several numbers as 3,4; a file name relative "
+                  "As NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.01; several numbers as 3,4; a file "
+                  "name relative "
                   "to the setup's folder")
       ->required();
 }

@@ -76,7 +76,8 @@ Json describeDataFile(const TsbFile& file) {
                                {"unit", item.unit},
                                {"first_step", describeValues(file, i + 1)}});
   }
-  for (const TsbCustomBlock& block : definition.customBlocks) report["custom_blocks"][block.name] = block.values;
+  for (const TsbCustomBlock& block : definition.customBlocks)
+    report["custom_blocks"][block.name] = block.values;
   if (definition.geography) {
     const TsbGeography& place = *definition.geography;
     report["geography"] = {{"projection", CVdMapProjection(place.projection).Name()},
@@ -91,25 +92,30 @@ void printDataFile(const Json& report, const Console& console) {
   const auto line = [&console](std::string_view label, const std::string& text) {
     console.out << fmt::format("{:<12} {}\n", label, text);
   };
-  line("Data file", fmt::format("{} (data type {})", report["title"].get<std::string>(), report["data_type"].get<int>()));
+  line("Data file",
+       fmt::format("{} (data type {})", report["title"].get<std::string>(), report["data_type"].get<int>()));
   const Json& time = report["time"];
-  line("Time", fmt::format("{} step{}{}, {:g} to {:g} {}", time["steps"].get<std::size_t>(),
-                           time["steps"] == 1 ? "" : "s",
-                           time.contains("start") ? " from " + time["start"].get<std::string>() : "",
-                           time["first"].get<double>(), time["last"].get<double>(), time["unit"].get<std::string>()));
+  line("Time",
+       fmt::format("{} step{}{}, {:g} to {:g} {}", time["steps"].get<std::size_t>(),
+                   time["steps"] == 1 ? "" : "s",
+                   time.contains("start") ? " from " + time["start"].get<std::string>() : "",
+                   time["first"].get<double>(), time["last"].get<double>(), time["unit"].get<std::string>()));
   for (std::size_t i = 0; i < report["axes"].size(); ++i) {
     const Json& axis = report["axes"][i];
-    line(fmt::format("Axis {}", "XY"[i]), fmt::format("{} points, {:.6g} {} apart, from {:.10g}", axis["points"].get<std::size_t>(),
-                                                      axis["spacing"].get<double>(), axis["unit"].get<std::string>(),
-                                                      axis["first"].get<double>()));
+    line(fmt::format("Axis {}", "XY"[i]),
+         fmt::format("{} points, {:.6g} {} apart, from {:.10g}", axis["points"].get<std::size_t>(),
+                     axis["spacing"].get<double>(), axis["unit"].get<std::string>(),
+                     axis["first"].get<double>()));
   }
   for (const Json& item : report["items"]) {
     const Json& range = item["first_step"];
-    const std::string values =
-        range.is_null() ? "" : fmt::format(", {:g} to {:g}", range["least"].get<double>(), range["greatest"].get<double>());
+    const std::string values = range.is_null() ? ""
+                                               : fmt::format(", {:g} to {:g}", range["least"].get<double>(),
+                                                             range["greatest"].get<double>());
     line(fmt::format("Item {}", item["number"].get<int>()),
-         fmt::format("{}: {} (type {}) in {}{}", item["name"].get<std::string>(), item["quantity"].get<std::string>(),
-                     item["type"].get<int>(), item["unit"].get<std::string>(), values));
+         fmt::format("{}: {} (type {}) in {}{}", item["name"].get<std::string>(),
+                     item["quantity"].get<std::string>(), item["type"].get<int>(),
+                     item["unit"].get<std::string>(), values));
   }
   for (const auto& [name, values] : report["custom_blocks"].items()) {
     line("Block", fmt::format("{}: {}", name, fmt::join(values.get<std::vector<float>>(), ", ")));
@@ -179,16 +185,18 @@ void printSetup(const Json& report, const Console& console) {
   line("Period", fmt::format("{} to {}, {} steps of {:g} s", report["start"].get<std::string>(),
                              report["end"].get<std::string>(), report["steps"].get<std::int64_t>(),
                              report["time_step"].get<double>()));
-  line("Projection", report["projection"].get<std::string>().empty() ? "none" : report["projection"].get<std::string>());
+  line("Projection",
+       report["projection"].get<std::string>().empty() ? "none" : report["projection"].get<std::string>());
   for (const Json& area : report["areas"]) {
     std::string text = area["file"].get<std::string>();
     if (area.contains("origin")) {
-      text += fmt::format(", at ({},{}) of area {}", area["origin"][0].get<int>(), area["origin"][1].get<int>(),
-                          area["enclosing_area"].get<int>());
+      text += fmt::format(", at ({},{}) of area {}", area["origin"][0].get<int>(),
+                          area["origin"][1].get<int>(), area["enclosing_area"].get<int>());
     }
     if (area.contains("points")) {
-      text += fmt::format(", {} x {} points, {:.6g} x {:.6g} m apart, land at {:g} m", area["points"][0].get<int>(),
-                          area["points"][1].get<int>(), area["spacing"][0].get<double>(), area["spacing"][1].get<double>(),
+      text += fmt::format(", {} x {} points, {:.6g} x {:.6g} m apart, land at {:g} m",
+                          area["points"][0].get<int>(), area["points"][1].get<int>(),
+                          area["spacing"][0].get<double>(), area["spacing"][1].get<double>(),
                           area["land_value"].get<double>());
     } else {
       text += fmt::format(": {}", area["fault"].get<std::string>());
@@ -197,7 +205,8 @@ void printSetup(const Json& report, const Console& console) {
   }
   const Json& courant = report["greatest_courant_number"];
   if (courant["area"] != 0) {
-    line("Courant number", fmt::format("at most {:.6g}, in area {}", courant["value"].get<double>(), courant["area"].get<int>()));
+    line("Courant number", fmt::format("at most {:.6g}, in area {}", courant["value"].get<double>(),
+                                       courant["area"].get<int>()));
   }
   for (std::size_t i = 0; i < report["boundaries"].size(); ++i) {
     line(fmt::format("Boundary {}", i + 1), report["boundaries"][i].get<std::string>());
@@ -206,8 +215,9 @@ void printSetup(const Json& report, const Console& console) {
     line(fmt::format("Source {}", i + 1), report["sources"][i].get<std::string>());
   }
   if (report["polygons"] != 0) line("Polygons", std::to_string(report["polygons"].get<int>()));
-  line("Flood and dry", fmt::format("drying at {:g} m, flooding at {:g} m", report["drying_depth"].get<double>(),
-                                    report["flooding_depth"].get<double>()));
+  line("Flood and dry",
+       fmt::format("drying at {:g} m, flooding at {:g} m", report["drying_depth"].get<double>(),
+                   report["flooding_depth"].get<double>()));
 }
 
 int print(const Json& report, const Options& options, void (*readable)(const Json&, const Console&),
@@ -220,7 +230,9 @@ int print(const Json& report, const Options& options, void (*readable)(const Jso
   return kClean;
 }
 
-bool looksLikeDataFile(std::string_view text) { return text.starts_with("\x89HDF") || text.starts_with("CDF"); }
+bool looksLikeDataFile(std::string_view text) {
+  return text.starts_with("\x89HDF") || text.starts_with("CDF");
+}
 
 int info(const Options& options, const Console& console) {
   const Result<FileText> text = readFile(options.file);
@@ -241,7 +253,8 @@ int info(const Options& options, const Console& console) {
 
 void addInfo(CLI::App& tool, Action& action) {
   std::shared_ptr<Options> options;
-  CLI::App& command = addCommand(tool, action, "info", "Tells what a setup or a data file holds", info, options);
+  CLI::App& command =
+      addCommand(tool, action, "info", "Tells what a setup or a data file holds", info, options);
   command.add_option("FILE", options->file, "The setup or data file")->required();
   command.add_flag("--json", options->json, "The same as JSON");
 }

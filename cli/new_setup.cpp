@@ -69,7 +69,8 @@ int newSetup(const Options& options, const Console& console) {
   if (!areas) return console.fail(areas.error());
   const int most = theEdition.wetlandSweepKit ? 1 : CBathymetryKvs::kMostAreas;
   if (static_cast<int>(areas->size()) > most) {
-    return console.fail(fmt::format("The {} has at most {} area{}", theEdition.editorName.format, most, most == 1 ? "" : "s"));
+    return console.fail(fmt::format("The {} has at most {} area{}", theEdition.editorName.format, most,
+                                    most == 1 ? "" : "s"));
   }
   ConsoleMessageHost host(console);
   SetupFile setup(&host);
@@ -85,7 +86,8 @@ int newSetup(const Options& options, const Console& console) {
   }
   if (!options.start.empty()) {
     const std::optional<DateTime> start = dateTimeOfText(options.start);
-    if (!start) return console.fail(fmt::format("\"{}\" is no moment of the form YYYY-MM-DD hh:mm:ss", options.start));
+    if (!start)
+      return console.fail(fmt::format("\"{}\" is no moment of the form YYYY-MM-DD hh:mm:ss", options.start));
     model.simulationPeriod->start = *start;
   }
   if (options.step) model.simulationPeriod->timeStepInterval = static_cast<float>(*options.step);
@@ -107,13 +109,17 @@ int newSetup(const Options& options, const Console& console) {
 
 void addNew(CLI::App& tool, Action& action) {
   std::shared_ptr<Options> options;
-  CLI::App& command = addCommand(tool, action, "new", "Makes a setup with the defaults of a new one", newSetup, options);
+  CLI::App& command =
+      addCommand(tool, action, "new", "Makes a setup with the defaults of a new one", newSetup, options);
   command.add_option("FILE", options->file, "The setup to write")->required();
-  command.add_option("--area", options->areas, "Grid file of an area, outermost first; a nested one as FILE@J,K, the point of "
-                                               "the enclosing grid that holds its first point")
+  command
+      .add_option("--area", options->areas,
+                  "Grid file of an area, outermost first; a nested one as FILE@J,K, the point of "
+                  "the enclosing grid that holds its first point")
       ->each([options](const std::string&) { options->order.push_back(true); });
-  command.add_option("--enclosing", options->enclosing,
-                     "Number of the area that encloses the --area before it (default: the area before)")
+  command
+      .add_option("--enclosing", options->enclosing,
+                  "Number of the area that encloses the --area before it (default: the area before)")
       ->each([options](const std::string&) { options->order.push_back(false); });
   command.add_option("--start", options->start, "Start of the simulation, \"YYYY-MM-DD hh:mm:ss\"");
   command.add_option("--step", options->step, "Time step (s)");

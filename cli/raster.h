@@ -25,7 +25,8 @@ class Raster {
   // The projection's full text; empty when the file has none.
   virtual std::string projection() const = 0;
   virtual std::optional<double> missingValue() const = 0;
-  // Rows firstRow to firstRow + n - 1, n being what the span holds; false with the reason when they can't be read.
+  // Rows firstRow to firstRow + n - 1, n being what the span holds; false with the reason when they can't be
+  // read.
   virtual bool read(int firstRow, std::span<float> values, std::string* error) = 0;
 };
 

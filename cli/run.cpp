@@ -53,9 +53,10 @@ Result<std::string> findEngine(const Options& options) {
     if (const auto found = engineIn(path.substr(start, end - start))) return *found;
     start = end + 1;
   }
-  return Failure{fmt::format("There is no engine: {} or {} was looked for in {}, and on the PATH. Name one with --engine or "
-                             "in {}",
-                             kEngineNames[0], kEngineNames[1], programFolder().string(), kEngineVariable)};
+  return Failure{fmt::format(
+      "There is no engine: {} or {} was looked for in {}, and on the PATH. Name one with --engine or "
+      "in {}",
+      kEngineNames[0], kEngineNames[1], programFolder().string(), kEngineVariable)};
 }
 
 int run(const Options& options, const Console& console) {
@@ -73,11 +74,12 @@ int run(const Options& options, const Console& console) {
 
 void addRun(CLI::App& tool, Action& action) {
   std::shared_ptr<Options> options;
-  CLI::App& command =
-      addCommand(tool, action, "run", "Hands a setup to the engine; the exit status is the engine's", run, options);
+  CLI::App& command = addCommand(
+      tool, action, "run", "Hands a setup to the engine; the exit status is the engine's", run, options);
   command.add_option("FILE", options->file, "The setup, as it is saved")->required();
-  command.add_option("--engine", options->engine,
-                     "The engine (default: GRIDBAY_ENGINE, gridbay.exe or gridbay beside this program or on the PATH)");
+  command.add_option(
+      "--engine", options->engine,
+      "The engine (default: GRIDBAY_ENGINE, gridbay.exe or gridbay beside this program or on the PATH)");
 }
 
 }  // namespace gridbay::cli

@@ -16,7 +16,8 @@ namespace {
 
 std::string lowered(std::string_view text) {
   std::string small(text);
-  std::ranges::transform(small, small.begin(), [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
+  std::ranges::transform(small, small.begin(),
+                         [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
   return small;
 }
 
@@ -44,7 +45,8 @@ void listPaths(const Node& section, const std::string& prefix, std::vector<std::
 
 std::string_view withoutTarget(std::string_view path) {
   constexpr std::string_view kTarget = CGlobalKvs::kTarget;
-  if (path.size() > kTarget.size() && path[kTarget.size()] == '/' && sameName(path.substr(0, kTarget.size()), kTarget)) {
+  if (path.size() > kTarget.size() && path[kTarget.size()] == '/' &&
+      sameName(path.substr(0, kTarget.size()), kTarget)) {
     path.remove_prefix(kTarget.size() + 1);
   }
   return path;
@@ -67,11 +69,16 @@ void copySection(const Node& from, KvsFile& to, const Node* replaced, const std:
 
 std::string_view kindName(ValueKind kind) {
   switch (kind) {
-    case ValueKind::boolean: return "true or false";
-    case ValueKind::integer: return "a whole number";
-    case ValueKind::real: return "a number";
-    case ValueKind::string: return "a text";
-    default: return "a file name";
+    case ValueKind::boolean:
+      return "true or false";
+    case ValueKind::integer:
+      return "a whole number";
+    case ValueKind::real:
+      return "a number";
+    case ValueKind::string:
+      return "a text";
+    default:
+      return "a file name";
   }
 }
 
@@ -93,7 +100,8 @@ std::optional<std::string> valueOf(ValueKind kind, std::string_view text) {
       const std::optional<double> number = doubleOfText(text);
       return number ? std::optional(numberText(*number)) : std::nullopt;
     }
-    default: return std::string(text);
+    default:
+      return std::string(text);
   }
 }
 
@@ -163,7 +171,9 @@ Result<std::vector<Value>> valuesOfText(const Node& keyword, std::string_view te
   std::vector<Value> values;
   for (std::size_t i = 0; i < now.size(); ++i) {
     const std::optional<std::string> value = valueOf(now[i].kind(), pieces[i]);
-    if (!value) return Failure{fmt::format("{} takes {}, not \"{}\"", keyword.name(), kindName(now[i].kind()), pieces[i])};
+    if (!value)
+      return Failure{
+          fmt::format("{} takes {}, not \"{}\"", keyword.name(), kindName(now[i].kind()), pieces[i])};
     values.emplace_back(now[i].kind(), keeper.keep(*value));
   }
   return values;
@@ -178,7 +188,8 @@ KvsHandle withValues(const KvsFile& file, const Node* keyword, const std::vector
 
 std::string shownValues(const Node& keyword) {
   const std::span<const Value> values = keyword.values();
-  if (values.size() == 1 && values.front().kind() != ValueKind::boolean) return std::string(values.front().text());
+  if (values.size() == 1 && values.front().kind() != ValueKind::boolean)
+    return std::string(values.front().text());
   std::string text;
   for (const Value& value : values) text += (text.empty() ? "" : " ") + valueText(value);
   return text;

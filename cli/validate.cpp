@@ -42,8 +42,8 @@ int validate(const Options& options, const Console& console) {
 
 void addValidate(CLI::App& tool, Action& action) {
   std::shared_ptr<Options> options;
-  CLI::App& command =
-      addCommand(tool, action, "validate", "Checks a setup and the data files that it names", validate, options);
+  CLI::App& command = addCommand(tool, action, "validate", "Checks a setup and the data files that it names",
+                                 validate, options);
   command.add_option("FILE", options->file, "The setup")->required();
   command.add_flag("--json", options->json, "The messages as JSON");
 }

@@ -17,7 +17,8 @@ class CVdArray2D {
   CVdArray2D(int noJ, int noK)
       : endJ_(noJ),
         endK_(noK),
-        values_(std::make_unique_for_overwrite<T[]>(static_cast<std::size_t>(noJ) * static_cast<std::size_t>(noK))) {}
+        values_(std::make_unique_for_overwrite<T[]>(static_cast<std::size_t>(noJ) *
+                                                    static_cast<std::size_t>(noK))) {}
   CVdArray2D(const CVdArray2D& other) : CVdArray2D(other.endJ_, other.endK_) {
     std::ranges::copy(other.values(), values_.get());
   }
@@ -43,7 +44,9 @@ class CVdArray2D {
     return contains(j, k) ? row(k)[static_cast<std::size_t>(j)] : values_[0];
   }
   // K must be in range.
-  std::span<const T> row(int k) const { return {values_.get() + static_cast<std::size_t>(k) * length(), length()}; }
+  std::span<const T> row(int k) const {
+    return {values_.get() + static_cast<std::size_t>(k) * length(), length()};
+  }
 
   std::span<T> values() { return {values_.get(), length() * static_cast<std::size_t>(endK_)}; }
   std::span<const T> values() const { return {values_.get(), length() * static_cast<std::size_t>(endK_)}; }

@@ -19,12 +19,14 @@ constexpr int kLastYear = 9999;
 
 }  // namespace
 
-DateTime DateTime::of(const std::array<std::int32_t, 6>& parts) {
+DateTime DateTime::of(std::array<std::int32_t, 6> parts) {
   const auto [year, month, day, hour, minute, second] = parts;
-  if (year < kFirstYear || year > kLastYear || month < 1 || month > 12 || day < 1 || day > 31) return invalid();
+  if (year < kFirstYear || year > kLastYear || month < 1 || month > 12 || day < 1 || day > 31)
+    return invalid();
   const year_month_day date{std::chrono::year{year}, std::chrono::month{static_cast<unsigned>(month)},
                             std::chrono::day{static_cast<unsigned>(day)}};
-  if (!date.ok() || hour < 0 || hour > 23 || minute < 0 || minute > 59 || second < 0 || second > 59) return invalid();
+  if (!date.ok() || hour < 0 || hour > 23 || minute < 0 || minute > 59 || second < 0 || second > 59)
+    return invalid();
   const auto days = static_cast<double>((sys_days{date} - kDayZero).count());
   return fromLinear(days + (hour * 3600 + minute * 60 + second) / kSecondsOfDay);
 }
@@ -49,9 +51,11 @@ std::optional<std::array<std::int32_t, 6>> DateTime::parts() const {
   const year_month_day date{kDayZero + std::chrono::days{days}};
   const int year = static_cast<int>(date.year());
   if (year < kFirstYear || year > kLastYear) return std::nullopt;
-  return std::array<std::int32_t, 6>{year,        static_cast<std::int32_t>(static_cast<unsigned>(date.month())),
+  return std::array<std::int32_t, 6>{year,
+                                     static_cast<std::int32_t>(static_cast<unsigned>(date.month())),
                                      static_cast<std::int32_t>(static_cast<unsigned>(date.day())),
-                                     left / 3600, left / 60 % 60,
+                                     left / 3600,
+                                     left / 60 % 60,
                                      left % 60};
 }
 

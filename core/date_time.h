@@ -16,7 +16,7 @@ struct DateTime {
   std::int32_t status = 0;
 
   // Year, month, day, hour, minute, second; status 1 when there is no such moment from year 100 to 9999.
-  static DateTime of(const std::array<std::int32_t, 6>& parts);
+  static DateTime of(std::array<std::int32_t, 6> parts);
   static DateTime invalid() { return {0, 1}; }
   static DateTime fromLinear(double days);
 

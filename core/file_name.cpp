@@ -6,7 +6,9 @@
 
 namespace gridbay {
 
-std::string FileNameValue::absolute() const { return absolutePath(name_, folder_); }
+std::string FileNameValue::absolute() const {
+  return absolutePath(name_, folder_);
+}
 
 std::string FileNameValue::onFile(const std::string& documentPath) const {
   const std::string folder = folderOfFile(documentPath);

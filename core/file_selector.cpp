@@ -33,19 +33,27 @@ std::string typeLabels(const std::vector<int>& codes) {
 
 std::string_view timeAxisLabel(int type) {
   switch (static_cast<TsbTimeAxisType>(type)) {
-    case TsbTimeAxisType::relativeEquidistant: return "a relative equidistant axis";
-    case TsbTimeAxisType::relative: return "a relative axis";
-    case TsbTimeAxisType::calendarEquidistant: return "an equidistant calendar axis";
-    case TsbTimeAxisType::calendar: return "a calendar axis";
+    case TsbTimeAxisType::relativeEquidistant:
+      return "a relative equidistant axis";
+    case TsbTimeAxisType::relative:
+      return "a relative axis";
+    case TsbTimeAxisType::calendarEquidistant:
+      return "an equidistant calendar axis";
+    case TsbTimeAxisType::calendar:
+      return "a calendar axis";
   }
   return "another axis";
 }
 
-bool sameSpacing(double a, double b) { return std::abs(a - b) <= kSpacingTolerance * std::abs(b); }
+bool sameSpacing(double a, double b) {
+  return std::abs(a - b) <= kSpacingTolerance * std::abs(b);
+}
 
 }  // namespace
 
-void CVdRqTsbItem::SetQunType(int code, int) { types_ = {code}; }
+void CVdRqTsbItem::SetQunType(int code, int) {
+  types_ = {code};
+}
 
 std::string CVdRqTsbItem::fault(const TsbHeader& header, int number) const {
   const TsbItem* found = tsbItemD(header, number);
@@ -70,7 +78,8 @@ std::string CVdRqTsbItem::fault(const TsbHeader& header, int number) const {
     const bool there = axis >= 1 && axis <= static_cast<int>(axes.size());
     const double has = there ? axes[static_cast<std::size_t>(axis) - 1].spacing : 0;
     if (!there || !sameSpacing(has, interval)) {
-      return fmt::format("{} has a spacing of {:g} along axis {}; {:g} is expected", label, has, axis, interval);
+      return fmt::format("{} has a spacing of {:g} along axis {}; {:g} is expected", label, has, axis,
+                         interval);
     }
   }
   return {};
@@ -98,7 +107,9 @@ bool CVdRqTsbItem::IsTsbFileValid(const TsbHeader& header, CValidationMessageBuf
   return false;
 }
 
-CVdRqTsbItem& CVdFileSelectorDlg::AddRequest() { return AddRequest(std::make_unique<CVdRqTsbItem>()); }
+CVdRqTsbItem& CVdFileSelectorDlg::AddRequest() {
+  return AddRequest(std::make_unique<CVdRqTsbItem>());
+}
 
 CVdRqTsbItem& CVdFileSelectorDlg::AddRequest(std::unique_ptr<CVdRqTsbItem> request) {
   request->place_ = requests_.size();
@@ -106,14 +117,18 @@ CVdRqTsbItem& CVdFileSelectorDlg::AddRequest(std::unique_ptr<CVdRqTsbItem> reque
   return *requests_.back();
 }
 
-void CVdFileSelectorDlg::AddRequestItemType(int code) { AddRequest().SetQunType(code, 0); }
+void CVdFileSelectorDlg::AddRequestItemType(int code) {
+  AddRequest().SetQunType(code, 0);
+}
 
 void CVdFileSelectorDlg::SetRequestPeriod(const DateTime& start, const DateTime& end) {
   periodStart_ = start;
   periodEnd_ = end;
 }
 
-int CVdFileSelectorDlg::DoModal() { return chooser_ != nullptr && chooser_->choose(*this) ? 1 : 0; }
+int CVdFileSelectorDlg::DoModal() {
+  return chooser_ != nullptr && chooser_->choose(*this) ? 1 : 0;
+}
 
 std::string CVdFileSelectorDlg::GetNameOfItem(int n) const {
   TsbHeader header;
@@ -157,7 +172,8 @@ std::string CVdFileSelectorDlg::itemsFault(const TsbHeader& header, std::span<co
                                            bool chosen) const {
   const char* who = chosen ? "The selection" : "The file";
   const auto count = static_cast<int>(items.size());
-  if (noItems_ && count != *noItems_) return fmt::format("{} has {} items; {} are expected", who, count, *noItems_);
+  if (noItems_ && count != *noItems_)
+    return fmt::format("{} has {} items; {} are expected", who, count, *noItems_);
   if (minNoItems_ && count < *minNoItems_) {
     return fmt::format("{} has {} items; at least {} are expected", who, count, *minNoItems_);
   }
@@ -180,7 +196,8 @@ std::string CVdFileSelectorDlg::itemsFault(const TsbHeader& header, std::span<co
 std::string CVdFileSelectorDlg::timeFault(const TsbTimeAxis& time) const {
   const int type = static_cast<int>(time.type);
   if (timeAxisType_ && type != *timeAxisType_) {
-    return fmt::format("The time axis is {}; {} is expected", timeAxisLabel(type), timeAxisLabel(*timeAxisType_));
+    return fmt::format("The time axis is {}; {} is expected", timeAxisLabel(type),
+                       timeAxisLabel(*timeAxisType_));
   }
   if (timeAxisUnit_) {
     const QunUnit* expected = qunFindUnit(*timeAxisUnit_);
@@ -205,21 +222,23 @@ std::string CVdFileSelectorDlg::periodFault(const TsbTimeAxis& time) const {
   if (!origin.valid()) return "The time axis has no valid start date";
   const DateTime start = origin.plusDays(toDays.Convert(time.at(0)));
   const DateTime end = origin.plusDays(toDays.Convert(time.at(time.count - 1)));
-  if (start.linear() <= periodStart_->linear() + kHalfSecond && end.linear() >= periodEnd_->linear() - kHalfSecond) {
+  if (start.linear() <= periodStart_->linear() + kHalfSecond &&
+      end.linear() >= periodEnd_->linear() - kHalfSecond) {
     return {};
   }
-  return fmt::format("The file covers {} to {}; the simulation needs {} to {}", dateTimeText(start), dateTimeText(end),
-                     dateTimeText(*periodStart_), dateTimeText(*periodEnd_));
+  return fmt::format("The file covers {} to {}; the simulation needs {} to {}", dateTimeText(start),
+                     dateTimeText(end), dateTimeText(*periodStart_), dateTimeText(*periodEnd_));
 }
 
-std::string CVdFileSelectorDlg::complianceFault(const TsbHeader& header, std::span<const std::uint32_t> items) const {
+std::string CVdFileSelectorDlg::complianceFault(const TsbHeader& header,
+                                                std::span<const std::uint32_t> items) const {
   if (!compliant_) return {};
   const TsbDefinition& definition = header.file->definition();
   for (std::size_t axis = 0; axis < definition.axes.size(); ++axis) {
     const std::string_view metre = qunFindUnit(unit::kMetre)->text;
     if (definition.axes[axis].unit != metre) {
-      return fmt::format("The unit of axis {} is \"{}\"; \"{}\" is expected", axis + 1, definition.axes[axis].unit,
-                         metre);
+      return fmt::format("The unit of axis {} is \"{}\"; \"{}\" is expected", axis + 1,
+                         definition.axes[axis].unit, metre);
     }
   }
   for (const std::uint32_t number : items) {
@@ -227,8 +246,8 @@ std::string CVdFileSelectorDlg::complianceFault(const TsbHeader& header, std::sp
     if (found == nullptr) return fmt::format("The file has no item {}", number);
     const QunUnit* base = qunBaseUnit(found->type);
     if (base != nullptr && found->unit != base->text) {
-      return fmt::format("{} is in \"{}\"; \"{}\" is expected", itemLabel(header, static_cast<int>(number)), found->unit,
-                         base->text);
+      return fmt::format("{} is in \"{}\"; \"{}\" is expected", itemLabel(header, static_cast<int>(number)),
+                         found->unit, base->text);
     }
   }
   return {};

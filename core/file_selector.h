@@ -37,8 +37,8 @@ class CVdRqTsbItem {
   // The name of the index-th item of the file (from 1) that meets the request; false when there are fewer.
   bool GetNameOfValidItem(const TsbHeader& header, int index, std::string* out) const;
 
-  // Whether the item chosen for this request meets it. `items` is the whole selection. What it lacks is told in
-  // the buffer.
+  // Whether the item chosen for this request meets it. `items` is the whole selection. What it lacks is told
+  // in the buffer.
   virtual bool IsTsbFileValid(const TsbHeader& header, CValidationMessageBuffer& buffer,
                               std::span<const std::uint32_t> items) const;
 
@@ -65,11 +65,12 @@ class FileChooser {
   virtual bool choose(CVdFileSelectorDlg& selector) = 0;
 };
 
-// A request for a data file, stated once by the object concerned and used for two jobs: to let the user pick a
-// file and its items, and to ask whether a given file meets it.
+// A request for a data file, stated once by the object concerned and used for two jobs: to let the user pick
+// a file and its items, and to ask whether a given file meets it.
 class CVdFileSelectorDlg {
  public:
-  explicit CVdFileSelectorDlg(std::string_view kind = {}, std::string_view fileName = {}, std::string_view filter = {})
+  explicit CVdFileSelectorDlg(std::string_view kind = {}, std::string_view fileName = {},
+                              std::string_view filter = {})
       : kind_(kind), fileName_(fileName), filter_(filter) {}
   CVdFileSelectorDlg(std::string_view kind, std::string_view fileName, std::string_view filter,
                      std::vector<std::uint32_t> selectedItems, int)
@@ -115,7 +116,8 @@ class CVdFileSelectorDlg {
   // Whether a file, or the items chosen in it, meets all requests; if not the text says which one, what was
   // expected and what the file has.
   bool IsTsbFileValid(const std::string& file, std::string* errorText) const;
-  bool IsTsbFileValid(const std::string& file, std::span<const std::uint32_t> items, std::string* errorText) const;
+  bool IsTsbFileValid(const std::string& file, std::span<const std::uint32_t> items,
+                      std::string* errorText) const;
 
  private:
   std::string faultOf(const TsbHeader& header, std::span<const std::uint32_t> items, bool chosen) const;

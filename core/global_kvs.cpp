@@ -86,7 +86,8 @@ constexpr Row kSkeleton[] = {
     sectionOnly("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/DREDGING", module::kMudTransportExpanded),
     sectionOnly("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters/FALL_VELOCITY_PARAMETERS",
                 module::kMudTransportExpanded),
-    sectionOnly("MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/EROSION_COEFFICIENTS", module::kMudTransportExpanded),
+    sectionOnly("MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/EROSION_COEFFICIENTS",
+                module::kMudTransportExpanded),
     sectionOnly("MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/SLIDING", module::kMudTransportExpanded),
     // Saved in here, but looked for at the top of the source: so its options come through only from there.
     options("MUD_TRANSPORT_EXPANDED_MODULE/XENOBIOTIC_MODULE", module::kMudTransportExpanded),
@@ -149,7 +150,8 @@ void passOptionsThrough(std::string_view place, KvsSection sourceTarget, KvsFile
   kvsAddSection(file, kOptionParameters);
   const KvsSection section =
       sourceTarget == nullptr ? nullptr : kvsSectionByNameNum(sourceTarget, partsOf(place).back(), 1);
-  const KvsSection optionSection = section == nullptr ? nullptr : kvsSectionByNameNum(section, kOptionParameters, 1);
+  const KvsSection optionSection =
+      section == nullptr ? nullptr : kvsSectionByNameNum(section, kOptionParameters, 1);
   if (optionSection != nullptr) CKvsBase::CopySection(optionSection, file);
   kvsEndSection(file);
 }
@@ -174,17 +176,25 @@ unsigned CGlobalKvs::Validate(ValidationList& messages, int deep) {
 }
 
 void CGlobalKvs::Save(KvsFile& file, const std::string& documentPath) {
-  const KvsSection sourceTarget = sourceFile_ == nullptr ? nullptr : kvsTargetByNameNum(*sourceFile_, kTarget, 1);
+  const KvsSection sourceTarget =
+      sourceFile_ == nullptr ? nullptr : kvsTargetByNameNum(*sourceFile_, kTarget, 1);
   kvsAddTarget(file, kTarget);
   PlaceCursor cursor(file);
   for (const Row& row : kSkeleton) {
     if (row.module != kAnyModule && row.module != moduleSelection->simulationType) continue;
     cursor.moveTo(row.place);
     switch (row.what) {
-      case Row::What::child: row.object(*this).Save(file, documentPath); break;
-      case Row::What::options: passOptionsThrough(row.place, sourceTarget, file); break;
-      case Row::What::zeroKeyword: kvsPutParam(file, row.keyword, 0); break;
-      case Row::What::sectionOnly: break;
+      case Row::What::child:
+        row.object(*this).Save(file, documentPath);
+        break;
+      case Row::What::options:
+        passOptionsThrough(row.place, sourceTarget, file);
+        break;
+      case Row::What::zeroKeyword:
+        kvsPutParam(file, row.keyword, 0);
+        break;
+      case Row::What::sectionOnly:
+        break;
     }
   }
   cursor.closeTo(0);

@@ -17,14 +17,14 @@ class CMassBudgetKvs;
 class CAreaDescriptionKvs;
 
 // The root of a model: owns one object for each page-sized part of the setup, and knows the skeleton of the
-// parameter file. A part reaches any other one through a member of the root. To add a part, declare its member
-// here and give it a row in each of the two tables of the source file.
+// parameter file. A part reaches any other one through a member of the root. To add a part, declare its
+// member here and give it a row in each of the two tables of the source file.
 class CGlobalKvs final : public CKvsBase {
  public:
   static constexpr std::string_view kTarget = "VANE27_NESTED_MODEL";
 
-  // A whole default model. The host shows what a load has to say; without one those texts are dropped. It must
-  // outlive the root.
+  // A whole default model. The host shows what a load has to say; without one those texts are dropped. It
+  // must outlive the root.
   explicit CGlobalKvs(MessageHost* host = nullptr);
   ~CGlobalKvs() override;
 

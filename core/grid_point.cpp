@@ -39,7 +39,9 @@ class Scanner {
 
 }  // namespace
 
-std::string pointText(GridPoint point) { return fmt::format("({},{})", point.j, point.k); }
+std::string pointText(GridPoint point) {
+  return fmt::format("({},{})", point.j, point.k);
+}
 
 std::optional<GridPoint> pointOfText(std::string_view text) {
   Scanner scanner(text);

@@ -15,7 +15,8 @@ bool isPlainBlock(const char* at, std::size_t size) {
   unsigned odd = 0;
   for (std::size_t i = 0; i < size; ++i) {
     const auto byte = static_cast<unsigned char>(at[i]);
-    odd |= static_cast<unsigned>((byte < 0x20) & ((byte < '\t') | (byte > '\r'))) | static_cast<unsigned>(byte >= 0x7F);
+    odd |= static_cast<unsigned>((byte < 0x20) & ((byte < '\t') | (byte > '\r'))) |
+           static_cast<unsigned>(byte >= 0x7F);
   }
   return odd == 0;
 }
@@ -30,7 +31,9 @@ constexpr std::array<bool, 256> wordBytes() {
 }
 constexpr std::array<bool, 256> kWordBytes = wordBytes();
 
-bool isDigit(char c) { return c >= '0' && c <= '9'; }
+bool isDigit(char c) {
+  return c >= '0' && c <= '9';
+}
 
 }  // namespace
 
@@ -78,8 +81,8 @@ bool isDisallowed(char32_t code) {
 }
 
 bool isUnicodeSpace(char32_t code) {
-  return code == 0x09 || code == 0x20 || code == 0xA0 || code == 0x1680 || (code >= 0x2000 && code <= 0x200A) ||
-         code == 0x202F || code == 0x205F || code == 0x3000;
+  return code == 0x09 || code == 0x20 || code == 0xA0 || code == 0x1680 ||
+         (code >= 0x2000 && code <= 0x200A) || code == 0x202F || code == 0x205F || code == 0x3000;
 }
 
 bool isNewline(char32_t code) {
@@ -108,7 +111,9 @@ std::size_t firstBadByte(std::string_view text) {
   return std::string_view::npos;
 }
 
-bool isWordByte(unsigned char byte) { return kWordBytes[byte]; }
+bool isWordByte(unsigned char byte) {
+  return kWordBytes[byte];
+}
 
 bool isKeywordWithoutHash(std::string_view word) {
   constexpr std::array<std::string_view, 6> kWords{"true", "false", "null", "inf", "-inf", "nan"};
@@ -123,8 +128,9 @@ bool isBareWord(std::string_view text) {
   if (!rest.empty() && isDigit(rest.front())) return false;
   for (std::size_t at = 0; at < text.size();) {
     const Character c = decode(text.substr(at));
-    if (c.code < 0x80 ? !isWordByte(static_cast<unsigned char>(c.code))
-                      : c.code == kNoCharacter || isUnicodeSpace(c.code) || isNewline(c.code) || isDisallowed(c.code)) {
+    if (c.code < 0x80
+            ? !isWordByte(static_cast<unsigned char>(c.code))
+            : c.code == kNoCharacter || isUnicodeSpace(c.code) || isNewline(c.code) || isDisallowed(c.code)) {
       return false;
     }
     at += c.length;

@@ -19,8 +19,12 @@ struct Fault {
   std::string found;
 };
 
-bool isDigit(char c) { return c >= '0' && c <= '9'; }
-bool isDigitOr_(char c) { return isDigit(c) || c == '_'; }
+bool isDigit(char c) {
+  return c >= '0' && c <= '9';
+}
+bool isDigitOr_(char c) {
+  return isDigit(c) || c == '_';
+}
 
 int digitValue(char c) {
   if (isDigit(c)) return c - '0';
@@ -30,7 +34,8 @@ int digitValue(char c) {
 
 class Reader {
  public:
-  Reader(ParameterTree& tree, std::string_view text) : tree_(tree), at_(text.data()), end_(at_ + text.size()) {}
+  Reader(ParameterTree& tree, std::string_view text)
+      : tree_(tree), at_(text.data()), end_(at_ + text.size()) {}
 
   void read() {
     open_.push_back({.section = &tree_.root()});
@@ -59,9 +64,9 @@ class Reader {
   // A node while it is being read.
   struct NodeState {
     std::string_view name;
-    bool keep = true;         // false where a slashdash comments it out
-    bool hasBlock = false;    // a block that counts
-    bool hasAnyBlock = false; // after any block no values may come
+    bool keep = true;          // false where a slashdash comments it out
+    bool hasBlock = false;     // a block that counts
+    bool hasAnyBlock = false;  // after any block no values may come
   };
   // A block while it is being read.
   struct Block {
@@ -169,7 +174,8 @@ class Reader {
     const char* start = at_;
     if (*at_ == '(') {
       readAnnotation();
-      if (node.keep) failAt(start, "a section or keyword", "a type annotation, which a name here cannot have");
+      if (node.keep)
+        failAt(start, "a section or keyword", "a type annotation, which a name here cannot have");
     }
     if (isDigit(*at_)) fail("a name; a name that begins with a digit stands in quotes");
     node.name = readString("a section or keyword");
@@ -181,7 +187,8 @@ class Reader {
   void readRest(NodeState& node) {
     for (;;) {
       const bool spaced = skipNodeSpace();
-      if (at_ == end_ || *at_ == '}' || newlineLength() > 0 || (*at_ == '/' && at_[1] == '/')) return finish(node);
+      if (at_ == end_ || *at_ == '}' || newlineLength() > 0 || (*at_ == '/' && at_[1] == '/'))
+        return finish(node);
       if (*at_ == ';') {
         ++at_;
         return finish(node);
@@ -198,10 +205,12 @@ class Reader {
     if (node.hasBlock && !dropped) fail("the end of the line: a section has one block");
     const bool keep = node.keep && !dropped;
     if (keep && !values_.empty()) {
-      fail("the end of the line: \"" + std::string(node.name) + "\" has values, and so it cannot have a block");
+      fail("the end of the line: \"" + std::string(node.name) +
+           "\" has values, and so it cannot have a block");
     }
     if (open_.size() > kDeepestBlock) {
-      failAt(at_, "no more than " + std::to_string(kDeepestBlock) + " blocks inside each other", "another block");
+      failAt(at_, "no more than " + std::to_string(kDeepestBlock) + " blocks inside each other",
+             "another block");
     }
     ++at_;
     node.hasBlock = node.hasBlock || !dropped;
@@ -453,7 +462,8 @@ class Reader {
         out.push_back(kMeanings[k]);
         continue;
       }
-      const std::size_t close = letter == 'u' && text.substr(i + 1).starts_with('{') ? text.find('}', i) : text.npos;
+      const std::size_t close =
+          letter == 'u' && text.substr(i + 1).starts_with('{') ? text.find('}', i) : text.npos;
       if (close == text.npos) {
         failAt(place, R"(\n, \r, \t, \b, \f, \s, \", \\ or \u{...})", "an unknown escape in this text");
       }
@@ -589,8 +599,8 @@ SyntaxError errorAt(std::string_view text, std::size_t offset, std::string expec
 }  // namespace
 
 std::string SyntaxError::text() const {
-  return "line " + std::to_string(line) + ", column " + std::to_string(column) + ": found " + found + ", expected " +
-         expected;
+  return "line " + std::to_string(line) + ", column " + std::to_string(column) + ": found " + found +
+         ", expected " + expected;
 }
 
 ReadText readKdl(FileText file) {

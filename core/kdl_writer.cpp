@@ -24,13 +24,27 @@ bool appendQuoted(std::string& out, std::string_view text) {
     const kdl::Character c = kdl::decode(text.substr(i));
     if (c.code == kdl::kNoCharacter) return false;
     switch (c.code) {
-      case U'"': out += "\\\""; break;
-      case U'\\': out += "\\\\"; break;
-      case U'\b': out += "\\b"; break;
-      case U'\f': out += "\\f"; break;
-      case U'\n': out += "\\n"; break;
-      case U'\r': out += "\\r"; break;
-      case U'\t': out += "\\t"; break;
+      case U'"':
+        out += "\\\"";
+        break;
+      case U'\\':
+        out += "\\\\";
+        break;
+      case U'\b':
+        out += "\\b";
+        break;
+      case U'\f':
+        out += "\\f";
+        break;
+      case U'\n':
+        out += "\\n";
+        break;
+      case U'\r':
+        out += "\\r";
+        break;
+      case U'\t':
+        out += "\\t";
+        break;
       default:
         if (kdl::isDisallowed(c.code) || kdl::isNewline(c.code)) {
           out += fmt::format("\\u{{{:x}}}", static_cast<std::uint32_t>(c.code));
@@ -53,15 +67,24 @@ bool appendName(std::string& out, std::string_view name) {
 bool appendValue(std::string& out, const Value& value) {
   const std::string_view text = value.text();
   switch (value.kind()) {
-    case ValueKind::boolean: out.append("#").append(text); return true;
-    case ValueKind::integer: out.append(text); return true;
+    case ValueKind::boolean:
+      out.append("#").append(text);
+      return true;
+    case ValueKind::integer:
+      out.append(text);
+      return true;
     case ValueKind::real:
       if (text == "inf" || text == "-inf" || text == "nan") out.push_back('#');
       out.append(text);
       return true;
-    case ValueKind::string: return appendQuoted(out, text);
-    case ValueKind::fileName: out.append("(file)"); return appendQuoted(out, text);
-    case ValueKind::resultFileName: out.append("(result)"); return appendQuoted(out, text);
+    case ValueKind::string:
+      return appendQuoted(out, text);
+    case ValueKind::fileName:
+      out.append("(file)");
+      return appendQuoted(out, text);
+    case ValueKind::resultFileName:
+      out.append("(result)");
+      return appendQuoted(out, text);
   }
   return false;
 }

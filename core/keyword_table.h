@@ -34,10 +34,12 @@ inline void putValue(KvsFile& file, std::string_view name, const GridPoint& valu
   kvsPutListParam(file, name, "ii", value.j, value.k);
 }
 inline void putValue(KvsFile& file, std::string_view name, const DateTime& value, const std::string&) {
-  const auto [year, month, day, hour, minute, second] = value.parts().value_or(std::array{-1, -1, -1, -1, -1, -1});
+  const auto [year, month, day, hour, minute, second] =
+      value.parts().value_or(std::array{-1, -1, -1, -1, -1, -1});
   kvsPutListParam(file, name, "iiiiii", year, month, day, hour, minute, second);
 }
-inline void putValue(KvsFile& file, std::string_view name, const UFileName& value, const std::string& documentPath) {
+inline void putValue(KvsFile& file, std::string_view name, const UFileName& value,
+                     const std::string& documentPath) {
   value.Save(file, documentPath, name);
 }
 
@@ -53,7 +55,8 @@ inline void getValue(KvsSection from, std::string_view name, DateTime& value, co
   kvsGetListParam(from, name, 1, "iiiiii", &parts[0], &parts[1], &parts[2], &parts[3], &parts[4], &parts[5]);
   value = DateTime::of(parts);
 }
-inline void getValue(KvsSection from, std::string_view name, UFileName& value, const std::string& documentPath) {
+inline void getValue(KvsSection from, std::string_view name, UFileName& value,
+                     const std::string& documentPath) {
   value.Load(from, documentPath, name);
 }
 

@@ -41,7 +41,9 @@ Outcome writeFile(const Node& root, const std::string& path) {
   return save->commit();
 }
 
-bool isNumber(ValueKind kind) { return kind == ValueKind::integer || kind == ValueKind::real; }
+bool isNumber(ValueKind kind) {
+  return kind == ValueKind::integer || kind == ValueKind::real;
+}
 
 std::optional<std::int32_t> valueOf(const Value& value, std::int32_t) {
   return isNumber(value.kind()) ? int32OfText(value.text()) : std::nullopt;
@@ -120,9 +122,13 @@ void KvsFile::startKeyword(std::string_view name) {
   inKeyword_ = true;
 }
 
-void KvsFile::add(ValueKind kind, std::string_view text) { values_.emplace_back(kind, tree_->keep(text)); }
+void KvsFile::add(ValueKind kind, std::string_view text) {
+  values_.emplace_back(kind, tree_->keep(text));
+}
 
-KvsHandle kvsCreate() { return std::make_unique<KvsFile>(); }
+KvsHandle kvsCreate() {
+  return std::make_unique<KvsFile>();
+}
 
 KvsHandle kvsLoadFile(const std::string& path, int) {
   pendingError() = {};
@@ -149,9 +155,13 @@ bool kvsWrite(KvsFile& file, const std::string& path) {
   return true;
 }
 
-void kvsClose(KvsHandle* file) { file->reset(); }
+void kvsClose(KvsHandle* file) {
+  file->reset();
+}
 
-int kvsPeekErrorGlb() { return pendingError().code; }
+int kvsPeekErrorGlb() {
+  return pendingError().code;
+}
 
 int kvsGetErrorGlb() {
   const int code = pendingError().code;
@@ -165,28 +175,56 @@ void kvsGetSyntaxErr(const KvsFile*, int* line, int* column, std::string* text) 
   *text = pendingError().text;
 }
 
-const std::string& kvsGetErrorText() { return pendingError().text; }
+const std::string& kvsGetErrorText() {
+  return pendingError().text;
+}
 
-void kvsAddTarget(KvsFile& file, std::string_view name) { file.open(name); }
-void kvsAddSection(KvsFile& file, std::string_view name) { file.open(name); }
-void kvsEndSection(KvsFile& file) { file.close(); }
-void kvsAddKeyword(KvsFile& file, std::string_view name) { file.startKeyword(name); }
-void kvsAddBool(KvsFile& file, bool value) { file.add(ValueKind::boolean, value ? "true" : "false"); }
-void kvsAddInt(KvsFile& file, std::int32_t value) { file.add(ValueKind::integer, numberText(std::int64_t{value})); }
-void kvsAddFloat(KvsFile& file, float value) { file.add(ValueKind::real, numberText(value)); }
-void kvsAddDouble(KvsFile& file, double value) { file.add(ValueKind::real, numberText(value)); }
-void kvsAddString(KvsFile& file, std::string_view value) { file.add(ValueKind::string, value); }
-void kvsAddFilename(KvsFile& file, std::string_view path) { file.add(ValueKind::fileName, path); }
-void kvsAddResultFilename(KvsFile& file, std::string_view path) { file.add(ValueKind::resultFileName, path); }
+void kvsAddTarget(KvsFile& file, std::string_view name) {
+  file.open(name);
+}
+void kvsAddSection(KvsFile& file, std::string_view name) {
+  file.open(name);
+}
+void kvsEndSection(KvsFile& file) {
+  file.close();
+}
+void kvsAddKeyword(KvsFile& file, std::string_view name) {
+  file.startKeyword(name);
+}
+void kvsAddBool(KvsFile& file, bool value) {
+  file.add(ValueKind::boolean, value ? "true" : "false");
+}
+void kvsAddInt(KvsFile& file, std::int32_t value) {
+  file.add(ValueKind::integer, numberText(std::int64_t{value}));
+}
+void kvsAddFloat(KvsFile& file, float value) {
+  file.add(ValueKind::real, numberText(value));
+}
+void kvsAddDouble(KvsFile& file, double value) {
+  file.add(ValueKind::real, numberText(value));
+}
+void kvsAddString(KvsFile& file, std::string_view value) {
+  file.add(ValueKind::string, value);
+}
+void kvsAddFilename(KvsFile& file, std::string_view path) {
+  file.add(ValueKind::fileName, path);
+}
+void kvsAddResultFilename(KvsFile& file, std::string_view path) {
+  file.add(ValueKind::resultFileName, path);
+}
 
 void kvsPutParam(KvsFile& file, std::string_view keyword, std::int32_t value) {
   putParam(file, keyword, kvsAddInt, value);
 }
-void kvsPutParam(KvsFile& file, std::string_view keyword, float value) { putParam(file, keyword, kvsAddFloat, value); }
+void kvsPutParam(KvsFile& file, std::string_view keyword, float value) {
+  putParam(file, keyword, kvsAddFloat, value);
+}
 void kvsPutParam(KvsFile& file, std::string_view keyword, double value) {
   putParam(file, keyword, kvsAddDouble, value);
 }
-void kvsPutParam(KvsFile& file, std::string_view keyword, bool value) { putParam(file, keyword, kvsAddBool, value); }
+void kvsPutParam(KvsFile& file, std::string_view keyword, bool value) {
+  putParam(file, keyword, kvsAddBool, value);
+}
 void kvsPutParam(KvsFile& file, std::string_view keyword, std::string_view value) {
   putParam(file, keyword, kvsAddString, value);
 }
@@ -212,22 +250,43 @@ KvsKeyword kvsKeywordByNameNum(KvsSection section, std::string_view name, int oc
   return occurrence < 1 ? nullptr : section->keyword(name, static_cast<std::uint32_t>(occurrence));
 }
 
-int kvsGetNoKeywords(KvsSection section) { return static_cast<int>(section->keywordCount()); }
-int kvsGetNoParams(KvsKeyword keyword) { return static_cast<int>(keyword->values().size()); }
-
-KvsParam kvsParamByNum(KvsKeyword keyword, int number) {
-  return number < 1 || number > kvsGetNoParams(keyword) ? nullptr : &keyword->values()[static_cast<std::size_t>(number) - 1];
+int kvsGetNoKeywords(KvsSection section) {
+  return static_cast<int>(section->keywordCount());
+}
+int kvsGetNoParams(KvsKeyword keyword) {
+  return static_cast<int>(keyword->values().size());
 }
 
-bool kvsGetBool(KvsParam param) { return valueOf(*param, bool()).value_or(false); }
-std::int32_t kvsGetInt(KvsParam param) { return valueOf(*param, std::int32_t()).value_or(0); }
-float kvsGetFloat(KvsParam param) { return valueOf(*param, float()).value_or(0.0F); }
-double kvsGetDouble(KvsParam param) { return valueOf(*param, double()).value_or(0.0); }
-std::string kvsGetString(KvsParam param) { return textOf(*param, ValueKind::string).value_or(""); }
-std::string kvsGetFilename(KvsParam param) { return textOf(*param, ValueKind::fileName).value_or(""); }
-std::string kvsGetResultFilename(KvsParam param) { return textOf(*param, ValueKind::resultFileName).value_or(""); }
+KvsParam kvsParamByNum(KvsKeyword keyword, int number) {
+  return number < 1 || number > kvsGetNoParams(keyword)
+             ? nullptr
+             : &keyword->values()[static_cast<std::size_t>(number) - 1];
+}
 
-void kvsGetParam(KvsSection section, std::string_view keyword, std::int32_t* value, int occurrence, int number) {
+bool kvsGetBool(KvsParam param) {
+  return valueOf(*param, bool()).value_or(false);
+}
+std::int32_t kvsGetInt(KvsParam param) {
+  return valueOf(*param, std::int32_t()).value_or(0);
+}
+float kvsGetFloat(KvsParam param) {
+  return valueOf(*param, float()).value_or(0.0F);
+}
+double kvsGetDouble(KvsParam param) {
+  return valueOf(*param, double()).value_or(0.0);
+}
+std::string kvsGetString(KvsParam param) {
+  return textOf(*param, ValueKind::string).value_or("");
+}
+std::string kvsGetFilename(KvsParam param) {
+  return textOf(*param, ValueKind::fileName).value_or("");
+}
+std::string kvsGetResultFilename(KvsParam param) {
+  return textOf(*param, ValueKind::resultFileName).value_or("");
+}
+
+void kvsGetParam(KvsSection section, std::string_view keyword, std::int32_t* value, int occurrence,
+                 int number) {
   getNumber(section, keyword, value, occurrence, number);
 }
 void kvsGetParam(KvsSection section, std::string_view keyword, float* value, int occurrence, int number) {
@@ -239,15 +298,16 @@ void kvsGetParam(KvsSection section, std::string_view keyword, double* value, in
 void kvsGetParam(KvsSection section, std::string_view keyword, bool* value, int occurrence, int number) {
   getNumber(section, keyword, value, occurrence, number);
 }
-void kvsGetParam(KvsSection section, std::string_view keyword, std::string* value, int occurrence, int number) {
+void kvsGetParam(KvsSection section, std::string_view keyword, std::string* value, int occurrence,
+                 int number) {
   getText(section, keyword, ValueKind::string, value, occurrence, number);
 }
 void kvsGetParamFilename(KvsSection section, std::string_view keyword, std::string* value, int occurrence,
                          int number) {
   getText(section, keyword, ValueKind::fileName, value, occurrence, number);
 }
-void kvsGetParamResultFilename(KvsSection section, std::string_view keyword, std::string* value, int occurrence,
-                               int number) {
+void kvsGetParamResultFilename(KvsSection section, std::string_view keyword, std::string* value,
+                               int occurrence, int number) {
   getText(section, keyword, ValueKind::resultFileName, value, occurrence, number);
 }
 

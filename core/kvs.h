@@ -105,14 +105,17 @@ std::string kvsGetResultFilename(KvsParam param);
 
 // Fills the variable from parameter `number` of the keyword's given occurrence. A keyword or parameter that
 // isn't there, and a value of a wrong kind, leave it alone; a number of another numeric kind is converted.
-void kvsGetParam(KvsSection section, std::string_view keyword, std::int32_t* value, int occurrence, int number);
+void kvsGetParam(KvsSection section, std::string_view keyword, std::int32_t* value, int occurrence,
+                 int number);
 void kvsGetParam(KvsSection section, std::string_view keyword, float* value, int occurrence, int number);
 void kvsGetParam(KvsSection section, std::string_view keyword, double* value, int occurrence, int number);
 void kvsGetParam(KvsSection section, std::string_view keyword, bool* value, int occurrence, int number);
-void kvsGetParam(KvsSection section, std::string_view keyword, std::string* value, int occurrence, int number);
-void kvsGetParamFilename(KvsSection section, std::string_view keyword, std::string* value, int occurrence, int number);
-void kvsGetParamResultFilename(KvsSection section, std::string_view keyword, std::string* value, int occurrence,
-                               int number);
+void kvsGetParam(KvsSection section, std::string_view keyword, std::string* value, int occurrence,
+                 int number);
+void kvsGetParamFilename(KvsSection section, std::string_view keyword, std::string* value, int occurrence,
+                         int number);
+void kvsGetParamResultFilename(KvsSection section, std::string_view keyword, std::string* value,
+                               int occurrence, int number);
 
 // A keyword with one integer for each letter "i" of the format.
 template <class... Integers>

@@ -5,11 +5,15 @@
 
 namespace gridbay {
 
-unsigned CKvsBase::Validate(ValidationList&, int) { return 0; }
+unsigned CKvsBase::Validate(ValidationList&, int) {
+  return 0;
+}
 
 void CKvsBase::CopyFrom(const CKvsBase&) {}
 
-CKvsBase* CKvsBase::GetParent() { return parent_; }
+CKvsBase* CKvsBase::GetParent() {
+  return parent_;
+}
 
 CKvsBase* CKvsBase::GetRoot() {
   CKvsBase* top = this;
@@ -17,9 +21,13 @@ CKvsBase* CKvsBase::GetRoot() {
   return top;
 }
 
-CKvsBase* CKvsBase::FindChildKvs() { return nullptr; }
+CKvsBase* CKvsBase::FindChildKvs() {
+  return nullptr;
+}
 
-bool CKvsBase::IsValidPathName(const char* path) { return path != nullptr && isUsablePathName(path); }
+bool CKvsBase::IsValidPathName(const char* path) {
+  return path != nullptr && isUsablePathName(path);
+}
 
 void CKvsBase::CopySection(KvsSection source, KvsFile& destination) {
   for (const Node* node = source->first(); node != nullptr; node = node->next()) {
@@ -34,7 +42,9 @@ void CKvsBase::CopySection(KvsSection source, KvsFile& destination) {
   }
 }
 
-CGlobalKvs* CKvsBase::model() { return dynamic_cast<CGlobalKvs*>(GetRoot()); }
+CGlobalKvs* CKvsBase::model() {
+  return dynamic_cast<CGlobalKvs*>(GetRoot());
+}
 
 void CKvsBase::ShowMessage(const std::string& text) {
   if (parent_ != nullptr) parent_->ShowMessage(text);

@@ -10,7 +10,8 @@ namespace gridbay {
 class CGlobalKvs;
 
 // Base of all parts of a model. An object knows its parameters with their defaults, writes itself under the
-// cursor of a parameter file, reads itself from a section, checks itself and copies itself from a like object.
+// cursor of a parameter file, reads itself from a section, checks itself and copies itself from a like
+// object.
 class CKvsBase {
  public:
   // The parent owns the object and never changes; the root has none.

@@ -22,8 +22,9 @@ void resizeFollower(CGlobalKvs& root, int count) {
 // A count in a file is believed as far as the sections beside it bear it out, and this much further.
 inline constexpr int kCountSlack = 1024;
 
-// A data object that holds a list of items, in the order of file and screen. The count is the list's length and
-// stands nowhere beside it. `Derived::table()` has among its rows `count` and `items` (below). Derived may have
+// A data object that holds a list of items, in the order of file and screen. The count is the list's length
+// and stands nowhere beside it. `Derived::table()` has among its rows `count` and `items` (below). Derived
+// may have
 //   void initialise(Item&, int number)         a default that depends on the item's place, from 1
 //   static std::span<const Follower> followers()   the lists that are told of each change of the count
 template <class Derived, class Item>
@@ -39,7 +40,8 @@ class ListKvs : public TableKvs<Derived> {
   }
   const Item* GetItem(int number) const { return const_cast<ListKvs*>(this)->GetItem(number); }
 
-  // Takes items from the tail, or appends default ones, and tells the followers. A negative count does nothing.
+  // Takes items from the tail, or appends default ones, and tells the followers. A negative count does
+  // nothing.
   void SetCount(int count) {
     if (count < 0) return;
     resize(count);
@@ -65,7 +67,8 @@ class ListKvs : public TableKvs<Derived> {
     const int sections = static_cast<int>(section->sectionCount());
     const int believed = std::min(count, sections + kCountSlack);
     if (believed < count) {
-      this->ShowMessage(formatted(texts::countNotBorneOut, std::string(section->name()), count, sections, believed));
+      this->ShowMessage(
+          formatted(texts::countNotBorneOut, std::string(section->name()), count, sections, believed));
     }
     static_cast<Derived&>(*this).SetCount(believed);
   }
@@ -76,7 +79,8 @@ class ListKvs : public TableKvs<Derived> {
       kvsEndSection(file);
     }
   }
-  void loadItems(const Text& sectionName, const Text& missing, KvsSection section, const std::string& documentPath) {
+  void loadItems(const Text& sectionName, const Text& missing, KvsSection section,
+                 const std::string& documentPath) {
     for (int number = 1; number <= GetCount(); ++number) {
       const KvsSection itemSection = kvsSectionByNameNum(section, formatted(sectionName, number), 1);
       if (itemSection != nullptr) {
@@ -106,7 +110,7 @@ class ListKvs : public TableKvs<Derived> {
     while (GetCount() > count) items_.pop_back();
     while (GetCount() < count) {
       items_.push_back(std::make_unique<Item>(this));
-      if constexpr (requires(Derived& derived, Item& item) { derived.initialise(item, 1); }) {
+      if constexpr (requires(Derived & derived, Item & item) { derived.initialise(item, 1); }) {
         static_cast<Derived&>(*this).initialise(*items_.back(), GetCount());
       }
     }
@@ -128,7 +132,9 @@ class ListKvs : public TableKvs<Derived> {
 struct CountRow {
   std::string_view name;
 
-  void save(const auto& list, KvsFile& file, const std::string&) const { kvsPutParam(file, name, list.GetCount()); }
+  void save(const auto& list, KvsFile& file, const std::string&) const {
+    kvsPutParam(file, name, list.GetCount());
+  }
   void load(auto& list, KvsSection from, const std::string&) const {
     int count = 0;
     kvsGetParam(from, name, &count, 1, 1);
@@ -136,7 +142,9 @@ struct CountRow {
   }
   void copy(auto&, const auto&) const {}
 };
-constexpr CountRow count(std::string_view name) { return {name}; }
+constexpr CountRow count(std::string_view name) {
+  return {name};
+}
 
 // A count that the Wetland Sweep Kit fixes, on file and after a load.
 struct PinnedCountRow {
@@ -159,7 +167,9 @@ struct PinnedCountRow {
   }
   void copy(auto&, const auto&) const {}
 };
-constexpr PinnedCountRow pinnedCount(std::string_view name, int fixed) { return {{name}, fixed}; }
+constexpr PinnedCountRow pinnedCount(std::string_view name, int fixed) {
+  return {{name}, fixed};
+}
 
 // The row of the items: their numbered sections, and the text shown for a section that is missing.
 struct ItemsRow {
@@ -174,6 +184,8 @@ struct ItemsRow {
   }
   void copy(auto& list, const auto& other) const { list.copyItems(other); }
 };
-constexpr ItemsRow items(std::string_view sectionName, Text missing) { return {{sectionName}, missing}; }
+constexpr ItemsRow items(std::string_view sectionName, Text missing) {
+  return {{sectionName}, missing};
+}
 
 }  // namespace gridbay

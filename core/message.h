@@ -10,8 +10,8 @@
 namespace gridbay {
 
 enum class Severity : std::int32_t {
-  fault = 1,           // an ordinary fault
-  dependedUpon = 2,    // a fault in a thing that others depend on
+  fault = 1,         // an ordinary fault
+  dependedUpon = 2,  // a fault in a thing that others depend on
 };
 
 // One validation message: the page to open for it, the finished text, the severity.
@@ -28,7 +28,8 @@ using ValidationList = std::vector<CMessage>;
 
 // Appends a message and returns 1, for the sum of faults.
 template <class... Args>
-unsigned report(ValidationList& messages, PageId page, Severity severity, const Text& text, const Args&... args) {
+unsigned report(ValidationList& messages, PageId page, Severity severity, const Text& text,
+                const Args&... args) {
   messages.push_back({page, formatted(text, args...), severity});
   return 1;
 }

@@ -16,8 +16,8 @@ inline constexpr std::int32_t kEcological = 9;
 inline constexpr std::int32_t kHydrodynamicToo = 11;
 }  // namespace module
 
-// The modules that run beside hydrodynamics, the scheme of advection-dispersion, and two switches. The Wetland
-// Sweep Kit has hydrodynamics alone.
+// The modules that run beside hydrodynamics, the scheme of advection-dispersion, and two switches. The
+// Wetland Sweep Kit has hydrodynamics alone.
 class CModuleSelectionKvs final : public TableKvs<CModuleSelectionKvs> {
  public:
   using TableKvs::TableKvs;

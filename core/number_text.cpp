@@ -36,9 +36,15 @@ std::optional<Real> realOfText(std::string_view text) {
 
 }  // namespace
 
-std::string numberText(std::int64_t number) { return shortest(number); }
-std::string numberText(float number) { return realText(number); }
-std::string numberText(double number) { return realText(number); }
+std::string numberText(std::int64_t number) {
+  return shortest(number);
+}
+std::string numberText(float number) {
+  return realText(number);
+}
+std::string numberText(double number) {
+  return realText(number);
+}
 
 std::optional<std::int32_t> int32OfText(std::string_view text) {
   std::int32_t number = 0;
@@ -51,7 +57,11 @@ std::optional<std::int32_t> int32OfText(std::string_view text) {
   return static_cast<std::int32_t>(*real);
 }
 
-std::optional<float> floatOfText(std::string_view text) { return realOfText<float>(text); }
-std::optional<double> doubleOfText(std::string_view text) { return realOfText<double>(text); }
+std::optional<float> floatOfText(std::string_view text) {
+  return realOfText<float>(text);
+}
+std::optional<double> doubleOfText(std::string_view text) {
+  return realOfText<double>(text);
+}
 
 }  // namespace gridbay

@@ -41,7 +41,8 @@ std::uint64_t mix(std::uint64_t a, std::uint64_t b) {
 // A hash of a name with its case folded. The seed is drawn anew in each process, so that no file can be made
 // whose names all meet in one place.
 std::uint64_t hashName(std::string_view name, std::uint64_t occurrence) {
-  static const std::uint64_t seed = (std::uint64_t{std::random_device{}()} << 32) | std::random_device{}() | 1U;
+  static const std::uint64_t seed =
+      (std::uint64_t{std::random_device{}()} << 32) | std::random_device{}() | 1U;
   constexpr std::uint64_t kFactor = 0x9E3779B97F4A7C15U;
   std::uint64_t state = mix(seed ^ name.size(), kFactor ^ occurrence);
   const char* at = name.data();
@@ -176,7 +177,8 @@ bool sameTree(const Node& a, const Node& b) {
     const auto [x, y] = open.back();
     open.pop_back();
     if (x == nullptr && y == nullptr) continue;
-    if (x == nullptr || y == nullptr || x->name() != y->name() || x->isSection() != y->isSection()) return false;
+    if (x == nullptr || y == nullptr || x->name() != y->name() || x->isSection() != y->isSection())
+      return false;
     open.emplace_back(x->next(), y->next());
     if (x->isSection()) {
       open.emplace_back(x->first(), y->first());

@@ -8,7 +8,8 @@
 namespace gridbay {
 namespace {
 
-void listUnknown(KvsSection source, KvsSection saved, const std::string& path, std::vector<std::string>& unknown) {
+void listUnknown(KvsSection source, KvsSection saved, const std::string& path,
+                 std::vector<std::string>& unknown) {
   for (const Node* node = source->first(); node != nullptr; node = node->next()) {
     if (!node->isSection()) continue;
     const std::string here = path + (path.empty() ? "" : "/") + std::string(node->name());
@@ -79,7 +80,8 @@ std::vector<std::string> SetupFile::unknownSections(const std::string& path) {
   const KvsHandle saved = tree(path);
   listUnknown(target, kvsTargetByNameNum(*saved, CGlobalKvs::kTarget, 1), {}, unknown);
   std::erase_if(unknown, [this](const std::string& name) {
-    return isOfOtherModule(std::string_view(name).substr(0, name.find('/')), model_->moduleSelection->simulationType);
+    return isOfOtherModule(std::string_view(name).substr(0, name.find('/')),
+                           model_->moduleSelection->simulationType);
   });
   return unknown;
 }

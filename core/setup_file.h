@@ -10,7 +10,8 @@
 
 namespace gridbay {
 
-// A model with the file it came from, which stays open so that a save can pass on what the editor does not know.
+// A model with the file it came from, which stays open so that a save can pass on what the editor does not
+// know.
 class SetupFile {
  public:
   // A new default model. The host, which must outlive it, is shown what a load has to say.

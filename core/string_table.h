@@ -24,11 +24,13 @@ namespace texts {
 inline constexpr Text dataFileNotValid{"Data file  \" %s\"  is not valid"};
 inline constexpr Text errorMessage{"  Error Message: "};
 inline constexpr Text countNotBorneOut{
-    "Error in the KVS-FILE\nSection %s says %d, which is far more than the %d sections that follow; %d are kept"};
+    "Error in the KVS-FILE\nSection %s says %d, which is far more than the %d sections that follow; %d are "
+    "kept"};
 
 // Help file, default name, new-file name, filter label, filter extension, registry type id, type name.
 inline constexpr Text flowModelDocument{
-    "V27Nested.chm\nUntitled\nVANE 27 Flow model\nVANE 27 Flow Model (*.v27)\n.v27\nVANE27FlowModel.Document\n"
+    "V27Nested.chm\nUntitled\nVANE 27 Flow model\nVANE 27 Flow Model "
+    "(*.v27)\n.v27\nVANE27FlowModel.Document\n"
     "Flow Model",
     18951};
 inline constexpr Text wetlandSweepKitDocument{

@@ -31,7 +31,8 @@ std::string libraryText(std::string_view text) {
   int zone = 0;
   const auto [end, error] = std::from_chars(rest.data(), rest.data() + rest.size(), zone);
   const std::string_view side(end, static_cast<std::size_t>(rest.data() + rest.size() - end));
-  if (error != std::errc() || zone < 1 || zone > 60 || (!side.empty() && side != "N" && side != "S")) return {};
+  if (error != std::errc() || zone < 1 || zone > 60 || (!side.empty() && side != "N" && side != "S"))
+    return {};
   return "EPSG:" + std::to_string((side == "S" ? 32700 : 32600) + zone);
 }
 
@@ -54,7 +55,8 @@ CVdMapProjection::CVdMapProjection(std::string_view text) : state_(std::make_uni
   if (!crs || proj_is_crs(crs.get()) == 0) return;
   const Projection geographic(proj_crs_get_geodetic_crs(context, crs.get()));
   if (geographic) {
-    const Projection there(proj_create_crs_to_crs_from_pj(context, geographic.get(), crs.get(), nullptr, nullptr));
+    const Projection there(
+        proj_create_crs_to_crs_from_pj(context, geographic.get(), crs.get(), nullptr, nullptr));
     if (there) state_->fromGeographic.reset(proj_normalize_for_visualization(context, there.get()));
   }
   state_->crs = std::move(crs);
@@ -73,8 +75,12 @@ bool CVdMapProjection::IsLocal(std::string_view text) {
   return text.empty() || text == kLocal || text.starts_with("LOCAL_CS");
 }
 
-bool CVdMapProjection::IsLocal() const { return IsLocal(state_->text); }
-bool CVdMapProjection::IsValid() const { return IsLocal() || state_->crs != nullptr; }
+bool CVdMapProjection::IsLocal() const {
+  return IsLocal(state_->text);
+}
+bool CVdMapProjection::IsValid() const {
+  return IsLocal() || state_->crs != nullptr;
+}
 
 std::string CVdMapProjection::Name() const {
   if (!state_->crs) return IsLocal() ? std::string(kLocal) : std::string();
@@ -110,14 +116,16 @@ bool CVdMapProjection::Geo2Proj(double longitude, double latitude, double* east,
 
 bool CVdMapProjection::Proj2Geo(double east, double north, double* longitude, double* latitude) const {
   if (!state_->fromGeographic) return false;
-  const PJ_COORD there = proj_trans(state_->fromGeographic.get(), PJ_INV, proj_coord(east, north, 0, HUGE_VAL));
+  const PJ_COORD there =
+      proj_trans(state_->fromGeographic.get(), PJ_INV, proj_coord(east, north, 0, HUGE_VAL));
   if (!std::isfinite(there.lp.lam) || !std::isfinite(there.lp.phi)) return false;
   *longitude = there.lp.lam;
   *latitude = there.lp.phi;
   return true;
 }
 
-CVdCartography::CVdCartography(std::string_view projection, double originEast, double originNorth, double rotation)
+CVdCartography::CVdCartography(std::string_view projection, double originEast, double originNorth,
+                               double rotation)
     : projection_(projection),
       originEast_(originEast),
       originNorth_(originNorth),

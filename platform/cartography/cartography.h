@@ -29,8 +29,9 @@ class CVdMapProjection {
   // The full projection text in the form that map data files carry (WKT1 of GDAL); empty when local.
   std::string Wkt() const;
 
-  // Longitude and latitude (degrees, on the projection's own datum) to easting and northing (metres), and back.
-  // False, with the results left alone, for local coordinates and for points that the projection cannot hold.
+  // Longitude and latitude (degrees, on the projection's own datum) to easting and northing (metres), and
+  // back. False, with the results left alone, for local coordinates and for points that the projection cannot
+  // hold.
   bool Geo2Proj(double longitude, double latitude, double* east, double* north) const;
   bool Proj2Geo(double east, double north, double* longitude, double* latitude) const;
 
@@ -39,7 +40,8 @@ class CVdMapProjection {
   std::unique_ptr<State> state_;
 };
 
-// A grid's place on a map: an origin in the projection (metres) and a rotation (degrees, clockwise from north).
+// A grid's place on a map: an origin in the projection (metres) and a rotation (degrees, clockwise from
+// north).
 class CVdCartography {
  public:
   CVdCartography(std::string_view projection, double originEast, double originNorth, double rotation);

@@ -41,8 +41,10 @@ bool isUsablePathName(std::string_view path) {
   }
   const fs::path parts(path);
   const std::string file = parts.filename().string();
-  if (file.empty() || file == "." || file == ".." || file.find_first_not_of(' ') == std::string::npos) return false;
-  return std::ranges::all_of(parts, [](const fs::path& part) { return part.string().size() <= kLongestPart; });
+  if (file.empty() || file == "." || file == ".." || file.find_first_not_of(' ') == std::string::npos)
+    return false;
+  return std::ranges::all_of(parts,
+                             [](const fs::path& part) { return part.string().size() <= kLongestPart; });
 }
 
 bool isReadableFile(const std::string& path) {

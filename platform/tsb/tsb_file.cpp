@@ -42,7 +42,8 @@ class OpenFile {
 std::optional<std::string> textAttribute(int file, int variable, const char* name) {
   nc_type type = NC_NAT;
   std::size_t length = 0;
-  if (nc_inq_att(file, variable, name, &type, &length) != NC_NOERR || length > kLongestText) return std::nullopt;
+  if (nc_inq_att(file, variable, name, &type, &length) != NC_NOERR || length > kLongestText)
+    return std::nullopt;
   if (type == NC_STRING && length == 1) {
     char* text = nullptr;
     if (nc_get_att_string(file, variable, name, &text) != NC_NOERR || text == nullptr) return std::nullopt;
@@ -139,7 +140,8 @@ class DefinitionReader {
     time.unit = units.substr(0, since);
     if (time.isCalendar()) {
       constexpr std::size_t kSinceLength = 7;
-      const auto start = since == units.npos ? std::nullopt : startOf(std::string_view(units).substr(since + kSinceLength));
+      const auto start =
+          since == units.npos ? std::nullopt : startOf(std::string_view(units).substr(since + kSinceLength));
       if (!start) return Failure{"its time axis has no start date"};
       time.start = *start;
     }
@@ -182,19 +184,22 @@ class DefinitionReader {
     if (nc_inq_nvars(file_, &count) != NC_NOERR || count < 0) return Failure{"its items cannot be read"};
     std::map<int, int> byNumber;
     for (int variable = 0; variable < count; ++variable) {
-      if (const auto number = integerAttribute(file_, variable, tsb::kItemNumber)) byNumber.emplace(*number, variable);
+      if (const auto number = integerAttribute(file_, variable, tsb::kItemNumber))
+        byNumber.emplace(*number, variable);
     }
     if (byNumber.empty()) return Failure{"it has no items (variables with an item type)"};
     if (byNumber.size() > kMostItems) return Failure{"it has too many items"};
     std::vector<std::size_t> wanted{definition_.time.count};
-    for (auto axis = definition_.axes.rbegin(); axis != definition_.axes.rend(); ++axis) wanted.push_back(axis->points);
+    for (auto axis = definition_.axes.rbegin(); axis != definition_.axes.rend(); ++axis)
+      wanted.push_back(axis->points);
     for (const auto& [number, variable] : byNumber) {
       TsbItem item;
       item.name = textAttribute(file_, variable, "long_name").value_or("");
       item.type = integerAttribute(file_, variable, tsb::kItemType).value_or(item.type);
       item.unit = textAttribute(file_, variable, "units").value_or("");
       nc_type type = NC_NAT;
-      const bool typed = nc_inq_vartype(file_, variable, &type) == NC_NOERR && (type == NC_FLOAT || type == NC_DOUBLE);
+      const bool typed =
+          nc_inq_vartype(file_, variable, &type) == NC_NOERR && (type == NC_FLOAT || type == NC_DOUBLE);
       const auto shape = shapeOf(file_, variable);
       if (!typed || !shape || *shape != wanted) {
         return Failure{"its item \"" + item.name + "\" does not have the shape of its axes"};
@@ -262,7 +267,9 @@ struct TsbFile::State {
 
   template <class Number, class Get>
   Outcome read(std::size_t item, std::size_t step, std::span<Number> values, Get get) const {
-    const auto fail = [this](const std::string& why) { return Failure{"cannot read \"" + path + "\": " + why}; };
+    const auto fail = [this](const std::string& why) {
+      return Failure{"cannot read \"" + path + "\": " + why};
+    };
     if (item < 1 || item > itemVariables.size()) return fail("it has no item " + std::to_string(item));
     if (step >= definition.time.count) return fail("it has no time step " + std::to_string(step));
     if (values.size() != definition.pointCount()) return fail("its grid has another size");
@@ -274,7 +281,8 @@ struct TsbFile::State {
     }
     const int status = get(file.id(), itemVariables[item - 1], start.data(), count.data(), values.data());
     if (status == NC_NOERR) return {};
-    return fail("item " + std::to_string(item) + ", step " + std::to_string(step) + ": " + nc_strerror(status));
+    return fail("item " + std::to_string(item) + ", step " + std::to_string(step) + ": " +
+                nc_strerror(status));
   }
 };
 
@@ -285,7 +293,9 @@ TsbFile::~TsbFile() = default;
 
 Result<TsbFile> TsbFile::open(const std::string& path) {
   if (path.empty()) return Failure{"no data file is named"};
-  const auto fail = [&path](const std::string& why) { return Failure{"cannot read \"" + path + "\": " + why}; };
+  const auto fail = [&path](const std::string& why) {
+    return Failure{"cannot read \"" + path + "\": " + why};
+  };
   std::error_code error;
   const std::filesystem::file_status status = std::filesystem::status(path, error);
   if (!std::filesystem::exists(status)) return fail("there is no such file");
@@ -301,8 +311,12 @@ Result<TsbFile> TsbFile::open(const std::string& path) {
   return TsbFile(std::move(state));
 }
 
-const TsbDefinition& TsbFile::definition() const { return state_->definition; }
-const std::string& TsbFile::path() const { return state_->path; }
+const TsbDefinition& TsbFile::definition() const {
+  return state_->definition;
+}
+const std::string& TsbFile::path() const {
+  return state_->path;
+}
 
 Outcome TsbFile::read(std::size_t item, std::size_t step, std::span<float> values) const {
   return state_->read(item, step, values, nc_get_vara_float);

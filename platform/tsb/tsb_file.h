@@ -26,8 +26,8 @@ class TsbFile {
   const TsbDefinition& definition() const;
   const std::string& path() const;
 
-  // One item (from 1) at one time step (from 0): definition().pointCount() values, x fastest, straight into the
-  // caller's memory.
+  // One item (from 1) at one time step (from 0): definition().pointCount() values, x fastest, straight into
+  // the caller's memory.
   Outcome read(std::size_t item, std::size_t step, std::span<float> values) const;
   Outcome read(std::size_t item, std::size_t step, std::span<double> values) const;
 

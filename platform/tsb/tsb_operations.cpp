@@ -28,10 +28,13 @@ int tsbFileRead(const std::string& path, TsbHeader* header, std::string* error) 
   return kDone;
 }
 
-int tsbGetNoOfItems(const TsbHeader& header) { return static_cast<int>(header.file->definition().items.size()); }
+int tsbGetNoOfItems(const TsbHeader& header) {
+  return static_cast<int>(header.file->definition().items.size());
+}
 
 const TsbItem* tsbItemD(const TsbHeader& header, int item) {
-  return hasItem(header, item) ? &header.file->definition().items[static_cast<std::size_t>(item) - 1] : nullptr;
+  return hasItem(header, item) ? &header.file->definition().items[static_cast<std::size_t>(item) - 1]
+                               : nullptr;
 }
 
 int tsbGetItemInfo(const TsbHeader& header, int item, int* type, std::string* name, std::string* unit) {
@@ -43,7 +46,9 @@ int tsbGetItemInfo(const TsbHeader& header, int item, int* type, std::string* na
   return kDone;
 }
 
-TsbAxisType tsbGetItemAxisType(const TsbHeader& header, int) { return header.file->definition().axisType(); }
+TsbAxisType tsbGetItemAxisType(const TsbHeader& header, int) {
+  return header.file->definition().axisType();
+}
 
 int tsbGetItemAxisEqD2(const TsbHeader& header, int item, int* noJ, int* noK, float* dx, float* dy) {
   if (!hasItem(header, item) || tsbGetItemAxisType(header, item) != TsbAxisType::d2) return kFailed;
@@ -57,7 +62,9 @@ int tsbGetItemAxisEqD2(const TsbHeader& header, int item, int* noJ, int* noK, fl
   return kDone;
 }
 
-int tsbFindBlockDynamic(TsbHeader* header) { return tsbFindItemDynamic(header, 0, 1); }
+int tsbFindBlockDynamic(TsbHeader* header) {
+  return tsbFindItemDynamic(header, 0, 1);
+}
 
 int tsbFindItemDynamic(TsbHeader* header, int step, int item) {
   if (!hasItem(*header, item) || step < 0) return kFailed;
@@ -95,10 +102,12 @@ int tsbGetCustomBlock(const TsbHeader& header, const TsbCustomBlock** block, std
   return kDone;
 }
 
-int tsbGetGeoInfoType(const TsbHeader& header) { return header.file->definition().geography ? 1 : 0; }
+int tsbGetGeoInfoType(const TsbHeader& header) {
+  return header.file->definition().geography ? 1 : 0;
+}
 
-int tsbGetGeoInfoUTMProj(const TsbHeader& header, std::string* projection, double* longitude, double* latitude,
-                         double* rotation) {
+int tsbGetGeoInfoUTMProj(const TsbHeader& header, std::string* projection, double* longitude,
+                         double* latitude, double* rotation) {
   const std::optional<TsbGeography>& place = header.file->definition().geography;
   if (!place) return kFailed;
   *projection = place->projection;
@@ -108,7 +117,11 @@ int tsbGetGeoInfoUTMProj(const TsbHeader& header, std::string* projection, doubl
   return kDone;
 }
 
-void tsbFileClose(TsbHeader* header) { header->file.reset(); }
-void tsbHeaderDestroy(TsbHeader* header) { *header = {}; }
+void tsbFileClose(TsbHeader* header) {
+  header->file.reset();
+}
+void tsbHeaderDestroy(TsbHeader* header) {
+  *header = {};
+}
 
 }  // namespace gridbay

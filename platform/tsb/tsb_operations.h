@@ -6,8 +6,8 @@
 
 #include "platform/tsb/tsb_file.h"
 
-// The operations on a data file in the form in which the model asks for them. A status is 0 for success. Items
-// count from 1, time steps from 0.
+// The operations on a data file in the form in which the model asks for them. A status is 0 for success.
+// Items count from 1, time steps from 0.
 
 namespace gridbay {
 
@@ -40,8 +40,8 @@ int tsbGetCustomBlock(const TsbHeader& header, const TsbCustomBlock** block, std
                       std::span<const float>* values);
 // 1 for a file that has a place on a map, else 0.
 int tsbGetGeoInfoType(const TsbHeader& header);
-int tsbGetGeoInfoUTMProj(const TsbHeader& header, std::string* projection, double* longitude, double* latitude,
-                         double* rotation);
+int tsbGetGeoInfoUTMProj(const TsbHeader& header, std::string* projection, double* longitude,
+                         double* latitude, double* rotation);
 void tsbFileClose(TsbHeader* header);
 void tsbHeaderDestroy(TsbHeader* header);
 

@@ -25,16 +25,20 @@ struct TsbTimeAxis {
   TsbTimeAxisType type = TsbTimeAxisType::calendarEquidistant;
   std::array<std::int32_t, 6> start{1990, 1, 1, 12, 0, 0};  // year to second, of a calendar axis
   std::string unit = "s";
-  double first = 0;            // of an equidistant axis, in the unit
-  double step = 1;             // of an equidistant axis, in the unit
+  double first = 0;  // of an equidistant axis, in the unit
+  double step = 1;   // of an equidistant axis, in the unit
   std::size_t count = 1;
   std::vector<double> values;  // of a non-equidistant axis, in the unit; `count` of them
 
-  bool isCalendar() const { return type == TsbTimeAxisType::calendarEquidistant || type == TsbTimeAxisType::calendar; }
+  bool isCalendar() const {
+    return type == TsbTimeAxisType::calendarEquidistant || type == TsbTimeAxisType::calendar;
+  }
   bool isEquidistant() const {
     return type == TsbTimeAxisType::calendarEquidistant || type == TsbTimeAxisType::relativeEquidistant;
   }
-  double at(std::size_t i) const { return isEquidistant() ? first + static_cast<double>(i) * step : values[i]; }
+  double at(std::size_t i) const {
+    return isEquidistant() ? first + static_cast<double>(i) * step : values[i];
+  }
 };
 
 // Grid points along one direction: the coordinate of the first, the spacing, the unit of both.
@@ -53,7 +57,8 @@ struct TsbItem {
   double deleteValue = -1e-35;  // stands for a missing value
 };
 
-// Where a grid lies: the projection's text, longitude and latitude of the first point, the rotation in degrees.
+// Where a grid lies: the projection's text, longitude and latitude of the first point, the rotation in
+// degrees.
 struct TsbGeography {
   std::string projection;
   double longitude = 0;

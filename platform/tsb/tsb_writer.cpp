@@ -17,6 +17,7 @@
 #include "platform/cartography/cartography.h"
 #include "platform/files/file_descriptor.h"
 #include "platform/tsb/netcdf_names.h"
+#include "platform/units/units.h"
 
 namespace gridbay {
 namespace {
@@ -48,7 +49,8 @@ int addDimension(int file, const char* name, std::size_t length) {
 
 int addVariable(int file, const std::string& name, nc_type type, const std::vector<int>& dimensions) {
   int variable = 0;
-  check(nc_def_var(file, name.c_str(), type, static_cast<int>(dimensions.size()), dimensions.data(), &variable));
+  check(nc_def_var(file, name.c_str(), type, static_cast<int>(dimensions.size()), dimensions.data(),
+                   &variable));
   return variable;
 }
 
@@ -91,11 +93,13 @@ class DefinitionWriter {
     std::string units = time.unit;
     if (time.isCalendar()) {
       const auto [year, month, day, hour, minute, second] = time.start;
-      units += fmt::format(" since {:04}-{:02}-{:02} {:02}:{:02}:{:02}", year, month, day, hour, minute, second);
+      units +=
+          fmt::format(" since {:04}-{:02}-{:02} {:02}:{:02}:{:02}", year, month, day, hour, minute, second);
       putText(file_, timeVariable_, "standard_name", "time");
       putText(file_, timeVariable_, "calendar", "proleptic_gregorian");
     }
     putText(file_, timeVariable_, "units", units);
+    if (qunAreEquivalent(time.unit, "s")) putText(file_, timeVariable_, "axis", "T");
     putInteger(file_, timeVariable_, tsb::kAxisType, static_cast<int>(time.type));
     if (time.isEquidistant()) {
       putNumber(file_, timeVariable_, tsb::kFirst, time.first);
@@ -135,7 +139,8 @@ class DefinitionWriter {
   }
 
   std::vector<int> addItems() {
-    std::set<std::string> taken{tsb::kTime, tsb::kAxes[0], tsb::kAxes[1], tsb::kProjection, tsb::kCustomBlocks};
+    std::set<std::string> taken{tsb::kTime, tsb::kAxes[0], tsb::kAxes[1], tsb::kProjection,
+                                tsb::kCustomBlocks};
     std::vector<int> variables;
     for (const TsbItem& item : definition_.items) {
       const int variable =
@@ -187,7 +192,8 @@ class DefinitionWriter {
     for (std::size_t a = 0; a < definition_.axes.size(); ++a) {
       const TsbGridAxis& axis = definition_.axes[a];
       values.clear();
-      for (std::size_t i = 0; i < axis.points; ++i) values.push_back(axis.first + static_cast<double>(i) * axis.spacing);
+      for (std::size_t i = 0; i < axis.points; ++i)
+        values.push_back(axis.first + static_cast<double>(i) * axis.spacing);
       check(nc_put_var_double(file_, axisVariables_[a], values.data()));
     }
   }
@@ -231,7 +237,8 @@ struct TsbWriter::State {
   Failure failure(const std::string& why) const { return {"cannot write \"" + path + "\": " + why}; }
 
   template <class Number, class Put>
-  Outcome write(std::size_t item, std::size_t step, std::size_t firstRow, std::span<const Number> values, Put put) {
+  Outcome write(std::size_t item, std::size_t step, std::size_t firstRow, std::span<const Number> values,
+                Put put) {
     if (item < 1 || item > items.size()) return failure("it has no item " + std::to_string(item));
     if (step >= definition.time.count) return failure("it has no time step " + std::to_string(step));
     std::vector<std::size_t> start{step};
@@ -244,7 +251,8 @@ struct TsbWriter::State {
       start.push_back(isRows ? firstRow : 0);
       count.push_back(length);
       wanted *= length;
-      if (isRows && firstRow + length > definition.axes[1].points) return failure("the grid has no such rows");
+      if (isRows && firstRow + length > definition.axes[1].points)
+        return failure("the grid has no such rows");
     }
     if (values.size() != wanted) return failure("the values do not have the shape of the grid");
     const int status = put(file, items[item - 1], start.data(), count.data(), values.data());
@@ -296,7 +304,8 @@ Outcome TsbWriter::write(std::size_t item, std::size_t step, std::span<const dou
   return state_->write(item, step, 0, values, nc_put_vara_double);
 }
 
-Outcome TsbWriter::writeRows(std::size_t item, std::size_t step, std::size_t firstRow, std::span<const float> values) {
+Outcome TsbWriter::writeRows(std::size_t item, std::size_t step, std::size_t firstRow,
+                             std::span<const float> values) {
   return state_->write(item, step, firstRow, values, nc_put_vara_float);
 }
 
@@ -305,7 +314,8 @@ Outcome TsbWriter::commit() {
   const int status = nc_close(std::exchange(state_->file, -1));
   if (status != NC_NOERR) return state_->failure(State::reason(status));
   const FileDescriptor written(::open(state_->temporary.c_str(), O_RDONLY | O_CLOEXEC));
-  if (!written || ::fsync(written.get()) != 0 || ::rename(state_->temporary.c_str(), state_->path.c_str()) != 0) {
+  if (!written || ::fsync(written.get()) != 0 ||
+      ::rename(state_->temporary.c_str(), state_->path.c_str()) != 0) {
     return Failure{systemError("cannot write", state_->path)};
   }
   state_->temporary.clear();

@@ -174,10 +174,18 @@ const Entry* findCode(std::span<const Entry> entries, int code) {
 
 }  // namespace
 
-std::span<const QunItem> qunItems() { return kItems; }
-std::span<const QunUnit> qunUnits() { return kUnits; }
-const QunItem* qunFindItem(int code) { return findCode(qunItems(), code); }
-const QunUnit* qunFindUnit(int code) { return findCode(qunUnits(), code); }
+std::span<const QunItem> qunItems() {
+  return kItems;
+}
+std::span<const QunUnit> qunUnits() {
+  return kUnits;
+}
+const QunItem* qunFindItem(int code) {
+  return findCode(qunItems(), code);
+}
+const QunUnit* qunFindUnit(int code) {
+  return findCode(qunUnits(), code);
+}
 
 const QunUnit* qunBaseUnit(int itemCode) {
   const QunItem* found = qunFindItem(itemCode);

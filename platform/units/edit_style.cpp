@@ -25,7 +25,8 @@ double CVdEditStyle::UnitConvertFromBase(double value, int toDisplay) const {
   const QunUnit* base = qunBaseUnit(itemCode_);
   const QunUnit* shown = choices_->unitOf(itemCode_);
   if (base == nullptr || shown == nullptr || base == shown) return value;
-  return (toDisplay != 0 ? CVdUnitConverter(base->code, shown->code) : CVdUnitConverter(shown->code, base->code))
+  return (toDisplay != 0 ? CVdUnitConverter(base->code, shown->code)
+                         : CVdUnitConverter(shown->code, base->code))
       .Convert(value);
 }
 

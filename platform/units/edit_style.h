@@ -33,7 +33,8 @@ class CVdEditStyle {
   // The printf format of the number.
   CVdEditStyle& SetFormat(std::string_view format);
 
-  // With `toDisplay` 1 a stored value in the unit that the user has chosen, with 0 a typed value in base units.
+  // With `toDisplay` 1 a stored value in the unit that the user has chosen, with 0 a typed value in base
+  // units.
   double UnitConvertFromBase(double value, int toDisplay) const;
   // The number in the unit shown, by the format.
   std::string Text(double baseValue) const;

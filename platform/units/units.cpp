@@ -44,7 +44,8 @@ struct CVdUnitConverter::State {
   std::unique_ptr<cv_converter, FreeConverter> converter;
 };
 
-CVdUnitConverter::CVdUnitConverter(int fromUnit, int toUnit) : CVdUnitConverter(textOf(fromUnit), textOf(toUnit)) {}
+CVdUnitConverter::CVdUnitConverter(int fromUnit, int toUnit)
+    : CVdUnitConverter(textOf(fromUnit), textOf(toUnit)) {}
 
 CVdUnitConverter::CVdUnitConverter(std::string_view fromText, std::string_view toText)
     : state_(std::make_unique<State>()) {
@@ -59,7 +60,9 @@ CVdUnitConverter::CVdUnitConverter(CVdUnitConverter&&) noexcept = default;
 CVdUnitConverter& CVdUnitConverter::operator=(CVdUnitConverter&&) noexcept = default;
 CVdUnitConverter::~CVdUnitConverter() = default;
 
-bool CVdUnitConverter::IsValid() const { return state_->converter != nullptr; }
+bool CVdUnitConverter::IsValid() const {
+  return state_->converter != nullptr;
+}
 
 double CVdUnitConverter::Convert(double value) const {
   return IsValid() ? cv_convert_double(state_->converter.get(), value) : value;
@@ -77,6 +80,8 @@ bool qunAreEquivalent(std::string_view unitText, std::string_view otherText) {
   return one && other && ut_are_convertible(one.get(), other.get()) != 0;
 }
 
-bool qunIsUnit(std::string_view unitText) { return parseUnit(unitText) != nullptr; }
+bool qunIsUnit(std::string_view unitText) {
+  return parseUnit(unitText) != nullptr;
+}
 
 }  // namespace gridbay

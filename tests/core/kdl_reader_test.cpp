@@ -21,16 +21,18 @@ std::string normalised(std::string_view text) {
 }
 
 TEST(KdlReader, SectionsKeywordsAndAllKindsOfValues) {
-  EXPECT_EQ(normalised("T {A 1 -2 +3 1_000\nB 1.5 -2e3 0x1F #inf #-inf\nC #true #false; D (file)\"a\" (result)b \"c d\"\n"
-                       "  E {}; F\n}"),
-            "T {\n"
-            "    A 1 -2 3 1000\n"
-            "    B 1.5 -2e3 31 #inf #-inf\n"
-            "    C #true #false\n"
-            "    D (file)\"a\" (result)\"b\" \"c d\"\n"
-            "    E {}\n"
-            "    F\n"
-            "}\n");
+  EXPECT_EQ(
+      normalised(
+          "T {A 1 -2 +3 1_000\nB 1.5 -2e3 0x1F #inf #-inf\nC #true #false; D (file)\"a\" (result)b \"c d\"\n"
+          "  E {}; F\n}"),
+      "T {\n"
+      "    A 1 -2 3 1000\n"
+      "    B 1.5 -2e3 31 #inf #-inf\n"
+      "    C #true #false\n"
+      "    D (file)\"a\" (result)\"b\" \"c d\"\n"
+      "    E {}\n"
+      "    F\n"
+      "}\n");
 }
 
 TEST(KdlReader, AnEmptySectionIsToldFromAKeywordWithNoValues) {
@@ -41,28 +43,34 @@ TEST(KdlReader, AnEmptySectionIsToldFromAKeywordWithNoValues) {
 }
 
 TEST(KdlReader, EscapesAndTextsOfSeveralLines) {
-  EXPECT_EQ(normalised("A \"q\\\" b\\\\ n\\n t\\t u\\u{e9} s\\s e\\   \n  nd\"\n"), "A \"q\\\" b\\\\ n\\n t\\t ué s  end\"\n");
+  EXPECT_EQ(normalised("A \"q\\\" b\\\\ n\\n t\\t u\\u{e9} s\\s e\\   \n  nd\"\n"),
+            "A \"q\\\" b\\\\ n\\n t\\t ué s  end\"\n");
   EXPECT_EQ(normalised("A \"\"\"\n    one\n      two\n\n    \"\"\"\n"), "A \"one\\n  two\\n\"\n");
   EXPECT_EQ(normalised("A #\"raw \\n \"quoted\"\"#\n"), "A \"raw \\\\n \\\"quoted\\\"\"\n");
 }
 
 TEST(KdlReader, CommentsAndSlashdashes) {
-  EXPECT_EQ(normalised("// one\nA 1 /* two /* three */ */ 2 /- 3\n/- B { C 1; D { E } }\nF /- { G } { H } /- { I }\n"
-                       "J \\ // goes on\n 7\n/- K x=1 #null\n"),
+  EXPECT_EQ(normalised(
+                "// one\nA 1 /* two /* three */ */ 2 /- 3\n/- B { C 1; D { E } }\nF /- { G } { H } /- { I }\n"
+                "J \\ // goes on\n 7\n/- K x=1 #null\n"),
             "A 1 2\nF {\n    H\n}\nJ 7\n");
 }
 
 TEST(KdlReader, ErrorsNameLineColumnWhatWasFoundAndWhatWasExpected) {
-  EXPECT_EQ(errorOf("A {\n  B 1\n"), "line 3, column 1: found the end of the file, expected \"}\" to close the block of \"A\"");
-  EXPECT_EQ(errorOf("A 1\n}\n"), "line 2, column 1: found \"}\", expected a section or keyword; no block is open here");
+  EXPECT_EQ(errorOf("A {\n  B 1\n"),
+            "line 3, column 1: found the end of the file, expected \"}\" to close the block of \"A\"");
+  EXPECT_EQ(errorOf("A 1\n}\n"),
+            "line 2, column 1: found \"}\", expected a section or keyword; no block is open here");
   EXPECT_EQ(errorOf("A 1 ]\n"), "line 1, column 5: found \"]\", expected a value");
   EXPECT_EQ(errorOf("A \"ü\" 1.x\n"), "line 1, column 9: found \"x\", expected a digit");
   EXPECT_EQ(errorOf("A \"open\nB\n"),
-            "line 1, column 8: found the end of the line, expected a closing quote on the same line (a text of several "
+            "line 1, column 8: found the end of the line, expected a closing quote on the same line (a text "
+            "of several "
             "lines stands between \"\"\")");
   EXPECT_EQ(errorOf("A true\n"), "line 1, column 3: found \"true\", expected #true (or the word in quotes)");
   EXPECT_EQ(errorOf("A \"\\q\"\n"),
-            "line 1, column 4: found an unknown escape in this text, expected \\n, \\r, \\t, \\b, \\f, \\s, \\\", \\\\ or "
+            "line 1, column 4: found an unknown escape in this text, expected \\n, \\r, \\t, \\b, \\f, \\s, "
+            "\\\", \\\\ or "
             "\\u{...}");
 }
 
@@ -80,9 +88,13 @@ TEST(KdlReader, TextThatIsNotUtf8) {
             "line 2, column 4: found a byte that is not UTF-8 text, expected readable UTF-8 text");
   EXPECT_EQ(errorOf(std::string_view("A\0B", 3)),
             "line 1, column 2: found a zero byte: this is not a text file, expected readable UTF-8 text");
-  EXPECT_THAT(errorOf("\xFF\xFE" "A"), HasSubstr("found UTF-16 text"));
+  EXPECT_THAT(errorOf("\xFF\xFE"
+                      "A"),
+              HasSubstr("found UTF-16 text"));
   EXPECT_THAT(errorOf("A \x1B\n"), HasSubstr("found a control character"));
-  EXPECT_EQ(normalised("\xEF\xBB\xBF" "A 1\n"), "A 1\n");
+  EXPECT_EQ(normalised("\xEF\xBB\xBF"
+                       "A 1\n"),
+            "A 1\n");
 }
 
 TEST(KdlReader, NestingIsBounded) {
@@ -100,7 +112,8 @@ TEST(KdlReader, NestingIsBounded) {
 
 TEST(KdlReader, EveryTruncationOfAFileIsReadOrRefused) {
   const std::string whole =
-      "T { // c\n A 1 -2.5e3 \"t\\u{41}\" (file)\"f\" #true\n /* x */ S { B \"\"\"\n  m\n  \"\"\"; C #\"r\"# } }\n";
+      "T { // c\n A 1 -2.5e3 \"t\\u{41}\" (file)\"f\" #true\n /* x */ S { B \"\"\"\n  m\n  \"\"\"; C #\"r\"# "
+      "} }\n";
   for (std::size_t length = 0; length <= whole.size(); ++length) {
     const ReadText read = readKdl(FileText(std::string_view(whole).substr(0, length)));
     EXPECT_TRUE(read.tree != nullptr || !read.error.expected.empty()) << length;
@@ -115,7 +128,8 @@ TEST(KdlWriter, NamesAndTextsThatNeedQuotes) {
     ParameterTree::append(tree.root(), last, *node);
     last = node;
   }
-  EXPECT_EQ(*kdlText(tree.root()), "plain-Name_1\n\"two words\"\n\"1st\"\n\"true\"\n\"a=b\"\n\"\"\n\"-5\"\n\".5\"\nö\n");
+  EXPECT_EQ(*kdlText(tree.root()),
+            "plain-Name_1\n\"two words\"\n\"1st\"\n\"true\"\n\"a=b\"\n\"\"\n\"-5\"\n\".5\"\nö\n");
 }
 
 TEST(KdlWriter, ATextThatIsNotUtf8IsNotWritten) {

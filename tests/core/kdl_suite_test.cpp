@@ -25,12 +25,15 @@ ReadText readDocument(const fs::path& path) {
 }
 
 bool isLeftOut(const std::string& error) {
-  return std::ranges::any_of(kLeftOut, [&](std::string_view words) { return error.find(words) != error.npos; });
+  return std::ranges::any_of(kLeftOut,
+                             [&](std::string_view words) { return error.find(words) != error.npos; });
 }
 
 // The suite writes numbers in its own way, so they are compared as numbers.
 bool sameValue(const Value& a, const Value& b) {
-  const auto isNumber = [](const Value& v) { return v.kind() == ValueKind::integer || v.kind() == ValueKind::real; };
+  const auto isNumber = [](const Value& v) {
+    return v.kind() == ValueKind::integer || v.kind() == ValueKind::real;
+  };
   if (!isNumber(a) || !isNumber(b)) return a.kind() == b.kind() && a.text() == b.text();
   const double x = doubleOfText(a.text()).value_or(0);
   const double y = doubleOfText(b.text()).value_or(0);
@@ -70,8 +73,7 @@ TEST(KdlSuite, ReadsWhatASetupCanHoldAndRefusesTheRest) {
       // refused too.
       const ReadText expected = readDocument(folder / "expected_kdl" / entry.path().filename());
       const bool hasIt = expected.tree == nullptr && isLeftOut(expected.error.text());
-      const bool isNormalisedAway = error.find("64 bits") != error.npos ||
-                                    input.error.found == "\"{\"";
+      const bool isNormalisedAway = error.find("64 bits") != error.npos || input.error.found == "\"{\"";
       EXPECT_TRUE(hasIt || isNormalisedAway) << error;
       ++leftOut;
     } else {
@@ -82,7 +84,8 @@ TEST(KdlSuite, ReadsWhatASetupCanHoldAndRefusesTheRest) {
       ++read;
     }
   }
-  std::cout << "KDL suite: " << read << " read, " << refused << " refused, " << leftOut << " hold what a setup does not\n";
+  std::cout << "KDL suite: " << read << " read, " << refused << " refused, " << leftOut
+            << " hold what a setup does not\n";
   EXPECT_GT(read, 100);
   EXPECT_GT(refused, 50);
 }

@@ -1,0 +1,317 @@
+#include "core/global_kvs.h"
+
+#include <gmock/gmock.h>
+
+#include "basic/area_description.h"
+#include "basic/bathymetry.h"
+#include "basic/boundary.h"
+#include "basic/mass_budget.h"
+#include "basic/simulation_period.h"
+#include "basic/source_sink.h"
+#include "core/edition.h"
+#include "core/setup_file.h"
+#include "tests/support/model.h"
+#include "tests/support/temporary_folder.h"
+
+namespace gridbay {
+namespace {
+
+using test::Model;
+using test::savedText;
+using ::testing::HasSubstr;
+using ::testing::Not;
+
+// A new model as it is saved, with the sections of a module's own data given.
+std::string newModelText(const std::string& selection, const std::string& advection = "",
+                         const std::string& mud = "", const std::string& expanded = "",
+                         const std::string& ecology = "") {
+  return "VANE27_NESTED_MODEL {\n"
+         "    NESTED_MODEL_GLOBALS {\n"
+         "        OPTION_PARAMETERS {}\n"
+         "        MODULE_SELECTION {\n" +
+         selection +
+         "        }\n"
+         "        BATHYMETRY_SELECTION {\n"
+         "            Projection \"\"\n"
+         "            CoriolisForce #false\n"
+         "            Land_Slides #false\n"
+         "            Overland_Solver #false\n"
+         "            Overland_Filename (file)\"\"\n"
+         "            No_Of_Areas 1\n"
+         "            Hot_Start 0\n"
+         "            AREA_1 {\n"
+         "                DATA_FILE {\n"
+         "                    FILE_NAME (file)\"\"\n"
+         "                }\n"
+         "                Origin 3 3\n"
+         "                Enclosing_Area 0\n"
+         "            }\n"
+         "        }\n"
+         "        OPEN_BOUNDARY {\n"
+         "            Number_Of_Boundaries 0\n"
+         "            Default_Position 1\n"
+         "        }\n"
+         "        SOURCE_AND_SINK {\n"
+         "            Number_Of_Sources 0\n"
+         "        }\n"
+         "        FLOOD_AND_DRY {\n"
+         "            Enable_Flood_And_Dry_Checking 1\n"
+         "            Drying_Depth 0.02\n"
+         "            Flooding_Depth 0.05\n"
+         "        }\n"
+         "        SIMULATION_PERIOD {\n"
+         "            Number_Of_Timesteps 100\n"
+         "            Time_Step_Interval 30.0\n"
+         "            Warm_Up_Period 0\n"
+         "            Start_Time 1990 1 1 12 0 0\n"
+         "        }\n"
+         "        MASS_BUDGET {\n"
+         "            NoOfPolygons 0\n"
+         "        }\n"
+         "    }\n"
+         "    HYDRODYNAMIC_MODULE {\n"
+         "        OPTION_PARAMETERS {}\n"
+         "        STRUCTURE_MODULE {}\n"
+         "        STRUCTURES {}\n"
+         "    }\n"
+         "    ADVECTION_DISPERSION_MODULE {\n"
+         "        OPTION_PARAMETERS {}\n" +
+         advection +
+         "    }\n"
+         "    MUD_TRANSPORT_MODULE {\n"
+         "        OPTION_PARAMETERS {}\n" +
+         mud +
+         "    }\n"
+         "    MUD_TRANSPORT_EXPANDED_MODULE {\n"
+         "        OPTION_PARAMETERS {}\n" +
+         expanded +
+         "    }\n"
+         "    BIO_RIG_MODULE {\n"
+         "        OPTION_PARAMETERS {}\n" +
+         ecology +
+         "    }\n"
+         "}\n";
+}
+
+std::string selectionText(int code) {
+  const bool pinned = theEdition.wetlandSweepKit;
+  return "            Simulation_Type " + std::to_string(pinned ? 0 : code) +
+         "\n            AD_Scheme 1\n            hydrodynamic_features " + (pinned ? "0" : "1") + "\n";
+}
+
+TEST(GlobalKvs, ANewModelIsWholeAndHasOneArea) {
+  Model model;
+  EXPECT_EQ(model.root.bathymetry->GetCount(), 1);
+  EXPECT_EQ(model.root.boundary->GetCount(), 0);
+  EXPECT_EQ(model.root.GetParent(), nullptr);
+  EXPECT_EQ(savedText(model.root), newModelText(selectionText(0)));
+}
+
+TEST(GlobalKvs, TheSectionsOfTheSelectedModuleAreWritten) {
+  Model model;
+  const auto textFor = [&model](int code) {
+    model.root.moduleSelection->simulationType = code;
+    return savedText(model.root);
+  };
+  EXPECT_EQ(textFor(2), newModelText(selectionText(2),
+                                     "        Cohesive_Sediment_Conditions {\n"
+                                     "            No_of_Sediment_Fractions 0\n"
+                                     "        }\n"));
+  EXPECT_EQ(textFor(3), newModelText(selectionText(3), "", "        MT_PARAMETERS {}\n"));
+  EXPECT_EQ(textFor(8), newModelText(selectionText(8), "", "",
+                                     "        FORCING_FUNCTIONS {\n"
+                                     "            WAVE_DATA {}\n"
+                                     "            DREDGING {}\n"
+                                     "        }\n"
+                                     "        Watercoloumn_Parameters {\n"
+                                     "            FALL_VELOCITY_PARAMETERS {}\n"
+                                     "        }\n"
+                                     "        BED_PARAMETERS {\n"
+                                     "            EROSION_COEFFICIENTS {}\n"
+                                     "            SLIDING {}\n"
+                                     "        }\n"
+                                     "        XENOBIOTIC_MODULE {\n"
+                                     "            OPTION_PARAMETERS {}\n"
+                                     "        }\n"));
+  EXPECT_EQ(textFor(9), newModelText(selectionText(9), "", "", "", "        AD_TRANSPORT_PARAMETERS {}\n"));
+  EXPECT_EQ(textFor(11), newModelText(selectionText(11)));
+}
+
+// A setup with options in every module section, loaded with its file as the source.
+struct Loaded {
+  explicit Loaded(std::string_view text) : file(test::fileOf(text)), root(&host) {
+    root.Load(&file->tree().root(), "/case/setup.v27");
+    root.SetSourceFile(file.get());
+  }
+  CollectingMessageHost host;
+  KvsHandle file;
+  CGlobalKvs root;
+};
+
+constexpr std::string_view kWithOptions =
+    "VANE27_NESTED_MODEL {\n"
+    " NESTED_MODEL_GLOBALS { OPTION_PARAMETERS { G 1 }; MODULE_SELECTION { Simulation_Type 8 } }\n"
+    " HYDRODYNAMIC_MODULE { OPTION_PARAMETERS { H 2.5; Deep { X \"y\"; X \"z\" } } }\n"
+    " ADVECTION_DISPERSION_MODULE { OPTION_PARAMETERS { A (file)\"f\" }; COMPONENT_SPECIFICATIONS { Number 4 "
+    "} }\n"
+    " MUD_TRANSPORT_MODULE { OPTION_PARAMETERS { M #true } }\n"
+    " MUD_TRANSPORT_EXPANDED_MODULE { OPTION_PARAMETERS { E 5 }\n"
+    "  XENOBIOTIC_MODULE { OPTION_PARAMETERS { Nested 6 } } }\n"
+    " XENOBIOTIC_MODULE { OPTION_PARAMETERS { Top 7 } }\n"
+    " BIO_RIG_MODULE { OPTION_PARAMETERS { B 8 } }\n"
+    "}\n";
+
+TEST(GlobalKvs, OptionsOfEveryModuleComeThroughWhateverIsSelected) {
+  Loaded loaded(kWithOptions);
+  for (const int code : {0, 2, 3, 8, 9}) {
+    loaded.root.moduleSelection->simulationType = code;
+    const std::string text = savedText(loaded.root);
+    EXPECT_THAT(text, HasSubstr("OPTION_PARAMETERS {\n            G 1\n        }\n"));
+    EXPECT_THAT(
+        text,
+        HasSubstr("OPTION_PARAMETERS {\n            H 2.5\n            Deep {\n                X \"y\"\n"
+                  "                X \"z\"\n            }\n        }\n"));
+    EXPECT_THAT(text, HasSubstr("A (file)\"f\"\n"));
+    EXPECT_THAT(text, HasSubstr("M #true\n"));
+    EXPECT_THAT(text, HasSubstr("E 5\n"));
+    EXPECT_THAT(text, HasSubstr("B 8\n"));
+    EXPECT_THAT(text, Not(HasSubstr("COMPONENT_SPECIFICATIONS")));
+  }
+}
+
+TEST(GlobalKvs, OptionsOfXenobioticsAreLookedForAtTheTopAndLostFromInside) {
+  Loaded loaded(kWithOptions);
+  loaded.root.moduleSelection->simulationType = 8;
+  const std::string text = savedText(loaded.root);
+  EXPECT_THAT(
+      text,
+      HasSubstr("        XENOBIOTIC_MODULE {\n            OPTION_PARAMETERS {\n                Top 7\n"));
+  EXPECT_THAT(text, Not(HasSubstr("Nested 6")));
+}
+
+TEST(GlobalKvs, WithoutASourceTheOptionsAreEmpty) {
+  Loaded loaded(kWithOptions);
+  loaded.root.SetSourceFile(nullptr);
+  EXPECT_THAT(savedText(loaded.root), Not(HasSubstr("G 1")));
+}
+
+TEST(GlobalKvs, TheModuleCodeIsPinnedInTheWetlandSweepKit) {
+  Loaded loaded(
+      "VANE27_NESTED_MODEL { NESTED_MODEL_GLOBALS { MODULE_SELECTION { Simulation_Type 2; AD_Scheme 5 } }\n"
+      " ADVECTION_DISPERSION_MODULE { COMPONENT_SPECIFICATIONS { Number 3 } } }");
+  EXPECT_EQ(loaded.root.moduleSelection->simulationType, theEdition.wetlandSweepKit ? 0 : 2);
+  EXPECT_THAT(savedText(loaded.root),
+              HasSubstr(theEdition.wetlandSweepKit ? "AD_Scheme 1\n" : "AD_Scheme 5\n"));
+}
+
+TEST(GlobalKvs, DataOfAModuleThatIsNotSelectedAreEmptiedBySaving) {
+  Loaded loaded(
+      "VANE27_NESTED_MODEL { NESTED_MODEL_GLOBALS {}\n"
+      " ADVECTION_DISPERSION_MODULE { OPTION_PARAMETERS { K 1 }; COMPONENT_SPECIFICATIONS { Number 3 } } }");
+  EXPECT_THAT(savedText(loaded.root), HasSubstr("    ADVECTION_DISPERSION_MODULE {\n"
+                                                "        OPTION_PARAMETERS {\n"
+                                                "            K 1\n"
+                                                "        }\n"
+                                                "    }\n"));
+}
+
+TEST(GlobalKvs, SectionsThatAreMissingKeepTheDefaults) {
+  for (const char* text :
+       {"", "OTHER {}", "VANE27_NESTED_MODEL {}", "VANE27_NESTED_MODEL { HYDRODYNAMIC_MODULE {} }"}) {
+    Loaded loaded(text);
+    EXPECT_EQ(loaded.root.simulationPeriod->noPointsInTime, 101) << text;
+    EXPECT_EQ(loaded.root.areaDescription->dryingDepth, 0.02F) << text;
+    EXPECT_TRUE(loaded.host.texts.empty());
+  }
+}
+
+TEST(GlobalKvs, ALoadedModelIsSavedAgainByteForByte) {
+  Model model;
+  model.root.boundary->SetNoBoundaries(2);
+  model.root.boundary->GetItem(2)->Set(1, 2, 1, 9);
+  model.root.sourceSink->SetNoSources(1);
+  model.root.bathymetry->GetArea(1)->fileName = "/case/grids/a.tsb2";
+  model.root.simulationPeriod->start = DateTime::of({2007, 6, 8, 1, 2, 3});
+  const std::string text = savedText(model.root);
+  Loaded loaded(text);
+  EXPECT_EQ(savedText(loaded.root), text);
+}
+
+TEST(GlobalKvs, CheckingWithoutDepthDoesNothing) {
+  Model model;
+  model.root.areaDescription->dryingDepth = -1;
+  ValidationList messages;
+  EXPECT_EQ(model.root.Validate(messages, 0), 0U);
+  EXPECT_TRUE(messages.empty());
+}
+
+TEST(GlobalKvs, TheCheckRunsInItsOrder) {
+  Model model;
+  model.root.massBudget->SetNoPolygons(1);
+  model.root.massBudget->GetItem(1)->corners.clear();
+  model.root.sourceSink->SetNoSources(1);
+  model.root.boundary->SetNoBoundaries(1);
+  model.root.boundary->GetItem(1)->Set(-1, 0, -1, 0);
+  model.root.simulationPeriod->timeStepInterval = 0;
+  model.root.areaDescription->dryingDepth = 0;
+  ValidationList messages;
+  EXPECT_EQ(model.root.Validate(messages, 1), 7U);
+  EXPECT_EQ(messages,
+            (ValidationList{
+                {PageId::bathymetry, "Data file  \" \"  is not valid", Severity::dependedUpon},
+                {PageId::floodAndDry, "Drying depth must be positive", Severity::fault},
+                {PageId::simulationPeriod, "Time step interval must be at least 0.01", Severity::fault},
+                {PageId::boundary, "First point coordinates can not be negative", Severity::fault},
+                {PageId::boundary, "Last point coordinates can not be negative", Severity::fault},
+                {PageId::sourceAndSink, "Source no.1 is outside of grid", Severity::fault},
+                {PageId::massBudget, "To few corner points in polygon", Severity::fault},
+            }));
+}
+
+TEST(GlobalKvs, ThePagesOfTheMessages) {
+  EXPECT_EQ(static_cast<int>(PageId::floodAndDry), 26);
+  EXPECT_EQ(static_cast<int>(PageId::bathymetry), 27);
+  EXPECT_EQ(static_cast<int>(PageId::boundary), 28);
+  EXPECT_EQ(static_cast<int>(PageId::massBudget), 34);
+  EXPECT_EQ(static_cast<int>(PageId::moduleSelection), 35);
+  EXPECT_EQ(static_cast<int>(PageId::simulationPeriod), 39);
+  EXPECT_EQ(static_cast<int>(PageId::sourceAndSink), 40);
+}
+
+TEST(SetupFile, KeepsTheSourceForLaterSaves) {
+  const test::TemporaryFolder folder;
+  const std::string path = folder.write("s.v27", kWithOptions);
+  CollectingMessageHost host;
+  Result<SetupFile> setup = SetupFile::open(path, &host);
+  ASSERT_TRUE(setup) << setup.error();
+  ASSERT_TRUE(setup->save(path));
+  ASSERT_TRUE(setup->save(path));
+  EXPECT_THAT(test::textOf(path), HasSubstr("H 2.5\n"));
+}
+
+TEST(SetupFile, AFileThatIsNoSetupIsRefused) {
+  const test::TemporaryFolder folder;
+  CollectingMessageHost host;
+  EXPECT_THAT(SetupFile::open(folder.write("a", ""), &host).error(),
+              HasSubstr("it has no section VANE27_NESTED_MODEL"));
+  EXPECT_THAT(SetupFile::open(folder.write("b", "X {}"), &host).error(), HasSubstr("is not a setup"));
+  EXPECT_THAT(SetupFile::open(folder.write("c", "VANE27_NESTED_MODEL {"), &host).error(),
+              HasSubstr("line 1, column 22"));
+  EXPECT_THAT(SetupFile::open(folder.file("none"), &host).error(), HasSubstr("No such file"));
+}
+
+TEST(SetupFile, TellsWhatASaveLeavesOutUnawares) {
+  const test::TemporaryFolder folder;
+  const std::string path = folder.write(
+      "s.v27",
+      "VANE27_NESTED_MODEL { NESTED_MODEL_GLOBALS { FUTURE { A 1 } }\n HYDRODYNAMIC_MODULE { STRANGE {} }\n"
+      " BIO_RIG_MODULE { CONSTANTS { A 1 } } }");
+  CollectingMessageHost host;
+  Result<SetupFile> setup = SetupFile::open(path, &host);
+  ASSERT_TRUE(setup);
+  EXPECT_EQ(setup->unknownSections(path),
+            (std::vector<std::string>{"NESTED_MODEL_GLOBALS/FUTURE", "HYDRODYNAMIC_MODULE/STRANGE"}));
+}
+
+}  // namespace
+}  // namespace gridbay

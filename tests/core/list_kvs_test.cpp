@@ -1,0 +1,157 @@
+#include "core/list_kvs.h"
+
+#include <gtest/gtest.h>
+
+#include "basic/bathymetry.h"
+#include "basic/boundary.h"
+#include "basic/mass_budget.h"
+#include "basic/source_sink.h"
+#include "tests/support/model.h"
+
+namespace gridbay {
+namespace {
+
+using test::load;
+using test::Model;
+using test::savedText;
+
+// A list of the tests' own that leads two others.
+class Item : public TableKvs<Item> {
+ public:
+  using TableKvs::TableKvs;
+  std::int32_t value = 7;
+  bool faulty = false;
+  static constexpr auto table() { return keywords(keyword("Value", &Item::value)); }
+  using TableKvs::Validate;
+  unsigned Validate(ValidationList& messages, int, int number) {
+    return faulty ? report(messages, PageId::boundary, Severity::fault, Text{"item %d"}, number) : 0U;
+  }
+};
+
+std::vector<std::pair<int, int>>& told() {
+  static std::vector<std::pair<int, int>> calls;
+  return calls;
+}
+
+class List : public ListKvs<List, Item> {
+ public:
+  using ListKvs::ListKvs;
+  std::int32_t other = 1;
+  static constexpr auto table() {
+    return section("LIST", count("Count"), keyword("Other", &List::other),
+                   items("ITEM_%d", {"Error in the KVS-FILE\nmissing"}));
+  }
+  void initialise(Item& item, int number) { item.value = 10 * number; }
+  static std::span<const Follower> followers() {
+    static constexpr Follower kFollowers[] = {[](CGlobalKvs&, int n) { told().emplace_back(1, n); },
+                                              [](CGlobalKvs&, int n) { told().emplace_back(2, n); }};
+    return kFollowers;
+  }
+};
+
+class ListKvsTest : public ::testing::Test {
+ protected:
+  void SetUp() override { told().clear(); }
+  Model model;
+  List list{&model.root};
+};
+
+TEST_F(ListKvsTest, AnEmptyListSavesItsCountAndNoSection) {
+  EXPECT_EQ(savedText(list), "LIST {\n    Count 0\n    Other 1\n}\n");
+  EXPECT_TRUE(test::messagesOf(list).empty());
+}
+
+TEST_F(ListKvsTest, ItemsStandInOrderInNumberedSections) {
+  list.SetCount(2);
+  EXPECT_EQ(savedText(list),
+            "LIST {\n    Count 2\n    Other 1\n    ITEM_1 {\n        Value 10\n    }\n    ITEM_2 {\n        "
+            "Value 20\n"
+            "    }\n}\n");
+}
+
+TEST_F(ListKvsTest, ANewCountKeepsTheHeadAndGrowsWithDefaults) {
+  list.SetCount(3);
+  list.GetItem(1)->value = 1;
+  list.GetItem(3)->value = 3;
+  list.SetCount(3);
+  EXPECT_EQ(list.GetItem(3)->value, 3);
+  list.SetCount(2);
+  list.SetCount(3);
+  EXPECT_EQ(list.GetItem(1)->value, 1);
+  EXPECT_EQ(list.GetItem(3)->value, 30);
+  list.SetCount(-1);
+  EXPECT_EQ(list.GetCount(), 3);
+  EXPECT_EQ(list.GetItem(0), nullptr);
+  EXPECT_EQ(list.GetItem(4), nullptr);
+}
+
+TEST_F(ListKvsTest, FollowersAreToldEachCountInTheirOrder) {
+  list.SetCount(2);
+  list.SetCount(2);
+  list.SetCount(-5);
+  EXPECT_EQ(told(), (std::vector<std::pair<int, int>>{{1, 2}, {2, 2}, {1, 2}, {2, 2}}));
+}
+
+TEST_F(ListKvsTest, AListThatStandsAloneHasNobodyToTell) {
+  List alone(nullptr);
+  alone.SetCount(2);
+  EXPECT_TRUE(told().empty());
+}
+
+TEST_F(ListKvsTest, AMissingSectionIsShownAndTheItemKeepsItsDefaults) {
+  load(list, "LIST { Count 3; Other 5; ITEM_1 { Value 1 }; ITEM_3 { Value 3 } }");
+  EXPECT_EQ(list.GetCount(), 3);
+  EXPECT_EQ(list.GetItem(2)->value, 20);
+  EXPECT_EQ(list.GetItem(3)->value, 3);
+  EXPECT_EQ(list.other, 5);
+  EXPECT_EQ(model.host.texts, std::vector<std::string>{"Error in the KVS-FILE\nmissing"});
+}
+
+TEST_F(ListKvsTest, CountsThatAreMissingOrNegativeOrNoNumbers) {
+  list.SetCount(2);
+  load(list, "LIST { Count -1 }");
+  EXPECT_EQ(list.GetCount(), 2);
+  load(list, "LIST { Count \"3\" }");
+  EXPECT_EQ(list.GetCount(), 0);
+  list.SetCount(2);
+  load(list, "LIST { Other 3 }");
+  EXPECT_EQ(list.GetCount(), 0);
+  list.SetCount(2);
+  load(list, "OTHER { Count 1 }");
+  EXPECT_EQ(list.GetCount(), 2);
+  EXPECT_TRUE(model.host.texts.empty());
+}
+
+TEST_F(ListKvsTest, ACountIsBelievedOnlyAsFarAsTheFileBearsItOut) {
+  load(list, "LIST { Count 2147483647; ITEM_1 { Value 1 } }");
+  EXPECT_EQ(list.GetCount(), 1 + kCountSlack);
+  ASSERT_EQ(model.host.texts.size(), std::size_t{1} + kCountSlack);
+  EXPECT_EQ(model.host.texts.front(),
+            "Error in the KVS-FILE\nSection LIST says 2147483647, which is far more than the 1 sections that "
+            "follow; 1025 "
+            "are kept");
+}
+
+TEST_F(ListKvsTest, ItemsAreCheckedWithTheirNumberAndOnlyDeep) {
+  list.SetCount(3);
+  list.GetItem(1)->faulty = true;
+  list.GetItem(3)->faulty = true;
+  ValidationList messages;
+  EXPECT_EQ(list.Validate(messages, 0), 0U);
+  EXPECT_TRUE(messages.empty());
+  EXPECT_EQ(list.Validate(messages, 1), 2U);
+  EXPECT_EQ(test::textsOf(messages), (std::vector<std::string>{"item 1", "item 3"}));
+}
+
+TEST_F(ListKvsTest, CopyingRebuildsTheList) {
+  list.SetCount(2);
+  list.GetItem(2)->value = 99;
+  list.other = 4;
+  List copy(&model.root);
+  copy.SetCount(5);
+  copy.CopyFrom(list);
+  EXPECT_EQ(savedText(copy), savedText(list));
+}
+
+}  // namespace
+}  // namespace gridbay

@@ -1,0 +1,86 @@
+#include "platform/cartography/cartography.h"
+
+#include <gmock/gmock.h>
+
+namespace gridbay {
+namespace {
+
+using ::testing::HasSubstr;
+using ::testing::StartsWith;
+
+TEST(MapProjection, ByZoneCodeAndFullText) {
+  for (const std::string& text : {std::string("UTM-32"), std::string("EPSG:32632"),
+                                 CVdPRJParser::Format("UTM-32"), CVdMapProjection("UTM-32").Wkt()}) {
+    const CVdMapProjection map(text);
+    ASSERT_TRUE(map.IsValid()) << text;
+    EXPECT_FALSE(map.IsLocal());
+    double east = 0;
+    double north = 0;
+    ASSERT_TRUE(map.Geo2Proj(9, 55, &east, &north));
+    EXPECT_NEAR(east, 500000, 1e-3);
+    EXPECT_NEAR(north, 6094791.419, 1);
+    double longitude = 0;
+    double latitude = 0;
+    ASSERT_TRUE(map.Proj2Geo(east, north, &longitude, &latitude));
+    EXPECT_NEAR(longitude, 9, 1e-9);
+    EXPECT_NEAR(latitude, 55, 1e-9);
+  }
+  EXPECT_EQ(CVdMapProjection("UTM-32").Name(), "WGS 84 / UTM zone 32N");
+  EXPECT_EQ(CVdMapProjection("UTM-56S").Name(), "WGS 84 / UTM zone 56S");
+  EXPECT_EQ(CVdMapProjection("EPSG:28356").Name(), "GDA94 / MGA zone 56");
+}
+
+TEST(MapProjection, FullTexts) {
+  EXPECT_THAT(CVdPRJParser::Format("UTM-32"), StartsWith("PROJCS[\"WGS_1984_UTM_Zone_32N\""));
+  EXPECT_EQ(CVdPRJParser::Format("UTM-32"), CVdMapProjection("UTM-32").GetProjectionString());
+  EXPECT_EQ(CVdPRJParser::Format("nonsense"), "");
+}
+
+TEST(MapProjection, LocalCoordinatesHaveNoPlace) {
+  const std::string local = CVdMapProjection::IDtoProjectionString(1);
+  EXPECT_EQ(local, "Local Coordinates");
+  for (const std::string& text : {local, std::string(), std::string("LOCAL_CS[\"x\"]")}) {
+    const CVdMapProjection map(text);
+    EXPECT_TRUE(map.IsLocal());
+    EXPECT_TRUE(map.IsValid());
+    double east = 7;
+    double north = 8;
+    EXPECT_FALSE(map.Geo2Proj(9, 55, &east, &north));
+    EXPECT_EQ(east, 7);
+    EXPECT_FALSE(map.Proj2Geo(1, 2, &east, &north));
+    EXPECT_EQ(map.Wkt(), "");
+  }
+  EXPECT_THAT(CVdMapProjection::IDtoProjectionString(2), HasSubstr("WGS_1984"));
+  EXPECT_EQ(CVdMapProjection::IDtoProjectionString(99), "");
+}
+
+TEST(MapProjection, TextsThatNameNone) {
+  for (const char* text : {"UTM-0", "UTM-61", "UTM-x", "UTM-32Q", "EPSG:1", "PROJCS[", "nonsense"}) {
+    EXPECT_FALSE(CVdMapProjection(text).IsValid()) << text;
+  }
+}
+
+TEST(Cartography, OriginAndRotation) {
+  const CVdCartography turned("UTM-32", 1000, 2000, 90);  // y eastwards, x southwards
+  double east = 0;
+  double north = 0;
+  turned.Xy2Proj(0, 10, &east, &north);
+  EXPECT_NEAR(east, 1010, 1e-9);
+  EXPECT_NEAR(north, 2000, 1e-9);
+  double x = 0;
+  double y = 0;
+  turned.Proj2Xy(east, north, &x, &y);
+  EXPECT_NEAR(x, 0, 1e-9);
+  EXPECT_NEAR(y, 10, 1e-9);
+  const CVdCartography plain("UTM-32", 0, 0, 0);
+  double longitude = 0;
+  double latitude = 0;
+  ASSERT_TRUE(plain.Proj2Geo(500000, 6094791.419, &longitude, &latitude));
+  EXPECT_NEAR(longitude, 9, 1e-6);
+  EXPECT_NEAR(latitude, 55, 1e-4);
+  ASSERT_TRUE(plain.Geo2Proj(9, 55, &east, &north));
+  EXPECT_NEAR(east, 500000, 1e-3);
+}
+
+}  // namespace
+}  // namespace gridbay

@@ -1,0 +1,349 @@
+#include <gmock/gmock.h>
+#include <netcdf.h>
+
+#include <filesystem>
+#include <random>
+
+#include "platform/tsb/tsb_file.h"
+#include "platform/tsb/tsb_operations.h"
+#include "platform/tsb/tsb_writer.h"
+#include "tests/support/grids.h"
+#include "tests/support/programs.h"
+#include "tests/support/temporary_folder.h"
+
+namespace gridbay {
+namespace {
+
+using ::testing::AllOf;
+using ::testing::AnyOf;
+using ::testing::HasSubstr;
+
+class Tsb : public ::testing::Test {
+ protected:
+  std::string openError() {
+    const Result<TsbFile> file = TsbFile::open(path);
+    return file ? "" : file.error();
+  }
+  test::TemporaryFolder folder;
+  std::string path = folder.file("f ö.tsb2");
+};
+
+// A definition with all that there can be, of so many dimensions.
+TsbDefinition full(std::size_t dimensions, TsbTimeAxisType type) {
+  TsbDefinition definition;
+  definition.title = "A title";
+  definition.dataType = 3;
+  definition.time.type = type;
+  definition.time.start = {2007, 6, 8, 1, 2, 3};
+  definition.time.unit = "min";
+  definition.time.first = 5;
+  definition.time.step = 2.5;
+  definition.time.count = 3;
+  if (!definition.time.isEquidistant()) definition.time.values = {0, 1, 10};
+  if (dimensions > 0) definition.axes.push_back({4, 100, 0.5, "m"});
+  if (dimensions > 1) definition.axes.push_back({3, -7, 2, "m"});
+  definition.items = {{"Surface", 100078, "m"}, {"Surface", 100001, "m3 s-1", true, -999}};
+  definition.customBlocks = {{"V27_Misc", {1, 2, 3, 4}}, {"Other block", {5}}};
+  definition.geography = TsbGeography{"UTM-32", 9.5, 55.25, 12};
+  return definition;
+}
+
+float valueAt(std::size_t item, std::size_t step, std::size_t i) {
+  return static_cast<float>(item * 1000 + step * 100 + i) + 0.25F;
+}
+
+TEST_F(Tsb, EveryShapeAndTimeAxisComesBack) {
+  for (const std::size_t dimensions : {0U, 1U, 2U}) {
+    for (const int type : {1, 2, 3, 4}) {
+      SCOPED_TRACE(std::to_string(dimensions) + " dimensions, time axis " + std::to_string(type));
+      const TsbDefinition wanted = full(dimensions, static_cast<TsbTimeAxisType>(type));
+      {
+        Result<TsbWriter> writer = TsbWriter::create(path, wanted);
+        ASSERT_TRUE(writer) << writer.error();
+        for (std::size_t item = 1; item <= 2; ++item) {
+          for (std::size_t step = 0; step < 3; ++step) {
+            std::vector<float> values;
+            for (std::size_t i = 0; i < wanted.pointCount(); ++i) values.push_back(valueAt(item, step, i));
+            ASSERT_TRUE(writer->write(item, step, std::span<const float>(values)));
+          }
+        }
+        ASSERT_TRUE(writer->commit());
+      }
+      const Result<TsbFile> file = TsbFile::open(path);
+      ASSERT_TRUE(file) << file.error();
+      const TsbDefinition& got = file->definition();
+      EXPECT_EQ(got.title, wanted.title);
+      EXPECT_EQ(got.dataType, 3);
+      EXPECT_EQ(got.time.type, wanted.time.type);
+      EXPECT_EQ(got.time.unit, "min");
+      EXPECT_EQ(got.time.count, 3U);
+      for (std::size_t i = 0; i < 3; ++i) EXPECT_EQ(got.time.at(i), wanted.time.at(i));
+      if (wanted.time.isCalendar()) EXPECT_EQ(got.time.start, wanted.time.start);
+      ASSERT_EQ(got.axes.size(), dimensions);
+      for (std::size_t i = 0; i < dimensions; ++i) {
+        EXPECT_EQ(got.axes[i].points, wanted.axes[i].points);
+        EXPECT_EQ(got.axes[i].first, wanted.axes[i].first);
+        EXPECT_EQ(got.axes[i].spacing, wanted.axes[i].spacing);
+        EXPECT_EQ(got.axes[i].unit, "m");
+      }
+      ASSERT_EQ(got.items.size(), 2U);
+      EXPECT_EQ(got.items[1].name, "Surface");
+      EXPECT_EQ(got.items[1].type, 100001);
+      EXPECT_EQ(got.items[1].unit, "m3 s-1");
+      EXPECT_TRUE(got.items[1].isDouble);
+      EXPECT_EQ(got.items[1].deleteValue, -999);
+      EXPECT_EQ(static_cast<float>(got.items[0].deleteValue), -1e-35F);
+      ASSERT_EQ(got.customBlocks.size(), 2U);
+      EXPECT_EQ(got.customBlocks[1].name, "Other block");
+      EXPECT_EQ(got.customBlocks[0].values, (std::vector<float>{1, 2, 3, 4}));
+      ASSERT_TRUE(got.geography);
+      EXPECT_EQ(got.geography->projection, "UTM-32");
+      EXPECT_EQ(got.geography->longitude, 9.5);
+      EXPECT_EQ(got.geography->latitude, 55.25);
+      EXPECT_EQ(got.geography->rotation, 12);
+      for (std::size_t item = 1; item <= 2; ++item) {
+        for (std::size_t step = 0; step < 3; ++step) {
+          std::vector<float> values(got.pointCount());
+          ASSERT_TRUE(file->read(item, step, std::span<float>(values)));
+          for (std::size_t i = 0; i < values.size(); ++i) ASSERT_EQ(values[i], valueAt(item, step, i));
+        }
+      }
+    }
+  }
+}
+
+TEST_F(Tsb, TheOperations) {
+  TsbHeader header;
+  std::string error;
+  EXPECT_NE(tsbFileRead(path, &header, &error), 0);
+  EXPECT_THAT(error, HasSubstr("there is no such file"));
+  test::GridSpec spec{.noJ = 5, .noK = 4, .dx = 20, .dy = 25, .items = 2, .steps = 2};
+  spec.geography = TsbGeography{"UTM-32", 9, 55, 1};
+  spec.time.step = 2;
+  spec.time.unit = "h";
+  test::writeGrid(path, spec);
+  ASSERT_EQ(tsbFileRead(path, &header), 0);
+  EXPECT_EQ(tsbGetNoOfItems(header), 2);
+  int type = 0;
+  std::string name;
+  std::string unit;
+  EXPECT_EQ(tsbGetItemInfo(header, 2, &type, &name, &unit), 0);
+  EXPECT_EQ(type, 100079);
+  EXPECT_EQ(name, "Item 2");
+  EXPECT_EQ(unit, "m");
+  EXPECT_NE(tsbGetItemInfo(header, 3, &type, &name, &unit), 0);
+  EXPECT_EQ(tsbItemD(header, 0), nullptr);
+  EXPECT_EQ(tsbItemD(header, 1)->name, "Item 1");
+  EXPECT_EQ(static_cast<int>(tsbGetItemAxisType(header, 1)), 5);
+  int noJ = 0;
+  int noK = 0;
+  float dx = 0;
+  float dy = 0;
+  EXPECT_EQ(tsbGetItemAxisEqD2(header, 1, &noJ, &noK, &dx, &dy), 0);
+  EXPECT_EQ(noJ, 5);
+  EXPECT_EQ(noK, 4);
+  EXPECT_EQ(dx, 20.0F);
+  EXPECT_EQ(dy, 25.0F);
+  std::vector<float> values(20);
+  EXPECT_EQ(tsbFindBlockDynamic(&header), 0);
+  EXPECT_EQ(tsbReadItemTimeStep(header, values), 0);
+  EXPECT_EQ(tsbFindItemDynamic(&header, 1, 2), 0);
+  EXPECT_NE(tsbFindItemDynamic(&header, 2, 1), 0);
+  EXPECT_NE(tsbFindItemDynamic(&header, -1, 1), 0);
+  EXPECT_NE(tsbFindItemDynamic(&header, 0, 3), 0);
+  values.resize(19);
+  EXPECT_NE(tsbReadItemTimeStep(header, values), 0);
+  std::string date;
+  std::string time;
+  double step = 0;
+  EXPECT_EQ(tsbGetEqCalendarAxis(header, &date, &time, &step), 0);
+  EXPECT_EQ(date, "1990-1-1");
+  EXPECT_EQ(time, "12:0:0");
+  EXPECT_EQ(step, 7200);
+  EXPECT_EQ(tsbGetGeoInfoType(header), 1);
+  double longitude = 0;
+  double latitude = 0;
+  double rotation = 0;
+  EXPECT_EQ(tsbGetGeoInfoUTMProj(header, &name, &longitude, &latitude, &rotation), 0);
+  EXPECT_EQ(name, "UTM-32");
+  EXPECT_EQ(rotation, 1);
+  const TsbCustomBlock* block = nullptr;
+  std::span<const float> numbers;
+  EXPECT_EQ(tsbGetCustomBlockRef(header, &block), 0);
+  EXPECT_EQ(tsbGetCustomBlock(header, &block, &name, &numbers), 0);
+  EXPECT_EQ(name, "V27_Misc");
+  EXPECT_EQ(numbers[3], 10.0F);
+  EXPECT_EQ(block, nullptr);
+  EXPECT_NE(tsbGetCustomBlock(header, &block, &name, &numbers), 0);
+  tsbFileClose(&header);
+  tsbHeaderDestroy(&header);
+  EXPECT_EQ(header.file, nullptr);
+
+  test::writeGrid(path, {});
+  ASSERT_EQ(tsbFileRead(path, &header), 0);
+  EXPECT_EQ(tsbGetGeoInfoType(header), 0);
+  EXPECT_NE(tsbGetGeoInfoUTMProj(header, &name, &longitude, &latitude, &rotation), 0);
+}
+
+TEST_F(Tsb, WritingByRows) {
+  Result<TsbWriter> writer = TsbWriter::create(path, test::definitionOf({.noJ = 3, .noK = 4}));
+  ASSERT_TRUE(writer);
+  const std::vector<float> two{1, 2, 3, 4, 5, 6};
+  ASSERT_TRUE(writer->writeRows(1, 0, 2, two));
+  ASSERT_TRUE(writer->writeRows(1, 0, 0, two));
+  EXPECT_FALSE(writer->writeRows(1, 0, 3, two));
+  EXPECT_FALSE(writer->write(2, 0, std::span<const float>(two)));
+  EXPECT_FALSE(writer->write(1, 1, std::span<const float>(two)));
+  ASSERT_TRUE(writer->commit());
+  std::vector<float> values(12);
+  ASSERT_TRUE(TsbFile::open(path)->read(1, 0, std::span<float>(values)));
+  EXPECT_EQ(values, (std::vector<float>{1, 2, 3, 4, 5, 6, 1, 2, 3, 4, 5, 6}));
+}
+
+TEST_F(Tsb, DefinitionsThatCannotBe) {
+  const auto errorOf = [this](auto change) {
+    TsbDefinition definition = test::definitionOf({});
+    change(definition);
+    const Result<TsbWriter> writer = TsbWriter::create(path, definition);
+    return writer ? "" : writer.error();
+  };
+  EXPECT_THAT(errorOf([](auto& d) { d.items.clear(); }), HasSubstr("no items are defined"));
+  EXPECT_THAT(errorOf([](auto& d) { d.axes[0].points = 0; }), HasSubstr("an axis has no points"));
+  EXPECT_THAT(errorOf([](auto& d) { d.axes.push_back({}); }), HasSubstr("at most two directions"));
+  EXPECT_THAT(errorOf([](auto& d) { d.time.type = TsbTimeAxisType::calendar; }),
+              HasSubstr("another number of values"));
+  path = folder.file("no/f.tsb2");
+  EXPECT_THAT(errorOf([](auto&) {}), HasSubstr("No such file or directory"));
+}
+
+TEST_F(Tsb, AWriterThatIsNotCommittedLeavesTheOldFile) {
+  test::writeGrid(path, {.noJ = 5});
+  { const Result<TsbWriter> writer = TsbWriter::create(path, test::definitionOf({.noJ = 7})); }
+  EXPECT_EQ(TsbFile::open(path)->definition().axes[0].points, 5U);
+  EXPECT_EQ(std::distance(std::filesystem::directory_iterator(folder.path()), {}), 1);
+}
+
+// Makes a file with the library alone, as a stranger would.
+void foreign(const std::string& path, const std::function<void(int)>& fill) {
+  int file = 0;
+  ASSERT_EQ(nc_create(path.c_str(), NC_NETCDF4 | NC_CLOBBER, &file), NC_NOERR);
+  fill(file);
+  ASSERT_EQ(nc_close(file), NC_NOERR);
+}
+
+int timeAxis(int file, std::size_t count, int type) {
+  int dimension = 0;
+  int variable = 0;
+  const double one = 1;
+  nc_def_dim(file, "time", count, &dimension);
+  nc_def_var(file, "time", NC_DOUBLE, 1, &dimension, &variable);
+  nc_put_att_text(file, variable, "units", 1, "s");
+  nc_put_att_int(file, variable, "axis_type", NC_INT, 1, &type);
+  nc_put_att_double(file, variable, "first_value", NC_DOUBLE, 1, &one);
+  nc_put_att_double(file, variable, "step", NC_DOUBLE, 1, &one);
+  return dimension;
+}
+
+void axis(int file, const char* name, std::size_t count) {
+  int dimension = 0;
+  int variable = 0;
+  const double one = 1;
+  nc_def_dim(file, name, count, &dimension);
+  nc_def_var(file, name, NC_FLOAT, 1, &dimension, &variable);
+  nc_def_var_chunking(file, variable, NC_CHUNKED, std::array<std::size_t, 1>{1024}.data());
+  nc_put_att_double(file, variable, "first_value", NC_DOUBLE, 1, &one);
+  nc_put_att_double(file, variable, "step", NC_DOUBLE, 1, &one);
+}
+
+TEST_F(Tsb, FilesOfStrangers) {
+  foreign(path, [](int) {});
+  EXPECT_THAT(openError(), HasSubstr("it has no time axis"));
+  foreign(path, [](int file) { timeAxis(file, 2, 1); });
+  EXPECT_THAT(openError(), HasSubstr("it has no items (variables with an item type)"));
+  foreign(path, [](int file) { timeAxis(file, 2, 9); });
+  EXPECT_THAT(openError(), HasSubstr("its time axis is of an unknown kind"));
+  foreign(path, [](int file) { timeAxis(file, NC_UNLIMITED, 1); });
+  EXPECT_THAT(openError(), HasSubstr("its time axis has no steps"));
+  foreign(path, [](int file) { timeAxis(file, 2, 3); });
+  EXPECT_THAT(openError(), HasSubstr("its time axis has no start date"));
+  foreign(path, [](int file) {
+    timeAxis(file, 2, 1);
+    axis(file, "x", NC_UNLIMITED);
+  });
+  EXPECT_THAT(openError(), HasSubstr("its axis x has no points"));
+  foreign(path, [](int file) {
+    const int dimension = timeAxis(file, 2, 1);
+    axis(file, "x", 3);
+    int variable = 0;
+    const int number = 1;
+    nc_def_var(file, "item", NC_FLOAT, 1, &dimension, &variable);
+    nc_put_att_int(file, variable, "item_number", NC_INT, 1, &number);
+  });
+  EXPECT_THAT(openError(), HasSubstr("does not have the shape of its axes"));
+}
+
+TEST_F(Tsb, AxesThatClaimMoreThanTheFileCanHold) {
+  foreign(path, [](int file) {
+    timeAxis(file, 1, 1);
+    axis(file, "x", 2000000000);
+    axis(file, "y", 2000000000);
+  });
+  EXPECT_THAT(openError(), HasSubstr("its axes say more points than the file can hold"));
+}
+
+TEST_F(Tsb, DamagedFilesAreRefusedOrRead) {
+  test::writeGrid(path, {.noJ = 20, .noK = 20});
+  const std::string whole = test::textOf(path);
+  std::mt19937 random(5);
+  int opened = 0;
+  for (int i = 0; i < 300; ++i) {
+    std::string damaged = whole;
+    for (int n = 0; n < 4; ++n) damaged[random() % damaged.size()] = static_cast<char>(random());
+    folder.write("d.tsb2", damaged);
+    const Result<TsbFile> file = TsbFile::open(folder.file("d.tsb2"));
+    if (!file) continue;
+    ++opened;
+    if (file->definition().pointCount() > 100000) continue;
+    std::vector<float> values(file->definition().pointCount());
+    const Outcome read = file->read(1, 0, std::span<float>(values));
+    EXPECT_TRUE(read || !read.error().empty());
+  }
+  EXPECT_GT(opened, 0);
+  EXPECT_LT(opened, 300);
+}
+
+// What other programs read in the files.
+TEST_F(Tsb, OtherProgramsReadAxesUnitsAndProjection) {
+  test::GridSpec spec{.noJ = 5, .noK = 4, .dx = 20, .dy = 25};
+  spec.geography = TsbGeography{"UTM-32", 9, 55, 0};
+  test::writeGrid(path, spec, [](int j, int k) { return static_cast<float>(10 * j + k); });
+  const test::ProgramRun dump = test::runProgram("ncdump", {"-h", path});
+  EXPECT_EQ(dump.status, 0) << dump.err;
+  EXPECT_THAT(dump.out,
+              AllOf(HasSubstr("float item_1(time, y, x)"), HasSubstr("item_1:units = \"m\""),
+                    HasSubstr("item_1:item_type = 100079"), HasSubstr("item_1:grid_mapping = \"projection\""),
+                    HasSubstr("time:units = \"s since 1990-01-01 12:00:00\""), HasSubstr("x:units = \"m\"")));
+  // The raster library has the file opened by its plain HDF5 reader unless it is told.
+  const test::ProgramRun gdal = test::runProgram("gdalinfo", {"NETCDF:" + path});
+  EXPECT_EQ(gdal.status, 0) << gdal.err;
+  EXPECT_THAT(gdal.out, AllOf(HasSubstr("Size is 5, 4"), HasSubstr("WGS 84 / UTM zone 32N"),
+                              HasSubstr("Origin = (-10.000000000000000,87.500000000000000)"),
+                              HasSubstr("Pixel Size = (20.000000000000000,-25.000000000000000)")));
+  const test::ProgramRun xarray = test::runProgram(
+      "/usr/bin/python3",
+      {"-c",
+       "import sys, xarray\n"
+       "d = xarray.open_dataset(sys.argv[1])\n"
+       "v = d['item_1']\n"
+       "print(v.dims, v.attrs['units'], list(d['x'].values), list(d['y'].values), d['time'].values[0],\n"
+       "      float(v[0, 3, 4]), d['projection'].attrs['crs_wkt'][:6])",
+       path});
+  EXPECT_EQ(xarray.status, 0) << xarray.err;
+  EXPECT_EQ(xarray.out,
+            "('time', 'y', 'x') m [0.0, 20.0, 40.0, 60.0, 80.0] [0.0, 25.0, 50.0, 75.0] "
+            "1990-01-01T12:00:00.000000000 43.0 "
+            "PROJCS\n");
+}
+
+}  // namespace
+}  // namespace gridbay
