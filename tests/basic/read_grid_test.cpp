@@ -20,6 +20,7 @@ const std::string kLandBelowZero = "True land defined in the bathymetry is less 
 
 class ReadGridTest : public ::testing::Test {
  protected:
+  test::TemporaryFolder folder;
   std::string path = folder.file("grid ä.tsb2");
   std::string notValid = "Data file  \" " + path + "\"  is not valid";
 
@@ -44,7 +45,6 @@ class ReadGridTest : public ::testing::Test {
   }
   CBathymetryObjectKvs& area() { return *model.root.bathymetry->GetArea(1); }
 
-  test::TemporaryFolder folder;
   Model model;
   unsigned errors = 0;
 };

@@ -19,12 +19,14 @@ class FileSelector : public ::testing::Test {
   }
   std::string ask() {
     std::string error;
-    EXPECT_EQ(selector.IsTsbFileValid(path, &error), error.empty());
+    const bool valid = selector.IsTsbFileValid(path, &error);
+    EXPECT_EQ(valid, error.empty());
     return error;
   }
   std::string ask(const std::vector<std::uint32_t>& items) {
     std::string error;
-    EXPECT_EQ(selector.IsTsbFileValid(path, items, &error), error.empty());
+    const bool valid = selector.IsTsbFileValid(path, items, &error);
+    EXPECT_EQ(valid, error.empty());
     return error;
   }
 

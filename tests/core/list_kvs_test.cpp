@@ -109,7 +109,7 @@ TEST_F(ListKvsTest, AMissingSectionIsShownAndTheItemKeepsItsDefaults) {
 
 TEST_F(ListKvsTest, CountsThatAreMissingOrNegativeOrNoNumbers) {
   list.SetCount(2);
-  load(list, "LIST { Count -1 }");
+  load(list, "LIST { Count -1; ITEM_1 {}; ITEM_2 {} }");
   EXPECT_EQ(list.GetCount(), 2);
   load(list, "LIST { Count \"3\" }");
   EXPECT_EQ(list.GetCount(), 0);

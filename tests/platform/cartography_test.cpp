@@ -10,7 +10,7 @@ using ::testing::StartsWith;
 
 TEST(MapProjection, ByZoneCodeAndFullText) {
   for (const std::string& text : {std::string("UTM-32"), std::string("EPSG:32632"),
-                                 CVdPRJParser::Format("UTM-32"), CVdMapProjection("UTM-32").Wkt()}) {
+                                  CVdPRJParser::Format("UTM-32"), CVdMapProjection("UTM-32").Wkt()}) {
     const CVdMapProjection map(text);
     ASSERT_TRUE(map.IsValid()) << text;
     EXPECT_FALSE(map.IsLocal());
