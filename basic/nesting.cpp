@@ -1,8 +1,6 @@
 #include "basic/nesting.h"
 
-#include <algorithm>
 #include <cmath>
-#include <ranges>
 
 namespace gridbay {
 namespace {
@@ -18,10 +16,16 @@ bool hasWrongRatio(float outer, float inner) {
 bool landRuleHolds(const CBathymetryObjectKvs& inner, const CBathymetryObjectKvs& outer, std::int64_t jextr,
                    std::int64_t kextr) {
   const auto columnIsLand = [&inner](int j) {
-    return std::ranges::all_of(std::views::iota(0, inner.noK), [&](int k) { return inner.isLand(j, k); });
+    for (int k = 0; k < inner.noK; ++k) {
+      if (!inner.isLand(j, k)) return false;
+    }
+    return true;
   };
   const auto rowIsLand = [&inner](int k) {
-    return std::ranges::all_of(std::views::iota(0, inner.noJ), [&](int j) { return inner.isLand(j, k); });
+    for (int j = 0; j < inner.noJ; ++j) {
+      if (!inner.isLand(j, k)) return false;
+    }
+    return true;
   };
   if (inner.origin.j < kNearBorder && !columnIsLand(0)) return false;
   if (inner.origin.k < kNearBorder && !rowIsLand(0)) return false;
