@@ -5,6 +5,7 @@
 #include "basic/bathymetry.h"
 #include "basic/boundary_detection.h"
 #include "core/global_kvs.h"
+#include "hydrodynamic/boundary.h"
 
 namespace gridbay {
 
@@ -37,7 +38,7 @@ float CBoundaryObjectKvs::CellSpacing() {
 }
 
 std::span<const Follower> CBoundaryKvs::followers() {
-  static constexpr std::array<Follower, 0> kFollowers{};
+  static constexpr std::array kFollowers{&resizeFollower<&CGlobalKvs::nhdBoundary>};
   return kFollowers;
 }
 

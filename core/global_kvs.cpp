@@ -9,6 +9,7 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "core/module_selection.h"
+#include "hydrodynamic/boundary.h"
 
 namespace gridbay {
 namespace {
@@ -71,6 +72,7 @@ constexpr Row kSkeleton[] = {
     child<&G::massBudget>("NESTED_MODEL_GLOBALS"),
 
     options("HYDRODYNAMIC_MODULE"),
+    child<&G::nhdBoundary>("HYDRODYNAMIC_MODULE"),
     sectionOnly("HYDRODYNAMIC_MODULE/STRUCTURE_MODULE"),
     sectionOnly("HYDRODYNAMIC_MODULE/STRUCTURES"),
 
@@ -102,8 +104,9 @@ struct Check {
 };
 
 constexpr Check kChecks[] = {
-    {childOf<&G::bathymetry>}, {childOf<&G::areaDescription>}, {childOf<&G::simulationPeriod>},
-    {childOf<&G::boundary>},   {childOf<&G::sourceSink>},      {childOf<&G::massBudget>},
+    {childOf<&G::bathymetry>},  {childOf<&G::areaDescription>}, {childOf<&G::simulationPeriod>},
+    {childOf<&G::boundary>},    {childOf<&G::sourceSink>},      {childOf<&G::massBudget>},
+    {childOf<&G::nhdBoundary>},
 };
 
 std::vector<std::string_view> partsOf(std::string_view place) {

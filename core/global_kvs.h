@@ -15,6 +15,7 @@ class CBoundaryKvs;
 class CSourceSinkKvs;
 class CMassBudgetKvs;
 class CAreaDescriptionKvs;
+class CNhdBoundaryKvs;
 
 // The root of a model: owns one object for each page-sized part of the setup, and knows the skeleton of the
 // parameter file. A part reaches any other one through a member of the root. To add a part, declare its
@@ -36,6 +37,7 @@ class CGlobalKvs final : public CKvsBase {
   std::unique_ptr<CSourceSinkKvs> sourceSink;
   std::unique_ptr<CMassBudgetKvs> massBudget;
   std::unique_ptr<CAreaDescriptionKvs> areaDescription;
+  std::unique_ptr<CNhdBoundaryKvs> nhdBoundary;
 
   // The loaded file from which a save passes on the options that the editor does not know; null for a new
   // model. It must stay open as long as saves are to have them.

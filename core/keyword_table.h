@@ -9,6 +9,7 @@
 #include "core/file_name.h"
 #include "core/grid_point.h"
 #include "core/kvs.h"
+#include "core/selections.h"
 
 // A data object names each field once, in a table in file order that ties keyword, type and member together:
 //
@@ -78,6 +79,26 @@ struct Keyword {
 template <class Object, class T>
 constexpr Keyword<Object, T> keyword(std::string_view name, T Object::*member) {
   return {name, member};
+}
+
+// A data file with its items, under keywords of its own.
+template <class Object>
+struct SelectionRow {
+  UTsbSelection Object::*member;
+  int noItems;
+
+  void save(const Object& object, KvsFile& file, const std::string& documentPath) const {
+    (object.*member).Save(file, documentPath);
+  }
+  void load(Object& object, KvsSection from, const std::string& documentPath) const {
+    (object.*member).Load(from, documentPath, noItems);
+  }
+  void copy(Object& object, const Object& other) const { (object.*member).UpdateData(other.*member); }
+};
+
+template <class Object>
+constexpr SelectionRow<Object> selection(UTsbSelection Object::*member, int noItems) {
+  return {member, noItems};
 }
 
 // A row that CopyFrom leaves out.

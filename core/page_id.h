@@ -10,6 +10,7 @@ enum class PageId : std::int32_t {
   floodAndDry = 26,
   bathymetry = 27,
   boundary = 28,
+  hdBoundary = 29,
   massBudget = 34,
   moduleSelection = 35,
   simulationPeriod = 39,

@@ -23,13 +23,15 @@ void UTsbSelection::Save(KvsFile& file, const std::string& documentPath) const {
 
 void UTsbSelection::Load(KvsSection section, const std::string& documentPath, int n) {
   fileName.Load(section, documentPath, kFileName);
-  if (const KvsKeyword numbers = kvsKeywordByNameNum(section, kItemNumbers, 1); numbers != nullptr) {
-    items.clear();
-    for (int i = 1; i <= kvsGetNoParams(numbers) && i <= n; ++i) {
-      items.push_back(static_cast<std::uint32_t>(kvsGetInt(kvsParamByNum(numbers, i))));
-    }
+  const KvsKeyword numbers = kvsKeywordByNameNum(section, kItemNumbers, 1);
+  if (numbers == nullptr) {
+    SetNoItems(n);
+    return;
   }
-  SetNoItems(n);
+  items.clear();
+  for (int i = 1; i <= kvsGetNoParams(numbers) && i <= n; ++i) {
+    items.push_back(static_cast<std::uint32_t>(kvsGetInt(kvsParamByNum(numbers, i))));
+  }
 }
 
 }  // namespace gridbay

@@ -18,7 +18,7 @@ class UTsbSelection {
   void UpdateData(const UTsbSelection& other) { *this = other; }
   // Keywords "File_Name" and "Item_Numbers" in the section of the owning object.
   void Save(KvsFile& file, const std::string& documentPath) const;
-  // Reads both and leaves `n` items.
+  // Reads both: at most `n` items where the file names some, else `n`.
   void Load(KvsSection section, const std::string& documentPath, int n);
 
   std::vector<std::uint32_t> items;

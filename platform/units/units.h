@@ -40,7 +40,10 @@ inline constexpr int kDischarge = 100001;
 inline constexpr int kSurfaceElevation = 100078;
 inline constexpr int kBathymetry = 100079;
 inline constexpr int kTimeStep = 100212;
+inline constexpr int kFlowFlux = 100080;
 inline constexpr int kFloodDepth = 100280;
+inline constexpr int kFlowDirection = 100408;
+inline constexpr int kFlowRate = 100430;
 }  // namespace item
 
 // The catalogues, by rising code.

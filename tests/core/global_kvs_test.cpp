@@ -71,6 +71,7 @@ std::string newModelText(const std::string& selection, const std::string& advect
          "    }\n"
          "    HYDRODYNAMIC_MODULE {\n"
          "        OPTION_PARAMETERS {}\n"
+         "        OPEN_BOUNDARY {}\n"
          "        STRUCTURE_MODULE {}\n"
          "        STRUCTURES {}\n"
          "    }\n"
@@ -272,6 +273,7 @@ TEST(GlobalKvs, ThePagesOfTheMessages) {
   EXPECT_EQ(static_cast<int>(PageId::floodAndDry), 26);
   EXPECT_EQ(static_cast<int>(PageId::bathymetry), 27);
   EXPECT_EQ(static_cast<int>(PageId::boundary), 28);
+  EXPECT_EQ(static_cast<int>(PageId::hdBoundary), 29);
   EXPECT_EQ(static_cast<int>(PageId::massBudget), 34);
   EXPECT_EQ(static_cast<int>(PageId::moduleSelection), 35);
   EXPECT_EQ(static_cast<int>(PageId::simulationPeriod), 39);

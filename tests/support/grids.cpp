@@ -61,21 +61,25 @@ void writeHotStart(const std::string& path, GridSpec spec, const Surface& surfac
   ASSERT_TRUE(written) << written.error();
 }
 
+void writeFile(const std::string& path, const TsbDefinition& definition) {
+  Result<TsbWriter> writer = TsbWriter::create(path, definition);
+  ASSERT_TRUE(writer) << writer.error();
+  const std::vector<float> zeros(definition.pointCount(), 0.0F);
+  for (std::size_t step = 0; step < definition.time.count; ++step) {
+    for (std::size_t i = 1; i <= definition.items.size(); ++i) {
+      ASSERT_TRUE(writer->write(i, step, std::span<const float>(zeros)));
+    }
+  }
+  ASSERT_TRUE(writer->commit());
+}
+
 void writeSeries(const std::string& path, const TsbTimeAxis& time, int itemType, const std::string& unit,
                  int items) {
   TsbDefinition definition;
   definition.time = time;
   for (int i = 1; i <= items; ++i)
     definition.items.push_back({"Series " + std::to_string(i), itemType, unit});
-  Result<TsbWriter> writer = TsbWriter::create(path, definition);
-  ASSERT_TRUE(writer) << writer.error();
-  const float zero = 0;
-  for (std::size_t step = 0; step < time.count; ++step) {
-    for (int i = 1; i <= items; ++i) {
-      ASSERT_TRUE(writer->write(static_cast<std::size_t>(i), step, std::span<const float>(&zero, 1)));
-    }
-  }
-  ASSERT_TRUE(writer->commit());
+  writeFile(path, definition);
 }
 
 }  // namespace gridbay::test

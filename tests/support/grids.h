@@ -41,6 +41,9 @@ void writeGrid(const std::string& path, const GridSpec& spec = {}, const Surface
 void writeHotStart(const std::string& path, GridSpec spec, const Surface& surface, int enclosing, int originJ,
                    int originK);
 
+// Writes zeros to every item and step.
+void writeFile(const std::string& path, const TsbDefinition& definition);
+
 // A time series of zeros.
 void writeSeries(const std::string& path, const TsbTimeAxis& time, int itemType, const std::string& unit,
                  int items = 1);

@@ -3,6 +3,10 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <cstdio>
+#include <cstdlib>
+#include <iostream>
+
 #include "core/edition.h"
 #include "tests/support/temporary_folder.h"
 
@@ -13,6 +17,8 @@ ProgramRun runProgram(const std::string& program, const std::vector<std::string>
   const TemporaryFolder folder;
   const std::string out = folder.file("out");
   const std::string err = folder.file("err");
+  std::fflush(nullptr);
+  std::cout.flush();
   const pid_t child = ::fork();
   if (child == 0) {
     if (std::freopen(out.c_str(), "w", stdout) == nullptr ||

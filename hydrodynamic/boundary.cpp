@@ -1,0 +1,192 @@
+#include "hydrodynamic/boundary.h"
+
+#include <algorithm>
+#include <filesystem>
+
+#include "basic/boundary.h"
+#include "basic/simulation_period.h"
+#include "core/global_kvs.h"
+#include "platform/files/paths.h"
+#include "platform/units/units.h"
+
+namespace gridbay {
+namespace {
+
+constexpr std::int32_t kStoredFabChoice = 3;
+constexpr std::int32_t kFabTransfer = 2;
+constexpr std::int32_t kFabDefault = 12;
+constexpr int kTransferDataType = 1;
+constexpr int kRatingCurveAxis = 2;
+constexpr int kNotAlongAnAxis = -1;
+
+// The quantities that a data file may have.
+std::vector<int> itemTypes(std::int32_t formulation, std::int32_t dataFormat) {
+  const bool isFlux = formulation == CNhdBoundaryObjectKvs::kFlux;
+  if (!isFlux || dataFormat == CNhdBoundaryObjectKvs::kTransferFile)
+    return {item::kWaterLevel, item::kSurfaceElevation};
+  if (dataFormat == CNhdBoundaryObjectKvs::kType1File) return {item::kFlowFlux};
+  return {item::kDischarge, item::kFlowRate};
+}
+
+// Points on a boundary, both ends counted; -1 for a diagonal.
+int pointsAlong(const CBoundaryObjectKvs& line) {
+  if (line.first.j == line.last.j) return line.last.k - line.first.k + 1;
+  return line.first.k == line.last.k ? line.last.j - line.first.j + 1 : kNotAlongAnAxis;
+}
+
+bool isWithin(std::int32_t value, std::int32_t end, std::int32_t otherEnd) {
+  const auto [least, greatest] = std::minmax(end, otherEnd);
+  return least <= value && value <= greatest;
+}
+
+bool isOnLine(std::int32_t point, const CBoundaryObjectKvs& line) {
+  if (line.first.j == line.last.j) return isWithin(point, line.first.k, line.last.k);
+  if (line.first.k == line.last.k) return isWithin(point, line.first.j, line.last.j);
+  return point == 0;
+}
+
+bool isRatingCurve(const UFileName& file) {
+  return !file.empty() && sameName(std::filesystem::path(file.text()).extension().string(), ".tsb0") &&
+         isReadableFile(file.absolute());
+}
+
+unsigned notValid(ValidationList& messages, const UFileName& file, const std::string& why) {
+  const std::string reason = why.empty() ? "" : formatted(texts::errorMessage) + why;
+  messages.push_back(
+      {PageId::hdBoundary, formatted(texts::dataFileNotValid, file.text()) + reason, Severity::fault});
+  return 1;
+}
+
+}  // namespace
+
+void CNhdBoundaryObjectKvs::FabTypeRow::save(const CNhdBoundaryObjectKvs& object, KvsFile& file,
+                                             const std::string&) const {
+  kvsPutParam(file, name, object.fabType == kStoredFabChoice ? kFabDefault : object.fabType);
+}
+
+void CNhdBoundaryObjectKvs::FabTypeRow::load(CNhdBoundaryObjectKvs& object, KvsSection from,
+                                             const std::string&) const {
+  kvsGetParam(from, name, &object.fabType, 1, 1);
+}
+
+void CNhdBoundaryObjectKvs::copyWhole(const CNhdBoundaryObjectKvs& other) {
+  CopyFrom(other);
+  referenceLevel = other.referenceLevel;
+  range = other.range;
+  period = other.period;
+  phase = other.phase;
+  relaxationFactor = other.relaxationFactor;
+}
+
+void CNhdBoundaryObjectKvs::SetDataFormat(std::int32_t format) {
+  if (format == dataFormat) return;
+  dataFormat = format;
+  switch (format) {
+    case kConstant:
+    case kSineSeries:
+      fabType = kFabDefault;
+      break;
+    case kType0File:
+    case kType1File:
+      dataFile.SetNoItems(1);
+      fabType = kFabDefault;
+      break;
+    case kTransferFile:
+      dataFile.SetNoItems(0);
+      fabType = kFabTransfer;
+      break;
+    case kRatingCurve:
+      dataFile.SetNoItems(1);
+      break;
+    default:
+      break;
+  }
+}
+
+const CBoundaryObjectKvs* CNhdBoundaryObjectKvs::boundary(int number) {
+  CGlobalKvs* root = model();
+  return root == nullptr ? nullptr : root->boundary->GetItem(number);
+}
+
+void CNhdBoundaryObjectKvs::requestAlongBoundary(CVdRqTsbItem& request, int number) {
+  CGlobalKvs* root = model();
+  CBoundaryObjectKvs* line = root == nullptr ? nullptr : root->boundary->GetItem(number);
+  request.SetDimensions(1);
+  request.SetNoPoints(1, line == nullptr ? kNotAlongAnAxis : pointsAlong(*line));
+  request.SetInterval(1, line == nullptr ? kNotAlongAnAxis : line->CellSpacing());
+}
+
+void CNhdBoundaryObjectKvs::finishRequest(CVdFileSelectorDlg& selector) {
+  if (CGlobalKvs* root = model(); root != nullptr) root->simulationPeriod->SetRequestPeriod(selector);
+  selector.EnablePlugin(0);
+  selector.SetVane27Compliant();
+}
+
+void CNhdBoundaryObjectKvs::RequestDataFile(CVdFileSelectorDlg& selector, int number) {
+  if (dataFormat < kType0File || dataFormat > kRatingCurve ||
+      (dataFormat > kTransferFile && dataFormat < kRatingCurve))
+    return;
+  CVdRqTsbItem& request = selector.AddRequest();
+  request.SetSelectionDescr(texts::boundaryRequest.format);
+  request.SetMultiQunType(itemTypes(formulation, dataFormat));
+  switch (dataFormat) {
+    case kType0File:
+      request.SetDimensions(0);
+      break;
+    case kType1File:
+      requestAlongBoundary(request, number);
+      break;
+    case kTransferFile:
+      requestAlongBoundary(request, number);
+      selector.SetDataType(kTransferDataType);
+      break;
+    default:
+      selector.SetTimeAxisType(kRatingCurveAxis);
+      selector.SetTimeAxisQunUnitEquivalentWith(unit::kMetre);
+      request.SetDimensions(0);
+      break;
+  }
+  finishRequest(selector);
+}
+
+void CNhdBoundaryObjectKvs::RequestDirectionFile(CVdFileSelectorDlg& selector, int number) {
+  CVdRqTsbItem& request = selector.AddRequest();
+  request.SetSelectionDescr(texts::flowDirectionRequest.format);
+  request.SetQunType(item::kFlowDirection, 0);
+  requestAlongBoundary(request, number);
+  finishRequest(selector);
+}
+
+unsigned CNhdBoundaryObjectKvs::Validate(ValidationList& messages, int, int number) {
+  unsigned faults = 0;
+  std::string why;
+  CVdFileSelectorDlg selector;
+  RequestDataFile(selector, number);
+  const std::string path = dataFile.fileName.absolute();
+  const bool isChosen = dataFormat == kType0File || dataFormat == kType1File;
+  if ((isChosen && !selector.IsTsbFileValid(path, dataFile.items, &why)) ||
+      (dataFormat == kTransferFile && !selector.IsTsbFileValid(path, &why))) {
+    faults += notValid(messages, dataFile.fileName, why);
+  }
+  if (dataFormat == kRatingCurve && !isRatingCurve(dataFile.fileName)) {
+    faults += notValid(messages, dataFile.fileName, formatted(texts::ratingCurveMissing));
+  }
+  if (tiltType == 0 || tiltType == 1) {
+    const CBoundaryObjectKvs* line = boundary(number);
+    if (line == nullptr) {
+      faults += report(messages, PageId::hdBoundary, Severity::fault, texts::noBoundaryDataItem);
+    } else if (!isOnLine(tiltingPoint, *line)) {
+      faults += report(messages, PageId::hdBoundary, Severity::fault, texts::tiltingPointOutside);
+    }
+  }
+  if ((fabType == kFabTransfer || fabType == kFabDefault) && enableUserDirections) {
+    CVdFileSelectorDlg directions;
+    RequestDirectionFile(directions, number);
+    if (!directions.IsTsbFileValid(directionFile.fileName.absolute(), directionFile.items, &why)) {
+      faults += notValid(messages, directionFile.fileName, {});
+    }
+  }
+  return faults;
+}
+
+}  // namespace gridbay

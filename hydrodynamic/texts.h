@@ -1,0 +1,17 @@
+#pragma once
+
+#include "core/string_table.h"
+
+namespace gridbay::texts {
+
+// HD boundary conditions.
+inline constexpr Text hdBoundarySectionMissing{
+    "Error in the KVS-FILE\nThe number of Hydrodynamic Boundary sections does not correspond to the number "
+    "of Boundaries"};
+inline constexpr Text noBoundaryDataItem{" No Boundary Data item "};
+inline constexpr Text tiltingPointOutside{"Tilting point is outside of boundary line"};
+inline constexpr Text boundaryRequest{"Boundary"};
+inline constexpr Text flowDirectionRequest{"Flow direction"};
+inline constexpr Text ratingCurveMissing{"The rating curve is a file that exists, with the extension .tsb0"};
+
+}  // namespace gridbay::texts
