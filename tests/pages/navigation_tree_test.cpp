@@ -1,0 +1,131 @@
+#include "pages/navigation_tree.h"
+
+#include <gtest/gtest.h>
+
+#include "basic/bathymetry.h"
+#include "basic/mass_budget.h"
+#include "core/edition.h"
+#include "core/module_selection.h"
+#include "tests/support/model.h"
+
+namespace gridbay {
+namespace {
+
+class NavigationTree : public ::testing::Test {
+ protected:
+  NavigationTree() { tree.OnInitialUpdate(&model.root); }
+  // The roots that are seen with a module code, in the order of the screen.
+  std::vector<std::int32_t> rootsWith(std::int32_t code) {
+    model.root.moduleSelection->simulationType = code;
+    tree.OnUpdate(&model.root);
+    std::vector<std::int32_t> roots;
+    for (const TreeItem& item : tree.items()) {
+      if (item.parent < 0 && tree.IsVisible(item)) roots.push_back(item.id);
+    }
+    return roots;
+  }
+  std::vector<std::int32_t> childrenOf(std::int32_t id) {
+    std::vector<std::int32_t> children;
+    for (const TreeItem& item : tree.items()) {
+      if (item.parent >= 0 && tree.items()[static_cast<std::size_t>(item.parent)].id == id)
+        children.push_back(item.id);
+    }
+    return children;
+  }
+  using Ids = std::vector<std::int32_t>;
+  test::Model model;
+  CDlgEnumerator enumerator;
+  CNavigationView tree{enumerator};
+};
+
+TEST_F(NavigationTree, OrderAndCaptions) {
+  const bool sweep = theEdition.wetlandSweepKit;
+  EXPECT_EQ(tree.items().size(), sweep ? 134U + 8 - 5 : 134U + 8);
+  EXPECT_EQ(tree.items()[0].caption, sweep ? "VANE 27 WSK" : "VANE 27 Flow Model");
+  EXPECT_EQ(childrenOf(2), sweep ? (Ids{27, 39, 28, 40, 26}) : (Ids{35, 27, 39, 28, 40, 26}));
+  EXPECT_EQ(childrenOf(4), sweep ? (Ids{43, 29, 41, 143, 37, 142, 42, 38})
+                                 : (Ids{34, 43, 29, 41, 143, 46, 32, 37, 44, 142, 42, 38}));
+  EXPECT_EQ(childrenOf(42), (Ids{45, 30, 31}));
+  EXPECT_EQ(childrenOf(92), (Ids{88, 64, 91}));
+  EXPECT_EQ(childrenOf(59), (Ids{53, 55, 56, 57, 54, 58}));
+  EXPECT_EQ(childrenOf(1), Ids{});
+  for (const TreeItem& item : tree.items()) {
+    EXPECT_FALSE(item.caption.empty()) << item.id;
+    if (item.depth > 0) EXPECT_EQ(item.caption, enumerator.GetCaption(item.id));
+  }
+}
+
+TEST_F(NavigationTree, RootsByModuleCode) {
+  EXPECT_EQ(rootsWith(0), (Ids{1, 2, 4}));
+  EXPECT_EQ(rootsWith(2), (Ids{1, 2, 4, 3}));
+  EXPECT_EQ(rootsWith(3), (Ids{1, 2, 4, 6}));
+  EXPECT_EQ(rootsWith(8), (Ids{1, 2, 4, 5}));
+  EXPECT_EQ(rootsWith(9), (Ids{1, 2, 4, 7}));
+  EXPECT_EQ(rootsWith(11), (Ids{1, 2, 4}));
+}
+
+TEST_F(NavigationTree, AnotherCodeLeavesTheRootsAndRunsTheOtherRules) {
+  rootsWith(3);
+  model.root.bathymetry->hotStart = 1;
+  EXPECT_EQ(rootsWith(1), (Ids{1, 2, 4, 6}));
+  EXPECT_FALSE(tree.IsVisible(26));
+}
+
+TEST_F(NavigationTree, AHotStartHidesAndShowsTwoPages) {
+  EXPECT_TRUE(tree.IsVisible(26));
+  model.root.bathymetry->hotStart = 1;
+  tree.OnUpdate(&model.root);
+  EXPECT_FALSE(tree.IsVisible(26));
+  EXPECT_FALSE(tree.IsVisible(43));
+  model.root.bathymetry->hotStart = 0;
+  tree.OnUpdate(&model.root);
+  EXPECT_TRUE(tree.IsVisible(26));
+  EXPECT_TRUE(tree.IsVisible(43));
+}
+
+TEST_F(NavigationTree, MassBudgetPagesNeedModuleSchemeAndPolygon) {
+  const auto visible = [this](std::int32_t code, std::int32_t scheme, int polygons, std::int32_t id) {
+    model.root.moduleSelection->simulationType = code;
+    model.root.moduleSelection->adScheme = scheme;
+    model.root.massBudget->SetNoPolygons(polygons);
+    tree.OnUpdate(&model.root);
+    return tree.IsVisible(id);
+  };
+  for (const auto& [code, id] : {std::pair{2, 21}, {8, 76}, {9, 119}}) {
+    EXPECT_TRUE(visible(code, 1, 1, id));
+    EXPECT_TRUE(visible(code, -1, 1, id));
+    EXPECT_FALSE(visible(code, 5, 1, id));
+    EXPECT_FALSE(visible(code, 1, 0, id));
+  }
+  visible(3, 1, 1, 21);
+  EXPECT_FALSE(tree.IsShown(21));
+}
+
+TEST_F(NavigationTree, ExpandedSlidingNeedsTwoAreas) {
+  rootsWith(8);
+  EXPECT_FALSE(tree.IsVisible(83));
+  model.root.bathymetry->SetNoAreas(2);
+  tree.OnUpdate(&model.root);
+  EXPECT_TRUE(tree.IsVisible(83));
+}
+
+TEST_F(NavigationTree, AHiddenParentHidesItsChildrenAndKeepsTheirFlags) {
+  rootsWith(3);
+  EXPECT_TRUE(tree.IsVisible(53));
+  tree.Show(59, false);
+  EXPECT_FALSE(tree.IsVisible(53));
+  EXPECT_TRUE(tree.IsShown(53));
+  tree.Show(59, true);
+  EXPECT_TRUE(tree.IsVisible(53));
+  tree.Show(9999, true);
+  EXPECT_FALSE(tree.IsVisible(9999));
+}
+
+TEST_F(NavigationTree, WithoutADocumentNothingHappens) {
+  tree.Show(27, false);
+  tree.OnUpdate(nullptr);
+  EXPECT_FALSE(tree.IsShown(27));
+}
+
+}  // namespace
+}  // namespace gridbay
