@@ -1,0 +1,99 @@
+#pragma once
+
+#include <cstdint>
+#include <deque>
+#include <functional>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <variant>
+#include <vector>
+
+#include "platform/units/edit_style.h"
+
+namespace gridbay {
+
+class CV27SetupGridWnd;
+
+enum class ControlKind { group, text, check, radio, dropDown, label, button, grid };
+
+// One control of a page, as any renderer needs it: what it is, what it shows, whether it can be used, and
+// what happens when the user changes it.
+struct Control {
+  using Variable = std::variant<std::monostate, std::int32_t*, float*, double*, std::string*>;
+
+  ControlKind kind;
+  std::string label;
+  Variable variable = {};
+  std::vector<std::string> choices = {};  // of a radio group or drop-down list
+  int itemCode = 0;                       // the quantity of a number; 0 for a plain one
+  CV27SetupGridWnd* grid = nullptr;
+
+  std::string text = {};  // what an edit or a label shows
+  int index = -1;         // the choice; 0 or 1 of a check box
+  bool enabled = true;
+  bool visible = true;
+  bool readOnly = false;
+  std::vector<bool> choiceEnabled = {};  // of a radio group; empty when all are
+
+  std::function<void()> onChange = {};         // an edit, click or selection; the press of a button
+  std::function<void(int delta)> onSpin = {};  // a step of the spin button beside an edit, where it has one
+  int spinLowest = 0;
+  int spinHighest = 0;
+
+  Control& Changed(std::function<void()> handler) {
+    onChange = std::move(handler);
+    return *this;
+  }
+  Control& Spin(int lowest, int highest, std::function<void(int)> handler) {
+    spinLowest = lowest;
+    spinHighest = highest;
+    onSpin = std::move(handler);
+    return *this;
+  }
+  Control& Hidden() {
+    visible = false;
+    return *this;
+  }
+  Control& ReadOnly() {
+    readOnly = true;
+    return *this;
+  }
+  bool usable() const { return enabled && visible && !readOnly; }
+};
+
+// The controls of a page in their order, each tied to a variable of the page. The page lists them once; the
+// frame loads and stores them by the list, a renderer builds widgets from it, a test finds a control in it.
+class Form {
+ public:
+  Control& Group(std::string_view caption);
+  Control& Label(std::string_view label, std::string& variable);
+  Control& Button(std::string_view label, std::function<void()> pressed);
+  Control& DDX_Text(std::string_view label, std::int32_t& variable);
+  Control& DDX_Text(std::string_view label, std::string& variable);
+  Control& DDX_Check(std::string_view label, std::int32_t& variable);
+  Control& DDX_Radio(std::string_view label, std::vector<std::string> choices, std::int32_t& variable);
+  Control& DDX_CBIndex(std::string_view label, std::vector<std::string> choices, std::int32_t& variable);
+  Control& DDX_Control(std::string_view label, CV27SetupGridWnd& grid);
+  // A number with a unit: the variable holds it in the base unit, the control shows it in the user's.
+  Control& DDX_VDedit(std::string_view label, float& variable, int itemCode);
+  Control& DDX_VDedit(std::string_view label, double& variable, int itemCode);
+
+  std::deque<Control>& controls() { return controls_; }
+  // The first control of a label, or null; the control that is tied to a variable.
+  Control* find(std::string_view label);
+  Control& of(const void* variable);
+
+  // Variables to controls.
+  void show(const UnitChoices& units);
+  // Controls to variables; the control whose text is no value, or null when all went well. Then no variable
+  // has changed.
+  const Control* store(const UnitChoices& units);
+
+ private:
+  Control& add(ControlKind kind, std::string_view label, Control::Variable variable = {});
+
+  std::deque<Control> controls_;
+};
+
+}  // namespace gridbay

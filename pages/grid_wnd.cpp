@@ -1,0 +1,69 @@
+#include "pages/grid_wnd.h"
+
+#include <cstdlib>
+
+namespace gridbay {
+
+int CV27SetupGridWnd::GetStyleRowCol(int row, int col, CellStyle& style) {
+  style = {};
+  if (rebuilding_) return 0;
+  if (row == 0 || col == 0) {
+    style.kind = CellKind::label;
+    style.value = row == 0 ? GetColHeader(col) : GetRowHeader(row);
+    return 1;
+  }
+  if (row < 0 || col < 0 || row > GetRowCount() || col > GetColCount()) return 0;
+  return styleOf(row, col, style) ? 1 : 0;
+}
+
+int CV27SetupGridWnd::StoreStyleRowCol(int row, int col, std::string_view text) {
+  if (rebuilding_) return 0;
+  if (row == 0 || col == 0) return 1;
+  CellStyle style;
+  if (GetStyleRowCol(row, col, style) == 0 || !style.takesValue()) return 0;
+  const std::size_t first = text.find_first_not_of(" \t");
+  const std::string_view rest = first == text.npos ? std::string_view() : text.substr(first);
+  const std::string trimmed(rest.substr(0, rest.find_last_not_of(" \t") + 1));
+  if (!storeCell(row, col, trimmed)) return 0;
+  UpdateDoc();
+  return 1;
+}
+
+void CV27SetupGridWnd::OnClickedButtonRowCol(int row, int col) {
+  CellStyle style;
+  if (GetStyleRowCol(row, col, style) == 0 || style.kind != CellKind::button || !style.enabled) return;
+  buttonPressed(row, col);
+}
+
+void ColumnGrid::SetColumns(int rowHeaderWidth, std::vector<Column> columns) {
+  rowHeaderWidth_ = rowHeaderWidth;
+  columns_ = std::move(columns);
+}
+
+bool ColumnGrid::styleOf(int row, int col, CellStyle& style) {
+  const Column& it = column(col);
+  style.kind = it.kind;
+  style.align = it.align;
+  style.choices = it.choices;
+  if (it.get) style.value = it.get(row);
+  if (it.kind == CellKind::button)
+    style.value = it.header.empty() && !it.choices.empty() ? it.choices.front() : it.header;
+  if (it.enabled && !it.enabled(row)) SetDisabled(style);
+  if (it.readOnly && it.readOnly(row)) SetReadOnly(style);
+  return true;
+}
+
+bool ColumnGrid::storeCell(int row, int col, std::string_view text) {
+  const Column& it = column(col);
+  return it.set && it.set(row, text);
+}
+
+void ColumnGrid::buttonPressed(int row, int col) {
+  if (const Column& it = column(col); it.press) it.press(row);
+}
+
+int plainInteger(std::string_view text) {
+  return std::atoi(std::string(text).c_str());
+}
+
+}  // namespace gridbay

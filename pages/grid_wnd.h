@@ -1,0 +1,118 @@
+#pragma once
+
+#include <functional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "pages/form_view.h"
+
+namespace gridbay {
+
+enum class CellKind { plain, button, dropDown, checkBox, resultFile, mapProjection, label };
+enum class CellAlign { left, right };
+
+// One cell as it is painted: its value and look, taken from the model each time.
+struct CellStyle {
+  std::string value = {};
+  CellKind kind = CellKind::plain;
+  CellAlign align = CellAlign::left;
+  std::vector<std::string> choices = {};
+  std::string toolTip = {};
+  bool enabled = true;
+  bool readOnly = false;
+
+  // Whether the cell takes a value at all, and whether a user can type one.
+  bool takesValue() const { return enabled && !readOnly && kind != CellKind::button; }
+  bool editable() const { return takesValue() && kind != CellKind::label; }
+};
+
+// Base of all grids. Cells are not stored: each paint reads the model, and each edit goes there. Rows and
+// columns count from 1; row 0 and column 0 are headers.
+class CV27SetupGridWnd {
+ public:
+  CV27SetupGridWnd() = default;
+  CV27SetupGridWnd(const CV27SetupGridWnd&) = delete;
+  CV27SetupGridWnd& operator=(const CV27SetupGridWnd&) = delete;
+  virtual ~CV27SetupGridWnd() = default;
+
+  void SetParentPage(CV27SetupFormView* page) { page_ = page; }
+  virtual void Initialize() {}
+
+  virtual int GetRowCount() = 0;
+  virtual int GetColCount() = 0;
+  // Header text of a column or row, and the width of a column in pixels (0 is the row headers).
+  virtual std::string GetColHeader(int col) = 0;
+  virtual std::string GetRowHeader(int row) { return std::to_string(row); }
+  virtual int GetColWidth(int col) = 0;
+  virtual bool ShowsHeaders() const { return true; }
+
+  // Fills the cell's style; 1 when there is such a cell.
+  int GetStyleRowCol(int row, int col, CellStyle& style);
+  // Stores an edited cell; 1 when the text was taken. Text that is no value is dropped, and the model's value
+  // stands.
+  int StoreStyleRowCol(int row, int col, std::string_view text);
+  // A press of the button in a cell.
+  void OnClickedButtonRowCol(int row, int col);
+
+  // While a grid is being laid out anew it gives and takes no cells.
+  void SetRebuilding(bool rebuilding) { rebuilding_ = rebuilding; }
+
+ protected:
+  CGlobalKvs& GetKvs() { return page_->GetKvs(); }
+  CV27SetupFormView& page() { return *page_; }
+  int UpdateDoc() { return page_->UpdateDoc(); }
+  static void SetDisabled(CellStyle& style) { style.enabled = false; }
+  static void SetReadOnly(CellStyle& style) { style.readOnly = true; }
+
+  // One cell of the data; false where there is none.
+  virtual bool styleOf(int row, int col, CellStyle& style) = 0;
+  // Takes a trimmed text; false when it is no value, with the model untouched.
+  virtual bool storeCell(int row, int col, std::string_view text) = 0;
+  virtual void buttonPressed(int, int) {}
+
+ private:
+  CV27SetupFormView* page_ = nullptr;
+  bool rebuilding_ = false;
+};
+
+// A grid with one row for each item of a list, whose columns are said once.
+class ColumnGrid : public CV27SetupGridWnd {
+ public:
+  struct Column {
+    std::string header;
+    int width;
+    CellKind kind = CellKind::plain;
+    CellAlign align = CellAlign::left;
+    std::function<std::string(int item)> get = {};
+    std::function<bool(int item, std::string_view text)> set = {};
+    std::function<bool(int item)> enabled = {};   // default: always
+    std::function<bool(int item)> readOnly = {};  // default: never
+    std::function<void(int item)> press = {};
+    std::vector<std::string> choices = {};
+  };
+
+  int GetRowCount() override { return ItemCount(); }
+  int GetColCount() override { return static_cast<int>(columns_.size()); }
+  std::string GetColHeader(int col) override { return col == 0 ? "" : column(col).header; }
+  int GetColWidth(int col) override { return col == 0 ? rowHeaderWidth_ : column(col).width; }
+
+ protected:
+  virtual int ItemCount() = 0;
+  void SetColumns(int rowHeaderWidth, std::vector<Column> columns);
+
+  bool styleOf(int row, int col, CellStyle& style) override;
+  bool storeCell(int row, int col, std::string_view text) override;
+  void buttonPressed(int row, int col) override;
+
+ private:
+  const Column& column(int col) const { return columns_[static_cast<std::size_t>(col) - 1]; }
+
+  int rowHeaderWidth_ = 30;
+  std::vector<Column> columns_;
+};
+
+// Text of a cell as an integer, read as far as it is one: "12x" is 12, "x" is 0.
+int plainInteger(std::string_view text);
+
+}  // namespace gridbay

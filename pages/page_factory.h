@@ -1,0 +1,13 @@
+#pragma once
+
+#include <memory>
+#include <string_view>
+
+#include "pages/form_view.h"
+
+namespace gridbay {
+
+// A page by its class name, ready to be shown; null for a class that this version does not have.
+std::unique_ptr<CV27SetupFormView> makePage(std::string_view pageClass, CV27SetupDoc& document);
+
+}  // namespace gridbay

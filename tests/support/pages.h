@@ -1,0 +1,123 @@
+#pragma once
+
+#include <gtest/gtest.h>
+
+#include <functional>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "pages/form_view.h"
+#include "pages/grid_wnd.h"
+#include "pages/host.h"
+#include "pages/page_factory.h"
+#include "pages/setup_doc.h"
+
+namespace gridbay::test {
+
+// Answers what pages ask, and keeps what they showed.
+class TestHost : public SetupHost {
+ public:
+  void show(const std::string& text) override { texts.push_back(text); }
+  bool askYesNo(const std::string& question) override {
+    questions.push_back(question);
+    return answer;
+  }
+  bool choose(CVdFileSelectorDlg& selector) override {
+    filters.push_back(selector.filter());
+    if (!chosenFile) return false;
+    selector.SetFileName(*chosenFile);
+    selector.SetSelectedItems(chosenItems);
+    return true;
+  }
+  bool chooseFile(std::string_view, std::string_view, std::string*) override { return false; }
+  bool editForm(std::string_view title, Form& form) override {
+    titles.emplace_back(title);
+    return fillForm && fillForm(form);
+  }
+  void openFile(const std::string& path) override { opened.push_back(path); }
+
+  std::vector<std::string> texts;
+  std::vector<std::string> questions;
+  std::vector<std::string> filters;
+  std::vector<std::string> titles;
+  std::vector<std::string> opened;
+  bool answer = true;
+  std::optional<std::string> chosenFile;
+  std::vector<std::uint32_t> chosenItems;
+  std::function<bool(Form&)> fillForm;
+};
+
+// A document with one page open, used by labels and cells as a user does.
+class PageTest : public ::testing::Test {
+ protected:
+  void open(std::string_view pageClass) {
+    page = makePage(pageClass, document);
+    ASSERT_NE(page, nullptr) << pageClass;
+  }
+  CGlobalKvs& root() { return document.root(); }
+
+  // The n-th control of a label.
+  Control& control(std::string_view label, int n = 1) {
+    for (Control& it : page->form().controls()) {
+      if (it.label == label && --n == 0) return it;
+    }
+    ADD_FAILURE() << "there is no control \"" << label << '"';
+    static Control none{.kind = ControlKind::label, .label = {}};
+    return none;
+  }
+  void edit(std::string_view label, std::string_view text, int n = 1) {
+    Control& it = control(label, n);
+    EXPECT_TRUE(it.usable()) << label;
+    it.text = text;
+    if (it.onChange) it.onChange();
+  }
+  void choose(std::string_view label, int index) {
+    Control& it = control(label);
+    EXPECT_TRUE(it.usable()) << label;
+    it.index = index;
+    if (it.onChange) it.onChange();
+  }
+  void press(std::string_view label) {
+    EXPECT_TRUE(control(label).usable()) << label;
+    control(label).onChange();
+  }
+  void spin(std::string_view label, int delta) { control(label).onSpin(delta); }
+  std::string text(std::string_view label, int n = 1) { return control(label, n).text; }
+  std::vector<std::string> labels() {
+    std::vector<std::string> all;
+    for (const Control& it : page->form().controls()) all.push_back(it.label);
+    return all;
+  }
+
+  CV27SetupGridWnd& grid() {
+    for (const Control& it : page->form().controls()) {
+      if (it.grid != nullptr) return *it.grid;
+    }
+    throw std::logic_error("the page has no grid");
+  }
+  CellStyle style(int row, int col) {
+    CellStyle it;
+    EXPECT_EQ(grid().GetStyleRowCol(row, col, it), 1) << row << ", " << col;
+    return it;
+  }
+  std::string cell(int row, int col) { return style(row, col).value; }
+  int store(int row, int col, std::string_view value) { return grid().StoreStyleRowCol(row, col, value); }
+  std::vector<std::string> headers() {
+    std::vector<std::string> all;
+    for (int col = 0; col <= grid().GetColCount(); ++col) all.push_back(grid().GetColHeader(col));
+    return all;
+  }
+  std::vector<int> widths() {
+    std::vector<int> all;
+    for (int col = 0; col <= grid().GetColCount(); ++col) all.push_back(grid().GetColWidth(col));
+    return all;
+  }
+  using Labels = std::vector<std::string>;
+
+  TestHost host;
+  CV27SetupDoc document{host};
+  std::unique_ptr<CV27SetupFormView> page;
+};
+
+}  // namespace gridbay::test
