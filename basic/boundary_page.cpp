@@ -13,17 +13,11 @@ constexpr std::int32_t kProgramDetected = 1;
 void CBoundaryGrid::Initialize() {
   constexpr int kWidth = 90;
   const auto pointColumn = [this](const char* header, GridPoint CBoundaryObjectKvs::*point) {
-    return Column{.header = header,
-                  .width = kWidth,
-                  .align = CellAlign::right,
-                  .get = [this, point](int n) { return pointText(GetKvs().boundary->GetItem(n)->*point); },
-                  .set =
-                      [this, point](int n, std::string_view text) {
-                        const std::optional<GridPoint> typed = pointOfText(text);
-                        if (typed) GetKvs().boundary->GetItem(n)->*point = *typed;
-                        return typed.has_value();
-                      },
-                  .readOnly = [this](int) { return GetKvs().boundary->defaultPosition != kUserSpecified; }};
+    Column column = PointColumn(
+        header, kWidth, [this, point](int n) -> GridPoint& { return GetKvs().boundary->GetItem(n)->*point; });
+    column.align = CellAlign::right;
+    column.readOnly = [this](int) { return GetKvs().boundary->defaultPosition != kUserSpecified; };
+    return column;
   };
   SetColumns(30, {pointColumn("First point", &CBoundaryObjectKvs::first),
                   pointColumn("Last point", &CBoundaryObjectKvs::last)});

@@ -27,16 +27,10 @@ void CSourceSinkGrid::Initialize() {
   };
   const auto pointColumn = [&](const char* header, GridPoint CSourceSinkObjectKvs::*point,
                                std::int32_t offType) {
-    return Column{.header = header,
-                  .width = kWidth,
-                  .get = [entry, point](int n) { return pointText(entry(n).*point); },
-                  .set =
-                      [entry, point](int n, std::string_view text) {
-                        const std::optional<GridPoint> typed = pointOfText(text);
-                        if (typed) entry(n).*point = *typed;
-                        return typed.has_value();
-                      },
-                  .enabled = isNot(offType)};
+    Column column =
+        PointColumn(header, kWidth, [entry, point](int n) -> GridPoint& { return entry(n).*point; });
+    column.enabled = isNot(offType);
+    return column;
   };
   const auto areaColumn = [&](std::int32_t CSourceSinkObjectKvs::*area, std::int32_t offType) {
     return Column{.header = "",

@@ -35,6 +35,19 @@ void CV27SetupGridWnd::OnClickedButtonRowCol(int row, int col) {
   buttonPressed(row, col);
 }
 
+ColumnGrid::Column ColumnGrid::PointColumn(std::string_view header, int width,
+                                           std::function<GridPoint&(int item)> point) {
+  return {.header = std::string(header),
+          .width = width,
+          .get = [point](int item) { return pointText(point(item)); },
+          .set =
+              [point](int item, std::string_view text) {
+                const std::optional<GridPoint> typed = pointOfText(text);
+                if (typed) point(item) = *typed;
+                return typed.has_value();
+              }};
+}
+
 void ColumnGrid::SetColumns(int rowHeaderWidth, std::vector<Column> columns) {
   rowHeaderWidth_ = rowHeaderWidth;
   columns_ = std::move(columns);

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <array>
 #include <string>
 #include <string_view>
 
@@ -8,6 +9,15 @@
 #include "pages/form.h"
 
 namespace gridbay {
+
+// A start of the engine: its name, the saved file, and what the command passes on.
+struct EngineStart {
+  std::string engine;
+  std::string input;
+  int flag;  // 0 when Shift was held, else 1
+  std::string text;
+  std::array<int, 3> further;
+};
 
 // What pages and documents ask of the program around them: dialogs and other documents. The desktop shows
 // windows; tests answer by themselves.
@@ -22,6 +32,10 @@ class SetupHost : public MessageHost, public FileChooser {
   virtual bool editForm(std::string_view title, Form& form) = 0;
   // Opens a file as a document or in a viewer.
   virtual void openFile(const std::string& path) = 0;
+  // Shows what a check found; each message leads to its page.
+  virtual void showMessages(const ValidationList& messages, unsigned faults) = 0;
+  virtual void startEngine(const EngineStart& start) = 0;
+  virtual bool isShiftHeld() = 0;
 };
 
 }  // namespace gridbay

@@ -36,12 +36,22 @@ class TestHost : public SetupHost {
     return fillForm && fillForm(form);
   }
   void openFile(const std::string& path) override { opened.push_back(path); }
+  void showMessages(const ValidationList& messages, unsigned faults) override {
+    shown = messages;
+    shownFaults = faults;
+  }
+  void startEngine(const EngineStart& start) override { starts.push_back(start); }
+  bool isShiftHeld() override { return shift; }
 
   std::vector<std::string> texts;
   std::vector<std::string> questions;
   std::vector<std::string> filters;
   std::vector<std::string> titles;
   std::vector<std::string> opened;
+  ValidationList shown;
+  unsigned shownFaults = 0;
+  std::vector<EngineStart> starts;
+  bool shift = false;
   bool answer = true;
   std::optional<std::string> chosenFile;
   std::vector<std::uint32_t> chosenItems;
