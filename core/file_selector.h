@@ -76,6 +76,10 @@ class CVdFileSelectorDlg {
                      std::vector<std::uint32_t> selectedItems, int)
       : kind_(kind), fileName_(fileName), filter_(filter), selectedItems_(std::move(selectedItems)) {}
 
+  CVdFileSelectorDlg(CVdFileSelectorDlg&&) = default;
+  CVdFileSelectorDlg& operator=(CVdFileSelectorDlg&&) = default;
+  virtual ~CVdFileSelectorDlg() = default;
+
   CVdRqTsbItem& AddRequest();
   CVdRqTsbItem& AddRequest(std::unique_ptr<CVdRqTsbItem> request);
   void AddRequestItemType(int code);
@@ -111,13 +115,13 @@ class CVdFileSelectorDlg {
   const std::vector<std::unique_ptr<CVdRqTsbItem>>& requests() const { return requests_; }
   const std::vector<std::uint32_t>& GetSelectedItems() const { return selectedItems_; }
   // The name of item n (from 1) in the current file; empty when there is none.
-  std::string GetNameOfItem(int n) const;
+  virtual std::string GetNameOfItem(int n) const;
 
   // Whether a file, or the items chosen in it, meets all requests; if not the text says which one, what was
   // expected and what the file has.
-  bool IsTsbFileValid(const std::string& file, std::string* errorText) const;
-  bool IsTsbFileValid(const std::string& file, std::span<const std::uint32_t> items,
-                      std::string* errorText) const;
+  virtual bool IsTsbFileValid(const std::string& file, std::string* errorText) const;
+  virtual bool IsTsbFileValid(const std::string& file, std::span<const std::uint32_t> items,
+                              std::string* errorText) const;
 
  private:
   std::string faultOf(const TsbHeader& header, std::span<const std::uint32_t> items, bool chosen) const;

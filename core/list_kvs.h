@@ -149,7 +149,7 @@ constexpr CountRow count(std::string_view name) {
 // A count that the Wetland Sweep Kit fixes, on file and after a load.
 struct PinnedCountRow {
   CountRow row;
-  int fixed;
+  int fixed = 0;
 
   void save(const auto& list, KvsFile& file, const std::string& documentPath) const {
     if (theEdition.wetlandSweepKit) {

@@ -12,7 +12,7 @@ namespace {
 
 template <class Number>
 std::string shortest(Number number) {
-  std::array<char, 64> buffer;
+  std::array<char, 64> buffer{};
   const auto [end, error] = std::to_chars(buffer.data(), buffer.data() + buffer.size(), number);
   return {buffer.data(), end};
 }

@@ -156,13 +156,20 @@ std::span<const Value> ParameterTree::keep(std::span<const Value> values) {
   return {copy, values.size()};
 }
 
+template <class T, class... Args>
+T* ParameterTree::make(Args&&... args) {
+  return std::construct_at(static_cast<T*>(arena_.allocate(sizeof(T), alignof(T))),
+                           std::forward<Args>(args)...);
+}
+
 Node* ParameterTree::makeSection(std::string_view name) {
-  auto* body = new (arena_.allocate(sizeof(SectionBody), alignof(SectionBody))) SectionBody{.tree = this};
-  return new (arena_.allocate(sizeof(Node), alignof(Node))) Node(name, body);
+  auto* body = make<SectionBody>();
+  body->tree = this;
+  return make<Node>(name, body);
 }
 
 Node* ParameterTree::makeKeyword(std::string_view name, std::span<const Value> values) {
-  return new (arena_.allocate(sizeof(Node), alignof(Node))) Node(name, values);
+  return make<Node>(name, values);
 }
 
 void ParameterTree::append(Node& section, Node* last, Node& node) {

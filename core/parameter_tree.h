@@ -37,7 +37,7 @@ class ParameterTree;
 // What a section (or target, or the file itself) holds: sections and keywords in the order of the file, and
 // the index by which a name is found, made at the first lookup that pays for it.
 struct SectionBody {
-  ParameterTree* tree;
+  ParameterTree* tree = nullptr;
   Node* first = nullptr;
   const class SectionIndex* index = nullptr;
   std::uint32_t sections = 0;
@@ -81,7 +81,7 @@ class Node {
   std::uint32_t valueCount_ : 31 = 0;
   std::uint32_t kind_ : 1 = 0;
   union {
-    SectionBody* body_;
+    SectionBody* body_ = nullptr;
     const Value* values_;
   };
   Node* next_ = nullptr;
@@ -111,6 +111,10 @@ class ParameterTree {
   std::pmr::memory_resource& arena() { return arena_; }
 
  private:
+  // Makes a thing in the arena, which frees it without a word: things with something to free don't go here.
+  template <class T, class... Args>
+  T* make(Args&&... args);
+
   FileText text_;
   std::pmr::monotonic_buffer_resource arena_;
   Node* root_;

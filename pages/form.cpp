@@ -135,6 +135,7 @@ Control& Form::of(const void* variable) {
 
 void Form::show(const UnitChoices& units) {
   for (Control& control : controls_) {
+    if (const QunUnit* unit = units.unitOf(control.itemCode); unit != nullptr) control.unit = unit->symbol;
     std::visit(Overloaded{[](std::monostate) {},
                           [&](const std::int32_t* value) {
                             control.index = *value;

@@ -30,6 +30,7 @@ struct Control {
   CV27SetupGridWnd* grid = nullptr;
 
   std::string text = {};  // what an edit or a label shows
+  std::string unit = {};  // the symbol of the unit that it is shown in; empty for a plain one
   int index = -1;         // the choice; 0 or 1 of a check box
   bool enabled = true;
   bool visible = true;

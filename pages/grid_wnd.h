@@ -49,12 +49,12 @@ class CV27SetupGridWnd {
   virtual bool ShowsHeaders() const { return true; }
 
   // Fills the cell's style; 1 when there is such a cell.
-  int GetStyleRowCol(int row, int col, CellStyle& style);
+  virtual int GetStyleRowCol(int row, int col, CellStyle& style);
   // Stores an edited cell; 1 when the text was taken. Text that is no value is dropped, and the model's value
   // stands.
-  int StoreStyleRowCol(int row, int col, std::string_view text);
+  virtual int StoreStyleRowCol(int row, int col, std::string_view text);
   // A press of the button in a cell.
-  void OnClickedButtonRowCol(int row, int col);
+  virtual void OnClickedButtonRowCol(int row, int col);
 
   // While a grid is being laid out anew it gives and takes no cells.
   void SetRebuilding(bool rebuilding) { rebuilding_ = rebuilding; }

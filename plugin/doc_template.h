@@ -3,8 +3,8 @@
 #include <memory>
 #include <string>
 
-#include "pages/gridbay_doc.h"
 #include "pages/host.h"
+#include "plugin/setup_editor.h"
 
 namespace gridbay {
 
@@ -18,7 +18,8 @@ class CVdDocTemplate {
 
   // One of the seven fields.
   virtual std::string GetDocString(Field field) const = 0;
-  virtual std::unique_ptr<CGridbayDoc> CreateNewDocument(SetupHost& host) const = 0;
+  // A new document with a whole default model. The host must outlive it.
+  virtual std::unique_ptr<SetupEditor> CreateNewDocument(SetupHost& host) const = 0;
 };
 
 }  // namespace gridbay

@@ -14,8 +14,8 @@ class GridbayDocTemplate final : public CVdDocTemplate {
     for (int i = 0; i < field; ++i) rest.remove_prefix(rest.find('\n') + 1);
     return std::string(rest.substr(0, rest.find('\n')));
   }
-  std::unique_ptr<CGridbayDoc> CreateNewDocument(SetupHost& host) const override {
-    return std::make_unique<CGridbayDoc>(host);
+  std::unique_ptr<SetupEditor> CreateNewDocument(SetupHost& host) const override {
+    return makeSetupEditor(host);
   }
 };
 

@@ -130,6 +130,7 @@ TEST_F(AreaDescriptionPage, ValuesAreShownInTheUsersUnitAndHeldInTheBaseUnit) {
   document.units().setSystem(UnitSystem::us);
   page->SetData();
   EXPECT_EQ(text("Drying depth:"), "0.0656168");
+  EXPECT_EQ(control("Drying depth:").unit, "ft");
   page->UpdateDoc();  // an edit of nothing changes nothing
   EXPECT_EQ(root().areaDescription->dryingDepth, 0.02F);
   edit("Flooding depth:", "1");

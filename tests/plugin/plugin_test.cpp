@@ -4,6 +4,7 @@
 #include "basic/area_description.h"
 #include "core/edition.h"
 #include "pages/graphical_view.h"
+#include "pages/gridbay_doc.h"
 #include "plugin/entry_points.h"
 #include "plugin/launch_records.h"
 #include "tests/support/pages.h"

@@ -1,0 +1,57 @@
+#pragma once
+
+#include <QAbstractTableModel>
+#include <QStyledItemDelegate>
+#include <QTableView>
+
+#include "pages/grid_wnd.h"
+
+namespace gridbay::shell {
+
+// The cells of a grid for the toolkit; each question goes through to the grid, and so to the model.
+class GridModel final : public QAbstractTableModel {
+  Q_OBJECT
+ public:
+  explicit GridModel(CV27SetupGridWnd& grid, QObject* parent) : QAbstractTableModel(parent), grid_(grid) {}
+
+  int rowCount(const QModelIndex& parent = {}) const override;
+  int columnCount(const QModelIndex& parent = {}) const override;
+  QVariant data(const QModelIndex& index, int role) const override;
+  QVariant headerData(int section, Qt::Orientation orientation, int role) const override;
+  Qt::ItemFlags flags(const QModelIndex& index) const override;
+  bool setData(const QModelIndex& index, const QVariant& value, int role) override;
+
+  CellStyle style(const QModelIndex& index) const;
+  void press(const QModelIndex& index);
+  // The grid or the model behind it has changed.
+  void refresh();
+
+ private:
+  CV27SetupGridWnd& grid_;
+};
+
+// Editors of cells: an edit, or a list for a drop-down cell.
+class CellDelegate final : public QStyledItemDelegate {
+  Q_OBJECT
+ public:
+  using QStyledItemDelegate::QStyledItemDelegate;
+
+  QWidget* createEditor(QWidget* parent, const QStyleOptionViewItem& option,
+                        const QModelIndex& index) const override;
+  void setEditorData(QWidget* editor, const QModelIndex& index) const override;
+  void setModelData(QWidget* editor, QAbstractItemModel* model, const QModelIndex& index) const override;
+  void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override;
+};
+
+// The widget of a grid.
+class GridView final : public QTableView {
+  Q_OBJECT
+ public:
+  GridView(CV27SetupGridWnd& grid, QWidget* parent);
+  GridModel& cells() { return *model_; }
+
+ private:
+  GridModel* model_;
+};
+
+}  // namespace gridbay::shell

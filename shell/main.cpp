@@ -1,0 +1,58 @@
+#include <QApplication>
+#include <QCommandLineParser>
+#include <QDir>
+#include <QMessageBox>
+#include <QPixmap>
+
+#include "shell/main_window.h"
+
+using namespace gridbay::shell;
+
+namespace {
+
+// Pictures of each page that the tree shows.
+void takeScreenshots(MainWindow& window, const QString& folder) {
+  QDir().mkpath(folder);
+  window.show();
+  for (const auto& item : window.currentDocument()->editor().items()) {
+    if (!item.visible || !window.currentDocument()->goToPage(item.id)) continue;
+    QApplication::processEvents();
+    window.grab().save(QString("%1/page-%2.png").arg(folder).arg(item.id));
+  }
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+  QApplication application(argc, argv);
+  QApplication::setApplicationDisplayName("VaneDeck");
+  QCommandLineParser parser;
+  parser.setApplicationDescription("Opens setups in their editor.");
+  parser.addHelpOption();
+  parser.addOption({"edition", "The editor of new documents: v27 or wsk.", "edition", "v27"});
+  parser.addOption({"screenshots", "Writes a picture of each page to a folder, and ends.", "folder"});
+  parser.addPositionalArgument("file", "Setups to open.");
+  parser.process(application);
+
+  std::vector<std::unique_ptr<EditorLibrary>> libraries;
+  QStringList names{"v27nested", "v27nestedwsk"};
+  if (parser.value("edition") == "wsk") std::swap(names[0], names[1]);
+  for (const QString& name : names) {
+    QString error;
+    if (auto library = EditorLibrary::load(name, &error)) {
+      libraries.push_back(std::move(library));
+    } else {
+      QMessageBox::critical(nullptr, "VaneDeck", error);
+    }
+  }
+  if (libraries.empty()) return 2;
+  MainWindow window(std::move(libraries));
+  for (const QString& path : parser.positionalArguments()) window.openDocument(path);
+  if (window.currentDocument() == nullptr) window.newDocument(0);
+  if (parser.isSet("screenshots")) {
+    takeScreenshots(window, parser.value("screenshots"));
+    return 0;
+  }
+  window.show();
+  return QApplication::exec();
+}
