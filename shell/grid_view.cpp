@@ -69,7 +69,14 @@ void GridModel::press(const QModelIndex& index) {
 }
 
 void GridModel::refresh() {
+  if (rowCount() == shownRows_ && columnCount() == shownColumns_) {
+    if (shownRows_ > 0 && shownColumns_ > 0)
+      emit dataChanged(index(0, 0), index(shownRows_ - 1, shownColumns_ - 1));
+    return;
+  }
   beginResetModel();
+  shownRows_ = rowCount();
+  shownColumns_ = columnCount();
   endResetModel();
 }
 
@@ -79,7 +86,8 @@ QWidget* CellDelegate::createEditor(QWidget* parent, const QStyleOptionViewItem&
   if (cell.kind != CellKind::dropDown) return new QLineEdit(parent);
   auto* list = new QComboBox(parent);
   for (const std::string& choice : cell.choices) list->addItem(QString::fromStdString(choice));
-  // A choice counts at once, without a further key. The signals of a delegate belong to an object that is not const.
+  // A choice counts at once, without a further key. The signals of a delegate belong to an object that is not
+  // const.
   auto* self = const_cast<CellDelegate*>(this);
   connect(list, &QComboBox::activated, self, [self, list] {
     emit self->commitData(list);

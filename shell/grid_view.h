@@ -12,7 +12,7 @@ namespace gridbay::shell {
 class GridModel final : public QAbstractTableModel {
   Q_OBJECT
  public:
-  explicit GridModel(CV27SetupGridWnd& grid, QObject* parent) : QAbstractTableModel(parent), grid_(grid) {}
+  GridModel(CV27SetupGridWnd& grid, QObject* parent) : QAbstractTableModel(parent), grid_(grid) { refresh(); }
 
   int rowCount(const QModelIndex& parent = {}) const override;
   int columnCount(const QModelIndex& parent = {}) const override;
@@ -28,6 +28,8 @@ class GridModel final : public QAbstractTableModel {
 
  private:
   CV27SetupGridWnd& grid_;
+  int shownRows_ = -1;
+  int shownColumns_ = -1;
 };
 
 // Editors of cells: an edit, or a list for a drop-down cell.

@@ -26,6 +26,8 @@ void takeScreenshots(MainWindow& window, const QString& folder) {
 int main(int argc, char** argv) {
   QApplication application(argc, argv);
   QApplication::setApplicationDisplayName("VaneDeck");
+  QApplication::setOrganizationName("VaneDeck");
+  QApplication::setApplicationName("vanedeck-shell");
   QCommandLineParser parser;
   parser.setApplicationDescription("Opens setups in their editor.");
   parser.addHelpOption();

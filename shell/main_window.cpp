@@ -9,6 +9,8 @@
 #include <QFileInfo>
 #include <QMenuBar>
 #include <QMessageBox>
+#include <QMimeData>
+#include <QSettings>
 #include <QStandardPaths>
 #include <QStatusBar>
 #include <QStyle>
@@ -17,6 +19,10 @@
 namespace gridbay::shell {
 namespace {
 
+constexpr const char* kRecentKey = "recent";
+constexpr const char* kGeometryKey = "window/geometry";
+constexpr const char* kStateKey = "window/state";
+constexpr int kMostRecent = 8;
 constexpr int kPageRole = Qt::UserRole;
 constexpr int kValidate = 46019;
 constexpr int kStart = 46018;
@@ -30,8 +36,11 @@ MainWindow::MainWindow(std::vector<std::unique_ptr<EditorLibrary>> libraries)
   tabs_->setTabsClosable(true);
   tabs_->setDocumentMode(true);
   setCentralWidget(tabs_);
+  setAcceptDrops(true);
   buildDocks();
   buildMenus();
+  restoreGeometry(QSettings().value(kGeometryKey).toByteArray());
+  restoreState(QSettings().value(kStateKey).toByteArray());
   connect(tabs_, &QTabWidget::tabCloseRequested, this, [this](int index) { closeTab(index); });
   connect(tabs_, &QTabWidget::currentChanged, this, [this] { rebuildRunMenu(); });
 }
@@ -59,6 +68,8 @@ void MainWindow::buildMenus() {
     const QString path = QFileDialog::getOpenFileName(this, {}, {}, filters.join(";;"));
     if (!path.isEmpty()) openDocument(path);
   });
+  recentMenu_ = file->addMenu(tr("Open &Recent"));
+  rebuildRecentMenu();
   file->addAction(tr("&Close"), QKeySequence::Close, this, [this] { closeTab(tabs_->currentIndex()); });
   file->addSeparator();
   file->addAction(tr("&Save"), QKeySequence::Save, this, [this] { saveDocument(); });
@@ -175,6 +186,7 @@ DocumentTab* MainWindow::openDocument(const QString& path) {
   DocumentTab* tab = newDocument(library);
   if (tab->editor().open(path.toStdString())) {
     tabs_->setTabText(tabs_->indexOf(tab), tab->title());
+    remember(path);
     return tab;
   }
   // Never an empty document that a save could write over the file.
@@ -190,6 +202,7 @@ bool MainWindow::saveDocument(const QString& path) {
   if (target.isEmpty()) target = QFileDialog::getSaveFileName(this);
   if (target.isEmpty() || !tab->editor().save(target.toStdString())) return false;
   tabs_->setTabText(tabs_->indexOf(tab), tab->title());
+  remember(target);
   statusBar()->showMessage(tr("Saved %1").arg(target), 3000);
   return true;
 }
@@ -245,12 +258,42 @@ bool MainWindow::closeTab(int index) {
   return true;
 }
 
+void MainWindow::remember(const QString& path) {
+  QSettings settings;
+  QStringList recent = settings.value(kRecentKey).toStringList();
+  const QString absolute = QFileInfo(path).absoluteFilePath();
+  recent.removeAll(absolute);
+  recent.prepend(absolute);
+  settings.setValue(kRecentKey, recent.mid(0, kMostRecent));
+  rebuildRecentMenu();
+}
+
+void MainWindow::rebuildRecentMenu() {
+  recentMenu_->clear();
+  const QStringList recent = QSettings().value(kRecentKey).toStringList();
+  for (const QString& path : recent) recentMenu_->addAction(path, this, [this, path] { openDocument(path); });
+  recentMenu_->setEnabled(!recent.isEmpty());
+}
+
+void MainWindow::dragEnterEvent(QDragEnterEvent* event) {
+  if (event->mimeData()->hasUrls()) event->acceptProposedAction();
+}
+
+void MainWindow::dropEvent(QDropEvent* event) {
+  for (const QUrl& url : event->mimeData()->urls()) {
+    if (url.isLocalFile()) openDocument(url.toLocalFile());
+  }
+}
+
 void MainWindow::closeEvent(QCloseEvent* event) {
   for (int i = 0; i < tabs_->count(); ++i) {
     if (mayClose(*static_cast<DocumentTab*>(tabs_->widget(i)))) continue;
     event->ignore();
     return;
   }
+  QSettings settings;
+  settings.setValue(kGeometryKey, saveGeometry());
+  settings.setValue(kStateKey, saveState());
   event->accept();
 }
 

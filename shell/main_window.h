@@ -32,11 +32,16 @@ class MainWindow final : public QMainWindow {
 
  protected:
   void closeEvent(QCloseEvent* event) override;
+  void dragEnterEvent(QDragEnterEvent* event) override;
+  void dropEvent(QDropEvent* event) override;
 
  private:
   void buildMenus();
   void buildDocks();
   void rebuildRunMenu();
+  // The list of setups opened last, newest first, and the menu that offers them.
+  void remember(const QString& path);
+  void rebuildRecentMenu();
   void showMessages(const ValidationList& messages, unsigned faults);
   void startEngine(const EngineStart& start);
   bool mayClose(DocumentTab& tab);
@@ -45,6 +50,7 @@ class MainWindow final : public QMainWindow {
   std::vector<std::unique_ptr<EditorLibrary>> libraries_;
   QTabWidget* tabs_;
   QMenu* runMenu_ = nullptr;
+  QMenu* recentMenu_ = nullptr;
   QTreeWidget* messages_ = nullptr;
   QPlainTextEdit* output_ = nullptr;
   QProcess* engine_ = nullptr;

@@ -4,8 +4,10 @@
 #include <QFile>
 #include <QLineEdit>
 #include <QMessageBox>
+#include <QMimeData>
 #include <QProcess>
 #include <QRadioButton>
+#include <QSettings>
 #include <QSignalSpy>
 #include <QTemporaryDir>
 #include <QTest>
@@ -72,6 +74,9 @@ class DesktopTest : public QObject {
  private slots:
   void initTestCase() {
     folder_ = new QTemporaryDir();
+    QSettings::setDefaultFormat(QSettings::IniFormat);
+    QSettings::setPath(QSettings::IniFormat, QSettings::UserScope, folder_->path());
+    QCoreApplication::setOrganizationName("test");
     run("make_terrain", {folder_->path()});
     run("v27setup", {"convert", "raster", "estuary.asc", "estuary.tsb2", "--land", "5", "--crs", "UTM-32"});
     run("v27setup", {"convert", "raster", "inlet.asc", "inlet.tsb2", "--land", "5", "--crs", "UTM-32"});
@@ -207,6 +212,20 @@ class DesktopTest : public QObject {
     QVERIFY(window_->openDocument(file("broken.v27")) == nullptr);
     QCOMPARE(window_->currentDocument()->title(), QString("s.v27"));
     QCOMPARE(textOf(file("broken.v27")), QString("VANE27_NESTED_MODEL {"));
+  }
+
+  void setupsAreDroppedAndRemembered() {
+    QMimeData dropped;
+    dropped.setUrls({QUrl::fromLocalFile(file("s.v27"))});
+    QDragEnterEvent enter(QPoint(5, 5), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
+    QApplication::sendEvent(window_, &enter);
+    QVERIFY(enter.isAccepted());
+    QDropEvent drop(QPointF(5, 5), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
+    DocumentTab* before = window_->currentDocument();
+    QApplication::sendEvent(window_, &drop);
+    QVERIFY(window_->currentDocument() != before);
+    QCOMPARE(window_->currentDocument()->title(), QString("s.v27"));
+    QCOMPARE(QSettings().value("recent").toStringList().value(0), file("s.v27"));
   }
 
   void bothEditionsAreOpenAtOnce() {
