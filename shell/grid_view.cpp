@@ -8,6 +8,12 @@
 #include <QPalette>
 
 namespace gridbay::shell {
+namespace {
+
+// Widths of columns are told in pixels of a font whose letters are this wide.
+constexpr int kCharWidth = 5;
+
+}  // namespace
 
 int GridModel::rowCount(const QModelIndex& parent) const {
   return parent.isValid() ? 0 : grid_.GetRowCount();
@@ -135,7 +141,7 @@ GridView::GridView(CV27SetupGridWnd& grid, QWidget* parent)
   horizontalHeader()->setVisible(grid.ShowsHeaders());
   verticalHeader()->setVisible(grid.GetColWidth(0) > 0);
   for (int column = 1; column <= grid.GetColCount(); ++column) {
-    setColumnWidth(column - 1, grid.GetColWidth(column) + fontMetrics().horizontalAdvance("00"));
+    setColumnWidth(column - 1, grid.GetColWidth(column) * fontMetrics().averageCharWidth() / kCharWidth);
   }
   connect(this, &QTableView::clicked, this, [this](const QModelIndex& index) {
     if (model_->style(index).kind == CellKind::button) model_->press(index);

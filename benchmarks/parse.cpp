@@ -1,0 +1,146 @@
+// A setup of many point sections: read into the tree with every value taken as a double, beside a fast XML
+// reader on the same tree as compact XML and a fast JSON reader on it as JSON; names looked up; and the text
+// written.
+
+#include <benchmark/benchmark.h>
+#include <fmt/format.h>
+#include <simdjson.h>
+
+#include <cstdio>
+#include <filesystem>
+#include <pugixml.hpp>
+#include <string>
+
+#include "core/kdl_reader.h"
+#include "core/kdl_writer.h"
+#include "core/kvs.h"
+#include "platform/files/save_file.h"
+
+namespace gridbay {
+namespace {
+
+constexpr int kPoints = 1'000'000;
+
+struct Texts {
+  Texts() {
+    kdl = "T {\n";
+    xml = "<T>";
+    json = "{\"T\":[";
+    for (int i = 1; i <= kPoints; ++i) {
+      const double x = 480000 + i * 0.37;
+      const double y = 6100000 + i * 0.61;
+      const double z = (i % 977) * 0.013 - 5;
+      kdl += fmt::format("    POINT_{} {{\n        X {:.3f}\n        Y {:.3f}\n        Z {:.6f}\n    }}\n", i,
+                         x, y, z);
+      xml += fmt::format("<POINT_{} X=\"{:.3f}\" Y=\"{:.3f}\" Z=\"{:.6f}\"/>", i, x, y, z);
+      json += fmt::format("{}{{\"POINT_{}\":{{\"X\":{:.3f},\"Y\":{:.3f},\"Z\":{:.6f}}}}}", i == 1 ? "" : ",",
+                          i, x, y, z);
+    }
+    kdl += "}\n";
+    xml += "</T>";
+    json += "]}";
+  }
+  std::string kdl;
+  std::string xml;
+  std::string json;
+};
+
+const Texts& texts() {
+  static const Texts made;
+  return made;
+}
+
+double sumOfTree(const Node& target) {
+  double sum = 0;
+  for (const Node* point = target.first(); point != nullptr; point = point->next()) {
+    for (const Node* keyword = point->first(); keyword != nullptr; keyword = keyword->next()) {
+      sum += kvsGetDouble(&keyword->values().front());
+    }
+  }
+  return sum;
+}
+
+void parseKdl(benchmark::State& state) {
+  for (auto _ : state) {
+    const ReadText read = readKdl(FileText(texts().kdl));
+    benchmark::DoNotOptimize(sumOfTree(*read.tree->root().first()));
+  }
+  state.SetBytesProcessed(state.iterations() * static_cast<std::int64_t>(texts().kdl.size()));
+}
+BENCHMARK(parseKdl)->Unit(benchmark::kMillisecond)->MinTime(2);
+
+void parseXmlInPlace(benchmark::State& state) {
+  for (auto _ : state) {
+    std::string text = texts().xml;
+    pugi::xml_document document;
+    document.load_buffer_inplace(text.data(), text.size());
+    double sum = 0;
+    for (const pugi::xml_node point : document.first_child()) {
+      for (const pugi::xml_attribute value : point.attributes()) sum += value.as_double();
+    }
+    benchmark::DoNotOptimize(sum);
+  }
+  state.SetBytesProcessed(state.iterations() * static_cast<std::int64_t>(texts().xml.size()));
+}
+BENCHMARK(parseXmlInPlace)->Unit(benchmark::kMillisecond)->MinTime(2);
+
+void parseJson(benchmark::State& state) {
+  const simdjson::padded_string text(texts().json);
+  for (auto _ : state) {
+    simdjson::dom::parser parser;
+    double sum = 0;
+    for (const simdjson::dom::element entry : parser.parse(text)["T"]) {
+      for (const auto point : simdjson::dom::object(entry)) {
+        for (const auto value : simdjson::dom::object(point.value)) sum += double(value.value);
+      }
+    }
+    benchmark::DoNotOptimize(sum);
+  }
+  state.SetBytesProcessed(state.iterations() * static_cast<std::int64_t>(texts().json.size()));
+}
+BENCHMARK(parseJson)->Unit(benchmark::kMillisecond)->MinTime(2);
+
+void lookUpEveryName(benchmark::State& state) {
+  const ReadText read = readKdl(FileText(texts().kdl));
+  for (auto _ : state) {
+    // The index is made at the first lookup, so each round has a tree of its own.
+    state.PauseTiming();
+    const ReadText fresh = readKdl(FileText(texts().kdl));
+    std::string name;
+    state.ResumeTiming();
+    int found = 0;
+    for (int i = 1; i <= kPoints; ++i) {
+      name.assign("POINT_").append(std::to_string(i));
+      found += kvsSectionByNameNum(fresh.tree->root().first(), name, 1) != nullptr ? 1 : 0;
+    }
+    if (found != kPoints) state.SkipWithError("a name was not found");
+  }
+}
+BENCHMARK(lookUpEveryName)->Unit(benchmark::kMillisecond);
+
+void writeText(benchmark::State& state) {
+  const ReadText read = readKdl(FileText(texts().kdl));
+  const std::string path = "/dev/shm/gridbay-bench.v27";
+  for (auto _ : state) {
+    const Result<std::string> text = kdlText(read.tree->root());
+    if (!saveFile(path, *text)) state.SkipWithError("the file cannot be written");
+  }
+  std::filesystem::remove(path);
+  state.SetBytesProcessed(state.iterations() * static_cast<std::int64_t>(texts().kdl.size()));
+}
+BENCHMARK(writeText)->Unit(benchmark::kMillisecond);
+
+void writeBytesPlainly(benchmark::State& state) {
+  const std::string path = "/dev/shm/gridbay-bench.peer";
+  for (auto _ : state) {
+    std::FILE* file = std::fopen(path.c_str(), "wb");
+    std::fwrite(texts().kdl.data(), 1, texts().kdl.size(), file);
+    std::fclose(file);
+  }
+  std::filesystem::remove(path);
+  state.SetBytesProcessed(state.iterations() * static_cast<std::int64_t>(texts().kdl.size()));
+}
+BENCHMARK(writeBytesPlainly)->Unit(benchmark::kMillisecond);
+
+}  // namespace
+}  // namespace gridbay
