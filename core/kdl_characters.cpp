@@ -127,12 +127,15 @@ bool isBareWord(std::string_view text) {
   if (!rest.empty() && rest.front() == '.') rest.remove_prefix(1);
   if (!rest.empty() && isDigit(rest.front())) return false;
   for (std::size_t at = 0; at < text.size();) {
-    const Character c = decode(text.substr(at));
-    if (c.code < 0x80
-            ? !isWordByte(static_cast<unsigned char>(c.code))
-            : c.code == kNoCharacter || isUnicodeSpace(c.code) || isNewline(c.code) || isDisallowed(c.code)) {
-      return false;
+    const auto byte = static_cast<unsigned char>(text[at]);
+    if (byte < 0x80) {
+      if (!isWordByte(byte)) return false;
+      ++at;
+      continue;
     }
+    const Character c = decode(text.substr(at));
+    if (c.code == kNoCharacter || isUnicodeSpace(c.code) || isNewline(c.code) || isDisallowed(c.code))
+      return false;
     at += c.length;
   }
   return true;

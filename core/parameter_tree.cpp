@@ -6,6 +6,7 @@
 #include <memory_resource>
 #include <new>
 #include <random>
+#include <unordered_map>
 #include <utility>
 #include <vector>
 
@@ -63,16 +64,18 @@ bool sameName(std::string_view a, std::string_view b) {
   return foldCase(loadBytes(a.data() + i, rest)) == foldCase(loadBytes(b.data() + i, rest));
 }
 
-// Open addressing over (kind, name, occurrence); each name's first node also counts its repetitions.
+// Open addressing over (kind, name, occurrence). How often a repeated name has come is kept apart: few names
+// repeat.
 class SectionIndex {
  public:
   SectionIndex(const Node& section, std::pmr::memory_resource& arena)
-      : slots_(std::bit_ceil((std::size_t{section.sectionCount()} + section.keywordCount()) * 2), &arena) {
+      : slots_(std::bit_ceil((std::size_t{section.sectionCount()} + section.keywordCount()) * 2), &arena),
+        repetitions_(&arena) {
     for (const Node* node = section.first(); node != nullptr; node = node->next()) insert(*node);
   }
 
   const Node* find(std::string_view name, std::uint32_t occurrence, bool wantSection) const {
-    return slots_[slotOf(name, occurrence, wantSection)].node;
+    return slots_[slotOf(hashName(name, occurrence), name, occurrence, wantSection)].node;
   }
 
  private:
@@ -80,11 +83,10 @@ class SectionIndex {
     const Node* node = nullptr;
     std::uint32_t hash = 0;
     std::uint32_t occurrence = 0;
-    std::uint32_t repetitions = 0;
   };
 
-  std::size_t slotOf(std::string_view name, std::uint32_t occurrence, bool wantSection) const {
-    const std::uint64_t hash = hashName(name, occurrence);
+  std::size_t slotOf(std::uint64_t hash, std::string_view name, std::uint32_t occurrence,
+                     bool wantSection) const {
     const std::size_t mask = slots_.size() - 1;
     for (std::size_t at = hash & mask;; at = (at + 1) & mask) {
       const Slot& slot = slots_[at];
@@ -96,21 +98,24 @@ class SectionIndex {
     }
   }
 
-  void put(std::size_t at, const Node& node, std::uint32_t occurrence) {
-    slots_[at] = {&node, static_cast<std::uint32_t>(hashName(node.name(), occurrence) >> 32), occurrence, 1};
+  // The slot that was free for the node, or that of the node of the same name and occurrence.
+  std::size_t place(const Node& node, std::uint32_t occurrence, bool& isNew) {
+    const std::uint64_t hash = hashName(node.name(), occurrence);
+    const std::size_t at = slotOf(hash, node.name(), occurrence, node.isSection());
+    isNew = slots_[at].node == nullptr;
+    if (isNew) slots_[at] = {&node, static_cast<std::uint32_t>(hash >> 32), occurrence};
+    return at;
   }
 
   void insert(const Node& node) {
-    const std::size_t first = slotOf(node.name(), 1, node.isSection());
-    if (slots_[first].node == nullptr) {
-      put(first, node, 1);
-      return;
-    }
-    const std::uint32_t occurrence = ++slots_[first].repetitions;
-    put(slotOf(node.name(), occurrence, node.isSection()), node, occurrence);
+    bool isNew = false;
+    const std::size_t first = place(node, 1, isNew);
+    if (!isNew) place(node, 2 + repetitions_[first]++, isNew);
   }
 
   std::pmr::vector<Slot> slots_;
+  std::pmr::unordered_map<std::size_t, std::uint32_t>
+      repetitions_;  // beyond the first, by the first one's slot
 };
 
 const Node* Node::find(std::string_view name, std::uint32_t occurrence, bool wantSection) const {
