@@ -35,7 +35,7 @@ class BlockedSignals {
   const sigset_t& before() const { return before_; }
 
  private:
-  sigset_t before_;
+  sigset_t before_{};
 };
 
 // Starts the program in a process group of its own, with the signals as they were.
@@ -44,6 +44,7 @@ int spawn(const std::string& program, const std::vector<std::string>& arguments,
   std::vector<std::string> words{program};
   words.insert(words.end(), arguments.begin(), arguments.end());
   std::vector<char*> argv;
+  argv.reserve(words.size() + 1);
   for (std::string& word : words) argv.push_back(word.data());
   argv.push_back(nullptr);
   posix_spawnattr_t attributes;

@@ -47,6 +47,7 @@ struct SectionBody {
 // A section with its body or a keyword with its values.
 class Node {
  public:
+  // NOLINTNEXTLINE(cppcoreguidelines-pro-type-member-init): the body and the values share one place
   Node(std::string_view name, SectionBody* body)
       : name_(name.data()), nameLength_(static_cast<std::uint32_t>(name.size())), kind_(1), body_(body) {}
   Node(std::string_view name, std::span<const Value> values)

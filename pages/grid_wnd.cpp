@@ -36,7 +36,7 @@ void CV27SetupGridWnd::OnClickedButtonRowCol(int row, int col) {
 }
 
 ColumnGrid::Column ColumnGrid::PointColumn(std::string_view header, int width,
-                                           std::function<GridPoint&(int item)> point) {
+                                           const std::function<GridPoint&(int item)>& point) {
   return {.header = std::string(header),
           .width = width,
           .get = [point](int item) { return pointText(point(item)); },

@@ -101,7 +101,8 @@ class ColumnGrid : public CV27SetupGridWnd {
  protected:
   virtual int ItemCount() = 0;
   // A column of grid points, shown as "(3,4)"; a store takes "3,4" too.
-  static Column PointColumn(std::string_view header, int width, std::function<GridPoint&(int item)> point);
+  static Column PointColumn(std::string_view header, int width,
+                            const std::function<GridPoint&(int item)>& point);
   void SetColumns(int rowHeaderWidth, std::vector<Column> columns);
 
   bool styleOf(int row, int col, CellStyle& style) override;

@@ -84,6 +84,7 @@ class Editor final : public SetupEditor {
 
   std::vector<Command> commands() const override {
     std::vector<Command> commands;
+    commands.reserve(CGridbayDoc::kCommands.size());
     for (const DocCommand& command : CGridbayDoc::kCommands) {
       commands.push_back({command.id, std::string(command.text), document_.IsChecked(command.id)});
     }
