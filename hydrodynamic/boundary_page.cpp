@@ -5,6 +5,7 @@
 #include <cstdio>
 
 #include "basic/boundary.h"
+#include "basic/page_texts.h"
 #include "hydrodynamic/page_texts.h"
 #include "platform/files/paths.h"
 #include "platform/units/units.h"
@@ -184,7 +185,7 @@ void CNhdBoundaryGrid::styleOfData(Object& object, int col, CellStyle& style) {
       showButton(style, "...", object.dataFormat != Object::kConstant);
       break;
     default:
-      showButton(style, texts::viewFile.format,
+      showButton(style, texts::view.format,
                  isFile(object.dataFormat) && isReadableFile(object.dataFile.fileName.absolute()));
       break;
   }
@@ -204,7 +205,7 @@ void CNhdBoundaryGrid::styleOfDirection(Object& object, int col, CellStyle& styl
       showButton(style, "...", object.enableUserDirections);
       break;
     default:
-      showButton(style, texts::viewFile.format,
+      showButton(style, texts::view.format,
                  object.enableUserDirections && isReadableFile(object.directionFile.fileName.absolute()));
       break;
   }

@@ -15,6 +15,5 @@ inline constexpr Text flowDirectionFilter{
     "Flow Direction (*.tsb1;*.tb1)|*.tsb1; *.tb1|All Files (*.*)|*.*||"};
 inline constexpr Text seriesExtension{"tsb0"};
 inline constexpr Text profileExtension{"tsb1"};
-inline constexpr Text viewFile{"View..."};
 
 }  // namespace gridbay::texts
