@@ -1,20 +1,16 @@
 #include "basic/bathymetry_page.h"
 
-#include <algorithm>
-
 #include "basic/bathymetry.h"
 #include "basic/bathymetry_requests.h"
 #include "basic/boundary.h"
 #include "basic/page_texts.h"
 #include "core/edition.h"
-#include "platform/cartography/cartography.h"
+#include "pages/cell_controls.h"
 #include "platform/files/paths.h"
 
 namespace gridbay {
 namespace {
 
-constexpr int kLocalCoordinates = 1;
-constexpr int kUtmZones = 60;
 constexpr const char* kOverlandEdit = "Edit";
 constexpr const char* kOverlandBrowse = "...";
 
@@ -25,6 +21,7 @@ CBathymetryObjectKvs& CBathymetryGrid::area(int number) {
 }
 
 void CBathymetryGrid::Initialize() {
+  CV27SetupDoc::EnableGXMultiToolTips(*this, 1);
   const auto isOutermost = [](int n) { return n == 1; };
   const auto placeIsFixed = [this](int n) { return n == 1 || GetKvs().bathymetry->hotStart == 1; };
   SetColumns(30,
@@ -33,7 +30,7 @@ void CBathymetryGrid::Initialize() {
                .get = [this](int n) { return area(n).fileName.text(); },
                .set =
                    [this](int n, std::string_view text) {
-                     area(n).fileName = text;
+                     area(n).fileName.Set(text, page().document().path());
                      OnFileChanged(n);
                      return true;
                    }},
@@ -91,7 +88,7 @@ void CBathymetryGrid::ChooseFile(int row) {
   RequestBathymetry(selector, GetKvs().bathymetry->hotStart == 1);
   selector.SetChooser(&page().document().host());
   if (selector.DoModal() != 1) return;
-  area(row).fileName = selector.fileName();
+  area(row).fileName.Set(selector.fileName(), page().document().path());
   OnFileChanged(row);
   if (row == 1) GetKvs().bathymetry->projectionStale = true;
   UpdateDoc();
@@ -149,7 +146,7 @@ int CBathymetryDlg::GetData() {
   if (hasProjection_) areas.coriolis = coriolis_ != 0;
   areas.landSlides = landSlides_ != 0;
   areas.overlandSolver = overlandSolver_ != 0;
-  if (overlandFile_ != areas.overlandFile.text()) areas.overlandFile = overlandFile_;
+  if (overlandFile_ != areas.overlandFile.text()) areas.overlandFile.Set(overlandFile_, document().path());
   return 1;
 }
 
@@ -158,12 +155,9 @@ void CBathymetryDlg::FillProjections() {
   std::string held;
   int flag = 0;
   hasProjection_ = GetKvs().bathymetry->GetProjection(&held, &flag) == 1;
-  projections_ = {held};
-  const auto add = [this](const std::string& text) {
-    if (std::ranges::find(projections_, text) == projections_.end()) projections_.push_back(text);
-  };
-  add(CVdMapProjection::IDtoProjectionString(kLocalCoordinates));
-  for (int zone = 1; zone <= kUtmZones; ++zone) add("UTM-" + std::to_string(zone));
+  CVdMapProjectionGXComboBox list;
+  list.UpdateMapProjection(held);
+  projections_ = list.choices();
   form().of(&projection_).choices = projections_;
   projection_ = 0;
 }

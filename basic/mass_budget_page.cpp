@@ -70,6 +70,10 @@ bool CMassBudgetGrid::storeCell(int row, int col, std::string_view text) {
   return true;
 }
 
+std::string CMassBudgetGrid::editName(int row, int col) {
+  return fmt::format("Polygon {}, {}", col, GetRowHeader(row));
+}
+
 bool CMassBudgetDlg::IsAvailable(CGlobalKvs& root) {
   const std::int32_t code = root.moduleSelection->simulationType;
   const std::int32_t scheme = root.moduleSelection->adScheme;

@@ -19,6 +19,7 @@ class CMassBudgetGrid final : public CV27SetupGridWnd {
  protected:
   bool styleOf(int row, int col, CellStyle& style) override;
   bool storeCell(int row, int col, std::string_view text) override;
+  std::string editName(int row, int col) override;
 };
 
 // The polygons of the mass budget, for a transport module with one of two schemes.

@@ -16,6 +16,9 @@ class FileNameValue {
     return *this;
   }
 
+  // A name that is relative to the folder of the setup at `documentPath`.
+  void Set(std::string_view name, const std::string& documentPath) { take(std::string(name), documentPath); }
+
   const std::string& text() const { return name_; }
   bool empty() const { return name_.empty(); }
   // The name by which the file can be opened; empty for an empty name.

@@ -216,6 +216,14 @@ void CGlobalKvs::Load(KvsSection file, const std::string& documentPath) {
   }
 }
 
+std::vector<CKvsBase*> CGlobalKvs::parts() {
+  std::vector<CKvsBase*> parts;
+  for (const Row& row : kSkeleton) {
+    if (row.what == Row::What::child) parts.push_back(&row.object(*this));
+  }
+  return parts;
+}
+
 void CGlobalKvs::ShowMessage(const std::string& text) {
   if (host_ != nullptr) host_->show(text);
 }

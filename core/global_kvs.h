@@ -3,6 +3,7 @@
 #include <memory>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "core/kvs_base.h"
 
@@ -38,6 +39,9 @@ class CGlobalKvs final : public CKvsBase {
   std::unique_ptr<CMassBudgetKvs> massBudget;
   std::unique_ptr<CAreaDescriptionKvs> areaDescription;
   std::unique_ptr<CNhdBoundaryKvs> nhdBoundary;
+
+  // All parts, in the order of the file.
+  std::vector<CKvsBase*> parts();
 
   // The loaded file from which a save passes on the options that the editor does not know; null for a new
   // model. It must stay open as long as saves are to have them.

@@ -39,7 +39,8 @@ bool isOfOtherModule(std::string_view name, std::int32_t selected) {
 
 SetupFile::SetupFile(MessageHost* host) : source_(kvsCreate()), model_(std::make_unique<CGlobalKvs>(host)) {}
 
-Result<SetupFile> SetupFile::open(const std::string& path, MessageHost* host) {
+Result<SetupFile> SetupFile::open(const std::string& path, MessageHost* host,
+                                  const std::optional<std::string>& documentPath) {
   KvsHandle file = kvsLoadFile(path, 0);
   if (kvsPeekErrorGlb() != kKvsNoError) {
     kvsGetErrorGlb();
@@ -48,7 +49,7 @@ Result<SetupFile> SetupFile::open(const std::string& path, MessageHost* host) {
   if (kvsTargetByNameNum(*file, CGlobalKvs::kTarget, 1) == nullptr) {
     return Failure{"\"" + path + "\" is not a setup: it has no section " + std::string(CGlobalKvs::kTarget)};
   }
-  return fromTree(std::move(file), path, host);
+  return fromTree(std::move(file), documentPath.value_or(path), host);
 }
 
 SetupFile SetupFile::fromTree(KvsHandle tree, const std::string& path, MessageHost* host) {
@@ -67,8 +68,12 @@ KvsHandle SetupFile::tree(const std::string& path) {
 }
 
 Outcome SetupFile::save(const std::string& path) {
+  return saveCopy(path, path);
+}
+
+Outcome SetupFile::saveCopy(const std::string& copy, const std::string& path) {
   KvsHandle file = tree(path);
-  if (kvsWrite(*file, path)) return {};
+  if (kvsWrite(*file, copy)) return {};
   kvsGetErrorGlb();
   return Failure{kvsGetErrorText()};
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -18,7 +19,9 @@ class SetupFile {
   explicit SetupFile(MessageHost* host);
 
   // Reads a setup; a file that is no setup is an error, so that it cannot be saved over by accident.
-  static Result<SetupFile> open(const std::string& path, MessageHost* host);
+  // File names in it are relative to the folder of `documentPath`, where one is given.
+  static Result<SetupFile> open(const std::string& path, MessageHost* host,
+                                const std::optional<std::string>& documentPath = std::nullopt);
   // Reads a setup from a tree in memory that stands for the file at the path.
   static SetupFile fromTree(KvsHandle tree, const std::string& path, MessageHost* host);
 
@@ -28,6 +31,8 @@ class SetupFile {
   // What a save to the path would write.
   KvsHandle tree(const std::string& path);
   Outcome save(const std::string& path);
+  // Writes what a save to the path would, to another file.
+  Outcome saveCopy(const std::string& copy, const std::string& path);
   // Sections of the file, as paths, that this model holds nothing of and a save leaves out. What belongs to a
   // module that is not selected is left out on purpose and is not among them.
   std::vector<std::string> unknownSections(const std::string& path);

@@ -98,13 +98,11 @@ std::string_view CNhdSineSeriesDlg::title() const {
   return texts::sineTitle.format;
 }
 
-bool CNhdSineSeriesDlg::OnOK(Object& object) {
-  if (form_.store(units_) != nullptr) return false;
+void CNhdSineSeriesDlg::OnOK(Object& object) const {
   object.referenceLevel = referenceLevel_;
   object.range = range_;
   object.period = period_;
   object.phase = phase_;
-  return true;
 }
 
 int CNhdBoundaryGrid::GetRowCount() {
@@ -131,6 +129,7 @@ bool CNhdBoundaryGrid::styleOf(int row, int col, CellStyle& style) {
   style.kind = CellKind::label;
   switch (subRowOf(row)) {
     case kTitleRow:
+      style.isHeading = col == kNameColumn;
       if (col == kNameColumn)
         style.value = formatted(texts::boundaryBlock, boundaryOf(row)) + boundary->Text();
       break;
@@ -158,6 +157,12 @@ bool CNhdBoundaryGrid::styleOf(int row, int col, CellStyle& style) {
       break;
   }
   return true;
+}
+
+std::string CNhdBoundaryGrid::editName(int row, int) {
+  constexpr std::array kNames{"title", "formulation", "data", "FAB type", "tilting", "flow direction"};
+  return "Boundary " + std::to_string(boundaryOf(row)) + ", " +
+         kNames[static_cast<std::size_t>(subRowOf(row)) - 1];
 }
 
 std::string CNhdBoundaryGrid::dataText(const Object& object) {
@@ -236,7 +241,7 @@ bool CNhdBoundaryGrid::storeCell(int row, int col, std::string_view text) {
         return storeChoice(kDirections, text,
                            [&it](std::int32_t value) { it.enableUserDirections = value == 1; });
       }
-      it.directionFile.fileName = text;
+      it.directionFile.fileName.Set(text, page().document().path());
       return true;
     default:
       return false;
@@ -247,7 +252,7 @@ bool CNhdBoundaryGrid::storeData(Object& object, std::string_view text) {
   const std::string typed(text);
   if (object.dataFormat == Object::kSineSeries) return storeSine(object, typed);
   if (object.dataFormat != Object::kConstant) {
-    object.dataFile.fileName = typed;
+    object.dataFile.fileName.Set(typed, page().document().path());
     return true;
   }
   double value = 0;
@@ -285,7 +290,9 @@ void CNhdBoundaryGrid::chooseData(Object& object, int number) {
   SetupHost& host = page().document().host();
   if (object.dataFormat == Object::kSineSeries) {
     CNhdSineSeriesDlg dialog(object, page().document().units());
-    if (host.editForm(dialog.title(), dialog.form()) && dialog.OnOK(object)) UpdateDoc();
+    if (!host.editForm(dialog.title(), dialog.form(), [&dialog] { return dialog.fault(); })) return;
+    dialog.OnOK(object);
+    UpdateDoc();
     return;
   }
   const bool isSeries = object.dataFormat == Object::kType0File || object.dataFormat == Object::kRatingCurve;
@@ -299,7 +306,7 @@ void CNhdBoundaryGrid::chooseData(Object& object, int number) {
   object.RequestDataFile(selector, number);
   selector.SetChooser(&host);
   if (selector.DoModal() != 1) return;
-  object.dataFile.fileName = selector.fileName();
+  object.dataFile.fileName.Set(selector.fileName(), page().document().path());
   object.dataFile.items = selector.GetSelectedItems();
   if (object.dataFormat == Object::kRatingCurve) object.dataFile.SetNoItems(1);
   UpdateDoc();
@@ -312,7 +319,7 @@ void CNhdBoundaryGrid::chooseDirection(Object& object, int number) {
   object.RequestDirectionFile(selector, number);
   selector.SetChooser(&host);
   if (selector.DoModal() != 1) return;
-  object.directionFile.fileName = selector.fileName();
+  object.directionFile.fileName.Set(selector.fileName(), page().document().path());
   object.directionFile.items = selector.GetSelectedItems();
   UpdateDoc();
 }

@@ -18,8 +18,9 @@ class CNhdSineSeriesDlg {
 
   std::string_view title() const;
   Form& form() { return form_; }
-  // False when a text is no number; then nothing is copied.
-  bool OnOK(CNhdBoundaryObjectKvs& object);
+  // Takes what the form shows; what is wrong with it, or empty.
+  std::string fault() { return form_.store(units_); }
+  void OnOK(CNhdBoundaryObjectKvs& object) const;
 
  private:
   const UnitChoices& units_;
@@ -50,6 +51,7 @@ class CNhdBoundaryGrid final : public CV27SetupGridWnd {
   bool styleOf(int row, int col, CellStyle& style) override;
   bool storeCell(int row, int col, std::string_view text) override;
   void buttonPressed(int row, int col) override;
+  std::string editName(int row, int col) override;
 
  private:
   CNhdBoundaryObjectKvs* object(int row);

@@ -62,6 +62,13 @@ bool isValid(const Control& control) {
 
 }  // namespace
 
+std::string Control::name() const {
+  std::string name(trimmed(label));
+  std::erase(name, '&');
+  while (name.ends_with(':') || name.ends_with(' ')) name.pop_back();
+  return name;
+}
+
 Control& Form::add(ControlKind kind, std::string_view label, Control::Variable variable) {
   controls_.push_back({.kind = kind, .label = std::string(label), .variable = variable});
   return controls_.back();
@@ -148,9 +155,10 @@ void Form::show(const UnitChoices& units) {
   }
 }
 
-const Control* Form::store(const UnitChoices& units) {
+std::string Form::store(const UnitChoices& units) {
   for (const Control& control : controls_) {
-    if (control.kind == ControlKind::text && !isValid(control)) return &control;
+    if (control.kind == ControlKind::text && !isValid(control))
+      return fmt::format("{} \"{}\" is not a number", control.label, control.text);
   }
   for (const Control& control : controls_) {
     if (control.kind != ControlKind::text && !isIndexed(control)) continue;
@@ -170,7 +178,7 @@ const Control* Form::store(const UnitChoices& units) {
                           [&](std::string* value) { *value = control.text; }},
                control.variable);
   }
-  return nullptr;
+  return {};
 }
 
 }  // namespace gridbay

@@ -35,6 +35,7 @@ struct Control {
   bool enabled = true;
   bool visible = true;
   bool readOnly = false;
+  std::string toolTip = {};
   std::vector<bool> choiceEnabled = {};  // of a radio group; empty when all are
 
   std::function<void()> onChange = {};         // an edit, click or selection; the press of a button
@@ -60,6 +61,8 @@ struct Control {
     readOnly = true;
     return *this;
   }
+  // The label with no accelerator and no colon, as a name in a sentence.
+  std::string name() const;
   bool usable() const { return enabled && visible && !readOnly; }
 };
 
@@ -85,16 +88,35 @@ class Form {
   Control* find(std::string_view label);
   Control& of(const void* variable);
 
+  // The user has changed a control, or stepped its count: its handler runs, and `acting` is the control for
+  // as long, so that what it does has a name.
+  void act(Control& control) {
+    acting_ = &control;
+    if (control.onChange) control.onChange();
+    acting_ = nullptr;
+  }
+  void spin(Control& control, int delta) {
+    acting_ = &control;
+    spinning_ = true;
+    if (control.onSpin) control.onSpin(delta);
+    spinning_ = false;
+    acting_ = nullptr;
+  }
+  const Control* acting() const { return acting_; }
+  bool isSpinning() const { return spinning_; }
+
   // Variables to controls.
   void show(const UnitChoices& units);
-  // Controls to variables; the control whose text is no value, or null when all went well. Then no variable
-  // has changed.
-  const Control* store(const UnitChoices& units);
+  // Controls to variables. Empty when all went well; else what is wrong with a text, and no variable has
+  // changed.
+  std::string store(const UnitChoices& units);
 
  private:
   Control& add(ControlKind kind, std::string_view label, Control::Variable variable = {});
 
   std::deque<Control> controls_;
+  const Control* acting_ = nullptr;
+  bool spinning_ = false;
 };
 
 }  // namespace gridbay

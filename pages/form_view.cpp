@@ -1,7 +1,5 @@
 #include "pages/form_view.h"
 
-#include <fmt/format.h>
-
 #include "pages/grid_wnd.h"
 
 namespace gridbay {
@@ -24,6 +22,9 @@ int CV27SetupFormView::UpdateDoc() {
   if (GetData() == 0) return 0;
   document_.Touch(pageId_);
   document_.SetModifiedFlag();
+  const Control* acting = form_.acting();
+  document_.RecordEdit(pageId_, !editName_.empty() || acting == nullptr ? editName_ : acting->name(),
+                       form_.isSpinning());
   document_.UpdateAllViews(this);
   return 1;
 }
@@ -33,10 +34,9 @@ bool CV27SetupFormView::UpdateData(bool save) {
     form_.show(document_.units());
     return true;
   }
-  const Control* bad = form_.store(document_.units());
-  if (bad == nullptr) return true;
-  document_.host().show(fmt::format("{} \"{}\" is not a number", bad->label, bad->text));
-  return false;
+  const std::string fault = form_.store(document_.units());
+  if (!fault.empty()) document_.host().show(fault);
+  return fault.empty();
 }
 
 void CV27SetupFormView::AddCount(Form& form, std::string_view label, std::int32_t& variable, int highestSpin,

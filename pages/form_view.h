@@ -34,6 +34,8 @@ class CV27SetupFormView {
   // Pushes the page into the model, marks the document as modified and lets the other views know. Nonzero on
   // success.
   int UpdateDoc();
+  // Names the edit that is being made, for as long as it is made; empty for that of a control.
+  void SetEditName(std::string name) { editName_ = std::move(name); }
 
   CGlobalKvs& GetKvs() { return document_.root(); }
   CV27SetupDoc& document() { return document_; }
@@ -68,6 +70,7 @@ class CV27SetupFormView {
   std::int32_t templateId_;
   PageId pageId_;
   Form form_;
+  std::string editName_;
   std::vector<const Control*> alignedRight_;
   std::vector<const Control*> alignedBottom_;
 };

@@ -13,7 +13,10 @@ int CV27SetupGridWnd::GetStyleRowCol(int row, int col, CellStyle& style) {
     return 1;
   }
   if (row < 0 || col < 0 || row > GetRowCount() || col > GetColCount()) return 0;
-  return styleOf(row, col, style) ? 1 : 0;
+  if (!styleOf(row, col, style)) return 0;
+  if (style.toolTip.empty() && toolTipColumns_.contains(col))
+    style.toolTip = CV27SetupDoc::GetToolTipsString(style.value);
+  return 1;
 }
 
 int CV27SetupGridWnd::StoreStyleRowCol(int row, int col, std::string_view text) {
@@ -24,15 +27,49 @@ int CV27SetupGridWnd::StoreStyleRowCol(int row, int col, std::string_view text) 
   const std::size_t first = text.find_first_not_of(" \t");
   const std::string_view rest = first == text.npos ? std::string_view() : text.substr(first);
   const std::string trimmed(rest.substr(0, rest.find_last_not_of(" \t") + 1));
-  if (!storeCell(row, col, trimmed)) return 0;
-  UpdateDoc();
-  return 1;
+  page_->SetEditName(editName(row, col));
+  const bool stored = storeCell(row, col, trimmed);
+  if (stored) UpdateDoc();
+  page_->SetEditName({});
+  return stored ? 1 : 0;
 }
 
 void CV27SetupGridWnd::OnClickedButtonRowCol(int row, int col) {
   CellStyle style;
   if (GetStyleRowCol(row, col, style) == 0 || style.kind != CellKind::button || !style.enabled) return;
+  page_->SetEditName(editName(row, col));
   buttonPressed(row, col);
+  page_->SetEditName({});
+}
+
+bool CV27SetupGridWnd::ProcessKeys(GridKey key, int row, int col) {
+  CellStyle style;
+  if (key != GridKey::browse || GetStyleRowCol(row, col, style) == 0) return false;
+  if (style.kind != CellKind::resultFile || !style.editable()) return false;
+  CVdGridResultFileEditCtrl control(page_->document().host());
+  setUpResultFile(row, col, control);
+  if (control.ShowDialog(&style.value)) StoreStyleRowCol(row, col, style.value);
+  return true;
+}
+
+std::vector<std::string> CV27SetupGridWnd::OnStartEditing(int row, int col) {
+  CellStyle style;
+  if (GetStyleRowCol(row, col, style) == 0 || style.kind != CellKind::mapProjection) return {};
+  projection_.UpdateMapProjection(style.value);
+  return projection_.choices();
+}
+
+void CV27SetupGridWnd::OnModifyCell(std::string_view text) {
+  projection_.UpdateMapProjection(text);
+}
+
+std::string CV27SetupGridWnd::editName(int row, int col) {
+  const std::string column = ShowsHeaders() ? GetColHeader(col) : std::string();
+  if (!column.empty()) return GetRowHeader(row).empty() ? column : column + ", row " + GetRowHeader(row);
+  for (const Control& control : page_->form().controls()) {
+    if (control.grid == this) return control.name();
+  }
+  return {};
 }
 
 ColumnGrid::Column ColumnGrid::PointColumn(std::string_view header, int width,

@@ -1,17 +1,21 @@
 #pragma once
 
 #include <functional>
+#include <set>
 #include <string>
 #include <string_view>
 #include <vector>
 
 #include "core/grid_point.h"
+#include "pages/cell_controls.h"
 #include "pages/form_view.h"
 
 namespace gridbay {
 
 enum class CellKind { plain, button, dropDown, checkBox, resultFile, mapProjection, label };
 enum class CellAlign { left, right };
+// Keys that mean something to a cell.
+enum class GridKey { browse /* Ctrl+D */, other };
 
 // One cell as it is painted: its value and look, taken from the model each time.
 struct CellStyle {
@@ -22,6 +26,7 @@ struct CellStyle {
   std::string toolTip = {};
   bool enabled = true;
   bool readOnly = false;
+  bool isHeading = false;  // stands over the rows below, across all columns
 
   // Whether the cell takes a value at all, and whether a user can type one.
   bool takesValue() const { return enabled && !readOnly && kind != CellKind::button; }
@@ -56,6 +61,24 @@ class CV27SetupGridWnd {
   // A press of the button in a cell.
   virtual void OnClickedButtonRowCol(int row, int col);
 
+  // A click on a cell that is no button.
+  virtual void OnLButtonHitRowCol(int, int) {}
+  // Ctrl+D lets the user browse for the file of a result file cell; false for any other key or cell.
+  virtual bool ProcessKeys(GridKey key, int row, int col);
+  // Whether a user may drag the column wider: a hidden one stays hidden.
+  virtual bool OnTrackColWidth(int col) { return GetColWidth(col) > 0; }
+
+  // A cell with a map projection while it is edited: the list starts from what the cell holds, takes what is
+  // picked, and stores it at the end. The first gives the list; empty for any other cell.
+  virtual std::vector<std::string> OnStartEditing(int row, int col);
+  virtual void OnModifyCell(std::string_view text);
+  virtual int OnEndEditing(int row, int col) {
+    return StoreStyleRowCol(row, col, projection_.GetMapProjection());
+  }
+
+  // Long values of a column are shown whole as tool tips.
+  void EnableGridToolTips(int col) { toolTipColumns_.insert(col); }
+
   // While a grid is being laid out anew it gives and takes no cells.
   void SetRebuilding(bool rebuilding) { rebuilding_ = rebuilding; }
 
@@ -71,10 +94,16 @@ class CV27SetupGridWnd {
   // Takes a trimmed text; false when it is no value, with the model untouched.
   virtual bool storeCell(int row, int col, std::string_view text) = 0;
   virtual void buttonPressed(int, int) {}
+  // Says what a result file cell is browsed for.
+  virtual void setUpResultFile(int, int, CVdGridResultFileEditCtrl&) {}
+  // What an edit of a cell is called.
+  virtual std::string editName(int row, int col);
 
  private:
   CV27SetupFormView* page_ = nullptr;
   bool rebuilding_ = false;
+  std::set<int> toolTipColumns_;
+  CVdMapProjectionGXComboBox projection_;
 };
 
 // A grid with one row for each item of a list, whose columns are said once.

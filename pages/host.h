@@ -1,6 +1,7 @@
 #pragma once
 
 #include <array>
+#include <functional>
 #include <string>
 #include <string_view>
 
@@ -28,8 +29,9 @@ class SetupHost : public MessageHost, public FileChooser {
   // A plain file dialog with a filter ("Grids (*.tsb2)|*.tsb2||") and the extension to add; false when it is
   // left.
   virtual bool chooseFile(std::string_view filter, std::string_view extension, std::string* name) = 0;
-  // Shows a few controls with OK and Cancel; true for OK.
-  virtual bool editForm(std::string_view title, Form& form) = 0;
+  // Shows a few controls with OK and Cancel; true for OK. `fault` says what is wrong with what the controls
+  // show, and OK does nothing but tell it, until it is empty.
+  virtual bool editForm(std::string_view title, Form& form, const std::function<std::string()>& fault) = 0;
   // Opens a file as a document or in a viewer.
   virtual void openFile(const std::string& path) = 0;
   // Shows what a check found; each message leads to its page.

@@ -2,16 +2,28 @@
 
 #include <algorithm>
 
+#include "pages/form_view.h"
+#include "pages/grid_wnd.h"
 #include "platform/files/paths.h"
 
 namespace gridbay {
 
-bool CV27SetupDoc::OnNewDocument() {
-  setup_ = SetupFile(&host_);
-  path_.clear();
+CV27SetupDoc::CV27SetupDoc(SetupHost& host) : host_(host), setup_(&host) {
+  history_.start(root(), path_, touched_);
+}
+
+void CV27SetupDoc::start(SetupFile setup, const std::string& path, bool modified) {
+  setup_ = std::move(setup);
+  path_ = path;
   touched_.clear();
-  modified_ = false;
+  modified_ = modified;
+  history_.start(root(), path_, touched_);
+  if (modified) history_.markUnsaved();
   UpdateAllViews(nullptr);
+}
+
+bool CV27SetupDoc::OnNewDocument() {
+  start(SetupFile(&host_), {}, false);
   return true;
 }
 
@@ -21,11 +33,7 @@ bool CV27SetupDoc::OnOpenDocument(const std::string& path) {
     host_.show(opened.error());
     return false;
   }
-  setup_ = std::move(*opened);
-  path_ = path;
-  touched_.clear();
-  modified_ = false;
-  UpdateAllViews(nullptr);
+  start(std::move(*opened), path, false);
   return true;
 }
 
@@ -36,11 +44,58 @@ bool CV27SetupDoc::OnSaveDocument(const std::string& path) {
   }
   path_ = path;
   modified_ = false;
+  history_.markSaved();
   return true;
+}
+
+Outcome CV27SetupDoc::WriteRecoveryCopy(const std::string& copy) {
+  return setup_.saveCopy(copy, path_);
+}
+
+bool CV27SetupDoc::OnRecoverDocument(const std::string& copy, const std::string& path) {
+  Result<SetupFile> opened = SetupFile::open(copy, &host_, path);
+  if (!opened) {
+    host_.show(opened.error());
+    return false;
+  }
+  start(std::move(*opened), path, true);
+  return true;
+}
+
+void CV27SetupDoc::RecordEdit(PageId page, std::string name, bool continues) {
+  history_.record(root(), page, std::move(name), continues, touched_);
+}
+
+void CV27SetupDoc::Undo() {
+  history_.undo(root(), touched_);
+  modified_ = !history_.isSaved();
+  UpdateAllViews(nullptr);
+}
+
+void CV27SetupDoc::Redo() {
+  history_.redo(root(), touched_);
+  modified_ = !history_.isSaved();
+  UpdateAllViews(nullptr);
 }
 
 std::string CV27SetupDoc::getAbsoluteFilepath(const std::string& name) const {
   return absolutePath(name, path_.empty() ? std::string() : folderOfFile(path_));
+}
+
+void CV27SetupDoc::EnableMultiToolTips(CV27SetupFormView& page, std::string_view label,
+                                       std::string_view text) {
+  if (Control* control = page.form().find(label)) control->toolTip = text;
+}
+
+void CV27SetupDoc::EnableGXMultiToolTips(CV27SetupGridWnd& grid, int column) {
+  grid.EnableGridToolTips(column);
+}
+
+std::string CV27SetupDoc::GetToolTipsString(std::string_view value) {
+  constexpr std::size_t kLine = 100;
+  std::string text;
+  for (; value.size() > kLine; value.remove_prefix(kLine)) text.append(value.substr(0, kLine)).append("\n");
+  return text.append(value);
 }
 
 void CV27SetupDoc::AddView(const void* owner, View update) {

@@ -9,16 +9,20 @@
 #include "core/global_kvs.h"
 #include "core/page_id.h"
 #include "core/setup_file.h"
+#include "pages/edit_history.h"
 #include "pages/host.h"
 #include "platform/units/edit_style.h"
 
 namespace gridbay {
 
+class CV27SetupFormView;
+class CV27SetupGridWnd;
+
 // A document: a model that is never without its parts, the file it is saved in, and what the pages of one
 // setup share. It knows of no window.
 class CV27SetupDoc {
  public:
-  explicit CV27SetupDoc(SetupHost& host) : host_(host), setup_(&host) {}
+  explicit CV27SetupDoc(SetupHost& host);
   CV27SetupDoc(const CV27SetupDoc&) = delete;
   CV27SetupDoc& operator=(const CV27SetupDoc&) = delete;
   virtual ~CV27SetupDoc() = default;
@@ -26,6 +30,7 @@ class CV27SetupDoc {
   CGlobalKvs& root() { return setup_.model(); }
   SetupHost& host() { return host_; }
   UnitChoices& units() { return units_; }
+  const UnitChoices& units() const { return units_; }
 
   // A fresh model without a file.
   virtual bool OnNewDocument();
@@ -43,6 +48,20 @@ class CV27SetupDoc {
   // The absolute form of a file name in the setup.
   std::string getAbsoluteFilepath(const std::string& name) const;
 
+  // Writes what a save would to another file, for when this program ends before the save; and takes such a
+  // file up again as unsaved edits of the setup at `path`, which may be empty.
+  Outcome WriteRecoveryCopy(const std::string& copy);
+  bool OnRecoverDocument(const std::string& copy, const std::string& path);
+
+  // A page has brought an edit into the model: it can be taken back by this name. An edit that continues a
+  // like one is taken back with it.
+  void RecordEdit(PageId page, std::string name, bool continues = false);
+  // The step that comes next; null when there is none.
+  const EditHistory::Step* UndoStep() const { return history_.undoStep(); }
+  const EditHistory::Step* RedoStep() const { return history_.redoStep(); }
+  void Undo();
+  void Redo();
+
   bool IsModified() const { return modified_; }
   void SetModifiedFlag(bool modified = true) { modified_ = modified; }
 
@@ -51,6 +70,12 @@ class CV27SetupDoc {
   void Touch(PageId page) { touched_.insert(page); }
   void UnTouch(PageId page) { touched_.erase(page); }
 
+  // Tool tips: of a page's control, and of the long values in a column of a grid.
+  static void EnableMultiToolTips(CV27SetupFormView& page, std::string_view label, std::string_view text);
+  static void EnableGXMultiToolTips(CV27SetupGridWnd& grid, int column);
+  // The tip of a long value, on lines that fit a screen.
+  static std::string GetToolTipsString(std::string_view value);
+
   // Views are told of each change, but for the one that made it.
   using View = std::function<void()>;
   void AddView(const void* owner, View update);
@@ -58,12 +83,15 @@ class CV27SetupDoc {
   void UpdateAllViews(const void* sender);
 
  private:
+  void start(SetupFile setup, const std::string& path, bool modified);
+
   SetupHost& host_;
   SetupFile setup_;
   UnitChoices units_;
   std::string path_;
   std::string engine_;
   std::set<PageId> touched_;
+  EditHistory history_;
   bool modified_ = false;
   std::vector<std::pair<const void*, View>> views_;
 };

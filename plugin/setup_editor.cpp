@@ -1,45 +1,12 @@
 #include "plugin/setup_editor.h"
 
-#include <algorithm>
-
+#include "pages/graphical_view.h"
 #include "pages/gridbay_doc.h"
 #include "pages/page_factory.h"
+#include "plugin/cover_pages.h"
 
 namespace gridbay {
 namespace {
-
-struct Cover {
-  std::int32_t id;
-  const char* text;
-};
-
-constexpr Cover kCovers[] = {
-    {1,
-     "A setup is everything that a simulation needs. Work through the basic parameters first: the areas and "
-     "their grids, "
-     "then the period, the open boundaries and the sources. Then give the conditions of the flow. Check the "
-     "setup with "
-     "Validate before you start it."},
-    {2,
-     "What every model has. Begin with the bathymetry: it gives the grids that all else lies on. Then set "
-     "the simulation "
-     "period, see to the open boundaries, place sources and sinks, and set the depths of flooding and "
-     "drying."},
-    {3,
-     "What is dissolved or suspended in the water: the components, where they start from, what comes in at "
-     "boundaries and "
-     "sources, how they spread and decay."},
-    {4,
-     "The flow itself: how it starts, what drives it at the open boundaries, what flows in at the sources, "
-     "resistance and "
-     "structures, and last the results to keep."},
-    {5, "Fractions of mud in the water and layers of it in the bed."},
-    {6, "Mud in the water and in the bed."},
-    {7, "The ecological model: its definition, its state variables and what they depend on."},
-    {42, "Weirs, culverts and dikes. Each is a named line that the engine places on the grid."},
-    {61, "The bed: its layers, and how they erode, slide and change the depth."},
-    {115, "How the state variables are carried and spread by the flow."},
-};
 
 class Editor final : public SetupEditor {
  public:
@@ -59,6 +26,28 @@ class Editor final : public SetupEditor {
   std::string fileKind() const override { return document_.fileKind(); }
   bool isModified() const override { return document_.IsModified(); }
 
+  std::string writeRecoveryCopy(const std::string& copy) override {
+    const Outcome written = document_.WriteRecoveryCopy(copy);
+    return written ? std::string() : written.error();
+  }
+  bool recover(const std::string& copy, const std::string& path) override {
+    if (!document_.OnRecoverDocument(copy, path)) return false;
+    tree_.OnInitialUpdate(&document_.root());
+    update();
+    return true;
+  }
+
+  std::optional<Edit> undoable() const override { return editOf(document_.UndoStep()); }
+  std::optional<Edit> redoable() const override { return editOf(document_.RedoStep()); }
+  void undo() override { document_.Undo(); }
+  void redo() override { document_.Redo(); }
+
+  FirstView firstView() const override {
+    CGraphicalView view;
+    view.OnInitialUpdate();
+    return {view.picture(), std::string(CGraphicalView::kText)};
+  }
+
   std::vector<Item> items() const override {
     std::vector<Item> items;
     for (const TreeItem& item : tree_.items())
@@ -75,11 +64,9 @@ class Editor final : public SetupEditor {
     if (page_ != nullptr) page_->SetData();
   }
   std::string cover(std::int32_t id) const override {
-    const auto* found = std::ranges::find(kCovers, id, &Cover::id);
-    return found != std::end(kCovers)
-               ? found->text
-               : "This page is not a part of this version yet. What a setup holds of it "
-                 "is not edited here.";
+    std::string topic;
+    std::string local;
+    return coverPage(id, document_.enumerator().GetPageClass(id, &topic, &local));
   }
 
   std::vector<Command> commands() const override {
@@ -91,14 +78,23 @@ class Editor final : public SetupEditor {
     return commands;
   }
   bool command(int id) override { return document_.OnCommand(id); }
-  void setUnitSystem(UnitSystem system) override {
-    document_.units().setSystem(system);
+  std::int32_t helpTopic(std::int32_t id) const override {
+    return document_.enumerator().GetHelpTopicNumber(id);
+  }
+  const UnitChoices& units() const override { return document_.units(); }
+  void setUnits(const UnitChoices& units) override {
+    document_.units() = units;
     refreshPage();
     update();
   }
   void onChange(std::function<void()> changed) override { changed_ = std::move(changed); }
 
  private:
+  std::optional<Edit> editOf(const EditHistory::Step* step) const {
+    if (step == nullptr) return std::nullopt;
+    const auto page = static_cast<std::int32_t>(step->page);
+    return Edit{page, step->name.empty() ? std::string(document_.enumerator().GetCaption(page)) : step->name};
+  }
   void update() {
     tree_.OnUpdate(&document_.root());
     if (changed_) changed_();

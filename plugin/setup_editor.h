@@ -1,7 +1,9 @@
 #pragma once
 
 #include <cstdint>
+#include <functional>
 #include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -29,6 +31,17 @@ class SetupEditor {
     bool checked;
   };
 
+  // An edit by its page and name.
+  struct Edit {
+    std::int32_t page;
+    std::string name;
+  };
+  // What the pane shows before a page is chosen: a picture, or else a text.
+  struct FirstView {
+    std::optional<std::string> picture;
+    std::string text;
+  };
+
   virtual ~SetupEditor() = default;
 
   virtual bool open(const std::string& path) = 0;
@@ -37,6 +50,18 @@ class SetupEditor {
   virtual std::string fileKind() const = 0;
   virtual bool isModified() const = 0;
 
+  // Writes what a save would to another file; what is wrong, or empty. Takes such a file up as unsaved edits
+  // of the setup at `path`, which is empty for one that was never saved.
+  virtual std::string writeRecoveryCopy(const std::string& copy) = 0;
+  virtual bool recover(const std::string& copy, const std::string& path) = 0;
+
+  // The edit that would be taken back or done again next.
+  virtual std::optional<Edit> undoable() const = 0;
+  virtual std::optional<Edit> redoable() const = 0;
+  virtual void undo() = 0;
+  virtual void redo() = 0;
+
+  virtual FirstView firstView() const = 0;
   virtual std::vector<Item> items() const = 0;
   // Opens the page of an item; null for one without a page in this version. The form lives until the next
   // call.
@@ -45,10 +70,14 @@ class SetupEditor {
   virtual void refreshPage() = 0;
   // What an item without a page is for, in a few lines.
   virtual std::string cover(std::int32_t id) const = 0;
+  // The number of an item's help topic; 0 for one that has no page.
+  virtual std::int32_t helpTopic(std::int32_t id) const = 0;
 
   virtual std::vector<Command> commands() const = 0;
   virtual bool command(int id) = 0;
-  virtual void setUnitSystem(UnitSystem system) = 0;
+  // The units that quantities are shown in.
+  virtual const UnitChoices& units() const = 0;
+  virtual void setUnits(const UnitChoices& units) = 0;
 
   // Called after each change of the model or its page.
   virtual void onChange(std::function<void()> changed) = 0;

@@ -1,13 +1,15 @@
 #include "shell/document_tab.h"
 
 #include <QApplication>
+#include <QDateTime>
 #include <QDialog>
 #include <QDialogButtonBox>
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QInputDialog>
 #include <QMessageBox>
-#include <QTreeWidgetItemIterator>
+#include <QPushButton>
+#include <QTimer>
 #include <QVBoxLayout>
 
 namespace gridbay::shell {
@@ -33,18 +35,26 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
                          WindowServices services, QWidget* parent)
     : QSplitter(parent), services_(std::move(services)) {
   auto* side = new QWidget(this);
-  auto* layout = new QVBoxLayout(side);
-  layout->setContentsMargins(0, 0, 0, 0);
+  auto* sideLayout = new QVBoxLayout(side);
+  sideLayout->setContentsMargins(0, 0, 0, 0);
   filter_ = new QLineEdit(side);
   filter_->setPlaceholderText(tr("Find a page"));
+  filter_->setAccessibleName(tr("Find a page"));
   filter_->setClearButtonEnabled(true);
   tree_ = new QTreeWidget(side);
   tree_->setHeaderHidden(true);
-  layout->addWidget(filter_);
-  layout->addWidget(tree_);
-  pane_ = new PagePane(this);
+  tree_->setAccessibleName(tr("Pages"));
+  sideLayout->addWidget(filter_);
+  sideLayout->addWidget(tree_);
+  auto* main = new QWidget(this);
+  auto* mainLayout = new QVBoxLayout(main);
+  mainLayout->setContentsMargins(0, 0, 0, 0);
+  notice_ = makeNotice(main);
+  pane_ = new PagePane(main);
+  mainLayout->addWidget(notice_);
+  mainLayout->addWidget(pane_, 1);
   addWidget(side);
-  addWidget(pane_);
+  addWidget(main);
   setStretchFactor(1, 1);
   setSizes({260, 700});
 
@@ -54,21 +64,50 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
     emit documentChanged();
   });
   fillTree();
+  showFirstView();
   connect(filter_, &QLineEdit::textChanged, this, [this] { applyVisibility(); });
   connect(tree_, &QTreeWidget::currentItemChanged, this, [this] { showCurrentPage(); });
-  goToPage(1);
+  connect(&watcher_, &QFileSystemWatcher::fileChanged, this, [this] {
+    // A program that replaces the file is given the moment that this takes.
+    constexpr int kMoment = 200;
+    QTimer::singleShot(kMoment, this, [this] { fileChanged(); });
+  });
 }
 
-DocumentTab::~DocumentTab() = default;
+// The page's widgets go before the editor whose form they show.
+DocumentTab::~DocumentTab() {
+  pane_->clear();
+}
+
+QFrame* DocumentTab::makeNotice(QWidget* parent) {
+  auto* notice = new QFrame(parent);
+  notice->setFrameShape(QFrame::StyledPanel);
+  notice->setVisible(false);
+  auto* layout = new QHBoxLayout(notice);
+  noticeText_ = new QLabel(notice);
+  noticeText_->setWordWrap(true);
+  auto* reload = new QPushButton(tr("Reload"), notice);
+  auto* keep = new QPushButton(tr("Keep mine"), notice);
+  reload->setObjectName("reload");
+  keep->setObjectName("keep");
+  layout->addWidget(noticeText_, 1);
+  layout->addWidget(reload);
+  layout->addWidget(keep);
+  connect(reload, &QPushButton::clicked, this, [this] { open(QString::fromStdString(editor_->path())); });
+  connect(keep, &QPushButton::clicked, this, [this] { notice_->hide(); });
+  return notice;
+}
 
 void DocumentTab::fillTree() {
   tree_->clear();
+  itemsById_.clear();
   std::vector<QTreeWidgetItem*> path;
   for (const SetupEditor::Item& item : editor_->items()) {
     path.resize(static_cast<std::size_t>(item.depth));
     auto* node = path.empty() ? new QTreeWidgetItem(tree_) : new QTreeWidgetItem(path.back());
     node->setText(0, QString::fromStdString(item.caption));
     node->setData(0, kIdRole, item.id);
+    itemsById_.insert(item.id, node);
     path.push_back(node);
   }
   applyVisibility();
@@ -78,36 +117,69 @@ void DocumentTab::fillTree() {
 // An item is seen when the rules show it and the filter finds it or something below it.
 void DocumentTab::applyVisibility() {
   const QString wanted = filter_->text();
-  for (const SetupEditor::Item& item : editor_->items()) {
-    if (QTreeWidgetItem* node = itemOf(item.id)) node->setHidden(!item.visible || !wanted.isEmpty());
+  const std::vector<SetupEditor::Item> items = editor_->items();
+  bool currentHidden = false;
+  for (const SetupEditor::Item& item : items) {
+    QTreeWidgetItem* node = itemOf(item.id);
+    if (node == nullptr) continue;
+    const bool hidden = !item.visible || !wanted.isEmpty();
+    if (node->isHidden() != hidden) node->setHidden(hidden);
+    if (node == tree_->currentItem() && !item.visible) currentHidden = true;
   }
-  if (wanted.isEmpty()) return;
-  for (const SetupEditor::Item& item : editor_->items()) {
-    if (!item.visible || !QString::fromStdString(item.caption).contains(wanted, Qt::CaseInsensitive))
-      continue;
+  for (const SetupEditor::Item& item : items) {
+    if (wanted.isEmpty() || !item.visible) continue;
+    if (!QString::fromStdString(item.caption).contains(wanted, Qt::CaseInsensitive)) continue;
     for (QTreeWidgetItem* node = itemOf(item.id); node != nullptr; node = node->parent())
       node->setHidden(false);
   }
+  // Not at once: the page may be in the middle of the edit that hides it.
+  if (currentHidden) QTimer::singleShot(0, this, [this] { leaveHiddenPage(); });
 }
 
-QTreeWidgetItem* DocumentTab::itemOf(std::int32_t id) const {
-  for (QTreeWidgetItemIterator it(tree_); *it != nullptr; ++it) {
-    if ((*it)->data(0, kIdRole).toInt() == id) return *it;
-  }
-  return nullptr;
+// From a page that has gone out the view moves to what is above it and still seen.
+void DocumentTab::leaveHiddenPage() {
+  QTreeWidgetItem* node = tree_->currentItem();
+  const auto isOut = [this](const QTreeWidgetItem* at) {
+    for (const SetupEditor::Item& item : editor_->items()) {
+      if (itemOf(item.id) == at) return !item.visible;
+    }
+    return false;
+  };
+  if (node == nullptr || !isOut(node)) return;
+  while (node != nullptr && isOut(node)) node = node->parent();
+  tree_->setCurrentItem(node != nullptr ? node : tree_->topLevelItem(0));
 }
 
 bool DocumentTab::goToPage(std::int32_t id) {
   QTreeWidgetItem* node = itemOf(id);
-  if (node == nullptr || node->isHidden()) return false;
+  for (const QTreeWidgetItem* at = node; at != nullptr; at = at->parent()) {
+    if (at->isHidden()) return false;
+  }
+  if (node == nullptr) return false;
   tree_->setCurrentItem(node);
   return true;
 }
 
 void DocumentTab::goToNeighbour(int direction) {
   QTreeWidgetItem* node = tree_->currentItem();
-  node = direction > 0 ? tree_->itemBelow(node) : tree_->itemAbove(node);
+  if (node != nullptr) node = direction > 0 ? tree_->itemBelow(node) : tree_->itemAbove(node);
+  if (tree_->currentItem() == nullptr) node = tree_->topLevelItem(0);
   if (node != nullptr) tree_->setCurrentItem(node);
+}
+
+std::int32_t DocumentTab::currentPage() const {
+  const QTreeWidgetItem* node = tree_->currentItem();
+  return node == nullptr ? 0 : node->data(0, kIdRole).toInt();
+}
+
+QString DocumentTab::caption(std::int32_t id) const {
+  const QTreeWidgetItem* node = itemOf(id);
+  return node == nullptr ? QString::number(id) : node->text(0);
+}
+
+void DocumentTab::showFirstView() {
+  const SetupEditor::FirstView view = editor_->firstView();
+  pane_->showPicture(QString::fromStdString(view.picture.value_or("")), QString::fromStdString(view.text));
 }
 
 void DocumentTab::showCurrentPage() {
@@ -115,14 +187,108 @@ void DocumentTab::showCurrentPage() {
   if (node == nullptr) return;
   const int id = node->data(0, kIdRole).toInt();
   // The old page's widgets go before the form that they show.
-  pane_->showText(node->text(0), QString::fromStdString(editor_->cover(id)));
-  if (Form* form = editor_->openPage(id)) pane_->showForm(node->text(0), *form);
+  pane_->clear();
+  if (Form* form = editor_->openPage(id)) {
+    pane_->showForm(node->text(0), *form);
+  } else {
+    pane_->showText(node->text(0), QString::fromStdString(editor_->cover(id)));
+  }
 }
 
 QString DocumentTab::title() const {
   const QString path = QString::fromStdString(editor_->path());
   return (path.isEmpty() ? QString(kUntitled) : QFileInfo(path).fileName()) +
          (editor_->isModified() ? " *" : "");
+}
+
+DocumentTab::Stamp DocumentTab::stampOf(const QString& path) {
+  const QFileInfo info(path);
+  return info.exists() ? Stamp{info.lastModified().toMSecsSinceEpoch(), info.size()} : Stamp{};
+}
+
+void DocumentTab::watch() {
+  const QString path = QString::fromStdString(editor_->path());
+  stamp_ = stampOf(path);
+  notice_->hide();
+  if (!watcher_.files().isEmpty()) watcher_.removePaths(watcher_.files());
+  if (!path.isEmpty() && QFileInfo::exists(path)) watcher_.addPath(path);
+}
+
+bool DocumentTab::isChangedOnDisk() const {
+  const QString path = QString::fromStdString(editor_->path());
+  return !path.isEmpty() && stamp_.size >= 0 && QFileInfo::exists(path) && stampOf(path) != stamp_;
+}
+
+void DocumentTab::fileChanged() {
+  const QString path = QString::fromStdString(editor_->path());
+  if (QFileInfo::exists(path)) watcher_.addPath(path);
+  const bool isGone = !path.isEmpty() && !QFileInfo::exists(path);
+  if (!isGone && !isChangedOnDisk()) return;
+  notice_->findChild<QPushButton*>("reload")->setEnabled(!isGone);
+  noticeText_->setText(isGone ? tr("%1 is no longer on disk. What is open here can be saved again.").arg(path)
+                              : tr("%1 was changed by another program. Reload it and lose the edits made "
+                                   "here, or keep what is open here.")
+                                    .arg(path));
+  notice_->show();
+}
+
+bool DocumentTab::open(const QString& path) {
+  const std::int32_t page = currentPage();
+  pane_->clear();
+  const bool opened = editor_->open(path.toStdString());
+  if (opened) {
+    fillTree();
+    watch();
+  }
+  if (page == 0 || !goToPage(page)) showFirstView();
+  showCurrentPage();
+  if (opened) emit documentChanged();
+  return opened;
+}
+
+bool DocumentTab::recover(const QString& copy, const QString& path) {
+  if (!editor_->recover(copy.toStdString(), path.toStdString())) return false;
+  fillTree();
+  watch();
+  emit documentChanged();
+  return true;
+}
+
+bool DocumentTab::save(const QString& path) {
+  commit();
+  const bool isOwn = path.toStdString() == editor_->path();
+  if (isOwn && isChangedOnDisk() &&
+      !askYesNo(path.toStdString() +
+                " was changed by another program since it was opened here.\n\nWrite over it?"))
+    return false;
+  if (!editor_->save(path.toStdString())) return false;
+  watch();
+  emit documentChanged();
+  return true;
+}
+
+void DocumentTab::undo() {
+  commit();
+  const std::optional<SetupEditor::Edit> edit = editor_->undoable();
+  if (!edit) return;
+  editor_->undo();
+  pane_->refresh();
+  goToPage(edit->page);
+}
+
+void DocumentTab::redo() {
+  commit();
+  const std::optional<SetupEditor::Edit> edit = editor_->redoable();
+  if (!edit) return;
+  editor_->redo();
+  pane_->refresh();
+  goToPage(edit->page);
+}
+
+void DocumentTab::setUnits(const UnitChoices& units) {
+  commit();
+  editor_->setUnits(units);
+  pane_->refresh();
 }
 
 void DocumentTab::show(const std::string& text) {
@@ -170,14 +336,22 @@ bool DocumentTab::choose(CVdFileSelectorDlg& selector) {
   return valid || askYesNo(why + "\n\nTake the file all the same?");
 }
 
-bool DocumentTab::editForm(std::string_view title, Form& form) {
+bool DocumentTab::editForm(std::string_view title, Form& form, const std::function<std::string()>& fault) {
   QDialog dialog(this);
   dialog.setWindowTitle(QString::fromUtf8(title.data(), static_cast<qsizetype>(title.size())));
   auto* layout = new QVBoxLayout(&dialog);
   auto* pane = new PagePane(&dialog);
   pane->showForm(dialog.windowTitle(), form);
   auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, &dialog);
-  connect(buttons, &QDialogButtonBox::accepted, &dialog, &QDialog::accept);
+  connect(buttons, &QDialogButtonBox::accepted, &dialog, [&] {
+    pane->commit();
+    const std::string text = fault();
+    if (text.empty()) {
+      dialog.accept();
+    } else {
+      show(text);
+    }
+  });
   connect(buttons, &QDialogButtonBox::rejected, &dialog, &QDialog::reject);
   layout->addWidget(pane);
   layout->addWidget(buttons);

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <QFileSystemWatcher>
+#include <QHash>
 #include <QLineEdit>
 #include <QSplitter>
 #include <QTreeWidget>
@@ -29,16 +31,35 @@ class DocumentTab final : public QSplitter, public SetupHost {
   SetupEditor& editor() { return *editor_; }
   PagePane& pane() { return *pane_; }
   QTreeWidget& tree() { return *tree_; }
+  QFrame& notice() { return *notice_; }
+
   // Selects the tree item of a page; false when it is not to be seen.
   bool goToPage(std::int32_t id);
   void goToNeighbour(int direction);
+  // The item that is selected; 0 for none.
+  std::int32_t currentPage() const;
+  QString caption(std::int32_t id) const;
   QString title() const;
+
+  // Reads or writes the setup, and watches its file from then on. What goes wrong has been said.
+  bool open(const QString& path);
+  bool recover(const QString& copy, const QString& path);
+  bool save(const QString& path);
+  // Whether another program has changed the file since it was read or written here.
+  bool isChangedOnDisk() const;
+
+  // Takes the last edit back, or does it again, and goes to its page.
+  void undo();
+  void redo();
+  void setUnits(const UnitChoices& units);
+  // Hands over what is typed and not yet entered.
+  void commit() { pane_->commit(); }
 
   void show(const std::string& text) override;
   bool choose(CVdFileSelectorDlg& selector) override;
   bool askYesNo(const std::string& question) override;
   bool chooseFile(std::string_view filter, std::string_view extension, std::string* name) override;
-  bool editForm(std::string_view title, Form& form) override;
+  bool editForm(std::string_view title, Form& form, const std::function<std::string()>& fault) override;
   void openFile(const std::string& path) override { services_.openFile(path); }
   void showMessages(const ValidationList& messages, unsigned faults) override {
     services_.showMessages(messages, faults);
@@ -53,12 +74,29 @@ class DocumentTab final : public QSplitter, public SetupHost {
   void fillTree();
   void applyVisibility();
   void showCurrentPage();
-  QTreeWidgetItem* itemOf(std::int32_t id) const;
+  void showFirstView();
+  QTreeWidgetItem* itemOf(std::int32_t id) const { return itemsById_.value(id); }
+  void leaveHiddenPage();
+  void watch();
+  void fileChanged();
+  QFrame* makeNotice(QWidget* parent);
 
   WindowServices services_;
   QLineEdit* filter_;
   QTreeWidget* tree_;
   PagePane* pane_;
+  QFrame* notice_;
+  QLabel* noticeText_ = nullptr;
+  QHash<std::int32_t, QTreeWidgetItem*> itemsById_;
+  QFileSystemWatcher watcher_;
+  // The file's time and size when it was read or written here.
+  struct Stamp {
+    qint64 time = 0;
+    qint64 size = -1;
+    bool operator==(const Stamp&) const = default;
+  };
+  static Stamp stampOf(const QString& path);
+  Stamp stamp_;
   std::unique_ptr<SetupEditor> editor_;
 };
 

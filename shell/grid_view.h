@@ -23,6 +23,9 @@ class GridModel final : public QAbstractTableModel {
 
   CellStyle style(const QModelIndex& index) const;
   void press(const QModelIndex& index);
+  // Lets the user browse for a cell's file, where it has one.
+  bool browse(const QModelIndex& index);
+  CV27SetupGridWnd& grid() const { return grid_; }
   // The grid or the model behind it has changed.
   void refresh();
 
@@ -32,7 +35,7 @@ class GridModel final : public QAbstractTableModel {
   int shownColumns_ = -1;
 };
 
-// Editors of cells: an edit, or a list for a drop-down cell.
+// Editors of cells: an edit, a list for a drop-down or a map projection, an edit with a browse button.
 class CellDelegate final : public QStyledItemDelegate {
   Q_OBJECT
  public:
@@ -52,7 +55,18 @@ class GridView final : public QTableView {
   GridView(CV27SetupGridWnd& grid, QWidget* parent);
   GridModel& cells() { return *model_; }
 
+ public slots:
+  void copy() const;
+  void paste();
+
+ protected:
+  void keyPressEvent(QKeyEvent* event) override;
+  bool focusNextPrevChild(bool next) override;
+
  private:
+  void layOutColumns();
+  CellStyle styleOfButton(int column) const;
+
   GridModel* model_;
 };
 

@@ -4,13 +4,14 @@
 #include <QMessageBox>
 #include <QPixmap>
 
+#include "shell/appearance.h"
 #include "shell/main_window.h"
 
 using namespace gridbay::shell;
 
 namespace {
 
-// Pictures of each page that the tree shows.
+// Pictures of each page that the tree shows, and of each data file that is open.
 void takeScreenshots(MainWindow& window, const QString& folder) {
   QDir().mkpath(folder);
   window.show();
@@ -18,6 +19,10 @@ void takeScreenshots(MainWindow& window, const QString& folder) {
     if (!item.visible || !window.currentDocument()->goToPage(item.id)) continue;
     QApplication::processEvents();
     window.grab().save(QString("%1/page-%2.png").arg(folder).arg(item.id));
+  }
+  for (DataWindow* data : window.findChildren<DataWindow*>()) {
+    QApplication::processEvents();
+    data->grab().save(QString("%1/data-%2.png").arg(folder, data->windowTitle()));
   }
 }
 
@@ -33,7 +38,8 @@ int main(int argc, char** argv) {
   parser.addHelpOption();
   parser.addOption({"edition", "The editor of new documents: v27 or wsk.", "edition", "v27"});
   parser.addOption({"screenshots", "Writes a picture of each page to a folder, and ends.", "folder"});
-  parser.addPositionalArgument("file", "Setups to open.");
+  parser.addOption({"appearance", "Colours for this time: light or dark.", "colours"});
+  parser.addPositionalArgument("file", "Setups and data files to open.");
   parser.process(application);
 
   std::vector<std::unique_ptr<EditorLibrary>> libraries;
@@ -49,12 +55,21 @@ int main(int argc, char** argv) {
   }
   if (libraries.empty()) return 2;
   MainWindow window(std::move(libraries));
-  for (const QString& path : parser.positionalArguments()) window.openDocument(path);
+  if (parser.isSet("appearance"))
+    setAppearance(parser.value("appearance") == "dark" ? Appearance::dark : Appearance::light);
+  for (const QString& path : parser.positionalArguments()) {
+    if (DataWindow::isDataFile(path)) {
+      window.openData(path);
+    } else {
+      window.openDocument(path);
+    }
+  }
   if (window.currentDocument() == nullptr) window.newDocument(0);
   if (parser.isSet("screenshots")) {
     takeScreenshots(window, parser.value("screenshots"));
     return 0;
   }
   window.show();
+  window.offerRecovery();
   return QApplication::exec();
 }

@@ -267,23 +267,36 @@ struct TsbFile::State {
 
   template <class Number, class Get>
   Outcome read(std::size_t item, std::size_t step, std::span<Number> values, Get get) const {
-    const auto fail = [this](const std::string& why) {
-      return Failure{"cannot read \"" + path + "\": " + why};
-    };
-    if (item < 1 || item > itemVariables.size()) return fail("it has no item " + std::to_string(item));
-    if (step >= definition.time.count) return fail("it has no time step " + std::to_string(step));
     if (values.size() != definition.pointCount()) return fail("its grid has another size");
-    std::vector<std::size_t> start{step};
-    std::vector<std::size_t> count{1};
+    return readBlock(item, {step, 1}, {0, rowCount()}, values, get);
+  }
+
+  // Some rows (all, where there are none to choose from) of some time steps.
+  struct Block {
+    std::size_t first;
+    std::size_t count;
+  };
+  template <class Number, class Get>
+  Outcome readBlock(std::size_t item, Block steps, Block rows, std::span<Number> values, Get get) const {
+    if (item < 1 || item > itemVariables.size()) return fail("it has no item " + std::to_string(item));
+    if (steps.first >= definition.time.count || steps.count > definition.time.count - steps.first)
+      return fail("it has no time step " + std::to_string(steps.first));
+    if (rows.first + rows.count > rowCount()) return fail("it has no row " + std::to_string(rows.first));
+    std::vector<std::size_t> start{steps.first};
+    std::vector<std::size_t> count{steps.count};
     for (auto axis = definition.axes.rbegin(); axis != definition.axes.rend(); ++axis) {
-      start.push_back(0);
-      count.push_back(axis->points);
+      const bool isRows = definition.axes.size() == 2 && axis == definition.axes.rbegin();
+      start.push_back(isRows ? rows.first : 0);
+      count.push_back(isRows ? rows.count : axis->points);
     }
     const int status = get(file.id(), itemVariables[item - 1], start.data(), count.data(), values.data());
     if (status == NC_NOERR) return {};
-    return fail("item " + std::to_string(item) + ", step " + std::to_string(step) + ": " +
+    return fail("item " + std::to_string(item) + ", step " + std::to_string(steps.first) + ": " +
                 nc_strerror(status));
   }
+
+  std::size_t rowCount() const { return definition.axes.size() == 2 ? definition.axes[1].points : 1; }
+  Failure fail(const std::string& why) const { return Failure{"cannot read \"" + path + "\": " + why}; }
 };
 
 TsbFile::TsbFile(std::unique_ptr<State> state) : state_(std::move(state)) {}
@@ -324,6 +337,22 @@ Outcome TsbFile::read(std::size_t item, std::size_t step, std::span<float> value
 
 Outcome TsbFile::read(std::size_t item, std::size_t step, std::span<double> values) const {
   return state_->read(item, step, values, nc_get_vara_double);
+}
+
+Outcome TsbFile::readRows(std::size_t item, std::size_t step, std::size_t firstRow,
+                          std::span<float> values) const {
+  const std::size_t row = definition().axes.empty() ? 1 : definition().axes[0].points;
+  if (definition().axes.size() != 2 || row == 0 || values.size() % row != 0)
+    return state_->fail("a part of it was asked for that is not of whole rows");
+  return state_->readBlock(item, {step, 1}, {firstRow, values.size() / row}, values, nc_get_vara_float);
+}
+
+Outcome TsbFile::readSteps(std::size_t item, std::size_t firstStep, std::span<float> values) const {
+  const std::size_t points = definition().pointCount();
+  if (points == 0 || values.size() % points != 0)
+    return state_->fail("a part of it was asked for that is not of whole steps");
+  return state_->readBlock(item, {firstStep, values.size() / points}, {0, state_->rowCount()}, values,
+                           nc_get_vara_float);
 }
 
 }  // namespace gridbay

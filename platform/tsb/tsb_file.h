@@ -31,6 +31,11 @@ class TsbFile {
   Outcome read(std::size_t item, std::size_t step, std::span<float> values) const;
   Outcome read(std::size_t item, std::size_t step, std::span<double> values) const;
 
+  // Rows `firstRow` and on (from 0) of a two-dimensional item; whole rows only.
+  Outcome readRows(std::size_t item, std::size_t step, std::size_t firstRow, std::span<float> values) const;
+  // All points of time steps `firstStep` and on; whole steps only.
+  Outcome readSteps(std::size_t item, std::size_t firstStep, std::span<float> values) const;
+
  private:
   struct State;
   explicit TsbFile(std::unique_ptr<State> state);

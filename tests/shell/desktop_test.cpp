@@ -1,20 +1,28 @@
 // The desktop as a user has it: real widgets, real clicks, real files, with no display.
 
+#include <unistd.h>
+
+#include <QCheckBox>
+#include <QClipboard>
 #include <QComboBox>
 #include <QFile>
 #include <QLineEdit>
 #include <QMessageBox>
 #include <QMimeData>
 #include <QProcess>
+#include <QPushButton>
 #include <QRadioButton>
 #include <QSettings>
 #include <QSignalSpy>
+#include <QStandardPaths>
 #include <QTemporaryDir>
 #include <QTest>
 #include <QTimer>
+#include <csignal>
 
 #include "shell/grid_view.h"
 #include "shell/main_window.h"
+#include "shell/viewers/map_plot.h"
 
 namespace gridbay::shell {
 
@@ -60,6 +68,45 @@ class DesktopTest : public QObject {
 
   GridModel& grid() { return window_->currentDocument()->pane().findChild<GridView*>()->cells(); }
 
+  QLineEdit* edit(const QString& label, int n = 1) {
+    QWidget* widget = window_->currentDocument()->pane().widgetOf(label, n);
+    return qobject_cast<QLineEdit*>(widget->focusProxy() != nullptr ? widget->focusProxy() : widget);
+  }
+  QRadioButton* radio(const QString& text) {
+    for (auto* button : window_->currentDocument()->pane().findChildren<QRadioButton*>()) {
+      if (button->text().remove('&') == text) return button;
+    }
+    return nullptr;
+  }
+  void spin(const QString& label, int delta) {
+    QTest::keyClick(edit(label), delta > 0 ? Qt::Key_Up : Qt::Key_Down);
+  }
+  void write(const QString& name, const QByteArray& text) {
+    QFile made(file(name));
+    QVERIFY(made.open(QFile::WriteOnly));
+    made.write(text);
+  }
+  // A stand-in for the engine, as a script that is given the setup.
+  void makeEngine(const QByteArray& script) {
+    write("engine", "#!/bin/sh\n" + script + "\n");
+    QVERIFY(QFile(file("engine")).setPermissions(QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
+    qputenv("GRIDBAY_ENGINE", file("engine").toUtf8());
+  }
+
+  // Answers the message box that an action brings, and returns its text.
+  static QString answer(QMessageBox::StandardButton button, const std::function<void()>& act) {
+    QString text;
+    QTimer::singleShot(0, qApp, [button, &text] {
+      auto* box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
+      if (box == nullptr) return;
+      text = box->text();
+      box->button(button)->click();
+    });
+    act();
+    QCoreApplication::processEvents();
+    return text;
+  }
+
   // Answers the next message box with a button.
   static void answer(QMessageBox::StandardButton button) {
     QTimer::singleShot(0, qApp, [button] {
@@ -76,7 +123,7 @@ class DesktopTest : public QObject {
     folder_ = new QTemporaryDir();
     QSettings::setDefaultFormat(QSettings::IniFormat);
     QSettings::setPath(QSettings::IniFormat, QSettings::UserScope, folder_->path());
-    QCoreApplication::setOrganizationName("test");
+    for (const char* home : {"XDG_DATA_HOME", "XDG_CONFIG_HOME"}) qputenv(home, folder_->path().toUtf8());
     run("make_terrain", {folder_->path()});
     run("v27setup", {"convert", "raster", "estuary.asc", "estuary.tsb2", "--land", "5", "--crs", "UTM-32"});
     run("v27setup", {"convert", "raster", "inlet.asc", "inlet.tsb2", "--land", "5", "--crs", "UTM-32"});
@@ -87,6 +134,8 @@ class DesktopTest : public QObject {
     run("v27setup", {"new", "s.v27", "--force", "--area", "estuary.tsb2", "--area", "inlet.tsb2@36,33"});
     window_ = new MainWindow(libraries());
     window_->show();
+    window_->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(window_));
     QVERIFY(window_->openDocument(file("s.v27")) != nullptr);
   }
   void cleanup() { delete window_; }
@@ -152,7 +201,7 @@ class DesktopTest : public QObject {
     QVERIFY(!tab->goToPage(3));
     QVERIFY(tab->goToPage(35));
     for (auto* button : tab->pane().findChildren<QRadioButton*>()) {
-      if (button->text() == "Hydrodynamic and Advection-Dispersion") button->click();
+      if (button->text().remove('&') == "Hydrodynamic and Advection-Dispersion") button->click();
     }
     QVERIFY(tab->goToPage(3));
   }
@@ -181,26 +230,316 @@ class DesktopTest : public QObject {
   void unitsChangeWhatIsShown() {
     DocumentTab* tab = window_->currentDocument();
     QVERIFY(tab->goToPage(26));
-    tab->editor().setUnitSystem(UnitSystem::us);
-    tab->pane().refresh();
+    window_->units().actions().at(1)->trigger();  // US for all
     type("Flooding depth:", "1");
+    window_->units().actions().first()->trigger();
     QVERIFY(window_->saveDocument());
     QVERIFY(textOf(file("s.v27")).contains("Flooding_Depth 0.3048\n"));
   }
 
   void theEngineRunsAndIsStopped() {
-    QFile engine(file("engine"));
-    QVERIFY(engine.open(QFile::WriteOnly));
-    engine.write("#!/bin/sh\necho \"running $1\"\nexec sleep 60\n");
-    engine.close();
-    QVERIFY(engine.setPermissions(QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
-    qputenv("GRIDBAY_ENGINE", file("engine").toUtf8());
-    QSignalSpy finished(&window_->engine(), &QProcess::finished);
+    makeEngine("echo \"running $1\"; echo '42 % done'; exec sleep 60");
+    QSignalSpy ended(&window_->run(), &RunDock::ended);
     QVERIFY(window_->currentDocument()->editor().command(46018));
-    QTRY_VERIFY(window_->output().toPlainText().contains("running " + file("s.v27")));
-    window_->engine().terminate();
-    QVERIFY(finished.wait());
+    QTRY_VERIFY(window_->run().output().toPlainText().contains("running " + file("s.v27")));
+    QTRY_COMPARE(window_->run().progress().value(), 42);
+    QVERIFY(window_->run().state().text().startsWith("Running, 00:00:0"));
+    QTest::mouseClick(&window_->run().stopButton(), Qt::LeftButton);
+    QVERIFY(ended.wait());
+    QVERIFY(window_->run().state().text().startsWith("Stopped after 00:00:0"));
+    QVERIFY(!window_->run().stopButton().isEnabled());
     qunsetenv("GRIDBAY_ENGINE");
+  }
+
+  void theEnginesStatusIsShown() {
+    makeEngine("printf 'no line end'; exit 3");
+    QSignalSpy ended(&window_->run(), &RunDock::ended);
+    QVERIFY(window_->currentDocument()->editor().command(46018));
+    QVERIFY(ended.wait());
+    QCOMPARE(ended.first().first().toInt(), 3);
+    QVERIFY(window_->run().state().text().startsWith("Ended with status 3 after"));
+    QCOMPARE(window_->run().output().toPlainText(), QString("no line end"));
+    qunsetenv("GRIDBAY_ENGINE");
+  }
+
+  void aMissingEngineIsNamed() {
+    qputenv("GRIDBAY_ENGINE", file("nowhere").toUtf8());
+    const QString text =
+        answer(QMessageBox::Ok, [this] { window_->currentDocument()->editor().command(46018); });
+    QVERIFY2(text.contains(file("nowhere")) && text.contains("GRIDBAY_ENGINE"), qPrintable(text));
+    qunsetenv("GRIDBAY_ENGINE");
+    const QByteArray path = qgetenv("PATH");
+    qputenv("PATH", "");
+    const QString other =
+        answer(QMessageBox::Ok, [this] { window_->currentDocument()->editor().command(46018); });
+    qputenv("PATH", path);
+    QVERIFY2(other.contains("gridbay.exe") && other.contains(QCoreApplication::applicationDirPath()),
+             qPrintable(other));
+  }
+
+  void aMissingPluginIsNamed() {
+    QString error;
+    QVERIFY(EditorLibrary::load("v27none", &error) == nullptr);
+    QVERIFY(error.contains(QCoreApplication::applicationDirPath() + "/v27none.so"));
+  }
+
+  void helpForEachPage() {
+    DocumentTab* tab = window_->currentDocument();
+    for (const int page : {26, 27, 28, 29, 34, 35, 39, 40}) {
+      QVERIFY(tab->goToPage(page));
+      QTest::keyClick(window_, Qt::Key_F1);
+      QVERIFY(window_->help().isVisible());
+      QString heading = window_->help().browser().toPlainText().section('\n', 0, 0);
+      QVERIFY2(heading.startsWith(tab->caption(page)), qPrintable(heading));
+    }
+    QVERIFY(tab->goToPage(1));
+    QTest::keyClick(window_, Qt::Key_F1);
+    QVERIFY(window_->help().browser().toPlainText().startsWith("The setup editor"));
+    QVERIFY(tab->goToPage(43));
+    const QString text = answer(QMessageBox::Ok, [this] { QTest::keyClick(window_, Qt::Key_F1); });
+    QVERIFY2(text.contains("Initial Surface Elevation") && text.contains("150003") && text.contains("/help"),
+             qPrintable(text));
+  }
+
+  void editsAreTakenBackByName() {
+    DocumentTab* tab = window_->currentDocument();
+    QVERIFY(!window_->undoAction()->isEnabled());
+    QVERIFY(tab->goToPage(26));
+    type("Drying depth:", "0.01");
+    QVERIFY(tab->goToPage(27));
+    QVERIFY(grid().setData(grid().index(1, 2), "30,31", Qt::EditRole));
+    QCOMPARE(window_->undoAction()->text(), QString("&Undo Origin, row 2"));
+    QVERIFY(tab->goToPage(1));
+    window_->undoAction()->trigger();
+    QCOMPARE(tab->currentPage(), 27);
+    QCOMPARE(grid().index(1, 2).data().toString(), QString("(36,33)"));
+    QCOMPARE(window_->undoAction()->text(), QString("&Undo Drying depth"));
+    QCOMPARE(window_->redoAction()->text(), QString("&Redo Origin, row 2"));
+    // In an edit with nothing typed the key is the document's.
+    QVERIFY(tab->goToPage(26));
+    edit("Flooding depth:")->setFocus();
+    QTest::keyClick(edit("Flooding depth:"), Qt::Key_Z, Qt::ControlModifier);
+    QCOMPARE(edit("Drying depth:")->text(), QString("0.02"));
+    QVERIFY(!tab->title().endsWith("*"));
+    window_->redoAction()->trigger();
+    QCOMPARE(edit("Drying depth:")->text(), QString("0.01"));
+    QVERIFY(tab->title().endsWith("*"));
+  }
+
+  void everyKindOfControlIsSavedAndTakenBack() {
+    DocumentTab* tab = window_->currentDocument();
+    const QString before = textOf(file("s.v27"));
+    QVERIFY(tab->goToPage(35));
+    radio("Hydrodynamic and Advection-Dispersion")->click();
+    auto* list = qobject_cast<QComboBox*>(tab->pane().widgetOf("Select scheme:"));
+    list->setFocus();
+    QTest::keyClick(list, Qt::Key_Down);
+    auto* box = qobject_cast<QCheckBox*>(tab->pane().widgetOf("Inland Flooding"));
+    box->click();
+    QVERIFY(tab->goToPage(39));
+    type("Simulation start date:", "2027-01-02 03:04:05");
+    QVERIFY(tab->goToPage(34));
+    type("&Number of polygons:", "1");  // refused: the scheme has none
+    QVERIFY(tab->goToPage(40));
+    type("Number of source sink pairs", "1");
+    spin("Number of source sink pairs", 1);
+    QVERIFY(grid().setData(grid().index(1, 0), "Isolated Sink", Qt::EditRole));
+    QVERIFY(grid().setData(grid().index(1, 3), "7,8", Qt::EditRole));
+    QVERIFY(grid().setData(grid().index(1, 4), "1", Qt::EditRole));
+    QVERIFY(window_->saveDocument());
+    const QString after = textOf(file("s.v27"));
+    for (const char* line : {"Simulation_Type 2\n", "AD_Scheme 5\n", "Start_Time 2027 1 2 3 4 5\n",
+                             "Number_Of_Sources 2\n", "Type 1\n", "Sink_Point 7 8\n"})
+      QVERIFY2(after.contains(line), line);
+    while (window_->undoAction()->isEnabled()) window_->undoAction()->trigger();
+    QVERIFY(tab->title().endsWith("*"));
+    QVERIFY(window_->saveDocument());
+    QCOMPARE(textOf(file("s.v27")), before);
+    while (window_->redoAction()->isEnabled()) window_->redoAction()->trigger();
+    QVERIFY(window_->saveDocument());
+    QCOMPARE(textOf(file("s.v27")), after);
+  }
+
+  void aButtonInACellOpensTheData() {
+    QVERIFY(window_->currentDocument()->goToPage(27));
+    auto* view = window_->currentDocument()->pane().findChild<GridView*>();
+    view->setFocus();
+    view->setCurrentIndex(grid().index(0, 4));
+    QTest::keyClick(view, Qt::Key_Space);
+    auto* data = window_->findChild<DataWindow*>();
+    QVERIFY(data != nullptr);
+    QCOMPARE(data->windowTitle(), QString("estuary.tsb2"));
+    auto* map = static_cast<MapPlot*>(&data->plot());
+    QVERIFY2(map->textAt(480090, 6100180).startsWith("(1,2)   E 480090.0  N 6100180.0   -"),
+             qPrintable(map->textAt(480090, 6100180)));
+    QVERIFY(map->textAt(490000, 6108000).endsWith("(land)"));
+    QCOMPARE(map->textAt(0, 0), QString());
+    map->setMapCoordinates(false);
+    QVERIFY(map->textAt(120, 90).startsWith("(120,90)"));
+    QVERIFY(data->exportPng(file("map.png")));
+    QCOMPARE(QImage(file("map.png")).width(), 2 * map->width());
+    QVERIFY(!data->exportPng(file("nowhere/map.png")));
+    QVERIFY(data->close());
+  }
+
+  void dataThatCannotBeShownIsNamed() {
+    QString text =
+        answer(QMessageBox::Ok, [this] { QVERIFY(window_->openData(file("none.tsb2")) == nullptr); });
+    QVERIFY2(text.contains(file("none.tsb2")) && text.contains("no such file"), qPrintable(text));
+    write("broken.tsb2", "not a data file");
+    text = answer(QMessageBox::Ok, [this] { QVERIFY(window_->openData(file("broken.tsb2")) == nullptr); });
+    QVERIFY(text.contains("it is no data file"));
+    text = answer(QMessageBox::Ok, [this] { window_->openFile(file("none.txt")); });
+    QVERIFY(text.contains(file("none.txt")));
+  }
+
+  void aSeriesIsPlotted() {
+    write("tide.csv", "time,level\n0,0.5\n3600,0.75\n7200,0.25\n");
+    run("v27setup", {"convert", "series", "tide.csv", "tide.tsb0", "--item-type", "100000", "--start",
+                     "2026-03-21 06:00:00", "--skip-lines", "1"});
+    DataWindow* data = window_->openData(file("tide.tsb0"));
+    QVERIFY(data != nullptr);
+    QCOMPARE(data->plot().graphCount(), 1);
+    QCOMPARE(data->plot().graph(0)->data()->at(1)->value, 0.75);
+    data->curves()->item(0)->setCheckState(Qt::Unchecked);
+    QCOMPARE(data->plot().graphCount(), 0);
+    QVERIFY(data->exportPng(file("tide.png")));
+    QVERIFY(data->close());
+  }
+
+  void aChangeByAnotherProgramIsTold() {
+    DocumentTab* tab = window_->currentDocument();
+    QVERIFY(tab->goToPage(26));
+    type("Flooding depth:", "0.4");
+    run("v27setup", {"set", "s.v27", "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.25"});
+    QTRY_VERIFY(tab->notice().isVisible());
+    const QString text = answer(QMessageBox::No, [this] { QVERIFY(!window_->saveDocument()); });
+    QVERIFY2(text.contains("was changed by another program"), qPrintable(text));
+    QVERIFY(textOf(file("s.v27")).contains("Drying_Depth 0.25\n"));
+    tab->notice().findChild<QPushButton*>("reload")->click();
+    QVERIFY(!tab->notice().isVisible());
+    QCOMPARE(edit("Drying depth:")->text(), QString("0.25"));
+    QCOMPARE(edit("Flooding depth:")->text(), QString("0.05"));
+    QVERIFY(!tab->title().endsWith("*"));
+    QVERIFY(window_->saveDocument());
+    QVERIFY(QFile::remove(file("s.v27")));
+    QTRY_VERIFY(tab->notice().isVisible());
+    QVERIFY(window_->saveDocument());
+    QVERIFY(QFile::exists(file("s.v27")));
+  }
+
+  void editsOutliveASuddenEnd() {
+    QProcess child;
+    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+    environment.insert("GRIDBAY_TEST_CRASH", file("s.v27"));
+    child.setProcessEnvironment(environment);
+    child.setProcessChannelMode(QProcess::ForwardedChannels);
+    child.start(QCoreApplication::applicationFilePath(), {});
+    QVERIFY(child.waitForFinished());
+    QCOMPARE(child.exitStatus(), QProcess::CrashExit);
+    QVERIFY(textOf(file("s.v27")).contains("Drying_Depth 0.02\n"));
+
+    const QString text = answer(QMessageBox::Open, [this] { window_->offerRecovery(); });
+    QVERIFY2(text.contains(file("s.v27")), qPrintable(text));
+    DocumentTab* tab = window_->currentDocument();
+    QCOMPARE(tab->title(), QString("s.v27 *"));
+    QVERIFY(tab->goToPage(26));
+    QCOMPARE(edit("Drying depth:")->text(), QString("0.0325"));
+    QVERIFY(tab->goToPage(27));
+    QCOMPARE(grid().index(0, 0).data().toString(), QString("estuary.tsb2"));
+    QVERIFY(window_->saveDocument());
+    QVERIFY(textOf(file("s.v27")).contains("Drying_Depth 0.0325\n"));
+    window_->offerRecovery();  // there is nothing left
+  }
+
+  void aPageThatGoesOutIsLeft() {
+    DocumentTab* tab = window_->currentDocument();
+    QVERIFY(tab->goToPage(26));
+    type("Drying depth:", "0.01");
+    QVERIFY(tab->goToPage(27));
+    radio("Hot start")->click();
+    QVERIFY(!tab->goToPage(26));
+    window_->undoAction()->trigger();
+    QVERIFY(tab->goToPage(26));
+    window_->redoAction()->trigger();
+    QTRY_COMPARE(tab->currentPage(), 27);
+  }
+
+  void theFirstViewComesBeforeAPage() {
+    DocumentTab* tab = window_->newDocument(0);
+    QCOMPARE(tab->currentPage(), 0);
+    bool found = false;
+    for (const auto* label : tab->pane().findChildren<QLabel*>())
+      found = found || label->text() == "Here should be the bathymetry";
+    QVERIFY(found);
+  }
+
+  void keysLeadThroughAPage() {
+    DocumentTab* tab = window_->currentDocument();
+    QVERIFY(tab->goToPage(26));
+    QTest::keyClick(window_, Qt::Key_PageUp, Qt::ControlModifier);
+    QCOMPARE(tab->currentPage(), 40);
+    QTest::keyClick(window_, Qt::Key_PageDown, Qt::ControlModifier);
+    QCOMPARE(tab->currentPage(), 26);
+    edit("Drying depth:")->setFocus();
+    QTest::keyClick(edit("Drying depth:"), Qt::Key_Tab);
+    QVERIFY(edit("Flooding depth:")->hasFocus());
+    // Every control that takes typing or a choice has a letter of its own.
+    for (const SetupEditor::Item& item : tab->editor().items()) {
+      if (!tab->goToPage(item.id)) continue;
+      QStringList letters;
+      for (const auto* label : tab->pane().findChildren<QLabel*>()) {
+        if (label->buddy() != nullptr && label->text().contains('&'))
+          letters << label->text().section('&', 1).left(1).toUpper();
+      }
+      for (const auto* button : tab->pane().findChildren<QAbstractButton*>()) {
+        if (button->text().contains('&')) letters << button->text().section('&', 1).left(1).toUpper();
+      }
+      QCOMPARE(QSet<QString>(letters.begin(), letters.end()).size(), letters.size());
+      for (const char* menu : {"F", "E", "V", "R", "W", "H"}) QVERIFY(!letters.contains(menu));
+    }
+  }
+
+  void aGridIsUsedByKeys() {
+    DocumentTab* tab = window_->currentDocument();
+    QVERIFY(tab->goToPage(40));
+    type("Number of source sink pairs", "2");
+    auto* view = tab->pane().findChild<GridView*>();
+    view->setFocus();
+    view->setCurrentIndex(grid().index(1, 1));
+    QApplication::clipboard()->setText("4,5\t1\n6,7\t2");
+    view->paste();
+    QCOMPARE(grid().index(1, 1).data().toString(), QString("(4,5)"));
+    QCOMPARE(grid().index(2, 1).data().toString(), QString("(6,7)"));
+    view->clearSelection();
+    view->selectionModel()->select(QItemSelection(grid().index(1, 1), grid().index(2, 1)),
+                                   QItemSelectionModel::Select);
+    view->copy();
+    QCOMPARE(QApplication::clipboard()->text(), QString("(4,5)\n(6,7)"));
+    view->setCurrentIndex(grid().index(2, 2));  // those after it are for a sink
+    QTest::keyClick(view, Qt::Key_Tab);
+    QVERIFY(!view->hasFocus());
+  }
+
+  void aUnitIsChosenForOneQuantity() {
+    DocumentTab* tab = window_->currentDocument();
+    QVERIFY(tab->goToPage(26));
+    QAction* feet = nullptr;
+    for (auto* menu : window_->units().findChildren<QMenu*>()) {
+      if (menu->title() != "Flooding and drying depth") continue;
+      for (QAction* action : menu->actions()) {
+        if (action->text() == "foot (ft)") feet = action;
+      }
+    }
+    QVERIFY(feet != nullptr);
+    feet->trigger();
+    type("Flooding depth:", "1");
+    QVERIFY(window_->saveDocument());
+    QVERIFY(textOf(file("s.v27")).contains("Flooding_Depth 0.3048\n"));
+    QVERIFY(tab->goToPage(39));
+    window_->units().actions().first()->trigger();  // metric for all
+    QVERIFY(tab->goToPage(26));
+    QCOMPARE(edit("Flooding depth:")->text(), QString("0.3048"));
   }
 
   void aSetupThatCannotBeReadOpensNothing() {
@@ -216,16 +555,18 @@ class DesktopTest : public QObject {
 
   void setupsAreDroppedAndRemembered() {
     QMimeData dropped;
-    dropped.setUrls({QUrl::fromLocalFile(file("s.v27"))});
+    QFile::remove(file("dropped.v27"));
+    QVERIFY(QFile::copy(file("s.v27"), file("dropped.v27")));
+    dropped.setUrls({QUrl::fromLocalFile(file("dropped.v27")), QUrl::fromLocalFile(file("s.v27"))});
     QDragEnterEvent enter(QPoint(5, 5), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
     QApplication::sendEvent(window_, &enter);
     QVERIFY(enter.isAccepted());
     QDropEvent drop(QPointF(5, 5), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
     DocumentTab* before = window_->currentDocument();
     QApplication::sendEvent(window_, &drop);
-    QVERIFY(window_->currentDocument() != before);
-    QCOMPARE(window_->currentDocument()->title(), QString("s.v27"));
-    QCOMPARE(QSettings().value("recent").toStringList().value(0), file("s.v27"));
+    // What is open already is not opened twice.
+    QVERIFY(window_->currentDocument() == before);
+    QCOMPARE(QSettings().value("recent").toStringList().value(0), file("dropped.v27"));
   }
 
   void bothEditionsAreOpenAtOnce() {
@@ -250,5 +591,34 @@ class DesktopTest : public QObject {
 
 }  // namespace gridbay::shell
 
-QTEST_MAIN(gridbay::shell::DesktopTest)
+namespace {
+
+// A second process that edits the setup and is killed once its edits have been put aside.
+int editAndDie(const QString& setup) {
+  using namespace gridbay::shell;
+  QString error;
+  std::vector<std::unique_ptr<EditorLibrary>> libraries;
+  libraries.push_back(EditorLibrary::load("v27nested", &error));
+  MainWindow window(std::move(libraries));
+  window.show();
+  window.openDocument(setup)->goToPage(26);
+  auto* edit = qobject_cast<QLineEdit*>(window.currentDocument()->pane().widgetOf("Drying depth:"));
+  edit->setText("0.0325");
+  emit edit->editingFinished();
+  QTimer::singleShot(3000, [] { ::kill(::getpid(), SIGKILL); });
+  return QApplication::exec();
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+  QApplication application(argc, argv);
+  QCoreApplication::setOrganizationName("test");
+  QCoreApplication::setApplicationName("desktop-test");
+  if (qEnvironmentVariableIsSet("GRIDBAY_TEST_CRASH"))
+    return editAndDie(qEnvironmentVariable("GRIDBAY_TEST_CRASH"));
+  gridbay::shell::DesktopTest test;
+  return QTest::qExec(&test, argc, argv);
+}
+
 #include "desktop_test.moc"

@@ -31,9 +31,11 @@ class TestHost : public SetupHost {
     return true;
   }
   bool chooseFile(std::string_view, std::string_view, std::string*) override { return false; }
-  bool editForm(std::string_view title, Form& form) override {
+  bool editForm(std::string_view title, Form& form, const std::function<std::string()>& fault) override {
     titles.emplace_back(title);
-    return fillForm && fillForm(form);
+    if (!fillForm || !fillForm(form)) return false;
+    formFault = fault();
+    return formFault.empty();
   }
   void openFile(const std::string& path) override { opened.push_back(path); }
   void showMessages(const ValidationList& messages, unsigned faults) override {
@@ -56,6 +58,7 @@ class TestHost : public SetupHost {
   std::optional<std::string> chosenFile;
   std::vector<std::uint32_t> chosenItems;
   std::function<bool(Form&)> fillForm;
+  std::string formFault;
 };
 
 // A document with one page open, used by labels and cells as a user does.
@@ -80,19 +83,19 @@ class PageTest : public ::testing::Test {
     Control& it = control(label, n);
     EXPECT_TRUE(it.usable()) << label;
     it.text = text;
-    if (it.onChange) it.onChange();
+    page->form().act(it);
   }
   void choose(std::string_view label, int index) {
     Control& it = control(label);
     EXPECT_TRUE(it.usable()) << label;
     it.index = index;
-    if (it.onChange) it.onChange();
+    page->form().act(it);
   }
   void press(std::string_view label) {
     EXPECT_TRUE(control(label).usable()) << label;
-    control(label).onChange();
+    page->form().act(control(label));
   }
-  void spin(std::string_view label, int delta) { control(label).onSpin(delta); }
+  void spin(std::string_view label, int delta) { page->form().spin(control(label), delta); }
   std::string text(std::string_view label, int n = 1) { return control(label, n).text; }
   std::vector<std::string> labels() {
     std::vector<std::string> all;

@@ -1,0 +1,207 @@
+#include "pages/cell_controls.h"
+
+#include <gmock/gmock.h>
+
+#include "pages/result_subset.h"
+#include "tests/support/pages.h"
+
+namespace gridbay {
+namespace {
+
+// A grid with one cell of each kind that the pages of this version have none of.
+class CellsOfAllKinds final : public CV27SetupGridWnd {
+ public:
+  enum Column { kResultFile = 1, kProjection, kCheckBox, kHidden };
+
+  int GetRowCount() override { return 1; }
+  int GetColCount() override { return 4; }
+  std::string GetColHeader(int col) override { return "column " + std::to_string(col); }
+  int GetColWidth(int col) override { return col == kHidden ? 0 : 80; }
+
+  std::string file = "old";
+  std::string projection = "UTM-40";
+  bool flag = false;
+  bool enabled = true;
+
+ protected:
+  bool styleOf(int, int col, CellStyle& style) override {
+    style.kind = col == kResultFile   ? CellKind::resultFile
+                 : col == kProjection ? CellKind::mapProjection
+                                      : CellKind::checkBox;
+    style.value = col == kResultFile ? file : col == kProjection ? projection : flag ? "1" : "0";
+    style.enabled = enabled;
+    return true;
+  }
+  bool storeCell(int, int col, std::string_view text) override {
+    if (col == kResultFile) file = text;
+    if (col == kProjection) projection = text;
+    if (col == kCheckBox) flag = text == "1";
+    return true;
+  }
+  void setUpResultFile(int, int, CVdGridResultFileEditCtrl& control) override {
+    control.SetDialogPara("Maps (*.tsb2)|*.tsb2||", "tsb2");
+  }
+};
+
+class OnePage final : public CV27SetupFormView {
+ public:
+  explicit OnePage(CV27SetupDoc& document) : CV27SetupFormView(document, 1, PageId::bathymetry) {}
+  CellsOfAllKinds cells;
+
+ protected:
+  void DoDataExchange(Form& form) override { form.DDX_Control("&Cells:", cells); }
+  int Initialize() override {
+    SetUpGrid("&Cells:");
+    return 1;
+  }
+};
+
+class ChoosingHost final : public test::TestHost {
+ public:
+  bool chooseFile(std::string_view filter, std::string_view extension, std::string* name) override {
+    asked = std::string(filter) + " " + std::string(extension) + " " + *name;
+    if (choice.empty()) return false;
+    *name = choice;
+    return true;
+  }
+  std::string asked;
+  std::string choice;
+};
+
+class Cells : public ::testing::Test {
+ protected:
+  Cells() { page.OnInitialUpdate(); }
+  ChoosingHost host;
+  CV27SetupDoc document{host};
+  OnePage page{document};
+};
+
+TEST_F(Cells, CtrlDBrowsesForAResultFile) {
+  host.choice = "results/depth";
+  EXPECT_TRUE(page.cells.ProcessKeys(GridKey::browse, 1, CellsOfAllKinds::kResultFile));
+  EXPECT_EQ(host.asked, "Maps (*.tsb2)|*.tsb2|| tsb2 old");
+  EXPECT_EQ(page.cells.file, "results/depth.tsb2");
+  EXPECT_TRUE(document.IsModified());
+}
+
+TEST_F(Cells, LeavingTheDialogKeepsTheName) {
+  EXPECT_TRUE(page.cells.ProcessKeys(GridKey::browse, 1, CellsOfAllKinds::kResultFile));
+  EXPECT_EQ(page.cells.file, "old");
+  EXPECT_FALSE(document.IsModified());
+}
+
+TEST_F(Cells, OtherKeysAndCellsAreLeftAlone) {
+  EXPECT_FALSE(page.cells.ProcessKeys(GridKey::other, 1, CellsOfAllKinds::kResultFile));
+  EXPECT_FALSE(page.cells.ProcessKeys(GridKey::browse, 1, CellsOfAllKinds::kProjection));
+  EXPECT_FALSE(page.cells.ProcessKeys(GridKey::browse, 2, CellsOfAllKinds::kResultFile));
+  page.cells.enabled = false;
+  EXPECT_FALSE(page.cells.ProcessKeys(GridKey::browse, 1, CellsOfAllKinds::kResultFile));
+  EXPECT_EQ(host.asked, "");
+}
+
+TEST_F(Cells, TheExtensionIsAdjusted) {
+  CVdGridResultFileEditCtrl control(host);
+  control.SetDialogPara("", "tsb2");
+  EXPECT_EQ(control.AdjustFileExtension("a"), "a.tsb2");
+  EXPECT_EQ(control.AdjustFileExtension("a.tsb0"), "a.tsb2");
+  EXPECT_EQ(control.AdjustFileExtension("a.b/c"), "a.b/c.tsb2");
+  EXPECT_EQ(control.AdjustFileExtension("../c.d.e"), "../c.d.tsb2");
+  EXPECT_EQ(control.AdjustFileExtension(".hidden"), ".hidden.tsb2");
+  EXPECT_EQ(control.AdjustFileExtension(""), "");
+}
+
+TEST_F(Cells, AProjectionIsEditedFromItsList) {
+  const std::vector<std::string> list = page.cells.OnStartEditing(1, CellsOfAllKinds::kProjection);
+  ASSERT_EQ(list.size(), 61U);
+  EXPECT_EQ(list[0], "UTM-40");
+  EXPECT_EQ(list[1], "Local Coordinates");
+  EXPECT_EQ(list[2], "UTM-1");
+  page.cells.OnModifyCell("UTM-33");
+  EXPECT_EQ(page.cells.OnEndEditing(1, CellsOfAllKinds::kProjection), 1);
+  EXPECT_EQ(page.cells.projection, "UTM-33");
+  EXPECT_TRUE(page.cells.OnStartEditing(1, CellsOfAllKinds::kCheckBox).empty());
+}
+
+TEST_F(Cells, AHiddenColumnStaysHidden) {
+  EXPECT_TRUE(page.cells.OnTrackColWidth(CellsOfAllKinds::kCheckBox));
+  EXPECT_FALSE(page.cells.OnTrackColWidth(CellsOfAllKinds::kHidden));
+}
+
+TEST_F(Cells, LongValuesHaveToolTips) {
+  CellStyle style;
+  page.cells.file = std::string(150, 'x');
+  page.cells.GetStyleRowCol(1, CellsOfAllKinds::kResultFile, style);
+  EXPECT_EQ(style.toolTip, "");
+  CV27SetupDoc::EnableGXMultiToolTips(page.cells, CellsOfAllKinds::kResultFile);
+  page.cells.GetStyleRowCol(1, CellsOfAllKinds::kResultFile, style);
+  EXPECT_EQ(style.toolTip, std::string(100, 'x') + "\n" + std::string(50, 'x'));
+  CV27SetupDoc::EnableMultiToolTips(page, "&Cells:", "What there is");
+  EXPECT_EQ(page.form().find("&Cells:")->toolTip, "What there is");
+  EXPECT_EQ(page.form().find("&Cells:")->name(), "Cells");
+}
+
+TEST_F(Cells, ARebuildGivesAndTakesNothing) {
+  CellStyle style;
+  page.cells.SetRebuilding(true);
+  EXPECT_EQ(page.cells.GetStyleRowCol(1, 1, style), 0);
+  EXPECT_EQ(page.cells.StoreStyleRowCol(1, 1, "new"), 0);
+  page.cells.SetRebuilding(false);
+  EXPECT_EQ(page.cells.GetStyleRowCol(1, 1, style), 1);
+  EXPECT_EQ(page.cells.GetStyleRowCol(0, 1, style), 1);
+  EXPECT_EQ(page.cells.StoreStyleRowCol(0, 1, "header"), 1);
+  EXPECT_EQ(page.cells.file, "old");
+}
+
+class ResultSubset : public ::testing::Test {
+ protected:
+  int run(const std::vector<std::string>& texts) {
+    host.fillForm = [&texts](Form& form) {
+      std::size_t n = 0;
+      for (Control& control : form.controls()) {
+        if (control.kind == ControlKind::text) control.text = texts[n++];
+      }
+      return true;
+    };
+    return dialog.DoModal(host);
+  }
+  test::TestHost host;
+  CV27SetupResultSubsetDialog::Range range{0, 100, 1, 0, 80, 1, 0, 500, 10};
+  CV27SetupResultSubsetDialog dialog{range, 120, 90, 999};
+};
+
+TEST_F(ResultSubset, OKCopiesTheNineIntegers) {
+  EXPECT_EQ(run({"10", "120", "2", "5", "90", "3", "0", "999", "4"}), 1);
+  EXPECT_EQ(dialog.range(), (CV27SetupResultSubsetDialog::Range{10, 120, 2, 5, 90, 3, 0, 999, 4}));
+  USubArea area;
+  USubLine steps;
+  CV27SetupResultSubsetDialog::copyBack(dialog.range(), area, steps);
+  EXPECT_EQ(area, (USubArea{{10, 120, 2}, {5, 90, 3}}));
+  EXPECT_EQ(steps, (USubLine{0, 999, 4}));
+  EXPECT_EQ(CV27SetupResultSubsetDialog::rangeOf(area, steps), dialog.range());
+}
+
+TEST_F(ResultSubset, CancelChangesNothing) {
+  host.fillForm = [](Form& form) {
+    form.controls()[1].text = "7";
+    return false;
+  };
+  EXPECT_EQ(dialog.DoModal(host), 0);
+  EXPECT_EQ(dialog.range(), range);
+}
+
+TEST_F(ResultSubset, WhatIsOutOfTheLimitsIsTold) {
+  EXPECT_EQ(run({"0", "121", "1", "0", "90", "1", "0", "999", "1"}), 0);
+  EXPECT_EQ(host.formFault, "X direction: 0 to 121 is not a part of 0 to 120");
+  EXPECT_EQ(run({"0", "1", "1", "5", "4", "1", "0", "999", "1"}), 0);
+  EXPECT_EQ(host.formFault, "Y direction: 5 to 4 is not a part of 0 to 90");
+  EXPECT_EQ(run({"0", "1", "1", "0", "4", "1", "-1", "999", "1"}), 0);
+  EXPECT_EQ(host.formFault, "Time steps: -1 to 999 is not a part of 0 to 999");
+  EXPECT_EQ(run({"0", "1", "0", "0", "4", "1", "0", "999", "1"}), 0);
+  EXPECT_EQ(host.formFault, "X direction: the interval 0 is below 1");
+  EXPECT_EQ(run({"0", "x", "1", "0", "4", "1", "0", "999", "1"}), 0);
+  EXPECT_EQ(host.formFault, "Last: \"x\" is not a number");
+  EXPECT_EQ(dialog.range(), range);
+}
+
+}  // namespace
+}  // namespace gridbay
