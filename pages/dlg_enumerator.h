@@ -11,8 +11,9 @@ namespace gridbay {
 struct PageEntry {
   std::int32_t id;
   std::string_view caption;
-  std::string_view pageClass;  // empty for an item without a page
-  std::int32_t templateId;     // 0 for an item without a page
+  std::string_view pageClass;   // empty for an item without a page
+  std::int32_t templateId;      // 0 for an item without a page
+  std::string_view grids = {};  // the classes of the page's grids, between commas
 };
 
 // The one table that turns a page id into its caption, its page class and its help.

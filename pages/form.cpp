@@ -3,6 +3,8 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <cmath>
+#include <limits>
 #include <optional>
 
 #include "core/number_text.h"
@@ -46,10 +48,18 @@ std::string shownText(Real value, const Control& control, const UnitChoices& uni
   return shown == value ? fmt::format("{}", value) : fmt::format("{:.7g}", shown);
 }
 
+std::int32_t roundedToInt32(double value) {
+  using Limits = std::numeric_limits<std::int32_t>;
+  return static_cast<std::int32_t>(
+      std::lround(std::clamp(value, double{Limits::min()}, double{Limits::max()})));
+}
+
 // Whether the text of an edit is a value for its variable.
 bool isValid(const Control& control) {
   return std::visit(Overloaded{[](std::monostate) { return true; },
                                [&](const std::int32_t*) {
+                                 if (control.itemCode != 0)
+                                   return doubleOfText(trimmed(control.text)).has_value();
                                  const std::string_view text = trimmed(control.text);
                                  return int32OfText(text).has_value() &&
                                         text.find_first_of(".eE") == text.npos;
@@ -146,13 +156,21 @@ void Form::show(const UnitChoices& units) {
     std::visit(Overloaded{[](std::monostate) {},
                           [&](const std::int32_t* value) {
                             control.index = *value;
-                            if (!isIndexed(control)) control.text = std::to_string(*value);
+                            if (!isIndexed(control))
+                              control.text = control.itemCode == 0 ? std::to_string(*value)
+                                                                   : shownText(*value, control, units);
                           },
                           [&](const float* value) { control.text = shownText(*value, control, units); },
                           [&](const double* value) { control.text = shownText(*value, control, units); },
                           [&](const std::string* value) { control.text = *value; }},
                control.variable);
   }
+}
+
+Control& Form::DDX_VdText(std::string_view label, std::int32_t& variable, int itemCode) {
+  Control& control = DDX_Text(label, variable);
+  control.itemCode = itemCode;
+  return control;
 }
 
 std::string Form::store(const UnitChoices& units) {
@@ -164,7 +182,13 @@ std::string Form::store(const UnitChoices& units) {
     if (control.kind != ControlKind::text && !isIndexed(control)) continue;
     std::visit(Overloaded{[](std::monostate) {},
                           [&](std::int32_t* value) {
-                            *value = isIndexed(control) ? control.index : *int32OfText(trimmed(control.text));
+                            if (isIndexed(control)) {
+                              *value = control.index;
+                            } else if (control.itemCode == 0) {
+                              *value = *int32OfText(trimmed(control.text));
+                            } else if (control.text != shownText(*value, control, units)) {
+                              *value = roundedToInt32(*realOf<double>(control, units));
+                            }
                           },
                           // A text that still shows the value keeps all of its digits.
                           [&](float* value) {

@@ -105,6 +105,15 @@ class Form {
   const Control* acting() const { return acting_; }
   bool isSpinning() const { return spinning_; }
 
+  // The same for any kind of number; an integer is rounded in the base unit.
+  Control& DDX_VdText(std::string_view label, std::int32_t& variable, int itemCode);
+  Control& DDX_VdText(std::string_view label, float& variable, int itemCode) {
+    return DDX_VDedit(label, variable, itemCode);
+  }
+  Control& DDX_VdText(std::string_view label, double& variable, int itemCode) {
+    return DDX_VDedit(label, variable, itemCode);
+  }
+
   // Variables to controls.
   void show(const UnitChoices& units);
   // Controls to variables. Empty when all went well; else what is wrong with a text, and no variable has

@@ -28,10 +28,14 @@ bool CGridbayDoc::OnCommand(int id) {
 }
 
 void CGridbayDoc::RunEngineApv2(int flag, std::string_view text, int a, int b, int c) {
-  if (path().empty() || IsModified()) {
+  if (path().empty()) {
     host().show("The setup must be saved before it can be run.");
     return;
   }
+  if (IsModified() &&
+      (!host().askYesNo("The setup has changes that are not saved. Save it, and run it then?") ||
+       !OnSaveDocument(path())))
+    return;
   if (automaticValidation_ == 1) {
     ValidationList messages;
     if (const unsigned faults = ValidateData(messages); faults > 0) {

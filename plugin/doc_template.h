@@ -3,6 +3,7 @@
 #include <memory>
 #include <string>
 
+#include "pages/child_frame.h"
 #include "pages/host.h"
 #include "plugin/setup_editor.h"
 
@@ -18,6 +19,10 @@ class CVdDocTemplate {
 
   // One of the seven fields.
   virtual std::string GetDocString(Field field) const = 0;
+  // The id of the strings, the class of its documents, and the frame that they are shown in.
+  virtual int GetStringId() const = 0;
+  virtual std::string GetDocumentClass() const = 0;
+  virtual std::unique_ptr<CV27SetupChildFrame> CreateFrame() const = 0;
   // A new document with a whole default model. The host must outlive it.
   virtual std::unique_ptr<SetupEditor> CreateNewDocument(SetupHost& host) const = 0;
 };

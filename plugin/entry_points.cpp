@@ -14,6 +14,11 @@ class GridbayDocTemplate final : public CVdDocTemplate {
     for (int i = 0; i < field; ++i) rest.remove_prefix(rest.find('\n') + 1);
     return std::string(rest.substr(0, rest.find('\n')));
   }
+  int GetStringId() const override { return theEdition.document.id; }
+  std::string GetDocumentClass() const override { return "CGridbayDoc"; }
+  std::unique_ptr<CV27SetupChildFrame> CreateFrame() const override {
+    return std::make_unique<CChildFrame>();
+  }
   std::unique_ptr<SetupEditor> CreateNewDocument(SetupHost& host) const override {
     return makeSetupEditor(host);
   }

@@ -54,6 +54,7 @@ class Editor final : public SetupEditor {
       items.push_back({item.id, item.caption, item.depth, tree_.IsVisible(item)});
     return items;
   }
+  void applyRules() override { tree_.OnUpdate(&document_.root()); }
   Form* openPage(std::int32_t id) override {
     std::string topic;
     std::string local;
@@ -96,7 +97,7 @@ class Editor final : public SetupEditor {
     return Edit{page, step->name.empty() ? std::string(document_.enumerator().GetCaption(page)) : step->name};
   }
   void update() {
-    tree_.OnUpdate(&document_.root());
+    applyRules();
     if (changed_) changed_();
   }
 

@@ -63,6 +63,8 @@ class SetupEditor {
 
   virtual FirstView firstView() const = 0;
   virtual std::vector<Item> items() const = 0;
+  // Works out anew which items are visible; done by itself after each change.
+  virtual void applyRules() = 0;
   // Opens the page of an item; null for one without a page in this version. The form lives until the next
   // call.
   virtual Form* openPage(std::int32_t id) = 0;

@@ -38,6 +38,7 @@ int main(int argc, char** argv) {
   parser.addHelpOption();
   parser.addOption({"edition", "The editor of new documents: v27 or wsk.", "edition", "v27"});
   parser.addOption({"screenshots", "Writes a picture of each page to a folder, and ends.", "folder"});
+  parser.addOption({"exit-when-shown", "Ends once the window has been painted, as a benchmark wants it."});
   parser.addOption({"appearance", "Colours for this time: light or dark.", "colours"});
   parser.addPositionalArgument("file", "Setups and data files to open.");
   parser.process(application);
@@ -70,6 +71,10 @@ int main(int argc, char** argv) {
     return 0;
   }
   window.show();
+  if (parser.isSet("exit-when-shown")) {
+    QApplication::processEvents();
+    return window.grab().isNull() ? 1 : 0;
+  }
   window.offerRecovery();
   return QApplication::exec();
 }

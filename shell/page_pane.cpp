@@ -126,6 +126,7 @@ void PagePane::showForm(const QString& caption, Form& form) {
   QWidget* page = layout->parentWidget();
   form_ = &form;
   auto* rows = new QFormLayout();
+  rows->setFieldGrowthPolicy(QFormLayout::ExpandingFieldsGrow);
   layout->addLayout(rows);
   bool hasGrid = false;
   for (Control& control : form.controls()) {
@@ -237,6 +238,11 @@ QWidget* PagePane::makeEdit(Control& control, QWidget* parent) {
   } else {
     edit = new QLineEdit(parent);
     widget = edit;
+  }
+  // A number needs no more room than its digits; a text may be long.
+  if (!std::holds_alternative<std::string*>(control.variable)) {
+    for (QWidget* each : {widget, static_cast<QWidget*>(edit)})
+      each->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed);
   }
   edit->installEventFilter(this);
   connect(edit, &QLineEdit::editingFinished, this, [this, edit, &control] {

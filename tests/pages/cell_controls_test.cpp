@@ -2,7 +2,12 @@
 
 #include <gmock/gmock.h>
 
+#include <algorithm>
+
+#include "pages/dlg_enumerator.h"
+#include "pages/page_factory.h"
 #include "pages/result_subset.h"
+#include "platform/units/units.h"
 #include "tests/support/pages.h"
 
 namespace gridbay {
@@ -150,6 +155,45 @@ TEST_F(Cells, ARebuildGivesAndTakesNothing) {
   EXPECT_EQ(page.cells.GetStyleRowCol(0, 1, style), 1);
   EXPECT_EQ(page.cells.StoreStyleRowCol(0, 1, "header"), 1);
   EXPECT_EQ(page.cells.file, "old");
+}
+
+TEST_F(Cells, EachPageHasTheGridsOfTheTable) {
+  int pages = 0;
+  for (const PageEntry& entry : CDlgEnumerator().pages()) {
+    const std::unique_ptr<CV27SetupFormView> built = makePage(entry.pageClass, document);
+    if (built == nullptr) continue;
+    const auto grids = std::ranges::count(built->form().controls(), ControlKind::grid, &Control::kind);
+    const auto named = entry.grids.empty() ? 0 : 1 + std::ranges::count(entry.grids, ',');
+    EXPECT_EQ(grids, named) << entry.pageClass;
+    ++pages;
+  }
+  EXPECT_EQ(pages, 8);
+}
+
+TEST(FormTest, AnIntegerWithAUnitIsShownInItAndKeptInBaseUnits) {
+  Form form;
+  std::int32_t depth = 3;
+  form.DDX_VdText("Depth:", depth, item::kFloodDepth);
+  UnitChoices feet;
+  feet.setSystem(UnitSystem::us);
+  form.show(feet);
+  EXPECT_EQ(form.find("Depth:")->text, "9.84252");
+  EXPECT_EQ(form.store(feet), "");
+  EXPECT_EQ(depth, 3);
+  form.find("Depth:")->text = "100";
+  EXPECT_EQ(form.store(feet), "");
+  EXPECT_EQ(depth, 30);
+  form.find("Depth:")->text = "1e300";
+  EXPECT_EQ(form.store(feet), "");
+  EXPECT_EQ(depth, 2147483647);
+  form.find("Depth:")->text = "deep";
+  EXPECT_EQ(form.store(feet), "Depth: \"deep\" is not a number");
+  float real = 1;
+  double wide = 1;
+  form.DDX_VdText("Real:", real, item::kFloodDepth);
+  form.DDX_VdText("Wide:", wide, item::kFloodDepth);
+  form.show(feet);
+  EXPECT_EQ(form.find("Real:")->text, form.find("Wide:")->text);
 }
 
 class ResultSubset : public ::testing::Test {

@@ -164,6 +164,15 @@ TEST_F(Undo, ASaveElsewhereKeepsFileNames) {
   EXPECT_EQ(root().bathymetry->GetArea(1)->fileName.absolute(), folder.file("grid.tsb2"));
 }
 
+TEST_F(Undo, ATypedNameStartsFromTheSetupsFolder) {
+  ASSERT_TRUE(document.OnSaveDocument(folder.file("s.v27")));
+  open("CBathymetryDlg");
+  if (!theEdition.wetlandSweepKit) edit("Number of areas", "2");
+  const int area = root().bathymetry->GetCount();
+  store(area, 1, "new.tsb2");
+  EXPECT_EQ(root().bathymetry->GetArea(area)->fileName.absolute(), folder.file("new.tsb2"));
+}
+
 TEST_F(Undo, OpeningForgetsTheSteps) {
   open("CAreaDescriptionDlg");
   edit("Drying depth:", "0.01");

@@ -65,6 +65,12 @@ TEST_P(Plugin, TheDocumentTemplate) {
             GetParam() ? "VANE27FlowModelWSK.Document" : "VANE27FlowModel.Document");
   EXPECT_EQ(docTemplate->GetDocString(CVdDocTemplate::kTypeName),
             GetParam() ? "Wetland Sweep Kit" : "Flow Model");
+  EXPECT_EQ(docTemplate->GetStringId(), GetParam() ? 19200 : 18951);
+  EXPECT_EQ(docTemplate->GetDocumentClass(), "CGridbayDoc");
+  const std::unique_ptr<CV27SetupChildFrame> frame = docTemplate->CreateFrame();
+  EXPECT_EQ(frame->navigationClass(), "CNavigationView");
+  EXPECT_EQ(frame->firstViewClass(), "CGraphicalView");
+  EXPECT_EQ(frame->OnMouseActivate(), 3);
   test::TestHost host;
   EXPECT_EQ(docTemplate->CreateNewDocument(host)->fileKind(), GetParam() ? "v27wsk" : "v27");
 }
@@ -130,8 +136,14 @@ TEST_F(Document, OnlyASavedFileIsRun) {
   EXPECT_THAT(host.texts.at(0), HasSubstr("must be saved"));
   save();
   document.SetModifiedFlag();
+  host.answer = false;
   document.OnCommand(46018);
   EXPECT_TRUE(host.starts.empty());
+  EXPECT_THAT(host.questions.at(0), HasSubstr("not saved"));
+  host.answer = true;
+  document.OnCommand(46018);
+  EXPECT_EQ(host.starts.size(), 1U);
+  EXPECT_FALSE(document.IsModified());
 }
 
 TEST_F(Document, WithAutomaticValidationFaultsPreventAStart) {

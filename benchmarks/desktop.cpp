@@ -1,0 +1,166 @@
+// The desktop, offscreen, on the shipped example: the plug-in, the window and the pages as a user has them.
+
+#include <benchmark/benchmark.h>
+#include <unistd.h>
+
+#include <QApplication>
+#include <QProcess>
+#include <QScrollBar>
+#include <QTemporaryDir>
+
+#include "platform/tsb/tsb_writer.h"
+#include "platform/units/units.h"
+#include "shell/grid_view.h"
+#include "shell/main_window.h"
+
+namespace gridbay::shell {
+namespace {
+
+constexpr int kValidate = 46019;
+
+// The shipped example, made anew by the programs beside this one.
+class Example {
+ public:
+  Example() {
+    run("make_terrain", {folder_.path()});
+    for (const char* name : {"estuary", "inlet"}) {
+      run("v27setup", {"convert", "raster", QString(name) + ".asc", QString(name) + ".tsb2", "--land", "5",
+                       "--crs", "UTM-32"});
+    }
+    run("v27setup", {"new", "s.v27", "--area", "estuary.tsb2", "--area", "inlet.tsb2@36,33"});
+  }
+  QString setup() const { return folder_.filePath("s.v27"); }
+
+ private:
+  void run(const QString& program, const QStringList& arguments) {
+    QProcess process;
+    process.setWorkingDirectory(folder_.path());
+    process.start(QCoreApplication::applicationDirPath() + "/" + program, arguments);
+    process.waitForFinished();
+    if (process.exitCode() != 0)
+      qFatal("%s failed: %s", qPrintable(program), process.readAllStandardError().data());
+  }
+  QTemporaryDir folder_;
+};
+
+const Example& example() {
+  static const Example made;
+  return made;
+}
+
+std::vector<std::unique_ptr<EditorLibrary>> libraries() {
+  QString error;
+  std::vector<std::unique_ptr<EditorLibrary>> found;
+  found.push_back(EditorLibrary::load("v27nested", &error));
+  if (found.back() == nullptr) qFatal("%s", qPrintable(error));
+  return found;
+}
+
+class Window {
+ public:
+  Window() : window_(libraries()) {
+    window_.show();
+    window_.openDocument(example().setup());
+    QApplication::processEvents();
+  }
+  DocumentTab& tab() { return *window_.currentDocument(); }
+
+ private:
+  MainWindow window_;
+};
+
+// A whole process: from its start until the window with the setup has been painted.
+void firstWindow(benchmark::State& state) {
+  const QString setup = example().setup();
+  QTemporaryDir pictures;
+  for (auto _ : state) {
+    QProcess shell;
+    shell.setStandardErrorFile(QProcess::nullDevice());
+    shell.start(QCoreApplication::applicationDirPath() + "/vanedeck-shell", {"--exit-when-shown", setup});
+    shell.waitForFinished();
+    if (shell.exitCode() != 0) state.SkipWithError("the shell failed");
+  }
+}
+
+void pageSwitch(benchmark::State& state) {
+  Window window;
+  const int pages[] = {27, 39, 28, 40, 26, 29, 35, 43};
+  std::size_t next = 0;
+  for (auto _ : state) {
+    window.tab().goToPage(pages[next++ % std::size(pages)]);
+    QApplication::processEvents();
+  }
+}
+
+void validate(benchmark::State& state) {
+  Window window;
+  for (auto _ : state) window.tab().editor().command(kValidate);
+}
+
+void treeRules(benchmark::State& state) {
+  Window window;
+  SetupEditor& editor = window.tab().editor();
+  for (auto _ : state) editor.applyRules();
+}
+
+void scrollGrid(benchmark::State& state) {
+  Window window;
+  window.tab().goToPage(40);
+  auto* edit =
+      qobject_cast<QLineEdit*>(window.tab().pane().widgetOf("Number of source sink pairs")->focusProxy());
+  edit->setText("1000");
+  emit edit->editingFinished();
+  auto* view = window.tab().pane().findChild<GridView*>();
+  QScrollBar* bar = view->verticalScrollBar();
+  QApplication::processEvents();
+  if (bar->maximum() < 900) state.SkipWithError("the grid has no rows");
+  for (auto _ : state) {
+    bar->setValue((bar->value() + 7) % bar->maximum());
+    view->viewport()->repaint();
+  }
+}
+
+// A map of 10,000 x 10,000 points, from the file to the painted window.
+void openBigMap(benchmark::State& state) {
+  constexpr std::size_t kPoints = 10000;
+  QTemporaryDir folder;
+  const QString path = folder.filePath("big.tsb2");
+  TsbDefinition definition;
+  definition.axes = {{.points = kPoints, .spacing = 10}, {.points = kPoints, .spacing = 10}};
+  definition.items = {{.name = "Bathymetry", .type = item::kBathymetry, .unit = "m"}};
+  Result<TsbWriter> writer = TsbWriter::create(path.toStdString(), definition);
+  std::vector<float> row(kPoints);
+  for (std::size_t k = 0; k < kPoints; ++k) {
+    for (std::size_t j = 0; j < kPoints; ++j) row[j] = -static_cast<float>((j + k) % 977);
+    if (!writer || !writer->writeRows(1, 0, k, row))
+      return state.SkipWithError("the map could not be written");
+  }
+  if (!writer->commit()) return state.SkipWithError("the map could not be written");
+  for (auto _ : state) {
+    QString error;
+    const std::unique_ptr<DataWindow> window(DataWindow::open(path, nullptr, &error));
+    window->show();
+    QApplication::processEvents();
+    if (window->grab().isNull()) state.SkipWithError("nothing was painted");
+  }
+}
+
+BENCHMARK(openBigMap)->Unit(benchmark::kMillisecond);
+BENCHMARK(firstWindow)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(pageSwitch)->Unit(benchmark::kMillisecond);
+BENCHMARK(validate)->Unit(benchmark::kMillisecond);
+BENCHMARK(treeRules)->Unit(benchmark::kMicrosecond);
+BENCHMARK(scrollGrid)->Unit(benchmark::kMillisecond);
+
+}  // namespace
+}  // namespace gridbay::shell
+
+int main(int argc, char** argv) {
+  if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
+  QTemporaryDir home;
+  for (const char* variable : {"XDG_DATA_HOME", "XDG_CONFIG_HOME"}) qputenv(variable, home.path().toUtf8());
+  QApplication application(argc, argv);
+  benchmark::Initialize(&argc, argv);
+  benchmark::RunSpecifiedBenchmarks();
+  return 0;
+}
