@@ -174,7 +174,7 @@ Result<std::vector<Value>> valuesOfText(const Node& keyword, std::string_view te
     if (!value)
       return Failure{
           fmt::format("{} takes {}, not \"{}\"", keyword.name(), kindName(now[i].kind()), pieces[i])};
-    values.emplace_back(now[i].kind(), keeper.keep(*value));
+    values.push_back(keeper.makeValue(now[i].kind(), keeper.keep(*value)));
   }
   return values;
 }

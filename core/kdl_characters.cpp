@@ -21,16 +21,6 @@ bool isPlainBlock(const char* at, std::size_t size) {
   return odd == 0;
 }
 
-constexpr std::array<bool, 256> wordBytes() {
-  std::array<bool, 256> table{};
-  for (int byte = 0x21; byte < 0x7F; ++byte) table[static_cast<std::size_t>(byte)] = true;
-  for (char c : {'\\', '/', '(', ')', '{', '}', ';', '[', ']', '"', '#', '='}) {
-    table[static_cast<unsigned char>(c)] = false;
-  }
-  return table;
-}
-constexpr std::array<bool, 256> kWordBytes = wordBytes();
-
 bool isDigit(char c) {
   return c >= '0' && c <= '9';
 }
@@ -111,13 +101,10 @@ std::size_t firstBadByte(std::string_view text) {
   return std::string_view::npos;
 }
 
-bool isWordByte(unsigned char byte) {
-  return kWordBytes[byte];
-}
-
 bool isKeywordWithoutHash(std::string_view word) {
+  constexpr std::size_t kLongest = 5;
   constexpr std::array<std::string_view, 6> kWords{"true", "false", "null", "inf", "-inf", "nan"};
-  return std::ranges::find(kWords, word) != kWords.end();
+  return word.size() <= kLongest && std::ranges::find(kWords, word) != kWords.end();
 }
 
 bool isBareWord(std::string_view text) {

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <array>
+#include <cstddef>
 #include <cstdint>
 #include <string>
 #include <string_view>
@@ -26,7 +28,16 @@ bool isNewline(char32_t code);
 std::size_t firstBadByte(std::string_view text);
 
 // Whether a byte below 0x80 can stand in a bare word; from 0x80 on the character decides.
-bool isWordByte(unsigned char byte);
+inline bool isWordByte(unsigned char byte) {
+  static constexpr std::array<bool, 256> kWordBytes = [] {
+    std::array<bool, 256> table{};
+    for (std::size_t code = 0x21; code < 0x7F; ++code) table[code] = true;
+    for (const char c : {'\\', '/', '(', ')', '{', '}', ';', '[', ']', '"', '#', '='})
+      table[static_cast<unsigned char>(c)] = false;
+    return table;
+  }();
+  return kWordBytes[byte];
+}
 
 // Whether a text can be written without quotes.
 bool isBareWord(std::string_view text);

@@ -40,6 +40,8 @@ class Reader {
   void read() {
     open_.push_back({.section = &tree_.root()});
     for (;;) {
+      while (*at_ == ' ' || *at_ == '\n') ++at_;
+      if (readPlainNode()) continue;
       skipLineSpace();
       if (at_ == end_) break;
       if (*at_ == '}') {
@@ -61,6 +63,11 @@ class Reader {
   const char* at() const { return at_; }
 
  private:
+  // A value as it is read.
+  struct Read {
+    ValueKind kind;
+    std::string_view text;
+  };
   // A node while it is being read.
   struct NodeState {
     std::string_view name;
@@ -168,6 +175,58 @@ class Reader {
     return true;
   }
 
+  // What nearly all of a large file consists of: a bare name and then a block or one decimal number, to the
+  // end of the line; or the end of such a block. Whatever is not just so is left for the rules below, which
+  // begin at the same place.
+  bool readPlainNode() {
+    if (!open_.back().keep) return false;
+    if (*at_ == '}') return closePlainBlock();
+    const char* at = at_;
+    if (!kdl::isWordByte(static_cast<unsigned char>(*at)) || isDigit(*at) || *at == '-' || *at == '+' ||
+        *at == '.')
+      return false;
+    while (kdl::isWordByte(static_cast<unsigned char>(*at))) ++at;
+    const std::string_view name(at_, static_cast<std::size_t>(at - at_));
+    if (*at != ' ' || kdl::isKeywordWithoutHash(name)) return false;
+    const char* start = ++at;
+    if (*at == '{' && at[1] == '\n') {
+      values_.clear();
+      at_ = at;
+      openBlock({.name = name}, false);
+      return true;
+    }
+    if (*at == '-') ++at;
+    ValueKind kind = ValueKind::integer;
+    const auto skipDigits = [&at] {
+      const char* first = at;
+      while (isDigit(*at)) ++at;
+      return at != first;
+    };
+    if (!skipDigits()) return false;
+    if (*at == '.') {
+      ++at;
+      kind = ValueKind::real;
+      if (!skipDigits()) return false;
+    }
+    if (*at == 'e' || *at == 'E') {
+      ++at;
+      kind = ValueKind::real;
+      if (*at == '+' || *at == '-') ++at;
+      if (!skipDigits()) return false;
+    }
+    if (*at != '\n') return false;
+    append(*tree_.makeKeyword(name, tree_.makeValue(kind, {start, static_cast<std::size_t>(at - start)})));
+    at_ = at + 1;
+    return true;
+  }
+
+  bool closePlainBlock() {
+    if (at_[1] != '\n' || open_.size() == 1) return false;
+    at_ += 2;
+    open_.pop_back();
+    return true;
+  }
+
   void readNode() {
     NodeState node;
     node.keep = !skipSlashdash() && open_.back().keep;
@@ -224,7 +283,7 @@ class Reader {
 
   void finish(const NodeState& node) {
     if (!node.keep || node.hasBlock) return;
-    append(*tree_.makeKeyword(node.name, tree_.keep(std::span<const Value>(values_))));
+    append(*tree_.makeKeyword(node.name, values_));
   }
 
   void append(Node& node) {
@@ -238,18 +297,18 @@ class Reader {
     if (*at_ == '(') {
       const std::string_view annotation = readAnnotation();
       skipNodeSpace();
-      Value value = readValue(keep);
+      const Read value = readValue(keep);
       if (!keep) return;
-      if (value.kind() != ValueKind::string || (annotation != "file" && annotation != "result")) {
+      if (value.kind != ValueKind::string || (annotation != "file" && annotation != "result")) {
         failAt(start, "a plain value, (file)\"...\" or (result)\"...\"",
                "the type annotation (" + std::string(annotation) + ")");
       }
       const ValueKind kind = annotation == "file" ? ValueKind::fileName : ValueKind::resultFileName;
-      values_.emplace_back(kind, value.text());
+      values_.push(tree_.makeValue(kind, value.text));
       return;
     }
-    const Value value = readValue(keep);
-    if (value.kind() == ValueKind::string) {
+    const Read value = readValue(keep);
+    if (value.kind == ValueKind::string) {
       const char* behind = at_;
       skipNodeSpace();
       if (*at_ == '=') {
@@ -265,7 +324,7 @@ class Reader {
       }
       at_ = behind;
     }
-    if (keep) values_.push_back(value);
+    if (keep) values_.push(tree_.makeValue(value.kind, value.text));
   }
 
   std::string_view readAnnotation() {
@@ -278,14 +337,14 @@ class Reader {
     return name;
   }
 
-  Value readValue(bool keep) {
+  Read readValue(bool keep) {
     if (*at_ == '#' && at_[1] != '"' && at_[1] != '#') return readHashWord(keep);
     const char* number = *at_ == '-' || *at_ == '+' ? at_ + 1 : at_;
     if (isDigit(*number)) return readNumber(number);
     return {ValueKind::string, readString("a value")};
   }
 
-  Value readHashWord(bool keep) {
+  Read readHashWord(bool keep) {
     constexpr std::pair<std::string_view, ValueKind> kWords[] = {
         {"#true", ValueKind::boolean}, {"#false", ValueKind::boolean}, {"#inf", ValueKind::real},
         {"#-inf", ValueKind::real},    {"#nan", ValueKind::real},      {"#null", ValueKind::string},
@@ -304,7 +363,7 @@ class Reader {
     failAt(start, "#true, #false, #inf, #-inf, #nan or a raw string", "\"" + std::string(word) + "\"");
   }
 
-  Value readNumber(const char* digits) {
+  Read readNumber(const char* digits) {
     const char* start = at_;
     const bool negative = *at_ == '-';
     if (*digits == '0' && (digits[1] == 'x' || digits[1] == 'o' || digits[1] == 'b')) {
@@ -340,7 +399,7 @@ class Reader {
     return {kind, tree_.keep(scratch_)};
   }
 
-  Value readBasedNumber(const char* start, bool negative, unsigned base) {
+  Read readBasedNumber(const char* start, bool negative, unsigned base) {
     std::uint64_t number = 0;
     bool any = false;
     for (;; ++at_) {
@@ -566,7 +625,7 @@ class Reader {
   const char* at_;
   const char* end_;
   std::vector<Block> open_;
-  std::vector<Value> values_;
+  ValueList values_;
   std::string scratch_;
 };
 

@@ -100,8 +100,7 @@ void KvsFile::append(Node& node) {
 void KvsFile::settle() {
   if (!inKeyword_) return;
   inKeyword_ = false;
-  append(*tree_->makeKeyword(keyword_, tree_->keep(std::span<const Value>(values_))));
-  values_.clear();
+  append(*tree_->makeKeyword(keyword_, values_));
 }
 
 void KvsFile::open(std::string_view name) {
@@ -123,7 +122,7 @@ void KvsFile::startKeyword(std::string_view name) {
 }
 
 void KvsFile::add(ValueKind kind, std::string_view text) {
-  values_.emplace_back(kind, tree_->keep(text));
+  values_.push(tree_->makeValue(kind, tree_->keep(text)));
 }
 
 KvsHandle kvsCreate() {

@@ -39,7 +39,7 @@ class KvsFile {
   std::vector<Open> open_;
   std::string_view keyword_;
   bool inKeyword_ = false;
-  std::vector<Value> values_;
+  ValueList values_;
 };
 
 using KvsHandle = std::unique_ptr<KvsFile>;

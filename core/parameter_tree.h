@@ -2,11 +2,14 @@
 
 #include <cstdint>
 #include <memory>
-#include <memory_resource>
 #include <span>
 #include <string>
 #include <string_view>
+#include <utility>
+#include <vector>
 
+#include "core/arena.h"
+#include "core/section_index.h"
 #include "platform/files/read_file.h"
 
 namespace gridbay {
@@ -16,19 +19,55 @@ namespace gridbay {
 enum class ValueKind : std::uint8_t { boolean, integer, real, string, fileName, resultFileName };
 
 // One value of a keyword, held as its text: "true" or "false", the decimal digits of a number (or "inf",
-// "-inf", "nan"), the characters of a string or path without quotes and escapes.
+// "-inf", "nan"), the characters of a string or path without quotes and escapes. It is made by a tree, which
+// holds the text. A file may have very many values, so one is eight bytes: the address of the text (a program
+// has 48 bits of them), the kind, and the length, which stands with the address elsewhere when it is long.
 class Value {
  public:
-  Value(ValueKind kind, std::string_view text)
-      : text_(text.data()), length_(static_cast<std::uint32_t>(text.size())), kind_(kind) {}
-
-  ValueKind kind() const { return kind_; }
-  std::string_view text() const { return {text_, length_}; }
+  ValueKind kind() const { return static_cast<ValueKind>(bits_ >> kAddressBits & kKindMask); }
+  std::string_view text() const {
+    const std::uint64_t address = bits_ & ((std::uint64_t{1} << kAddressBits) - 1);
+    const std::uint64_t length = bits_ >> (kAddressBits + kKindBits);
+    if (length < kLong) return {reinterpret_cast<const char*>(address), length};
+    return *reinterpret_cast<const std::string_view*>(address);
+  }
 
  private:
-  const char* text_;
-  std::uint32_t length_;
-  ValueKind kind_;
+  friend class ParameterTree;
+
+  static constexpr unsigned kAddressBits = 48;
+  static constexpr unsigned kKindBits = 3;
+  static constexpr std::uint64_t kKindMask = (1U << kKindBits) - 1;
+  static constexpr std::uint64_t kLong = (std::uint64_t{1} << (64 - kAddressBits - kKindBits)) - 1;
+
+  Value(ValueKind kind, const void* address, std::uint64_t length)
+      : bits_(reinterpret_cast<std::uint64_t>(address) | static_cast<std::uint64_t>(kind) << kAddressBits |
+              length << (kAddressBits + kKindBits)) {}
+
+  std::uint64_t bits_;
+};
+
+// The values of a keyword while it is being read or written. Many of them are held in pieces, so that their
+// number does not double for a moment.
+class ValueList {
+ public:
+  void push(Value value) {
+    if (last_.size() == kPiece) full_.push_back(std::exchange(last_, {}));
+    last_.push_back(value);
+  }
+  bool empty() const { return last_.empty(); }
+  void clear() {
+    full_.clear();
+    last_.clear();
+  }
+
+ private:
+  friend class ParameterTree;
+
+  static constexpr std::size_t kPiece = 1 << 16;
+
+  std::vector<std::vector<Value>> full_;
+  std::vector<Value> last_;
 };
 
 class Node;
@@ -39,7 +78,7 @@ class ParameterTree;
 struct SectionBody {
   ParameterTree* tree = nullptr;
   Node* first = nullptr;
-  const class SectionIndex* index = nullptr;
+  SectionIndex* index = nullptr;
   std::uint32_t sections = 0;
   std::uint32_t keywords = 0;
 };
@@ -95,7 +134,7 @@ class ParameterTree {
   explicit ParameterTree(FileText text = FileText());
   ParameterTree(const ParameterTree&) = delete;
   ParameterTree& operator=(const ParameterTree&) = delete;
-  ~ParameterTree() = default;
+  ~ParameterTree();
 
   const Node& root() const { return *root_; }
   Node& root() { return *root_; }
@@ -103,22 +142,42 @@ class ParameterTree {
 
   // Making nodes. Texts given here must outlive the tree: `keep` copies one into it.
   std::string_view keep(std::string_view text);
-  std::span<const Value> keep(std::span<const Value> values);
-  Node* makeSection(std::string_view name);
-  Node* makeKeyword(std::string_view name, std::span<const Value> values);
+  Value makeValue(ValueKind kind, std::string_view text) {
+    if (text.size() < Value::kLong) return {kind, text.data(), text.size()};
+    return {kind, arena_.make<std::string_view>(text), Value::kLong};
+  }
+  Node* makeSection(std::string_view name) {
+    return arena_.make<Node>(name, arena_.make<SectionBody>(SectionBody{.tree = this}));
+  }
+  // The list is empty afterwards.
+  Node* makeKeyword(std::string_view name, ValueList& values);
+  Node* makeKeyword(std::string_view name, Value value) {
+    return arena_.make<Node>(name, std::span<const Value>(arena_.make<Value>(value), 1));
+  }
   // Appends a node to a section behind `last`, the section's last node so far (null when it is empty).
-  static void append(Node& section, Node* last, Node& node);
-
-  std::pmr::memory_resource& arena() { return arena_; }
+  static void append(Node& section, Node* last, Node& node) {
+    (last == nullptr ? section.body_->first : last->next_) = &node;
+    SectionBody& body = *section.body_;
+    ++(node.isSection() ? body.sections : body.keywords);
+    if (body.index != nullptr) {
+      body.index->add(node);
+    } else if (body.sections + body.keywords == kLarge) {
+      body.index = body.tree->makeIndex(section);
+    }
+  }
 
  private:
-  // Makes a thing in the arena, which frees it without a word: things with something to free don't go here.
-  template <class T, class... Args>
-  T* make(Args&&... args);
+  friend class Node;
+
+  // From this many nodes on a section's index grows with it; a smaller one has one once it is asked.
+  static constexpr std::uint32_t kLarge = 64;
+
+  SectionIndex* makeIndex(const Node& section);
 
   FileText text_;
-  std::pmr::monotonic_buffer_resource arena_;
+  Arena arena_;
   Node* root_;
+  std::vector<std::unique_ptr<SectionIndex>> indexes_;
 };
 
 // Whether two names are the same but for the case of the letters A to Z.

@@ -13,7 +13,7 @@
 namespace gridbay {
 
 FileText::FileText(std::string_view text)
-    : bytes_(std::make_unique_for_overwrite<char[]>(text.size() + kPadding)), size_(text.size()) {
+    : bytes_(allocateBytes(text.size() + kPadding)), size_(text.size()) {
   std::copy(text.begin(), text.end(), bytes_.get());
   std::memset(bytes_.get() + text.size(), 0, kPadding);
 }
@@ -26,7 +26,7 @@ Result<FileText> readFile(const std::string& path) {
   if (!S_ISREG(status.st_mode)) return Failure{"cannot read \"" + path + "\": it is not a file"};
 
   const auto size = static_cast<std::size_t>(status.st_size);
-  auto bytes = std::make_unique_for_overwrite<char[]>(size + FileText::kPadding);
+  LargeBytes bytes = allocateBytes(size + FileText::kPadding);
   std::size_t got = 0;
   while (got < size) {
     const ssize_t n = ::read(file.get(), bytes.get() + got, size - got);

@@ -4,6 +4,7 @@
 #include <string>
 #include <string_view>
 
+#include "platform/large_memory.h"
 #include "platform/result.h"
 
 namespace gridbay {
@@ -17,12 +18,12 @@ class FileText {
 
   FileText() : FileText(std::string_view()) {}
   explicit FileText(std::string_view text);
-  FileText(std::unique_ptr<char[]> bytes, std::size_t size) : bytes_(std::move(bytes)), size_(size) {}
+  FileText(LargeBytes bytes, std::size_t size) : bytes_(std::move(bytes)), size_(size) {}
 
   std::string_view view() const { return {bytes_.get(), size_}; }
 
  private:
-  std::unique_ptr<char[]> bytes_;
+  LargeBytes bytes_;
   std::size_t size_ = 0;
 };
 

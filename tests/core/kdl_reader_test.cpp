@@ -123,8 +123,9 @@ TEST(KdlReader, EveryTruncationOfAFileIsReadOrRefused) {
 TEST(KdlWriter, NamesAndTextsThatNeedQuotes) {
   ParameterTree tree;
   Node* last = nullptr;
+  ValueList none;
   for (const char* name : {"plain-Name_1", "two words", "1st", "true", "a=b", "", "-5", ".5", "ö"}) {
-    Node* node = tree.makeKeyword(name, {});
+    Node* node = tree.makeKeyword(name, none);
     ParameterTree::append(tree.root(), last, *node);
     last = node;
   }
@@ -134,8 +135,8 @@ TEST(KdlWriter, NamesAndTextsThatNeedQuotes) {
 
 TEST(KdlWriter, ATextThatIsNotUtf8IsNotWritten) {
   ParameterTree tree;
-  const Value value(ValueKind::string, "\xFF");
-  ParameterTree::append(tree.root(), nullptr, *tree.makeKeyword("Name", tree.keep(std::span(&value, 1))));
+  ParameterTree::append(tree.root(), nullptr,
+                        *tree.makeKeyword("Name", tree.makeValue(ValueKind::string, "\xFF")));
   const Result<std::string> text = kdlText(tree.root());
   ASSERT_FALSE(text);
   EXPECT_EQ(text.error(), "a name or text of \"Name\" is not UTF-8");

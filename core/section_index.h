@@ -1,0 +1,64 @@
+#pragma once
+
+#include <cstdint>
+#include <string_view>
+#include <unordered_map>
+#include <vector>
+
+namespace gridbay {
+
+class Node;
+
+// Finds what a section holds by name and occurrence. Most of a large file is numbered, as POINT_1, POINT_2
+// and on: such a run is found by its number. All else is found by a hash of name and occurrence, made when it
+// is first asked for. Not to be asked from two threads at once.
+class SectionIndex {
+ public:
+  // With all that the section holds now.
+  explicit SectionIndex(const Node& section);
+
+  // The section has got another node, its last.
+  void add(const Node& node);
+  // The occurrence-th (from 1) section or keyword of a name, its case ignored; null when there is none.
+  const Node* find(std::string_view name, std::uint32_t occurrence, bool wantSection);
+
+ private:
+  // A name that ends in a number without needless zeros, so that each number has one name.
+  struct NumberedName {
+    std::string_view prefix;
+    std::uint32_t number = 0;
+  };
+  // Siblings of one kind that are numbered on without a gap.
+  struct Run {
+    bool sections = false;
+    std::string_view prefix;
+    std::uint32_t first = 0;
+    std::vector<const Node*> nodes = {};
+
+    bool holds(const NumberedName& name, bool wantSection) const;
+  };
+  struct Slot {
+    const Node* node = nullptr;
+    std::uint32_t hash = 0;
+    std::uint32_t occurrence = 0;
+  };
+
+  static bool split(std::string_view name, NumberedName& numbered);
+  void endRun();
+  void settle();
+  bool runsMeet() const;
+  std::size_t slotOf(std::uint64_t hash, std::string_view name, std::uint32_t occurrence,
+                     bool wantSection) const;
+  std::size_t place(const Node& node, std::uint32_t occurrence, bool& isNew);
+  void insert(const Node& node);
+
+  const Node& section_;
+  std::vector<Run> runs_;           // the last one may still grow, and be too short to count
+  std::vector<const Node*> loose_;  // in the order of the file
+  bool runsAllowed_ = true;
+  bool settled_ = false;
+  std::vector<Slot> slots_;
+  std::unordered_map<std::size_t, std::uint32_t> repetitions_;  // beyond the first, by the first one's slot
+};
+
+}  // namespace gridbay
