@@ -2,6 +2,8 @@
 
 #include <fmt/format.h>
 
+#include <cstring>
+#include <memory>
 #include <vector>
 
 #include "core/kdl_characters.h"
@@ -11,82 +13,134 @@ namespace {
 
 constexpr std::size_t kIndent = 4;
 
-// False when the text is not UTF-8.
-bool appendQuoted(std::string& out, std::string_view text) {
-  out.push_back('"');
-  for (std::size_t i = 0; i < text.size();) {
-    const char byte = text[i];
-    if (byte >= 0x20 && byte != '"' && byte != '\\' && byte != 0x7F) {
-      out.push_back(byte);
-      ++i;
-      continue;
+// The text on its way to the sink, in pieces of a size that suits a file.
+class Output {
+ public:
+  explicit Output(TextSink& sink) : sink_(sink), piece_(std::make_unique_for_overwrite<char[]>(kPiece)) {}
+
+  void put(char c) {
+    if (size_ == kPiece) flush();
+    piece_[size_++] = c;
+  }
+  void put(std::string_view text) {
+    if (text.size() > kPiece - size_) flush();
+    if (text.size() > kPiece) {
+      take(text);
+      return;
     }
+    std::memcpy(piece_.get() + size_, text.data(), text.size());
+    size_ += text.size();
+  }
+  void indent(std::size_t depth) {
+    const std::size_t blanks = depth * kIndent;
+    if (blanks > kPiece - size_) flush();
+    std::memset(piece_.get() + size_, ' ', blanks);
+    size_ += blanks;
+  }
+  // What went wrong first, if anything did.
+  Outcome finish() {
+    flush();
+    return std::move(outcome_);
+  }
+  bool failed() const { return !outcome_; }
+
+ private:
+  // Holds the deepest indent.
+  static constexpr std::size_t kPiece = 1 << 15;
+
+  void flush() {
+    take({piece_.get(), size_});
+    size_ = 0;
+  }
+  void take(std::string_view text) {
+    if (outcome_) outcome_ = sink_.write(text);
+  }
+
+  TextSink& sink_;
+  std::unique_ptr<char[]> piece_;
+  std::size_t size_ = 0;
+  Outcome outcome_;
+};
+
+void putEscaped(Output& out, kdl::Character c, std::string_view bytes) {
+  switch (c.code) {
+    case U'"':
+      out.put("\\\"");
+      break;
+    case U'\\':
+      out.put("\\\\");
+      break;
+    case U'\b':
+      out.put("\\b");
+      break;
+    case U'\f':
+      out.put("\\f");
+      break;
+    case U'\n':
+      out.put("\\n");
+      break;
+    case U'\r':
+      out.put("\\r");
+      break;
+    case U'\t':
+      out.put("\\t");
+      break;
+    default:
+      if (kdl::isDisallowed(c.code) || kdl::isNewline(c.code)) {
+        out.put(fmt::format("\\u{{{:x}}}", static_cast<std::uint32_t>(c.code)));
+      } else {
+        out.put(bytes);
+      }
+  }
+}
+
+// False when the text is not UTF-8.
+bool putQuoted(Output& out, std::string_view text) {
+  out.put('"');
+  for (std::size_t i = 0; i < text.size();) {
+    std::size_t plain = i;
+    const auto isPlain = [](char c) { return c >= 0x20 && c != '"' && c != '\\' && c != 0x7F; };
+    while (plain < text.size() && isPlain(text[plain])) ++plain;
+    out.put(text.substr(i, plain - i));
+    i = plain;
+    if (i == text.size()) break;
     const kdl::Character c = kdl::decode(text.substr(i));
     if (c.code == kdl::kNoCharacter) return false;
-    switch (c.code) {
-      case U'"':
-        out += "\\\"";
-        break;
-      case U'\\':
-        out += "\\\\";
-        break;
-      case U'\b':
-        out += "\\b";
-        break;
-      case U'\f':
-        out += "\\f";
-        break;
-      case U'\n':
-        out += "\\n";
-        break;
-      case U'\r':
-        out += "\\r";
-        break;
-      case U'\t':
-        out += "\\t";
-        break;
-      default:
-        if (kdl::isDisallowed(c.code) || kdl::isNewline(c.code)) {
-          out += fmt::format("\\u{{{:x}}}", static_cast<std::uint32_t>(c.code));
-        } else {
-          out.append(text.substr(i, c.length));
-        }
-    }
+    putEscaped(out, c, text.substr(i, c.length));
     i += c.length;
   }
-  out.push_back('"');
+  out.put('"');
   return true;
 }
 
-bool appendName(std::string& out, std::string_view name) {
-  if (!kdl::isBareWord(name)) return appendQuoted(out, name);
-  out.append(name);
+bool putName(Output& out, std::string_view name) {
+  if (!kdl::isBareWord(name)) return putQuoted(out, name);
+  out.put(name);
   return true;
 }
 
-bool appendValue(std::string& out, const Value& value) {
+bool putValue(Output& out, const Value& value) {
   const std::string_view text = value.text();
   switch (value.kind()) {
     case ValueKind::boolean:
-      out.append("#").append(text);
-      return true;
+      out.put('#');
+      break;
     case ValueKind::integer:
-      out.append(text);
-      return true;
+      break;
     case ValueKind::real:
-      if (text == "inf" || text == "-inf" || text == "nan") out.push_back('#');
-      out.append(text);
-      return true;
+      if (text == "inf" || text == "-inf" || text == "nan") out.put('#');
+      break;
     case ValueKind::string:
-      return appendQuoted(out, text);
+      return putQuoted(out, text);
     case ValueKind::fileName:
-      out.append("(file)");
-      return appendQuoted(out, text);
+      out.put("(file)");
+      return putQuoted(out, text);
     case ValueKind::resultFileName:
-      out.append("(result)");
-      return appendQuoted(out, text);
+      out.put("(result)");
+      return putQuoted(out, text);
   }
-  return false;
+  out.put(text);
+  return true;
 }
 
 class StringSink : public TextSink {
@@ -104,38 +158,34 @@ class StringSink : public TextSink {
 }  // namespace
 
 Outcome writeKdl(const Node& section, TextSink& sink) {
-  constexpr std::size_t kPiece = 1 << 14;
-  std::string line;
+  Output out(sink);
   std::vector<const Node*> open{section.first()};
-  for (;;) {
+  while (!out.failed()) {
     const Node* node = open.back();
     if (node == nullptr) {
       open.pop_back();
       if (open.empty()) break;
-      line.append((open.size() - 1) * kIndent, ' ').append("}\n");
+      out.indent(open.size() - 1);
+      out.put("}\n");
       continue;
     }
     open.back() = node->next();
-    line.append((open.size() - 1) * kIndent, ' ');
-    bool good = appendName(line, node->name());
+    out.indent(open.size() - 1);
+    bool good = putName(out, node->name());
     if (node->isSection()) {
       const bool empty = node->first() == nullptr;
-      line.append(empty ? " {}\n" : " {\n");
+      out.put(empty ? " {}\n" : " {\n");
       if (!empty) open.push_back(node->first());
     } else {
       for (const Value& value : node->values()) {
-        line.push_back(' ');
-        good = appendValue(line, value) && good;
+        out.put(' ');
+        good = putValue(out, value) && good;
       }
-      line.push_back('\n');
+      out.put('\n');
     }
     if (!good) return Failure{"a name or text of \"" + std::string(node->name()) + "\" is not UTF-8"};
-    if (line.size() >= kPiece) {
-      if (Outcome written = sink.write(line); !written) return written;
-      line.clear();
-    }
   }
-  return sink.write(line);
+  return out.finish();
 }
 
 Result<std::string> kdlText(const Node& section) {
@@ -145,9 +195,12 @@ Result<std::string> kdlText(const Node& section) {
 }
 
 std::string valueText(const Value& value) {
-  std::string text;
-  appendValue(text, value);
-  return text;
+  StringSink sink;
+  Output out(sink);
+  putValue(out, value);
+  // A sink in memory takes everything.
+  static_cast<void>(static_cast<bool>(out.finish()));
+  return sink.take();
 }
 
 }  // namespace gridbay

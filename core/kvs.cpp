@@ -80,12 +80,6 @@ void getText(KvsSection section, std::string_view keyword, ValueKind kind, std::
   if (auto got = textOf(*param, kind)) *value = *std::move(got);
 }
 
-template <class Add, class T>
-void putParam(KvsFile& file, std::string_view keyword, Add add, T value) {
-  kvsAddKeyword(file, keyword);
-  add(file, value);
-}
-
 }  // namespace
 
 KvsFile::KvsFile(std::unique_ptr<ParameterTree> tree) : tree_(std::move(tree)) {
@@ -95,6 +89,21 @@ KvsFile::KvsFile(std::unique_ptr<ParameterTree> tree) : tree_(std::move(tree)) {
 void KvsFile::append(Node& node) {
   ParameterTree::append(*open_.back().section, open_.back().last, node);
   open_.back().last = &node;
+}
+
+// The items of a list have the same keywords again and again; each is kept once, if none of the same look has
+// come between.
+std::string_view KvsFile::keepName(std::string_view name) {
+  if (name.empty()) return {};
+  std::string_view& recent =
+      recentNames_[(name.size() + static_cast<unsigned char>(name.front())) % recentNames_.size()];
+  if (recent != name) recent = tree_->keep(name);
+  return recent;
+}
+
+void KvsFile::put(std::string_view name, ValueKind kind, std::string_view text) {
+  settle();
+  append(*tree_->makeKeyword(keepName(name), tree_->makeValue(kind, tree_->keep(text))));
 }
 
 void KvsFile::settle() {
@@ -117,7 +126,7 @@ void KvsFile::close() {
 
 void KvsFile::startKeyword(std::string_view name) {
   settle();
-  keyword_ = tree_->keep(name);
+  keyword_ = keepName(name);
   inKeyword_ = true;
 }
 
@@ -194,13 +203,13 @@ void kvsAddBool(KvsFile& file, bool value) {
   file.add(ValueKind::boolean, value ? "true" : "false");
 }
 void kvsAddInt(KvsFile& file, std::int32_t value) {
-  file.add(ValueKind::integer, numberText(std::int64_t{value}));
+  file.add(ValueKind::integer, NumberText(std::int64_t{value}).view());
 }
 void kvsAddFloat(KvsFile& file, float value) {
-  file.add(ValueKind::real, numberText(value));
+  file.add(ValueKind::real, NumberText(value).view());
 }
 void kvsAddDouble(KvsFile& file, double value) {
-  file.add(ValueKind::real, numberText(value));
+  file.add(ValueKind::real, NumberText(value).view());
 }
 void kvsAddString(KvsFile& file, std::string_view value) {
   file.add(ValueKind::string, value);
@@ -213,28 +222,28 @@ void kvsAddResultFilename(KvsFile& file, std::string_view path) {
 }
 
 void kvsPutParam(KvsFile& file, std::string_view keyword, std::int32_t value) {
-  putParam(file, keyword, kvsAddInt, value);
+  file.put(keyword, ValueKind::integer, NumberText(std::int64_t{value}).view());
 }
 void kvsPutParam(KvsFile& file, std::string_view keyword, float value) {
-  putParam(file, keyword, kvsAddFloat, value);
+  file.put(keyword, ValueKind::real, NumberText(value).view());
 }
 void kvsPutParam(KvsFile& file, std::string_view keyword, double value) {
-  putParam(file, keyword, kvsAddDouble, value);
+  file.put(keyword, ValueKind::real, NumberText(value).view());
 }
 void kvsPutParam(KvsFile& file, std::string_view keyword, bool value) {
-  putParam(file, keyword, kvsAddBool, value);
+  file.put(keyword, ValueKind::boolean, value ? "true" : "false");
 }
 void kvsPutParam(KvsFile& file, std::string_view keyword, std::string_view value) {
-  putParam(file, keyword, kvsAddString, value);
+  file.put(keyword, ValueKind::string, value);
 }
 void kvsPutParam(KvsFile& file, std::string_view keyword, const char* value) {
-  putParam(file, keyword, kvsAddString, std::string_view(value));
+  file.put(keyword, ValueKind::string, value);
 }
 void kvsPutParamFilename(KvsFile& file, std::string_view keyword, std::string_view path) {
-  putParam(file, keyword, kvsAddFilename, path);
+  file.put(keyword, ValueKind::fileName, path);
 }
 void kvsPutParamResultFilename(KvsFile& file, std::string_view keyword, std::string_view path) {
-  putParam(file, keyword, kvsAddResultFilename, path);
+  file.put(keyword, ValueKind::resultFileName, path);
 }
 
 KvsSection kvsTargetByNameNum(const KvsFile& file, std::string_view name, int occurrence) {

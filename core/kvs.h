@@ -1,5 +1,6 @@
 #pragma once
 
+#include <array>
 #include <cstdint>
 #include <memory>
 #include <string>
@@ -25,6 +26,8 @@ class KvsFile {
   void close();
   void startKeyword(std::string_view name);
   void add(ValueKind kind, std::string_view text);
+  // A keyword with one value.
+  void put(std::string_view name, ValueKind kind, std::string_view text);
   // Ends the keyword that is being filled, so that the tree is whole.
   void settle();
 
@@ -34,12 +37,14 @@ class KvsFile {
     Node* last;
   };
   void append(Node& node);
+  std::string_view keepName(std::string_view name);
 
   std::unique_ptr<ParameterTree> tree_;
   std::vector<Open> open_;
   std::string_view keyword_;
   bool inKeyword_ = false;
   ValueList values_;
+  std::array<std::string_view, 16> recentNames_;
 };
 
 using KvsHandle = std::unique_ptr<KvsFile>;

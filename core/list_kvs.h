@@ -73,16 +73,18 @@ class ListKvs : public TableKvs<Derived> {
     static_cast<Derived&>(*this).SetCount(believed);
   }
   void saveItems(const Text& sectionName, KvsFile& file, const std::string& documentPath) const {
+    NumberedText name(sectionName);
     for (int number = 1; number <= GetCount(); ++number) {
-      kvsAddSection(file, formatted(sectionName, number));
+      kvsAddSection(file, name.of(number));
       items_[static_cast<std::size_t>(number) - 1]->Save(file, documentPath);
       kvsEndSection(file);
     }
   }
   void loadItems(const Text& sectionName, const Text& missing, KvsSection section,
                  const std::string& documentPath) {
+    NumberedText name(sectionName);
     for (int number = 1; number <= GetCount(); ++number) {
-      const KvsSection itemSection = kvsSectionByNameNum(section, formatted(sectionName, number), 1);
+      const KvsSection itemSection = kvsSectionByNameNum(section, name.of(number), 1);
       if (itemSection != nullptr) {
         GetItem(number)->Load(itemSection, documentPath);
       } else {
@@ -108,6 +110,7 @@ class ListKvs : public TableKvs<Derived> {
  private:
   void resize(int count) {
     while (GetCount() > count) items_.pop_back();
+    items_.reserve(static_cast<std::size_t>(count));
     while (GetCount() < count) {
       items_.push_back(std::make_unique<Item>(this));
       if constexpr (requires(Derived & derived, Item & item) { derived.initialise(item, 1); }) {

@@ -1,30 +1,15 @@
 #include "core/number_text.h"
 
 #include <fast_float/fast_float.h>
+#include <fmt/compile.h>
 
-#include <array>
+#include <algorithm>
 #include <charconv>
 #include <cmath>
 #include <limits>
 
 namespace gridbay {
 namespace {
-
-template <class Number>
-std::string shortest(Number number) {
-  std::array<char, 64> buffer{};
-  const auto [end, error] = std::to_chars(buffer.data(), buffer.data() + buffer.size(), number);
-  return {buffer.data(), end};
-}
-
-template <class Real>
-std::string realText(Real number) {
-  if (std::isnan(number)) return "nan";
-  if (std::isinf(number)) return number < 0 ? "-inf" : "inf";
-  std::string text = shortest(number);
-  if (text.find_first_of(".e") == std::string::npos) text += ".0";
-  return text;
-}
 
 template <class Real>
 std::optional<Real> realOfText(std::string_view text) {
@@ -36,14 +21,25 @@ std::optional<Real> realOfText(std::string_view text) {
 
 }  // namespace
 
-std::string numberText(std::int64_t number) {
-  return shortest(number);
+NumberText::NumberText(std::int64_t number) {
+  size_ = static_cast<std::size_t>(
+      std::to_chars(buffer_.data(), buffer_.data() + buffer_.size(), number).ptr - buffer_.data());
 }
-std::string numberText(float number) {
-  return realText(number);
+NumberText::NumberText(float number) {
+  setReal(number);
 }
-std::string numberText(double number) {
-  return realText(number);
+NumberText::NumberText(double number) {
+  setReal(number);
+}
+
+template <class Real>
+void NumberText::setReal(Real number) {
+  constexpr std::string_view kPoint = ".0";
+  char* end = fmt::format_to(buffer_.data(), FMT_COMPILE("{}"), number);
+  const bool isReal = std::any_of(buffer_.data(), end, [](char c) { return c == '.' || c == 'e'; });
+  if (!isReal && std::isfinite(number)) end = std::copy(kPoint.begin(), kPoint.end(), end);
+  if (std::isnan(number)) end = std::copy_n("nan", 3, buffer_.data());  // whatever its sign
+  size_ = static_cast<std::size_t>(end - buffer_.data());
 }
 
 std::optional<std::int32_t> int32OfText(std::string_view text) {

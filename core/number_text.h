@@ -1,5 +1,6 @@
 #pragma once
 
+#include <array>
 #include <cstdint>
 #include <optional>
 #include <string>
@@ -9,9 +10,26 @@ namespace gridbay {
 
 // The shortest decimal text that reads back as the same number; a real always has a point or an exponent, so
 // that it is told from an integer. Infinities are "inf" and "-inf", not-a-number is "nan".
-std::string numberText(std::int64_t number);
-std::string numberText(float number);
-std::string numberText(double number);
+class NumberText {
+ public:
+  explicit NumberText(std::int64_t number);
+  explicit NumberText(float number);
+  explicit NumberText(double number);
+
+  std::string_view view() const { return {buffer_.data(), size_}; }
+
+ private:
+  template <class Real>
+  void setReal(Real number);
+
+  std::array<char, 40> buffer_;
+  std::size_t size_ = 0;
+};
+
+template <class Number>
+std::string numberText(Number number) {
+  return std::string(NumberText(number).view());
+}
 
 // A number of any numeric text. An integer that is out of range, or text with anything behind the number,
 // gives nothing; a real given to an integer loses its fraction.

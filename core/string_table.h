@@ -1,7 +1,9 @@
 #pragma once
 
+#include <fmt/compile.h>
 #include <fmt/printf.h>
 
+#include <iterator>
 #include <string>
 #include <string_view>
 
@@ -12,6 +14,23 @@ namespace gridbay {
 struct Text {
   std::string_view format;
   int id = 0;
+};
+
+// The texts of a format that ends in its one number, "POINT_%d", for many numbers.
+class NumberedText {
+ public:
+  explicit NumberedText(const Text& text)
+      : text_(text.format.substr(0, text.format.rfind('%'))), prefix_(text_.size()) {}
+
+  std::string_view of(int number) {
+    text_.resize(prefix_);
+    fmt::format_to(std::back_inserter(text_), FMT_COMPILE("{}"), number);
+    return text_;
+  }
+
+ private:
+  std::string text_;
+  std::size_t prefix_;
 };
 
 template <class... Args>

@@ -61,7 +61,7 @@ TEST(Kvs, WritesTheWholeTreeAsText) {
             "    Result (result)\"out put.tsb0\"\n"
             "    Pair 3 4\n"
             "    Date 1990 1 1 12 0 0\n"
-            "    Mixed 1 1e+10 0.3333333333333333 \"s\" #false (file)\"f\" (result)\"r\"\n"
+            "    Mixed 1 10000000000.0 0.3333333333333333 \"s\" #false (file)\"f\" (result)\"r\"\n"
             "    SECTION {\n"
             "        EMPTY {}\n"
             "        Inner 1\n"
