@@ -28,7 +28,7 @@ class Output {
       take(text);
       return;
     }
-    std::memcpy(piece_.get() + size_, text.data(), text.size());
+    copy(piece_.get() + size_, text);
     size_ += text.size();
   }
   void indent(std::size_t depth) {
@@ -45,6 +45,31 @@ class Output {
   bool failed() const { return !outcome_; }
 
  private:
+  // Nearly all texts are a few bytes long: two moves that overlap take less time than a call.
+  static void copy(char* to, std::string_view text) {
+    const std::size_t n = text.size();
+    if (n > 16) {
+      std::memcpy(to, text.data(), n);
+    } else if (n >= 8) {
+      copyEnds<8>(to, text);
+    } else if (n >= 4) {
+      copyEnds<4>(to, text);
+    } else if (n > 0) {
+      to[0] = text[0];
+      to[n / 2] = text[n / 2];
+      to[n - 1] = text[n - 1];
+    }
+  }
+  template <std::size_t size>
+  static void copyEnds(char* to, std::string_view text) {
+    char head[size];
+    char tail[size];
+    std::memcpy(head, text.data(), size);
+    std::memcpy(tail, text.data() + text.size() - size, size);
+    std::memcpy(to, head, size);
+    std::memcpy(to + text.size() - size, tail, size);
+  }
+
   // Holds the deepest indent.
   static constexpr std::size_t kPiece = 1 << 15;
 
@@ -113,8 +138,20 @@ bool putQuoted(Output& out, std::string_view text) {
   return true;
 }
 
+// The names that a setup has, letters and digits and so on in ASCII, without the rarer rules.
+bool isPlainName(std::string_view name) {
+  constexpr std::size_t kLongestReserved = 5;
+  if (name.size() <= kLongestReserved) return kdl::isBareWord(name);
+  const auto first = static_cast<unsigned char>(name.front() | 0x20);
+  if (first < 'a' || first > 'z') return kdl::isBareWord(name);
+  for (const char c : name) {
+    if (!kdl::isWordByte(static_cast<unsigned char>(c))) return kdl::isBareWord(name);
+  }
+  return true;
+}
+
 bool putName(Output& out, std::string_view name) {
-  if (!kdl::isBareWord(name)) return putQuoted(out, name);
+  if (!isPlainName(name)) return putQuoted(out, name);
   out.put(name);
   return true;
 }
@@ -128,7 +165,7 @@ bool putValue(Output& out, const Value& value) {
     case ValueKind::integer:
       break;
     case ValueKind::real:
-      if (text == "inf" || text == "-inf" || text == "nan") out.put('#');
+      if (text.back() == 'f' || text.back() == 'n') out.put('#');  // inf, -inf, nan
       break;
     case ValueKind::string:
       return putQuoted(out, text);

@@ -29,7 +29,32 @@ NumberText::NumberText(float number) {
   setReal(number);
 }
 NumberText::NumberText(double number) {
-  setReal(number);
+  if (!setFewDecimals(number)) setReal(number);
+}
+
+// Nearly all numbers of a setup have at most six decimals. Decimals of up to 15 digits are all different as
+// doubles, so that one which gives the number back is the shortest there is.
+bool NumberText::setFewDecimals(double number) {
+  constexpr double kScale = 1e6;
+  constexpr double kLeast = 1e-3;
+  constexpr double kMost = 1e9;  // of what is 15 digits with its decimals
+  const double size = std::abs(number);
+  if (!(size >= kLeast && size < kMost)) return false;
+  const auto scaled = static_cast<std::uint64_t>(size * kScale + 0.5);
+  if (static_cast<double>(scaled) / kScale != size) return false;
+  char* at = buffer_.data();
+  if (number < 0) *at++ = '-';
+  constexpr std::uint64_t kUnit = 1'000'000;
+  at = std::to_chars(at, buffer_.data() + buffer_.size(), scaled / kUnit).ptr;
+  *at++ = '.';
+  auto decimals = static_cast<std::uint32_t>(scaled % kUnit);
+  for (std::uint32_t unit = 100'000; unit > 0; unit /= 10) {
+    *at++ = static_cast<char>('0' + decimals / unit);
+    decimals %= unit;
+    if (decimals == 0) break;
+  }
+  size_ = static_cast<std::size_t>(at - buffer_.data());
+  return true;
 }
 
 template <class Real>

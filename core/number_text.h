@@ -19,6 +19,7 @@ class NumberText {
   std::string_view view() const { return {buffer_.data(), size_}; }
 
  private:
+  bool setFewDecimals(double number);
   template <class Real>
   void setReal(Real number);
 

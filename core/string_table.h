@@ -1,9 +1,8 @@
 #pragma once
 
-#include <fmt/compile.h>
 #include <fmt/printf.h>
 
-#include <iterator>
+#include <charconv>
 #include <string>
 #include <string_view>
 
@@ -20,15 +19,19 @@ struct Text {
 class NumberedText {
  public:
   explicit NumberedText(const Text& text)
-      : text_(text.format.substr(0, text.format.rfind('%'))), prefix_(text_.size()) {}
+      : text_(text.format.substr(0, text.format.rfind('%'))), prefix_(text_.size()) {
+    text_.resize(prefix_ + kMostDigits);
+  }
 
+  // Holds until the next number is asked for.
   std::string_view of(int number) {
-    text_.resize(prefix_);
-    fmt::format_to(std::back_inserter(text_), FMT_COMPILE("{}"), number);
-    return text_;
+    const char* end = std::to_chars(text_.data() + prefix_, text_.data() + text_.size(), number).ptr;
+    return {text_.data(), static_cast<std::size_t>(end - text_.data())};
   }
 
  private:
+  static constexpr std::size_t kMostDigits = 11;  // with a sign
+
   std::string text_;
   std::size_t prefix_;
 };

@@ -1,5 +1,6 @@
 #include "core/number_text.h"
 
+#include <fmt/format.h>
 #include <gtest/gtest.h>
 
 #include <bit>
@@ -31,6 +32,28 @@ TEST(NumberText, EveryRealComesBack) {
     if (!std::isnan(twice)) ASSERT_EQ(doubleOfText(numberText(twice)), twice);
     if (!std::isnan(single)) ASSERT_EQ(floatOfText(numberText(single)), single);
   }
+}
+
+// Numbers with few decimals go another way than all others; both must write the same.
+TEST(NumberText, FewDecimalsAreTheShortestText) {
+  std::mt19937_64 random(20261122);
+  for (int i = 0; i < 500000; ++i) {
+    const double scale = std::pow(10.0, static_cast<double>(random() % 12));
+    const auto digits = static_cast<double>(random() % 10'000'000'000'000'000U);
+    const double number = (random() % 2 == 0 ? 1 : -1) * std::round(digits / scale) / 1e6;
+    std::string expected = fmt::format("{}", number);
+    if (expected.find_first_of(".e") == std::string::npos) expected += ".0";
+    ASSERT_EQ(numberText(number), expected);
+    ASSERT_EQ(doubleOfText(expected), number);
+    const double neighbour = std::nextafter(number, 1e300);
+    ASSERT_EQ(doubleOfText(numberText(neighbour)), neighbour);
+  }
+  EXPECT_EQ(numberText(0.001), "0.001");
+  EXPECT_EQ(numberText(0.000001), "1e-06");
+  EXPECT_EQ(numberText(999999999.999999), "999999999.999999");
+  EXPECT_EQ(numberText(1e9), "1000000000.0");
+  EXPECT_EQ(numberText(-2.5), "-2.5");
+  EXPECT_EQ(numberText(0.0), "0.0");
 }
 
 TEST(NumberText, Integers) {
