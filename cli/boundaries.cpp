@@ -16,7 +16,6 @@ int boundaries(const Options& options, const Console& console) {
   ConsoleMessageHost host(console);
   Result<SetupFile> setup = SetupFile::open(options.file, &host);
   if (!setup) return console.fail(setup.error());
-  host.flush();
   CBoundaryKvs& list = *setup->model().boundary;
   if (options.detect) {
     // The detection itself empties the list where the grid can't be read; here the old list is kept then.

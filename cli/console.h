@@ -1,6 +1,5 @@
 #pragma once
 
-#include <map>
 #include <ostream>
 #include <string>
 #include <string_view>
@@ -23,21 +22,15 @@ struct Console {
   void note(std::string_view text) const;
 };
 
-// What a load has to say, on standard error: each text once, on one line, with how often it came.
+// What a load has to say, on standard error.
 class ConsoleMessageHost : public MessageHost {
  public:
   explicit ConsoleMessageHost(const Console& console) : console_(console) {}
-  ConsoleMessageHost(const ConsoleMessageHost&) = delete;
-  ConsoleMessageHost& operator=(const ConsoleMessageHost&) = delete;
-  ~ConsoleMessageHost() override { flush(); }
 
-  void show(const std::string& text) override;
-  void flush();
+  void show(const std::string& text) override { console_.note(text); }
 
  private:
   const Console& console_;
-  std::vector<std::string> order_;
-  std::map<std::string, int> counts_;
 };
 
 // Saves a setup to its own file, and says which of its sections this version does not know and leaves out.

@@ -55,7 +55,6 @@ int set(const SetOptions& options, const Console& console) {
   ConsoleMessageHost host(console);
   Result<SetupFile> opened = SetupFile::open(options.file, &host);
   if (!opened) return console.fail(opened.error());
-  host.flush();
   SetupFile setup = std::move(*opened);
   for (const std::string& setting : options.settings) {
     const std::size_t equals = setting.find('=');

@@ -245,7 +245,6 @@ int info(const Options& options, const Console& console) {
   ConsoleMessageHost host(console);
   Result<SetupFile> setup = SetupFile::open(options.file, &host);
   if (!setup) return console.fail(setup.error());
-  host.flush();
   return print(describeSetup(setup->model()), options, printSetup, console);
 }
 

@@ -16,7 +16,6 @@ int validate(const Options& options, const Console& console) {
   ConsoleMessageHost host(console);
   Result<SetupFile> setup = SetupFile::open(options.file, &host);
   if (!setup) return console.fail(setup.error());
-  host.flush();
   ValidationList messages;
   const unsigned faults = setup->model().Validate(messages, 1);
   if (options.json) {

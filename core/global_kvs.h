@@ -30,6 +30,9 @@ class CGlobalKvs final : public CKvsBase {
   explicit CGlobalKvs(MessageHost* host = nullptr);
   ~CGlobalKvs() override;
 
+  // Whom the next texts go to.
+  void SetMessageHost(MessageHost* host) { host_ = host; }
+
   // Never null while the root lives.
   std::unique_ptr<CModuleSelectionKvs> moduleSelection;
   std::unique_ptr<CBathymetryKvs> bathymetry;

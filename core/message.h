@@ -59,6 +59,10 @@ class MessageHost {
   virtual void show(const std::string& text) = 0;
 };
 
+// Shows texts that belong together, as what a load has to say: one as it is, more as one list with a line for
+// each, where it came first, and how often it came.
+void showTogether(MessageHost& host, const std::vector<std::string>& texts);
+
 // Keeps the texts, for a caller who shows them together.
 class CollectingMessageHost : public MessageHost {
  public:

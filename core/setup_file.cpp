@@ -53,9 +53,12 @@ Result<SetupFile> SetupFile::open(const std::string& path, MessageHost* host,
 }
 
 SetupFile SetupFile::fromTree(KvsHandle tree, const std::string& path, MessageHost* host) {
-  SetupFile setup(host);
+  CollectingMessageHost said;
+  SetupFile setup(&said);
   setup.source_ = std::move(tree);
   setup.model_->Load(&setup.source_->tree().root(), path);
+  setup.model_->SetMessageHost(host);
+  if (host != nullptr) showTogether(*host, said.texts);
   setup.model_->SetSourceFile(setup.source_.get());
   return setup;
 }

@@ -15,7 +15,7 @@ namespace gridbay {
 // know.
 class SetupFile {
  public:
-  // A new default model. The host, which must outlive it, is shown what a load has to say.
+  // A new default model. The host, which must outlive it, is shown what a load has to say, in one list.
   explicit SetupFile(MessageHost* host);
 
   // Reads a setup; a file that is no setup is an error, so that it cannot be saved over by accident.
