@@ -54,15 +54,21 @@ std::string_view ParameterTree::keep(std::string_view text) {
   return {copy, text.size()};
 }
 
+void ValueList::pushFurther(Value value) {
+  if (count_ % kPiece == 0) further_.push_back(allocateBytes(kLargeMemory));
+  std::construct_at(reinterpret_cast<Value*>(further_.back().get()) + count_ % kPiece, value);
+  ++count_;
+}
+
 Node* ParameterTree::makeKeyword(std::string_view name, ValueList& values) {
-  const std::size_t count = values.full_.size() * ValueList::kPiece + values.last_.size();
+  const std::size_t count = values.first_.size() + values.count_;
   Value* kept = count == 0 ? nullptr : arena_.room<Value>(count);
-  Value* at = kept;
-  for (std::vector<Value>& piece : values.full_) {
-    at = std::uninitialized_copy(piece.begin(), piece.end(), at);
-    piece = {};
+  Value* at = std::uninitialized_copy(values.first_.begin(), values.first_.end(), kept);
+  for (LargeBytes& piece : values.further_) {
+    const std::size_t size = std::min(ValueList::kPiece, count - static_cast<std::size_t>(at - kept));
+    at = std::uninitialized_copy_n(reinterpret_cast<const Value*>(piece.get()), size, at);
+    piece.reset();
   }
-  std::uninitialized_copy(values.last_.begin(), values.last_.end(), at);
   values.clear();
   return arena_.make<Node>(name, std::span<const Value>(kept, count));
 }

@@ -52,22 +52,30 @@ class Value {
 class ValueList {
  public:
   void push(Value value) {
-    if (last_.size() == kPiece) full_.push_back(std::exchange(last_, {}));
-    last_.push_back(value);
+    if (first_.size() < kFirst) {
+      first_.push_back(value);
+    } else {
+      pushFurther(value);
+    }
   }
-  bool empty() const { return last_.empty(); }
+  bool empty() const { return first_.empty(); }
   void clear() {
-    full_.clear();
-    last_.clear();
+    first_.clear();
+    further_.clear();
+    count_ = 0;
   }
 
  private:
   friend class ParameterTree;
 
-  static constexpr std::size_t kPiece = 1 << 16;
+  static constexpr std::size_t kFirst = 1 << 16;
+  static constexpr std::size_t kPiece = kLargeMemory / sizeof(Value);
 
-  std::vector<std::vector<Value>> full_;
-  std::vector<Value> last_;
+  void pushFurther(Value value);
+
+  std::vector<Value> first_;
+  std::vector<LargeBytes> further_;  // of `kPiece` values each
+  std::size_t count_ = 0;            // in `further_`
 };
 
 class Node;
@@ -146,9 +154,7 @@ class ParameterTree {
     if (text.size() < Value::kLong) return {kind, text.data(), text.size()};
     return {kind, arena_.make<std::string_view>(text), Value::kLong};
   }
-  Node* makeSection(std::string_view name) {
-    return arena_.make<Node>(name, arena_.make<SectionBody>(SectionBody{.tree = this}));
-  }
+  Node* makeSection(std::string_view name) { return arena_.make<Node>(name, &empty_); }
   // The list is empty afterwards.
   Node* makeKeyword(std::string_view name, ValueList& values);
   Node* makeKeyword(std::string_view name, Value value) {
@@ -156,13 +162,15 @@ class ParameterTree {
   }
   // Appends a node to a section behind `last`, the section's last node so far (null when it is empty).
   static void append(Node& section, Node* last, Node& node) {
-    (last == nullptr ? section.body_->first : last->next_) = &node;
+    ParameterTree& tree = *section.body_->tree;
+    if (section.body_ == &tree.empty_) section.body_ = tree.arena_.make<SectionBody>(tree.empty_);
     SectionBody& body = *section.body_;
+    (last == nullptr ? body.first : last->next_) = &node;
     ++(node.isSection() ? body.sections : body.keywords);
     if (body.index != nullptr) {
       body.index->add(node);
     } else if (body.sections + body.keywords == kLarge) {
-      body.index = body.tree->makeIndex(section);
+      body.index = tree.makeIndex(section);
     }
   }
 
@@ -176,6 +184,7 @@ class ParameterTree {
 
   FileText text_;
   Arena arena_;
+  SectionBody empty_{.tree = this};  // of all sections that hold nothing
   Node* root_;
   std::vector<std::unique_ptr<SectionIndex>> indexes_;
 };

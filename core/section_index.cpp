@@ -143,8 +143,9 @@ void SectionIndex::settle() {
     for (const Node* node = section_.first(); node != nullptr; node = node->next()) loose_.push_back(node);
   }
   repetitions_.clear();
+  occurrences_.assign(loose_.size(), 0);
   slots_.assign(std::bit_ceil(loose_.size() * 4 / 3 + 1), {});
-  for (const Node* node : loose_) insert(*node);
+  for (std::size_t place = 0; place < loose_.size(); ++place) insert(place);
 }
 
 const Node* SectionIndex::find(std::string_view name, std::uint32_t occurrence, bool wantSection) {
@@ -156,7 +157,8 @@ const Node* SectionIndex::find(std::string_view name, std::uint32_t occurrence, 
         return occurrence == 1 ? run.nodes[numbered.number - run.first] : nullptr;
     }
   }
-  return slots_[slotOf(hashName(name, occurrence), name, occurrence, wantSection)].node;
+  const std::uint32_t place = slots_[slotOf(hashName(name, occurrence), name, occurrence, wantSection)].place;
+  return place == 0 ? nullptr : loose_[place - 1];
 }
 
 std::size_t SectionIndex::slotOf(std::uint64_t hash, std::string_view name, std::uint32_t occurrence,
@@ -164,28 +166,30 @@ std::size_t SectionIndex::slotOf(std::uint64_t hash, std::string_view name, std:
   const std::size_t mask = slots_.size() - 1;
   for (std::size_t at = hash & mask;; at = (at + 1) & mask) {
     const Slot& slot = slots_[at];
-    if (slot.node == nullptr) return at;
-    if (slot.hash == static_cast<std::uint32_t>(hash >> 32) && slot.occurrence == occurrence &&
-        slot.node->isSection() == wantSection && names::same(slot.node->name(), name)) {
-      return at;
-    }
+    if (slot.place == 0) return at;
+    if (slot.hash != static_cast<std::uint32_t>(hash >> 32) || occurrences_[slot.place - 1] != occurrence)
+      continue;
+    const Node& node = *loose_[slot.place - 1];
+    if (node.isSection() == wantSection && names::same(node.name(), name)) return at;
   }
 }
 
-// The slot that was free for the node, or that of the node of the same name and occurrence.
-std::size_t SectionIndex::place(const Node& node, std::uint32_t occurrence, bool& isNew) {
+// Takes a slot for a loose node, unless one of the same name and occurrence has it.
+bool SectionIndex::take(std::size_t place, std::uint32_t occurrence, std::size_t* slot) {
+  const Node& node = *loose_[place];
   const std::uint64_t hash = hashName(node.name(), occurrence);
-  const std::size_t at = slotOf(hash, node.name(), occurrence, node.isSection());
-  isNew = slots_[at].node == nullptr;
-  if (isNew) slots_[at] = {&node, static_cast<std::uint32_t>(hash >> 32), occurrence};
-  return at;
+  *slot = slotOf(hash, node.name(), occurrence, node.isSection());
+  if (slots_[*slot].place != 0) return false;
+  slots_[*slot] = {static_cast<std::uint32_t>(place) + 1, static_cast<std::uint32_t>(hash >> 32)};
+  occurrences_[place] = occurrence;
+  return true;
 }
 
 // How often a repeated name has come is kept apart: few names repeat.
-void SectionIndex::insert(const Node& node) {
-  bool isNew = false;
-  const std::size_t first = place(node, 1, isNew);
-  if (!isNew) place(node, 2 + repetitions_[first]++, isNew);
+void SectionIndex::insert(std::size_t place) {
+  std::size_t first = 0;
+  std::size_t slot = 0;
+  if (!take(place, 1, &first)) take(place, 2 + repetitions_[first]++, &slot);
 }
 
 }  // namespace gridbay

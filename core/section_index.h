@@ -38,9 +38,8 @@ class SectionIndex {
     bool holds(const NumberedName& name, bool wantSection) const;
   };
   struct Slot {
-    const Node* node = nullptr;
+    std::uint32_t place = 0;  // of the node among the loose ones, from 1; 0 where the slot is free
     std::uint32_t hash = 0;
-    std::uint32_t occurrence = 0;
   };
 
   static bool split(std::string_view name, NumberedName& numbered);
@@ -49,12 +48,13 @@ class SectionIndex {
   bool runsMeet() const;
   std::size_t slotOf(std::uint64_t hash, std::string_view name, std::uint32_t occurrence,
                      bool wantSection) const;
-  std::size_t place(const Node& node, std::uint32_t occurrence, bool& isNew);
-  void insert(const Node& node);
+  bool take(std::size_t place, std::uint32_t occurrence, std::size_t* slot);
+  void insert(std::size_t place);
 
   const Node& section_;
-  std::vector<Run> runs_;           // the last one may still grow, and be too short to count
-  std::vector<const Node*> loose_;  // in the order of the file
+  std::vector<Run> runs_;                   // the last one may still grow, and be too short to count
+  std::vector<const Node*> loose_;          // in the order of the file
+  std::vector<std::uint32_t> occurrences_;  // of the loose ones, each among those of its name
   bool runsAllowed_ = true;
   bool settled_ = false;
   std::vector<Slot> slots_;
