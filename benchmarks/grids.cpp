@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "basic/bathymetry.h"
+#include "basic/boundary_detection.h"
 #include "core/global_kvs.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_writer.h"
@@ -128,6 +129,14 @@ void plainSweep(benchmark::State& state) {
   setBytes(state);
 }
 BENCHMARK(plainSweep)->Unit(benchmark::kMillisecond);
+
+// Only the border is looked at: the time is that of 40,000 points, not of 100,000,000.
+void detectBoundaries(benchmark::State& state) {
+  CGlobalKvs root;
+  const CBathymetryObjectKvs& area = readArea(root);
+  for (auto _ : state) benchmark::DoNotOptimize(findOpenBoundaries(area.grid, area.landValue));
+}
+BENCHMARK(detectBoundaries)->Unit(benchmark::kMillisecond);
 
 void courantWithEightNestedAreas(benchmark::State& state) {
   CGlobalKvs root;

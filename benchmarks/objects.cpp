@@ -75,8 +75,8 @@ void loadAndSave(benchmark::State& state) {
   std::filesystem::remove(path);
 }
 
-BENCHMARK(parseAlone)->Arg(10'000)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond);
-BENCHMARK(loadAndSave)->Arg(10'000)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond);
+BENCHMARK(parseAlone)->Arg(10'000)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond)->MinTime(2);
+BENCHMARK(loadAndSave)->Arg(10'000)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond)->MinTime(2);
 
 }  // namespace
 }  // namespace gridbay
