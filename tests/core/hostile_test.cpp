@@ -67,6 +67,10 @@ struct CountKeyword {
   int (*count)(CGlobalKvs&);
 };
 
+void PrintTo(const CountKeyword& row, std::ostream* out) {
+  *out << row.keyword;
+}
+
 const CountKeyword kCounts[] = {
     {"BATHYMETRY_SELECTION", "No_Of_Areas", [](CGlobalKvs& root) { return root.bathymetry->GetCount(); }},
     {"OPEN_BOUNDARY", "Number_Of_Boundaries", [](CGlobalKvs& root) { return root.boundary->GetCount(); }},
@@ -141,6 +145,10 @@ struct Shape {
   std::string (*text)();
   bool readable;
 };
+
+void PrintTo(const Shape& shape, std::ostream* out) {
+  *out << shape.name;
+}
 
 std::string repeated(std::string_view piece, int times) {
   std::string text;
