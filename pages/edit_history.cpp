@@ -58,27 +58,28 @@ bool EditHistory::record(CGlobalKvs& model, PageId page, std::string name, bool 
 }
 
 void EditHistory::undo(CGlobalKvs& model, Touched& touched) {
-  bool more = true;
-  while (more && done_ > 0) {
-    const Step& step = steps_[--done_];
-    restore(model, step, &PartChange::before);
-    touched_ = touched = step.touchedBefore;
-    const Step* next = undoStep();
-    more = step.continues && next != nullptr && next->continues && next->name == step.name &&
-           next->page == step.page && !isSaved();
+  for (const Step* step = undoStep(); step != nullptr;) {
+    --done_;
+    restore(model, *step, &PartChange::before);
+    touched_ = touched = step->touchedBefore;
+    step = nextOfRun(*step, undoStep());
   }
 }
 
 void EditHistory::redo(CGlobalKvs& model, Touched& touched) {
-  bool more = true;
-  while (more && done_ < steps_.size()) {
-    const Step& step = steps_[done_++];
-    restore(model, step, &PartChange::after);
-    touched_ = touched = step.touchedAfter;
-    const Step* next = redoStep();
-    more = step.continues && next != nullptr && next->continues && next->name == step.name &&
-           next->page == step.page && !isSaved();
+  for (const Step* step = redoStep(); step != nullptr;) {
+    ++done_;
+    restore(model, *step, &PartChange::after);
+    touched_ = touched = step->touchedAfter;
+    step = nextOfRun(*step, redoStep());
   }
+}
+
+// A run ends where the state on file lies within it.
+const EditHistory::Step* EditHistory::nextOfRun(const Step& step, const Step* next) const {
+  const bool goesOn = next != nullptr && step.continues && next->continues && next->name == step.name &&
+                      next->page == step.page && !isSaved();
+  return goesOn ? next : nullptr;
 }
 
 // A count that one part takes up again reaches its followers, which is why the parts are looked at once more.

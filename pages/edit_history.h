@@ -51,6 +51,7 @@ class EditHistory {
  private:
   static constexpr std::size_t kNeverSaved = static_cast<std::size_t>(-1);
 
+  const Step* nextOfRun(const Step& step, const Step* next) const;
   void restore(CGlobalKvs& model, const Step& step, std::string PartChange::*side);
   void dropOldest();
 

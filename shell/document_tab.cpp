@@ -269,20 +269,23 @@ bool DocumentTab::save(const QString& path) {
 
 void DocumentTab::undo() {
   commit();
-  const std::optional<SetupEditor::Edit> edit = editor_->undoable();
-  if (!edit) return;
-  editor_->undo();
-  pane_->refresh();
-  goToPage(edit->page);
+  if (const std::optional<SetupEditor::Edit> edit = editor_->undoable()) {
+    editor_->undo();
+    showEdit(*edit);
+  }
 }
 
 void DocumentTab::redo() {
   commit();
-  const std::optional<SetupEditor::Edit> edit = editor_->redoable();
-  if (!edit) return;
-  editor_->redo();
+  if (const std::optional<SetupEditor::Edit> edit = editor_->redoable()) {
+    editor_->redo();
+    showEdit(*edit);
+  }
+}
+
+void DocumentTab::showEdit(const SetupEditor::Edit& edit) {
   pane_->refresh();
-  goToPage(edit->page);
+  goToPage(edit.page);
 }
 
 void DocumentTab::setUnits(const UnitChoices& units) {

@@ -75,6 +75,7 @@ class DocumentTab final : public QSplitter, public SetupHost {
   void applyVisibility();
   void showCurrentPage();
   void showFirstView();
+  void showEdit(const SetupEditor::Edit& edit);
   QTreeWidgetItem* itemOf(std::int32_t id) const { return itemsById_.value(id); }
   void leaveHiddenPage();
   void watch();

@@ -2,10 +2,8 @@
 
 #include <QApplication>
 #include <QFileDialog>
-#include <QFileInfo>
 #include <QMenuBar>
 #include <QMessageBox>
-#include <QSettings>
 
 #include "shell/appearance.h"
 #include "shell/main_window.h"
@@ -13,7 +11,6 @@
 namespace gridbay::shell {
 namespace {
 
-constexpr const char* kRecentKey = "recent";
 // Commands of the editor that have a key here.
 constexpr int kValidate = 46019;
 constexpr int kStart = 46018;
@@ -178,13 +175,6 @@ void MainWindow::askOpen() {
   } else {
     openDocument(path);
   }
-}
-
-void MainWindow::rebuildRecentMenu() {
-  recentMenu_->clear();
-  const QStringList recent = QSettings().value(kRecentKey).toStringList();
-  for (const QString& path : recent) recentMenu_->addAction(path, this, [this, path] { openDocument(path); });
-  recentMenu_->setEnabled(!recent.isEmpty());
 }
 
 }  // namespace gridbay::shell

@@ -7,7 +7,6 @@
 #include <QDockWidget>
 #include <QFileDialog>
 #include <QFileInfo>
-#include <QLineEdit>
 #include <QMessageBox>
 #include <QMimeData>
 #include <QPointer>
@@ -16,8 +15,6 @@
 #include <QStatusBar>
 #include <QStyle>
 #include <QUrl>
-
-#include "shell/appearance.h"
 
 namespace gridbay::shell {
 namespace {
@@ -323,6 +320,13 @@ void MainWindow::remember(const QString& path) {
   recent.prepend(absolute);
   settings.setValue(kRecentKey, recent.mid(0, kMostRecent));
   rebuildRecentMenu();
+}
+
+void MainWindow::rebuildRecentMenu() {
+  recentMenu_->clear();
+  const QStringList recent = QSettings().value(kRecentKey).toStringList();
+  for (const QString& path : recent) recentMenu_->addAction(path, this, [this, path] { openDocument(path); });
+  recentMenu_->setEnabled(!recent.isEmpty());
 }
 
 void MainWindow::dragEnterEvent(QDragEnterEvent* event) {

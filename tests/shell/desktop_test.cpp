@@ -23,6 +23,8 @@
 #include "shell/grid_view.h"
 #include "shell/main_window.h"
 #include "shell/viewers/map_plot.h"
+#include "tests/support/cells.h"
+#include "tests/support/pages.h"
 
 namespace gridbay::shell {
 
@@ -519,6 +521,51 @@ class DesktopTest : public QObject {
     view->setCurrentIndex(grid().index(2, 2));  // those after it are for a sink
     QTest::keyClick(view, Qt::Key_Tab);
     QVERIFY(!view->hasFocus());
+  }
+
+  // The kinds of cell that the pages of this version have none of.
+  void cellsOfAllKindsAreEdited() {
+    class Host final : public test::TestHost {
+     public:
+      bool chooseFile(std::string_view, std::string_view, std::string* name) override {
+        *name = "results/depth";
+        return true;
+      }
+    };
+    Host host;
+    CV27SetupDoc document(host);
+    test::OnePage page(document);
+    page.OnInitialUpdate();
+    PagePane pane(nullptr);
+    pane.resize(600, 300);
+    pane.showForm("Cells", page.form());
+    pane.show();
+    auto* view = pane.findChild<GridView*>();
+    QVERIFY(view != nullptr);
+    GridModel& cells = view->cells();
+    const auto at = [&cells](int column) { return cells.index(0, column - 1); };
+
+    QVERIFY(view->isColumnHidden(test::CellsOfAllKinds::kHidden - 1));
+    view->setCurrentIndex(at(test::CellsOfAllKinds::kCheckBox));
+    QTest::keyClick(view, Qt::Key_Space);
+    QVERIFY(page.cells.flag);
+    QCOMPARE(at(test::CellsOfAllKinds::kCheckBox).data(Qt::CheckStateRole).toInt(),
+             static_cast<int>(Qt::Checked));
+
+    view->setCurrentIndex(at(test::CellsOfAllKinds::kProjection));
+    auto* list = view->findChild<QComboBox*>();
+    QVERIFY(list != nullptr);
+    QCOMPARE(list->count(), 61);
+    QCOMPARE(list->currentText(), QString("UTM-40"));
+    QTest::keyClick(list, Qt::Key_Down);
+    QCOMPARE(page.cells.projection, std::string("Local Coordinates"));
+
+    view->setCurrentIndex(at(test::CellsOfAllKinds::kResultFile));
+    QTest::keyClick(view, Qt::Key_D, Qt::ControlModifier);
+    QCOMPARE(page.cells.file, std::string("results/depth.tsb2"));
+    page.cells.enabled = false;
+    cells.refresh();
+    QVERIFY(!cells.flags(at(test::CellsOfAllKinds::kResultFile)).testFlag(Qt::ItemIsEnabled));
   }
 
   void aUnitIsChosenForOneQuantity() {
