@@ -47,6 +47,18 @@ bool isUsablePathName(std::string_view path) {
                              [](const fs::path& part) { return part.string().size() <= kLongestPart; });
 }
 
+std::string endOfLinks(const std::string& path) {
+  constexpr int kMostLinks = 40;
+  std::error_code error;
+  fs::path end(path);
+  for (int i = 0; i < kMostLinks && fs::is_symlink(end, error); ++i) {
+    fs::path next = fs::read_symlink(end, error);
+    if (error) break;
+    end = next.is_absolute() ? std::move(next) : end.parent_path() / next;
+  }
+  return end.string();
+}
+
 bool isReadableFile(const std::string& path) {
   std::error_code error;
   return fs::is_regular_file(path, error) && ::access(path.c_str(), R_OK) == 0;

@@ -20,6 +20,9 @@ std::string pathOnFile(std::string_view absolute, std::string_view folder);
 // file systems allow, and a file name at its end.
 bool isUsablePathName(std::string_view path);
 
+// The file that a write to the path replaces: the end of a chain of links, whether or not it exists yet.
+std::string endOfLinks(const std::string& path);
+
 // Whether the file exists and can be read.
 bool isReadableFile(const std::string& path);
 

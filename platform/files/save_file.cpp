@@ -10,23 +10,12 @@
 #include <optional>
 
 #include "platform/files/file_descriptor.h"
+#include "platform/files/paths.h"
 
 namespace gridbay {
 namespace {
 
 constexpr std::size_t kBufferSize = 1 << 16;
-
-// The file that a save replaces: the end of a chain of links, whether or not it exists yet.
-std::filesystem::path linkEnd(std::filesystem::path path) {
-  constexpr int kMostLinks = 40;
-  std::error_code error;
-  for (int i = 0; i < kMostLinks && std::filesystem::is_symlink(path, error); ++i) {
-    std::filesystem::path next = std::filesystem::read_symlink(path, error);
-    if (error) break;
-    path = next.is_absolute() ? std::move(next) : path.parent_path() / next;
-  }
-  return path;
-}
 
 std::string folderOf(const std::filesystem::path& path) {
   const std::string folder = path.parent_path().string();
@@ -63,7 +52,7 @@ FileSave::FileSave(FileSave&&) noexcept = default;
 FileSave::~FileSave() = default;
 
 Result<FileSave> FileSave::begin(const std::string& path) {
-  const std::filesystem::path target = linkEnd(path);
+  const std::filesystem::path target = endOfLinks(path);
   const std::string folder = folderOf(target);
 
   struct stat old {};

@@ -16,6 +16,7 @@
 
 #include "platform/cartography/cartography.h"
 #include "platform/files/file_descriptor.h"
+#include "platform/files/paths.h"
 #include "platform/tsb/netcdf_names.h"
 #include "platform/units/units.h"
 
@@ -224,6 +225,7 @@ std::string whyNot(const TsbDefinition& definition) {
 
 struct TsbWriter::State {
   std::string path;
+  std::string target;  // where the path leads
   std::string temporary;
   TsbDefinition definition;
   int file = -1;
@@ -275,7 +277,9 @@ Result<TsbWriter> TsbWriter::create(const std::string& path, const TsbDefinition
   state->definition = definition;
   if (const std::string why = whyNot(definition); !why.empty()) return state->failure(why);
 
-  const std::filesystem::path target(path);
+  // A symbolic link stays one, and what it leads to is replaced.
+  state->target = endOfLinks(path);
+  const std::filesystem::path target(state->target);
   const std::string folder = target.parent_path().empty() ? "." : target.parent_path().string();
   std::string temporary = folder + "/." + target.filename().string() + ".XXXXXX";
   {
@@ -315,7 +319,7 @@ Outcome TsbWriter::commit() {
   if (status != NC_NOERR) return state_->failure(State::reason(status));
   const FileDescriptor written(::open(state_->temporary.c_str(), O_RDONLY | O_CLOEXEC));
   if (!written || ::fsync(written.get()) != 0 ||
-      ::rename(state_->temporary.c_str(), state_->path.c_str()) != 0) {
+      ::rename(state_->temporary.c_str(), state_->target.c_str()) != 0) {
     return Failure{systemError("cannot write", state_->path)};
   }
   state_->temporary.clear();

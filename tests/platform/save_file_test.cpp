@@ -9,6 +9,7 @@
 #include <functional>
 
 #include "core/kvs.h"
+#include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_writer.h"
 #include "tests/support/grids.h"
 #include "tests/support/temporary_folder.h"
@@ -46,6 +47,17 @@ TEST(SaveFile, WithoutACommitNothingIsLeftAndTheOldFileStays) {
   }
   EXPECT_EQ(textOf(path), "old");
   EXPECT_EQ(filesIn(folder.path()), 1);
+}
+
+TEST(SaveFile, ALinkToADataFileStaysALink) {
+  const TemporaryFolder folder;
+  fs::create_directory(folder.path() / "sub");
+  fs::create_symlink("sub/grid.tsb2", folder.path() / "link.tsb2");
+  for (int time = 0; time < 2; ++time) {  // at first the link leads to nothing
+    test::writeGrid(folder.file("link.tsb2"), {});
+    EXPECT_TRUE(fs::is_symlink(folder.path() / "link.tsb2"));
+    EXPECT_TRUE(TsbFile::open(folder.file("sub/grid.tsb2")));
+  }
 }
 
 TEST(SaveFile, ALinkStaysALink) {
