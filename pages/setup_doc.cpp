@@ -17,6 +17,7 @@ void CV27SetupDoc::start(SetupFile setup, const std::string& path, bool modified
   path_ = path;
   touched_.clear();
   modified_ = modified;
+  leavesOut_ = false;
   history_.start(root(), path_, touched_);
   if (modified) history_.markUnsaved();
   UpdateAllViews(nullptr);
@@ -37,7 +38,21 @@ bool CV27SetupDoc::OnOpenDocument(const std::string& path) {
   return true;
 }
 
+bool CV27SetupDoc::mayLeaveOut(const std::string& path) {
+  if (leavesOut_) return true;
+  const std::vector<std::string> unknown = setup_.unknownSections(path);
+  if (unknown.empty()) return true;
+  constexpr std::size_t kMost = 10;
+  std::string question =
+      "This version does not know some of what the file holds, and a save leaves it out:\n";
+  for (std::size_t i = 0; i < std::min(kMost, unknown.size()); ++i) question += "\n" + unknown[i];
+  if (unknown.size() > kMost) question += "\nand " + std::to_string(unknown.size() - kMost) + " more";
+  leavesOut_ = host_.askYesNo(question + "\n\nSave without it?");
+  return leavesOut_;
+}
+
 bool CV27SetupDoc::OnSaveDocument(const std::string& path) {
+  if (!mayLeaveOut(path)) return false;
   if (const Outcome saved = setup_.save(path); !saved) {
     host_.show(saved.error());
     return false;

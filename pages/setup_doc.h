@@ -36,7 +36,8 @@ class CV27SetupDoc {
   virtual bool OnNewDocument();
   // Reads a setup. On failure the reason is shown, and the document is as it was.
   bool OnOpenDocument(const std::string& path);
-  // Writes the setup and makes the path the document's own. On failure the reason is shown.
+  // Writes the setup and makes the path the document's own. On failure the reason is shown. A setup that was
+  // read with sections which this version does not know is not written without them unless the user agrees.
   bool OnSaveDocument(const std::string& path);
   const std::string& path() const { return path_; }
 
@@ -83,6 +84,7 @@ class CV27SetupDoc {
   void UpdateAllViews(const void* sender);
 
  private:
+  bool mayLeaveOut(const std::string& path);
   void start(SetupFile setup, const std::string& path, bool modified);
 
   SetupHost& host_;
@@ -93,6 +95,7 @@ class CV27SetupDoc {
   std::set<PageId> touched_;
   EditHistory history_;
   bool modified_ = false;
+  bool leavesOut_ = false;  // the user has agreed
   std::vector<std::pair<const void*, View>> views_;
 };
 

@@ -52,6 +52,26 @@ TEST_F(SetupDoc, TheEnginesOptionsComeThroughASave) {
   EXPECT_THAT(test::textOf(path), HasSubstr("Speed 3\n"));
 }
 
+TEST_F(SetupDoc, WhatASaveWouldLeaveOutIsAskedAbout) {
+  const std::string text =
+      "VANE27_NESTED_MODEL { HYDRODYNAMIC_MODULE { STRUCTURES { WEIR_1 { Width 3 } } }; MY_OWN { A 1 } }";
+  const std::string path = folder.write("s.v27", text);
+  ASSERT_TRUE(document.OnOpenDocument(path));
+  host.answer = false;
+  EXPECT_FALSE(document.OnSaveDocument(path));
+  EXPECT_EQ(test::textOf(path), text);
+  EXPECT_THAT(host.questions.at(0), HasSubstr("HYDRODYNAMIC_MODULE/STRUCTURES/WEIR_1"));
+  EXPECT_THAT(host.questions.at(0), HasSubstr("MY_OWN"));
+  host.answer = true;
+  EXPECT_TRUE(document.OnSaveDocument(path));
+  EXPECT_NE(test::textOf(path), text);
+  EXPECT_TRUE(document.OnSaveDocument(path));
+  EXPECT_EQ(host.questions.size(), 2U);  // once agreed, not asked again
+  ASSERT_TRUE(document.OnOpenDocument(path));
+  EXPECT_TRUE(document.OnSaveDocument(path));
+  EXPECT_EQ(host.questions.size(), 2U);  // nothing is left to lose
+}
+
 TEST_F(SetupDoc, ViewsAreToldOfChangesButForTheirOwn) {
   int first = 0;
   int second = 0;
