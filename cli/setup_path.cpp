@@ -182,7 +182,6 @@ Result<std::vector<Value>> valuesOfText(const Node& keyword, std::string_view te
 KvsHandle withValues(const KvsFile& file, const Node* keyword, const std::vector<Value>& values) {
   KvsHandle changed = kvsCreate();
   copySection(file.tree().root(), *changed, keyword, values);
-  changed->settle();
   return changed;
 }
 

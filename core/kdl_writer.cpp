@@ -2,8 +2,6 @@
 
 #include <fmt/format.h>
 
-#include <cstring>
-#include <memory>
 #include <vector>
 
 #include "core/kdl_characters.h"
@@ -13,81 +11,7 @@ namespace {
 
 constexpr std::size_t kIndent = 4;
 
-// The text on its way to the sink, in pieces of a size that suits a file.
-class Output {
- public:
-  explicit Output(TextSink& sink) : sink_(sink), piece_(std::make_unique_for_overwrite<char[]>(kPiece)) {}
-
-  void put(char c) {
-    if (size_ == kPiece) flush();
-    piece_[size_++] = c;
-  }
-  void put(std::string_view text) {
-    if (text.size() > kPiece - size_) flush();
-    if (text.size() > kPiece) {
-      take(text);
-      return;
-    }
-    copy(piece_.get() + size_, text);
-    size_ += text.size();
-  }
-  void indent(std::size_t depth) {
-    const std::size_t blanks = depth * kIndent;
-    if (blanks > kPiece - size_) flush();
-    std::memset(piece_.get() + size_, ' ', blanks);
-    size_ += blanks;
-  }
-  // What went wrong first, if anything did.
-  Outcome finish() {
-    flush();
-    return std::move(outcome_);
-  }
-  bool failed() const { return !outcome_; }
-
- private:
-  // Nearly all texts are a few bytes long: two moves that overlap take less time than a call.
-  static void copy(char* to, std::string_view text) {
-    const std::size_t n = text.size();
-    if (n > 16) {
-      std::memcpy(to, text.data(), n);
-    } else if (n >= 8) {
-      copyEnds<8>(to, text);
-    } else if (n >= 4) {
-      copyEnds<4>(to, text);
-    } else if (n > 0) {
-      to[0] = text[0];
-      to[n / 2] = text[n / 2];
-      to[n - 1] = text[n - 1];
-    }
-  }
-  template <std::size_t size>
-  static void copyEnds(char* to, std::string_view text) {
-    char head[size];
-    char tail[size];
-    std::memcpy(head, text.data(), size);
-    std::memcpy(tail, text.data() + text.size() - size, size);
-    std::memcpy(to, head, size);
-    std::memcpy(to + text.size() - size, tail, size);
-  }
-
-  // Holds the deepest indent.
-  static constexpr std::size_t kPiece = 1 << 15;
-
-  void flush() {
-    take({piece_.get(), size_});
-    size_ = 0;
-  }
-  void take(std::string_view text) {
-    if (outcome_) outcome_ = sink_.write(text);
-  }
-
-  TextSink& sink_;
-  std::unique_ptr<char[]> piece_;
-  std::size_t size_ = 0;
-  Outcome outcome_;
-};
-
-void putEscaped(Output& out, kdl::Character c, std::string_view bytes) {
+void putEscaped(TextOutput& out, kdl::Character c, std::string_view bytes) {
   switch (c.code) {
     case U'"':
       out.put("\\\"");
@@ -120,7 +44,7 @@ void putEscaped(Output& out, kdl::Character c, std::string_view bytes) {
 }
 
 // False when the text is not UTF-8.
-bool putQuoted(Output& out, std::string_view text) {
+bool putQuoted(TextOutput& out, std::string_view text) {
   out.put('"');
   for (std::size_t i = 0; i < text.size();) {
     std::size_t plain = i;
@@ -150,15 +74,14 @@ bool isPlainName(std::string_view name) {
   return true;
 }
 
-bool putName(Output& out, std::string_view name) {
+bool putName(TextOutput& out, std::string_view name) {
   if (!isPlainName(name)) return putQuoted(out, name);
   out.put(name);
   return true;
 }
 
-bool putValue(Output& out, const Value& value) {
-  const std::string_view text = value.text();
-  switch (value.kind()) {
+bool putValue(TextOutput& out, ValueKind kind, std::string_view text) {
+  switch (kind) {
     case ValueKind::boolean:
       out.put('#');
       break;
@@ -180,49 +103,107 @@ bool putValue(Output& out, const Value& value) {
   return true;
 }
 
-class StringSink : public TextSink {
- public:
-  Outcome write(std::string_view text) override {
-    text_.append(text);
-    return {};
-  }
-  std::string take() { return std::move(text_); }
-
- private:
-  std::string text_;
-};
-
 }  // namespace
 
-Outcome writeKdl(const Node& section, TextSink& sink) {
-  Output out(sink);
+void KdlWriter::open(std::string_view section) {
+  startLine(section);
+  out_.put(" {");
+  end_ = End::opening;
+  ++depth_;
+}
+
+void KdlWriter::close() {
+  if (depth_ == 0) return;
+  --depth_;
+  if (end_ != End::opening) {
+    if (end_ == End::keyword) out_.put('\n');
+    out_.blanks(depth_ * kIndent);
+  }
+  out_.put("}\n");
+  end_ = End::line;
+}
+
+void KdlWriter::startKeyword(std::string_view name) {
+  startLine(name);
+  keyword_ = name;
+  end_ = End::keyword;
+}
+
+void KdlWriter::add(ValueKind kind, std::string_view text) {
+  if (end_ == End::keyword) addValue(keyword_, kind, text);
+}
+
+void KdlWriter::put(std::string_view name, ValueKind kind, std::string_view text) {
+  startLine(name);
+  addValue(name, kind, text);
+  out_.put('\n');
+  end_ = End::line;
+}
+
+Outcome KdlWriter::finish() {
+  out_.put(closing());
+  end_ = End::line;
+  depth_ = 0;
+  return flush();
+}
+
+Outcome KdlWriter::flush() {
+  out_.flush();
+  return outcome_ ? out_.outcome() : outcome_;
+}
+
+std::string KdlWriter::closing() const {
+  std::string text = end_ == End::keyword ? "\n" : "";
+  for (std::size_t depth = depth_; depth > 0; --depth) {
+    if (end_ != End::opening || depth < depth_) text.append((depth - 1) * kIndent, ' ');
+    text += "}\n";
+  }
+  return text;
+}
+
+void KdlWriter::startLine(std::string_view name) {
+  if (end_ != End::line) out_.put('\n');
+  out_.blanks(depth_ * kIndent);
+  check(putName(out_, name), name);
+}
+
+void KdlWriter::addValue(std::string_view keyword, ValueKind kind, std::string_view text) {
+  out_.put(' ');
+  check(putValue(out_, kind, text), keyword);
+}
+
+void KdlWriter::check(bool isUtf8, std::string_view name) {
+  if (isUtf8 || !outcome_) return;
+  outcome_ = Failure{"a name or text of \"" + std::string(name) + "\" is not UTF-8"};
+}
+
+void writeKdl(const Node& section, KdlWriter& writer) {
   std::vector<const Node*> open{section.first()};
-  while (!out.failed()) {
+  while (true) {
     const Node* node = open.back();
     if (node == nullptr) {
       open.pop_back();
-      if (open.empty()) break;
-      out.indent(open.size() - 1);
-      out.put("}\n");
+      if (open.empty()) return;
+      writer.close();
       continue;
     }
     open.back() = node->next();
-    out.indent(open.size() - 1);
-    bool good = putName(out, node->name());
     if (node->isSection()) {
-      const bool empty = node->first() == nullptr;
-      out.put(empty ? " {}\n" : " {\n");
-      if (!empty) open.push_back(node->first());
+      writer.open(node->name());
+      open.push_back(node->first());
+    } else if (node->values().size() == 1) {
+      writer.put(node->name(), node->values().front().kind(), node->values().front().text());
     } else {
-      for (const Value& value : node->values()) {
-        out.put(' ');
-        good = putValue(out, value) && good;
-      }
-      out.put('\n');
+      writer.startKeyword(node->name());
+      for (const Value& value : node->values()) writer.add(value.kind(), value.text());
     }
-    if (!good) return Failure{"a name or text of \"" + std::string(node->name()) + "\" is not UTF-8"};
   }
-  return out.finish();
+}
+
+Outcome writeKdl(const Node& section, TextSink& sink) {
+  KdlWriter writer(sink);
+  writeKdl(section, writer);
+  return writer.finish();
 }
 
 Result<std::string> kdlText(const Node& section) {
@@ -233,10 +214,9 @@ Result<std::string> kdlText(const Node& section) {
 
 std::string valueText(const Value& value) {
   StringSink sink;
-  Output out(sink);
-  putValue(out, value);
-  // A sink in memory takes everything.
-  static_cast<void>(static_cast<bool>(out.finish()));
+  TextOutput out(sink);
+  putValue(out, value.kind(), value.text());
+  out.flush();
   return sink.take();
 }
 

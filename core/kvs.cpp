@@ -5,6 +5,7 @@
 #include "core/kdl_reader.h"
 #include "core/kdl_writer.h"
 #include "core/number_text.h"
+#include "core/text_pieces.h"
 #include "platform/files/read_file.h"
 #include "platform/files/save_file.h"
 
@@ -33,11 +34,11 @@ class FileSink : public TextSink {
   FileSave& save_;
 };
 
-Outcome writeFile(const Node& root, const std::string& path) {
+Outcome writeFile(const KvsFile& file, const std::string& path) {
   Result<FileSave> save = FileSave::begin(path);
   if (!save) return Failure{save.error()};
   FileSink sink(*save);
-  if (Outcome written = writeKdl(root, sink); !written) return written;
+  if (Outcome written = file.writeTo(sink); !written) return written;
   return save->commit();
 }
 
@@ -82,56 +83,63 @@ void getText(KvsSection section, std::string_view keyword, ValueKind kind, std::
 
 }  // namespace
 
-KvsFile::KvsFile(std::unique_ptr<ParameterTree> tree) : tree_(std::move(tree)) {
-  open_.push_back({&tree_->root(), nullptr});
-}
+struct KvsFile::Writing {
+  TextPieces pieces;
+  KdlWriter writer{pieces};
+};
 
-void KvsFile::append(Node& node) {
-  ParameterTree::append(*open_.back().section, open_.back().last, node);
-  open_.back().last = &node;
-}
+KvsFile::KvsFile() : KvsFile(std::make_unique<ParameterTree>()) {}
 
-// The items of a list have the same keywords again and again; each is kept once, if none of the same look has
-// come between.
-std::string_view KvsFile::keepName(std::string_view name) {
-  if (name.empty()) return {};
-  std::string_view& recent =
-      recentNames_[(name.size() + static_cast<unsigned char>(name.front())) % recentNames_.size()];
-  if (recent != name) recent = tree_->keep(name);
-  return recent;
-}
+KvsFile::KvsFile(std::unique_ptr<ParameterTree> tree) : tree_(std::move(tree)) {}
 
-void KvsFile::put(std::string_view name, ValueKind kind, std::string_view text) {
-  settle();
-  append(*tree_->makeKeyword(keepName(name), tree_->makeValue(kind, tree_->keep(text))));
-}
+KvsFile::~KvsFile() = default;
 
-void KvsFile::settle() {
-  if (!inKeyword_) return;
-  inKeyword_ = false;
-  append(*tree_->makeKeyword(keyword_, values_));
+KdlWriter& KvsFile::writer() {
+  if (writing_ == nullptr) {
+    writing_ = std::make_unique<Writing>();
+    writeKdl(tree_->root(), writing_->writer);
+  }
+  tree_.reset();
+  return writing_->writer;
 }
 
 void KvsFile::open(std::string_view name) {
-  settle();
-  Node* section = tree_->makeSection(tree_->keep(name));
-  append(*section);
-  open_.push_back({section, nullptr});
+  writer().open(name);
 }
-
 void KvsFile::close() {
-  settle();
-  if (open_.size() > 1) open_.pop_back();
+  writer().close();
 }
-
 void KvsFile::startKeyword(std::string_view name) {
-  settle();
-  keyword_ = keepName(name);
-  inKeyword_ = true;
+  writer().startKeyword(name);
+}
+void KvsFile::add(ValueKind kind, std::string_view text) {
+  writer().add(kind, text);
+}
+void KvsFile::put(std::string_view name, ValueKind kind, std::string_view text) {
+  writer().put(name, kind, text);
 }
 
-void KvsFile::add(ValueKind kind, std::string_view text) {
-  values_.push(tree_->makeValue(kind, tree_->keep(text)));
+Outcome KvsFile::writeTo(TextSink& sink) const {
+  if (writing_ == nullptr) return writeKdl(tree_->root(), sink);
+  if (Outcome written = writing_->writer.flush(); !written) return written;
+  if (Outcome written = writing_->pieces.copyTo(sink); !written) return written;
+  const std::string closing = writing_->writer.closing();
+  return closing.empty() ? Outcome() : sink.write(closing);
+}
+
+Result<std::string> KvsFile::text() const {
+  StringSink sink;
+  if (Outcome written = writeTo(sink); !written) return Failure{written.error()};
+  return sink.take();
+}
+
+const ParameterTree& KvsFile::tree() const {
+  if (tree_ == nullptr) {
+    const Result<std::string> whole = text();
+    if (whole) tree_ = readKdl(FileText(*whole)).tree;
+    if (tree_ == nullptr) tree_ = std::make_unique<ParameterTree>();
+  }
+  return *tree_;
 }
 
 KvsHandle kvsCreate() {
@@ -155,8 +163,7 @@ KvsHandle kvsLoadFile(const std::string& path, int) {
 }
 
 bool kvsWrite(KvsFile& file, const std::string& path) {
-  file.settle();
-  if (const Outcome written = writeFile(file.tree().root(), path); !written) {
+  if (const Outcome written = writeFile(file, path); !written) {
     pendingError() = {kKvsCannotWrite, 0, 0, written.error()};
     return false;
   }

@@ -1,13 +1,13 @@
 #pragma once
 
-#include <array>
 #include <cstdint>
 #include <memory>
 #include <string>
 #include <string_view>
-#include <vector>
 
+#include "core/kdl_writer.h"
 #include "core/parameter_tree.h"
+#include "platform/result.h"
 
 // The parameter file as its users see it: a tree of targets, sections, keywords and parameters. Writing goes
 // through one cursor, reading through explicit handles. A null handle means that the thing isn't there. Names
@@ -15,36 +15,36 @@
 
 namespace gridbay {
 
+// A file that was read, or one in writing. What is written is kept as the text that it will be on file, and
+// becomes a tree when that is asked for; the handles into a tree hold until the next write.
 class KvsFile {
  public:
-  explicit KvsFile(std::unique_ptr<ParameterTree> tree = std::make_unique<ParameterTree>());
+  // A file with nothing in it.
+  KvsFile();
+  explicit KvsFile(std::unique_ptr<ParameterTree> tree);
+  ~KvsFile();
 
-  const ParameterTree& tree() const { return *tree_; }
+  // With all that is open closed. Empty where what was written can't be read, of which `text` or a load tell.
+  const ParameterTree& tree() const;
+  Result<std::string> text() const;
+  // Gives the sink the whole text.
+  Outcome writeTo(TextSink& sink) const;
 
-  // The cursor.
+  // The cursor. In a file that was read it starts behind all there is.
   void open(std::string_view name);
   void close();
   void startKeyword(std::string_view name);
   void add(ValueKind kind, std::string_view text);
   // A keyword with one value.
   void put(std::string_view name, ValueKind kind, std::string_view text);
-  // Ends the keyword that is being filled, so that the tree is whole.
-  void settle();
 
  private:
-  struct Open {
-    Node* section;
-    Node* last;
-  };
-  void append(Node& node);
-  std::string_view keepName(std::string_view name);
+  struct Writing;
 
-  std::unique_ptr<ParameterTree> tree_;
-  std::vector<Open> open_;
-  std::string_view keyword_;
-  bool inKeyword_ = false;
-  ValueList values_;
-  std::array<std::string_view, 16> recentNames_;
+  KdlWriter& writer();
+
+  std::unique_ptr<Writing> writing_;             // null until the first write
+  mutable std::unique_ptr<ParameterTree> tree_;  // null when there is more in `writing_`
 };
 
 using KvsHandle = std::unique_ptr<KvsFile>;

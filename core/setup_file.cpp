@@ -66,7 +66,6 @@ SetupFile SetupFile::fromTree(KvsHandle tree, const std::string& path, MessageHo
 KvsHandle SetupFile::tree(const std::string& path) {
   KvsHandle file = kvsCreate();
   model_->Save(*file, path);
-  file->settle();
   return file;
 }
 

@@ -22,8 +22,7 @@ std::string loadedAndSaved(std::string_view text, bool check) {
   }
   const KvsHandle file = kvsCreate();
   root.Save(*file, "/nowhere/setup.v27");
-  file->settle();
-  Result<std::string> saved = kdlText(file->tree().root());
+  Result<std::string> saved = file->text();
   if (!saved) std::abort();
   return *saved;
 }

@@ -12,9 +12,8 @@ constexpr std::size_t kMostBytes = std::size_t{256} << 20;
 std::string textOf(CKvsBase& part, const std::string& documentPath) {
   KvsFile file;
   part.Save(file, documentPath);
-  file.settle();
   // A text that is not UTF-8 is told of by a save; a history simply holds nothing of it.
-  const Result<std::string> text = kdlText(file.tree().root());
+  const Result<std::string> text = file.text();
   return text ? *text : std::string();
 }
 

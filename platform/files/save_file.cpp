@@ -4,6 +4,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <cstdlib>
 #include <filesystem>
@@ -16,6 +17,8 @@ namespace gridbay {
 namespace {
 
 constexpr std::size_t kBufferSize = 1 << 16;
+// A process that is told to stop does so between two writes, also on a slow disk.
+constexpr std::size_t kMostAtOnce = 1 << 18;
 
 std::string folderOf(const std::filesystem::path& path) {
   const std::string folder = path.parent_path().string();
@@ -80,21 +83,29 @@ Result<FileSave> FileSave::begin(const std::string& path) {
   return FileSave(std::move(state));
 }
 
-Outcome FileSave::flush() {
-  std::string_view rest = state_->buffer;
-  while (!rest.empty()) {
-    const ssize_t n = ::write(state_->file.get(), rest.data(), rest.size());
+Outcome FileSave::writeThrough(std::string_view text) {
+  while (!text.empty()) {
+    const ssize_t n = ::write(state_->file.get(), text.data(), std::min(text.size(), kMostAtOnce));
     if (n < 0 && errno == EINTR) continue;
     if (n < 0) return state_->failure();
-    rest.remove_prefix(static_cast<std::size_t>(n));
+    text.remove_prefix(static_cast<std::size_t>(n));
   }
+  return {};
+}
+
+Outcome FileSave::flush() {
+  if (Outcome written = writeThrough(state_->buffer); !written) return written;
   state_->buffer.clear();
   return {};
 }
 
 Outcome FileSave::write(std::string_view text) {
-  state_->buffer.append(text);
-  return state_->buffer.size() < kBufferSize ? Outcome() : flush();
+  if (state_->buffer.size() + text.size() < kBufferSize) {
+    state_->buffer.append(text);
+    return {};
+  }
+  if (Outcome flushed = flush(); !flushed) return flushed;
+  return writeThrough(text);
 }
 
 Outcome FileSave::commit() {

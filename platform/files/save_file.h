@@ -27,6 +27,7 @@ class FileSave {
   struct State;
   explicit FileSave(std::unique_ptr<State> state);
 
+  Outcome writeThrough(std::string_view text);
   Outcome flush();
 
   std::unique_ptr<State> state_;

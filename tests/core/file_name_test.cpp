@@ -11,7 +11,6 @@ namespace {
 UFileName loaded(const std::string& name, const std::string& documentPath) {
   KvsHandle file = kvsCreate();
   kvsPutParamFilename(*file, "FILE_NAME", name);
-  file->settle();
   UFileName fileName;
   fileName.Load(&file->tree().root(), documentPath);
   return fileName;
@@ -20,8 +19,7 @@ UFileName loaded(const std::string& name, const std::string& documentPath) {
 std::string saved(const UFileName& name, const std::string& documentPath) {
   KvsHandle file = kvsCreate();
   name.Save(*file, documentPath);
-  file->settle();
-  return *kdlText(file->tree().root());
+  return *file->text();
 }
 
 TEST(FileName, IsShownAsGivenAndOpenedFromTheSetupsFolder) {
@@ -61,8 +59,7 @@ TEST(FileName, ResultFilesAreAKindOfTheirOwn) {
   UResultFileName name;
   name = "out.tsb0";
   name.Save(*file, "setup.v27", "File_Name");
-  file->settle();
-  EXPECT_EQ(*kdlText(file->tree().root()), "File_Name (result)\"out.tsb0\"\n");
+  EXPECT_EQ(*file->text(), "File_Name (result)\"out.tsb0\"\n");
   UFileName input;
   input.Load(&file->tree().root(), "setup.v27", "File_Name");
   EXPECT_TRUE(input.empty());
@@ -78,8 +75,7 @@ TEST(Selection, KeepsTheFileAndItsItems) {
   selection.fileName = "/d/series.tsb0";
   KvsHandle file = kvsCreate();
   selection.Save(*file, "/d/setup.v27");
-  file->settle();
-  EXPECT_EQ(*kdlText(file->tree().root()), "File_Name (file)\"series.tsb0\"\nItem_Numbers 4 7\n");
+  EXPECT_EQ(*file->text(), "File_Name (file)\"series.tsb0\"\nItem_Numbers 4 7\n");
   UTsbSelection back(1);
   back.Load(&file->tree().root(), "/d/setup.v27", 2);
   EXPECT_EQ(back.items, selection.items);

@@ -45,12 +45,11 @@ KvsHandle sample() {
   kvsEndSection(*file);
   kvsPutParam(*file, "After", 2);
   kvsEndSection(*file);
-  file->settle();
   return file;
 }
 
 TEST(Kvs, WritesTheWholeTreeAsText) {
-  EXPECT_EQ(*kdlText(sample()->tree().root()),
+  EXPECT_EQ(*sample()->text(),
             "TARGET {\n"
             "    Integer -7\n"
             "    Float 0.02\n"
@@ -212,6 +211,75 @@ TEST(Kvs, LookupsAmongManySiblings) {
   }
   EXPECT_EQ(kvsSectionByNameNum(target, "Point_3001", 1), nullptr);
   EXPECT_EQ(kvsKeywordByNameNum(target, "Same", kMany + 1), nullptr);
+}
+
+TEST(Kvs, AFileInWritingCanBeReadAtAnyMoment) {
+  KvsHandle file = kvsCreate();
+  EXPECT_EQ(*file->text(), "");
+  kvsAddTarget(*file, "T");
+  EXPECT_EQ(*file->text(), "T {}\n");
+  EXPECT_NE(kvsTargetByNameNum(*file, "T", 1), nullptr);
+  kvsAddSection(*file, "S");
+  EXPECT_EQ(*file->text(), "T {\n    S {}\n}\n");
+  kvsAddKeyword(*file, "K");
+  EXPECT_EQ(*file->text(), "T {\n    S {\n        K\n    }\n}\n");
+  kvsAddInt(*file, 1);
+  const KvsSection section = kvsSectionByNameNum(kvsTargetByNameNum(*file, "T", 1), "S", 1);
+  ASSERT_NE(section, nullptr);
+  EXPECT_EQ(kvsGetNoParams(kvsKeywordByNameNum(section, "K", 1)), 1);
+  kvsAddInt(*file, 2);
+  kvsEndSection(*file);
+  EXPECT_EQ(*file->text(), "T {\n    S {\n        K 1 2\n    }\n}\n");
+  kvsPutParam(*file, "Last", 3);
+  kvsEndSection(*file);
+  kvsEndSection(*file);  // one too many
+  EXPECT_EQ(*file->text(), "T {\n    S {\n        K 1 2\n    }\n    Last 3\n}\n");
+}
+
+TEST(Kvs, WhatIsWrittenToAFileThatWasReadGoesBehindAllThereIs) {
+  const TemporaryFolder folder;
+  KvsHandle file = kvsLoadFile(folder.write("f", "T { A 1 }"), 0);
+  kvsAddTarget(*file, "U");
+  kvsPutParam(*file, "B", 2);
+  kvsEndSection(*file);
+  EXPECT_EQ(*file->text(), "T {\n    A 1\n}\nU {\n    B 2\n}\n");
+  ASSERT_TRUE(kvsWrite(*file, folder.file("g")));
+  EXPECT_EQ(textOf(folder.file("g")), *file->text());
+}
+
+TEST(Kvs, AValueWithNoKeywordIsNotWritten) {
+  KvsFile file;
+  kvsAddInt(file, 1);
+  kvsPutParam(file, "A", 2);
+  kvsAddInt(file, 3);
+  kvsAddSection(file, "S");
+  kvsAddInt(file, 4);
+  EXPECT_EQ(*file.text(), "A 2\nS {}\n");
+}
+
+TEST(Kvs, ATextThatIsNotUtf8IsToldWithItsKeyword) {
+  KvsFile file;
+  kvsPutParam(file, "Good", "x");
+  kvsAddKeyword(file, "Bad");
+  kvsAddString(file, "\xFF");
+  ASSERT_FALSE(file.text());
+  EXPECT_EQ(file.text().error(), "a name or text of \"Bad\" is not UTF-8");
+  EXPECT_EQ(file.tree().root().first(), nullptr);
+}
+
+TEST(Kvs, ATextOfManyPiecesIsWrittenWhole) {
+  const TemporaryFolder folder;
+  KvsFile file;
+  std::string expected;
+  const std::string longText(100'000, 'x');
+  for (int i = 0; i < 150; ++i) {
+    const std::string name = "Name_" + std::to_string(i);
+    kvsPutParam(file, name, i % 3 == 0 ? std::string_view(longText) : std::string_view("short"));
+    expected += name + " \"" + (i % 3 == 0 ? longText : "short") + "\"\n";
+  }
+  EXPECT_TRUE(*file.text() == expected);
+  ASSERT_TRUE(kvsWrite(file, folder.file("f")));
+  EXPECT_TRUE(textOf(folder.file("f")) == expected);
 }
 
 TEST(Kvs, ASyntaxErrorIsPendingWithItsText) {

@@ -104,13 +104,11 @@ TEST(SectionIndex, GrowsWithAFileInWriting) {
   kvsAddTarget(file, "T");
   for (int i = 1; i <= 300; ++i) {
     kvsPutParam(file, "N" + std::to_string(i), i);
-    file.settle();
     const Node& target = *file.tree().root().first();
     ASSERT_NE(target.keyword("n" + std::to_string(i)), nullptr) << i;
     ASSERT_EQ(target.keyword("N" + std::to_string(i + 1)), nullptr) << i;
   }
   kvsPutParam(file, "N5", 0);
-  file.settle();
   const Node& target = *file.tree().root().first();
   ASSERT_NE(target.keyword("N5", 2), nullptr);
   EXPECT_EQ(kvsGetInt(&target.keyword("N5", 2)->values().front()), 0);

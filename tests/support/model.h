@@ -16,8 +16,7 @@ namespace gridbay::test {
 inline std::string savedText(CKvsBase& object, const std::string& documentPath = "/case/setup.v27") {
   const KvsHandle file = kvsCreate();
   object.Save(*file, documentPath);
-  file->settle();
-  return *kdlText(file->tree().root());
+  return *file->text();
 }
 
 // A text as the file that holds it.
