@@ -1,0 +1,63 @@
+#include "platform/apart.h"
+
+#include <gtest/gtest.h>
+#include <unistd.h>
+
+#include <atomic>
+#include <csignal>
+#include <cstdio>
+#include <cstdlib>
+#include <new>
+#include <stdexcept>
+
+#include "platform/large_memory.h"
+
+namespace gridbay {
+namespace {
+
+TEST(Apart, TellsWhetherTheCheckHolds) {
+  EXPECT_TRUE(holdsApart([] { return true; }, 10));
+  EXPECT_FALSE(holdsApart([] { return false; }, 10));
+}
+
+TEST(Apart, WhateverEndsTheCopyTheCheckDoesNotHold) {
+  EXPECT_FALSE(holdsApart([]() -> bool { throw std::runtime_error("x"); }, 10));
+  EXPECT_FALSE(holdsApart([] { return std::raise(SIGSEGV) == 0; }, 10));
+  EXPECT_FALSE(holdsApart([]() -> bool { std::abort(); }, 10));
+  EXPECT_FALSE(holdsApart([]() -> bool { ::_exit(3); }, 10));
+}
+
+TEST(Apart, ACheckThatGoesOnForEverIsEnded) {
+  EXPECT_FALSE(holdsApart(
+      [] {
+        std::atomic<int> rounds = 0;
+        while (rounds >= 0) rounds = 1 - rounds;
+        return true;
+      },
+      1));
+}
+
+TEST(Apart, MemoryIsBounded) {
+  EXPECT_FALSE(holdsApart([] { return allocateBytes(std::size_t{64} << 30) != nullptr; }, 10));
+  EXPECT_TRUE(holdsApart([] { return allocateBytes(std::size_t{64} << 20) != nullptr; }, 10));
+}
+
+TEST(Apart, NothingThatTheCheckChangesOrSaysIsLeft) {
+  int number = 1;
+  ::testing::internal::CaptureStderr();
+  ::testing::internal::CaptureStdout();
+  EXPECT_TRUE(holdsApart(
+      [&number] {
+        number = 2;
+        std::fputs("text\n", stderr);
+        std::puts("text");
+        return std::fflush(nullptr) == 0;
+      },
+      10));
+  EXPECT_EQ(::testing::internal::GetCapturedStdout(), "");
+  EXPECT_EQ(::testing::internal::GetCapturedStderr(), "");
+  EXPECT_EQ(number, 1);
+}
+
+}  // namespace
+}  // namespace gridbay
