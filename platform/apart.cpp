@@ -6,9 +6,12 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <array>
 #include <cerrno>
 #include <csignal>
 #include <fstream>
+
+#include "platform/files/file_descriptor.h"
 
 namespace gridbay {
 namespace {
@@ -38,28 +41,44 @@ void expectTheWorst(unsigned seconds) {
   }
 }
 
-[[noreturn]] void makeCheck(const std::function<bool()>& check, unsigned seconds) {
-  bool holds = false;
+constexpr char kHolds = 'y';
+
+[[noreturn]] void makeCheck(const std::function<bool()>& check, unsigned seconds,
+                            const FileDescriptor& answer) {
   expectTheWorst(seconds);
   try {
-    holds = check();
+    if (check()) static_cast<void>(::write(answer.get(), &kHolds, 1) == 1);
   } catch (...) {
   }
-  ::_exit(holds ? 0 : 1);
+  ::_exit(0);
+}
+
+// An answer, or the end of the copy that gives none.
+bool isAnswered(const FileDescriptor& answer) {
+  char got = 0;
+  while (true) {
+    const ssize_t size = ::read(answer.get(), &got, 1);
+    if (size >= 0 || errno != EINTR) return size == 1 && got == kHolds;
+  }
 }
 
 }  // namespace
 
 bool holdsApart(const std::function<bool()>& check, unsigned seconds) {
+  std::array<int, 2> ends{};
+  if (::pipe2(ends.data(), O_CLOEXEC) != 0) return check();
+  FileDescriptor answer(ends[0]);
+  FileDescriptor question(ends[1]);
   const pid_t copy = ::fork();
-  if (copy == 0) makeCheck(check, seconds);
+  if (copy == 0) makeCheck(check, seconds, question);
   // A machine that is out of processes still has its data files read.
   if (copy < 0) return check();
-  int status = 0;
-  while (::waitpid(copy, &status, 0) < 0) {
-    if (errno != EINTR) return false;
+  ::close(question.release());
+  const bool holds = isAnswered(answer);
+  // Its status says nothing more, and where the host ignores its children there is none.
+  while (::waitpid(copy, nullptr, 0) < 0 && errno == EINTR) {
   }
-  return WIFEXITED(status) && WEXITSTATUS(status) == 0;
+  return holds;
 }
 
 }  // namespace gridbay

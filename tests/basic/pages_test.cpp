@@ -258,6 +258,21 @@ TEST_F(BathymetryPage, TheRowsOfTheGrid) {
   EXPECT_EQ(store(2, 3, "1,1"), 0);
 }
 
+TEST_F(BathymetryPage, ACellOfAnAreaThatIsGoneShowsAndTakesNothing) {
+  areas().SetNoAreas(2);
+  EXPECT_EQ(store(2, 3, "4,5"), 1);
+  areas().SetNoAreas(1);
+  CellStyle shown;
+  for (int col = 1; col <= grid().GetColCount(); ++col) {
+    EXPECT_EQ(grid().GetStyleRowCol(2, col, shown), 0) << col;
+    EXPECT_EQ(shown.value, "") << col;
+    EXPECT_EQ(store(2, col, "1,1"), 0) << col;
+    grid().OnClickedButtonRowCol(2, col);
+  }
+  EXPECT_TRUE(host.filters.empty());
+  EXPECT_EQ(areas().GetCount(), 1);
+}
+
 TEST_F(BathymetryPage, AFileForArea1DetectsBoundaries) {
   EXPECT_EQ(store(1, 1, path), 1);
   EXPECT_EQ(root().boundary->GetCount(), 3);

@@ -7,6 +7,7 @@
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
+#include <filesystem>
 #include <new>
 #include <stdexcept>
 
@@ -25,6 +26,22 @@ TEST(Apart, WhateverEndsTheCopyTheCheckDoesNotHold) {
   EXPECT_FALSE(holdsApart([] { return std::raise(SIGSEGV) == 0; }, 10));
   EXPECT_FALSE(holdsApart([]() -> bool { std::abort(); }, 10));
   EXPECT_FALSE(holdsApart([]() -> bool { ::_exit(3); }, 10));
+}
+
+TEST(Apart, AlsoWhereChildrenAreIgnored) {
+  const auto before = std::signal(SIGCHLD, SIG_IGN);
+  EXPECT_TRUE(holdsApart([] { return true; }, 10));
+  EXPECT_FALSE(holdsApart([]() -> bool { std::abort(); }, 10));
+  std::signal(SIGCHLD, before);
+}
+
+TEST(Apart, NoFileIsLeftOpen) {
+  const auto openFiles = [] {
+    return std::distance(std::filesystem::directory_iterator("/proc/self/fd"), {});
+  };
+  const auto before = openFiles();
+  for (int i = 0; i < 10; ++i) holdsApart([i] { return i % 2 == 0; }, 10);
+  EXPECT_EQ(openFiles(), before);
 }
 
 TEST(Apart, ACheckThatGoesOnForEverIsEnded) {
