@@ -16,7 +16,8 @@
 namespace gridbay {
 namespace {
 
-constexpr unsigned kWaiting = 20;
+constexpr char kHolds = 'y';
+constexpr unsigned kWaiting = 20;                // times as long as computing
 constexpr rlim_t kMostMemory = rlim_t{2} << 30;  // beyond what the process has
 
 // So that whatever happens to the copy ends it at once, and leaves neither a word nor a file.
@@ -40,8 +41,6 @@ void expectTheWorst(unsigned seconds) {
     ::setrlimit(RLIMIT_AS, &limit);
   }
 }
-
-constexpr char kHolds = 'y';
 
 [[noreturn]] void makeCheck(const std::function<bool()>& check, unsigned seconds,
                             const FileDescriptor& answer) {

@@ -29,7 +29,13 @@ constexpr double kGreatestRatio = 1100;
 constexpr std::size_t kMostItems = 10000;
 constexpr std::size_t kLongestText = 1 << 20;
 constexpr std::size_t kLongestBlock = 1 << 20;
-constexpr unsigned kMostSeconds = 2;  // of computing, for a look at a file before it is opened
+
+// Seconds of computing for a look at a file before it is opened: more where there may be much to unpack.
+unsigned secondsFor(std::uintmax_t size) {
+  constexpr std::uintmax_t kLeast = 2;
+  constexpr std::uintmax_t kMost = 60;
+  return static_cast<unsigned>(std::min(kLeast + (size >> 24U), kMost));
+}
 
 std::optional<std::string> textAttribute(int file, int variable, const char* name) {
   nc_type type = NC_NAT;
@@ -336,7 +342,7 @@ Result<TsbFile> TsbFile::open(const std::string& path) {
   static KnownFiles knownFiles;
   const bool known = knownFiles.holds(path, [&] {
     prepareHdf5();
-    return holdsApart([&] { return State::canBeRead(path, static_cast<double>(size)); }, kMostSeconds);
+    return holdsApart([&] { return State::canBeRead(path, static_cast<double>(size)); }, secondsFor(size));
   });
   if (!known) return fail("it is no data file, or it is damaged");
   std::optional<NetcdfFile> file = NetcdfFile::open(path);
