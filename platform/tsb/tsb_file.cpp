@@ -86,9 +86,17 @@ std::optional<std::vector<std::size_t>> shapeOf(int file, int variable) {
   return shape;
 }
 
+// The library reads texts where it is asked for numbers, and forgets them.
+bool holdsNumbers(int file, int variable) {
+  nc_type type = NC_NAT;
+  return nc_inq_vartype(file, variable, &type) == NC_NOERR && type != NC_CHAR && type <= NC_MAX_ATOMIC_TYPE &&
+         type != NC_STRING;
+}
+
 std::optional<std::vector<double>> numbersOf(int file, int variable, std::size_t count) {
   std::vector<double> numbers(count);
-  if (nc_get_var_double(file, variable, numbers.data()) != NC_NOERR) return std::nullopt;
+  if (!holdsNumbers(file, variable) || nc_get_var_double(file, variable, numbers.data()) != NC_NOERR)
+    return std::nullopt;
   return numbers;
 }
 
@@ -232,7 +240,8 @@ class DefinitionReader {
       const auto shape = shapeOf(group, variable);
       if (shape && shape->size() == 1 && shape->front() <= kLongestBlock) {
         block.values.resize(shape->front());
-        block.readable = nc_get_var_float(group, variable, block.values.data()) == NC_NOERR;
+        block.readable = holdsNumbers(group, variable) &&
+                         nc_get_var_float(group, variable, block.values.data()) == NC_NOERR;
       }
       definition_.customBlocks.push_back(std::move(block));
     }

@@ -282,6 +282,27 @@ TEST_F(Tsb, FilesOfStrangers) {
   EXPECT_THAT(openError(), HasSubstr("does not have the shape of its axes"));
 }
 
+TEST_F(Tsb, TextsWhereNumbersShouldBe) {
+  test::writeGrid(path, {.noJ = 4, .noK = 4});
+  int file = 0;
+  int group = 0;
+  int dimension = 0;
+  int variable = 0;
+  ASSERT_EQ(nc_open(path.c_str(), NC_WRITE, &file), NC_NOERR);
+  ASSERT_EQ(nc_inq_ncid(file, "custom_blocks", &group), NC_NOERR);
+  ASSERT_EQ(nc_def_dim(group, "texts", 1000, &dimension), NC_NOERR);
+  ASSERT_EQ(nc_def_var(group, "of_text", NC_STRING, 1, &dimension, &variable), NC_NOERR);
+  ASSERT_EQ(nc_def_var(group, "of_letters", NC_CHAR, 1, &dimension, &variable), NC_NOERR);
+  ASSERT_EQ(nc_close(file), NC_NOERR);
+  const Result<TsbFile> opened = TsbFile::open(path);
+  ASSERT_TRUE(opened) << opened.error();
+  const std::vector<TsbCustomBlock>& blocks = opened->definition().customBlocks;
+  ASSERT_EQ(blocks.size(), 3U);
+  EXPECT_TRUE(blocks[0].readable);
+  EXPECT_FALSE(blocks[1].readable);
+  EXPECT_FALSE(blocks[2].readable);
+}
+
 TEST_F(Tsb, AxesThatClaimMoreThanTheFileCanHold) {
   foreign(path, [](int file) {
     timeAxis(file, 1, 1);
