@@ -86,8 +86,8 @@ unsigned CBathymetryObjectKvs::ReadGrid(ValidationList& messages, int areaNumber
   RequestBathymetry(selector, hotStart);
   std::string errorText;
   TsbHeader header;
-  if (!selector.IsTsbFileValid(fileName.absolute(), &errorText) ||
-      tsbFileRead(fileName.absolute(), &header) != 0) {
+  if (tsbFileRead(fileName.absolute(), &header, &errorText) != 0 ||
+      !selector.IsTsbFileValid(header, &errorText)) {
     grid = {};
     noJ = noK = 0;
     dx = dy = 0;

@@ -68,7 +68,7 @@ void readByLibrary(benchmark::State& state) {
   }
   setBytes(state);
 }
-BENCHMARK(readByLibrary)->Unit(benchmark::kMillisecond);
+BENCHMARK(readByLibrary)->Unit(benchmark::kMillisecond)->MinWarmUpTime(1)->MinTime(2);
 
 void readGrid(benchmark::State& state) {
   const std::string path = largeGrid().path;
@@ -81,7 +81,7 @@ void readGrid(benchmark::State& state) {
   }
   setBytes(state);
 }
-BENCHMARK(readGrid)->Unit(benchmark::kMillisecond);
+BENCHMARK(readGrid)->Unit(benchmark::kMillisecond)->MinWarmUpTime(1)->MinTime(2);
 
 void writeByLibrary(benchmark::State& state) {
   const std::string path = largeGrid().path + ".peer";

@@ -139,8 +139,10 @@ std::string CVdFileSelectorDlg::GetNameOfItem(int n) const {
 
 bool CVdFileSelectorDlg::IsTsbFileValid(const std::string& file, std::string* errorText) const {
   TsbHeader header;
-  errorText->clear();
-  if (tsbFileRead(file, &header, errorText) != 0) return false;
+  return tsbFileRead(file, &header, errorText) == 0 && IsTsbFileValid(header, errorText);
+}
+
+bool CVdFileSelectorDlg::IsTsbFileValid(const TsbHeader& header, std::string* errorText) const {
   std::vector<std::uint32_t> all(static_cast<std::size_t>(tsbGetNoOfItems(header)));
   std::iota(all.begin(), all.end(), 1U);
   *errorText = faultOf(header, all, false);
@@ -150,7 +152,6 @@ bool CVdFileSelectorDlg::IsTsbFileValid(const std::string& file, std::string* er
 bool CVdFileSelectorDlg::IsTsbFileValid(const std::string& file, std::span<const std::uint32_t> items,
                                         std::string* errorText) const {
   TsbHeader header;
-  errorText->clear();
   if (tsbFileRead(file, &header, errorText) != 0) return false;
   *errorText = faultOf(header, items, true);
   return errorText->empty();

@@ -122,6 +122,8 @@ class CVdFileSelectorDlg {
   virtual bool IsTsbFileValid(const std::string& file, std::string* errorText) const;
   virtual bool IsTsbFileValid(const std::string& file, std::span<const std::uint32_t> items,
                               std::string* errorText) const;
+  // The same for a file that is open, with all of its items.
+  bool IsTsbFileValid(const TsbHeader& header, std::string* errorText) const;
 
  private:
   std::string faultOf(const TsbHeader& header, std::span<const std::uint32_t> items, bool chosen) const;

@@ -29,6 +29,17 @@ QString toolkitFilter(std::string_view filter) {
   return filters.join(";;");
 }
 
+// The items of a data file, numbered; none when it cannot be opened.
+QStringList itemNames(const std::string& file) {
+  TsbHeader header;
+  if (tsbFileRead(file, &header) != 0) return {};
+  QStringList names;
+  for (const TsbItem& item : header.file->definition().items) {
+    names << QString("%1 %2").arg(names.size() + 1).arg(QString::fromStdString(item.name));
+  }
+  return names;
+}
+
 }  // namespace
 
 DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)> make,
@@ -318,10 +329,7 @@ bool DocumentTab::choose(CVdFileSelectorDlg& selector) {
   if (!chooseFile(selector.filter(), selector.kind(), &name)) return false;
   selector.SetFileName(name);
   std::vector<std::uint32_t> items;
-  QStringList names;
-  for (int n = 1; !selector.GetNameOfItem(n).empty(); ++n) {
-    names << QString("%1 %2").arg(n).arg(QString::fromStdString(selector.GetNameOfItem(n)));
-  }
+  const QStringList names = selector.GetSelectedItems().empty() ? QStringList() : itemNames(name);
   for (std::size_t i = 0; i < selector.GetSelectedItems().size(); ++i) {
     bool chosen = names.size() <= 1;
     const QString item =

@@ -350,7 +350,9 @@ Result<TsbFile> TsbFile::open(const std::string& path) {
 
   static KnownFiles knownFiles;
   const bool known = knownFiles.holds(path, [&] {
+    // Set up here, once, and not in each copy.
     prepareHdf5();
+    nc_initialize();
     return holdsApart([&] { return State::canBeRead(path, static_cast<double>(size)); }, secondsFor(size));
   });
   if (!known) return fail("it is no data file, or it is damaged");
