@@ -5,10 +5,13 @@
 #include <array>
 #include <cmath>
 #include <optional>
+#include <string>
+#include <vector>
 
 #include "basic/nesting.h"
 #include "core/global_kvs.h"
 #include "platform/cartography/cartography.h"
+#include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_operations.h"
 
 namespace gridbay {
@@ -55,6 +58,12 @@ std::span<const Follower> CBathymetryKvs::followers() {
 
 unsigned CBathymetryKvs::Validate(ValidationList& messages, int deep) {
   unsigned faults = 0;
+  if (deep != 0) {
+    std::vector<std::string> files;
+    for (int number = 1; number <= GetCount(); ++number)
+      files.push_back(GetArea(number)->fileName.absolute());
+    TsbFile::lookAhead(files);
+  }
   for (int number = 1; deep != 0 && number <= GetCount(); ++number) {
     faults += GetArea(number)->ReadGrid(messages, number);
   }

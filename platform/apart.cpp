@@ -6,10 +6,13 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <csignal>
+#include <ctime>
 #include <fstream>
+#include <optional>
 
 #include "platform/files/file_descriptor.h"
 
@@ -17,20 +20,18 @@ namespace gridbay {
 namespace {
 
 constexpr char kHolds = 'y';
+constexpr char kDoesNotHold = 'n';
 constexpr unsigned kWaiting = 20;                // times as long as computing
 constexpr rlim_t kMostMemory = rlim_t{2} << 30;  // beyond what the process has
 
 // So that whatever happens to the copy ends it at once, and leaves neither a word nor a file.
-void expectTheWorst(unsigned seconds) {
-  for (const int signal : {SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGABRT, SIGALRM, SIGTERM, SIGINT})
+void expectTheWorst() {
+  for (const int signal : {SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGABRT, SIGALRM, SIGXCPU, SIGTERM, SIGINT})
     ::signal(signal, SIG_DFL);
   sigset_t none;
   sigemptyset(&none);
   ::sigprocmask(SIG_SETMASK, &none, nullptr);
   ::prctl(PR_SET_DUMPABLE, 0);
-  ::alarm(kWaiting * seconds);
-  const rlimit computing{seconds, seconds};
-  ::setrlimit(RLIMIT_CPU, &computing);
   const int nowhere = ::open("/dev/null", O_WRONLY | O_CLOEXEC);
   ::dup2(nowhere, STDOUT_FILENO);
   ::dup2(nowhere, STDERR_FILENO);
@@ -42,42 +43,76 @@ void expectTheWorst(unsigned seconds) {
   }
 }
 
-[[noreturn]] void makeCheck(const std::function<bool()>& check, unsigned seconds,
-                            const FileDescriptor& answer) {
-  expectTheWorst(seconds);
+// From now on; the limit is in whole seconds.
+void allowSeconds(unsigned seconds) {
+  ::alarm(kWaiting * seconds);
+  timespec used{};
+  ::clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &used);
+  rlimit computing{};
+  ::getrlimit(RLIMIT_CPU, &computing);
+  computing.rlim_cur = std::min(computing.rlim_max, static_cast<rlim_t>(used.tv_sec) + 1 + seconds);
+  ::setrlimit(RLIMIT_CPU, &computing);
+}
+
+[[noreturn]] void makeChecks(std::size_t count, const std::function<bool(std::size_t)>& check,
+                             unsigned seconds, const FileDescriptor& answers) {
+  expectTheWorst();
   try {
-    if (check()) static_cast<void>(::write(answer.get(), &kHolds, 1) == 1);
+    for (std::size_t i = 0; i < count; ++i) {
+      allowSeconds(seconds);
+      const char answer = check(i) ? kHolds : kDoesNotHold;
+      if (::write(answers.get(), &answer, 1) != 1) break;
+    }
   } catch (...) {
   }
   ::_exit(0);
 }
 
-// An answer, or the end of the copy that gives none.
-bool isAnswered(const FileDescriptor& answer) {
+// The next answer, or the end of the copy that gives none.
+std::optional<bool> nextOf(const FileDescriptor& answers) {
   char got = 0;
   while (true) {
-    const ssize_t size = ::read(answer.get(), &got, 1);
-    if (size >= 0 || errno != EINTR) return size == 1 && got == kHolds;
+    const ssize_t size = ::read(answers.get(), &got, 1);
+    if (size == 1) return got == kHolds;
+    if (size == 0 || errno != EINTR) return std::nullopt;
   }
+}
+
+std::vector<bool> makeHere(std::size_t count, const std::function<bool(std::size_t)>& check) {
+  std::vector<bool> holds(count);
+  for (std::size_t i = 0; i < count; ++i) holds[i] = check(i);
+  return holds;
 }
 
 }  // namespace
 
-bool holdsApart(const std::function<bool()>& check, unsigned seconds) {
+std::vector<bool> holdApart(std::size_t count, const std::function<bool(std::size_t)>& check,
+                            unsigned seconds) {
+  if (count == 0) return {};
   std::array<int, 2> ends{};
-  if (::pipe2(ends.data(), O_CLOEXEC) != 0) return check();
-  FileDescriptor answer(ends[0]);
+  if (::pipe2(ends.data(), O_CLOEXEC) != 0) return makeHere(count, check);
+  FileDescriptor answers(ends[0]);
   FileDescriptor question(ends[1]);
   const pid_t copy = ::fork();
-  if (copy == 0) makeCheck(check, seconds, question);
+  if (copy == 0) makeChecks(count, check, seconds, question);
   // A machine that is out of processes still has its data files read.
-  if (copy < 0) return check();
+  if (copy < 0) return makeHere(count, check);
   ::close(question.release());
-  const bool holds = isAnswered(answer);
+  std::vector<bool> holds(count);
+  for (std::size_t i = 0; i < count; ++i) {
+    const std::optional<bool> answer = nextOf(answers);
+    if (!answer) break;
+    holds[i] = *answer;
+  }
   // Its status says nothing more, and where the host ignores its children there is none.
   while (::waitpid(copy, nullptr, 0) < 0 && errno == EINTR) {
   }
   return holds;
+}
+
+bool holdsApart(const std::function<bool()>& check, unsigned seconds) {
+  return holdApart(
+      1, [&check](std::size_t) { return check(); }, seconds)[0];
 }
 
 }  // namespace gridbay

@@ -4,7 +4,6 @@
 
 #include <algorithm>
 #include <ctime>
-#include <optional>
 
 namespace gridbay {
 namespace {
@@ -13,21 +12,39 @@ constexpr std::size_t kMostFiles = 64;
 
 }  // namespace
 
-bool KnownFiles::holds(const std::string& path, const std::function<bool()>& check) {
-  const auto stateOf = [&path]() -> std::optional<State> {
-    struct stat file {};
-    if (::stat(path.c_str(), &file) != 0) return std::nullopt;
-    return State{static_cast<std::int64_t>(file.st_dev), static_cast<std::int64_t>(file.st_ino), file.st_size,
-                 file.st_ctim.tv_sec, file.st_ctim.tv_nsec};
-  };
-  const std::optional<State> before = stateOf();
-  if (before && std::ranges::find(known_, *before) != known_.end()) return true;
-  if (!check()) return false;
+std::optional<KnownFiles::State> KnownFiles::stateOf(const std::string& path) {
+  struct stat file {};
+  if (::stat(path.c_str(), &file) != 0) return std::nullopt;
+  return State{static_cast<std::int64_t>(file.st_dev), static_cast<std::int64_t>(file.st_ino), file.st_size,
+               file.st_ctim.tv_sec, file.st_ctim.tv_nsec};
+}
+
+void KnownFiles::keep(const State& state) {
   constexpr std::time_t kMoment = 2;
-  if (!before || stateOf() != before || std::time(nullptr) - (*before)[3] < kMoment) return true;
-  known_.insert(known_.begin(), *before);
+  if (std::time(nullptr) - state[3] < kMoment) return;
+  known_.insert(known_.begin(), state);
   known_.resize(std::min(known_.size(), kMostFiles));
-  return true;
+}
+
+std::vector<bool> KnownFiles::hold(std::span<const std::string> paths, const Check& check) {
+  std::vector<bool> holds(paths.size(), true);
+  std::vector<std::string> unknown;
+  std::vector<std::size_t> places;
+  std::vector<std::optional<State>> before;
+  for (std::size_t i = 0; i < paths.size(); ++i) {
+    const std::optional<State> state = stateOf(paths[i]);
+    if (state && std::ranges::find(known_, *state) != known_.end()) continue;
+    unknown.push_back(paths[i]);
+    places.push_back(i);
+    before.push_back(state);
+  }
+  if (unknown.empty()) return holds;
+  const std::vector<bool> checked = check(unknown);
+  for (std::size_t i = 0; i < unknown.size(); ++i) {
+    holds[places[i]] = checked[i];
+    if (checked[i] && before[i] && stateOf(unknown[i]) == before[i]) keep(*before[i]);
+  }
+  return holds;
 }
 
 }  // namespace gridbay

@@ -3,6 +3,8 @@
 #include <array>
 #include <cstdint>
 #include <functional>
+#include <optional>
+#include <span>
 #include <string>
 #include <vector>
 
@@ -12,12 +14,18 @@ namespace gridbay {
 // that was written to in the last moments is not kept, as the next write might bear the same time.
 class KnownFiles {
  public:
-  // Whether the check holds for a file as it is now.
-  bool holds(const std::string& path, const std::function<bool()>& check);
+  // Whether a check holds for each of some files.
+  using Check = std::function<std::vector<bool>(std::span<const std::string> paths)>;
+
+  // Whether the check holds for each file as it is now. It is asked once, for those that are not known.
+  std::vector<bool> hold(std::span<const std::string> paths, const Check& check);
 
  private:
   // Device, number, size and the time of the last change to its content or owner, in seconds and nanoseconds.
   using State = std::array<std::int64_t, 5>;
+  static std::optional<State> stateOf(const std::string& path);
+  void keep(const State& state);
+
   std::vector<State> known_;
 };
 

@@ -7,6 +7,7 @@
 #include <charconv>
 #include <cmath>
 #include <filesystem>
+#include <iterator>
 #include <limits>
 #include <map>
 #include <optional>
@@ -26,6 +27,7 @@ namespace {
 // A compressed file can hold about this many times its own length; one that claims more is damaged or made to
 // harm.
 constexpr double kGreatestRatio = 1100;
+constexpr std::string_view kNoDataFile = "it is no data file, or it is damaged";
 constexpr std::size_t kMostItems = 10000;
 constexpr std::size_t kLongestText = 1 << 20;
 constexpr std::size_t kLongestBlock = 1 << 20;
@@ -35,6 +37,26 @@ unsigned secondsFor(std::uintmax_t size) {
   constexpr std::uintmax_t kLeast = 2;
   constexpr std::uintmax_t kMost = 60;
   return static_cast<unsigned>(std::min(kLeast + (size >> 24U), kMost));
+}
+
+Failure cannotRead(const std::string& path, std::string_view why) {
+  return Failure{"cannot read \"" + path + "\": " + std::string(why)};
+}
+
+// Why a file can't be looked at; empty when it can.
+std::string_view hindranceOf(const std::string& path) {
+  std::error_code error;
+  const std::filesystem::file_status status = std::filesystem::status(path, error);
+  if (!std::filesystem::exists(status)) return "there is no such file";
+  if (!std::filesystem::is_regular_file(status)) return "it is not a file";
+  return isReadableFile(path) ? "" : "no permission";
+}
+
+// 0 where there is no such file.
+std::uintmax_t sizeOf(const std::string& path) {
+  std::error_code error;
+  const std::uintmax_t size = std::filesystem::file_size(path, error);
+  return error ? 0 : size;
 }
 
 std::optional<std::string> textAttribute(int file, int variable, const char* name) {
@@ -272,14 +294,27 @@ struct TsbFile::State {
   TsbDefinition definition;
   std::vector<int> itemVariables;
 
-  // Whether the library stands all that is asked of it for this file. Its reader was not written for files
-  // that are made to harm, so this is to be asked apart.
-  static bool canBeRead(const std::string& path, double size) {
+  // Whether the library stands all that is asked of it for each file. Its reader was not written for files
+  // that are made to harm, so it is tried apart.
+  static std::vector<bool> canBeRead(std::span<const std::string> paths) {
+    static KnownFiles knownFiles;
+    return knownFiles.hold(paths, [](std::span<const std::string> unknown) {
+      // Set up here, once, and not in each copy.
+      prepareHdf5();
+      nc_initialize();
+      std::uintmax_t largest = 0;
+      for (const std::string& path : unknown) largest = std::max(largest, sizeOf(path));
+      return holdApart(
+          unknown.size(), [&](std::size_t i) { return tryToRead(unknown[i]); }, secondsFor(largest));
+    });
+  }
+
+  static bool tryToRead(const std::string& path) {
     if (!isSoundHdf5(path)) return false;
     std::optional<NetcdfFile> file = NetcdfFile::open(path);
     if (!file) return false;
     State state(path, *std::move(file));
-    if (!state.readDefinition(size)) return true;  // the caller will see why
+    if (!state.readDefinition()) return true;  // the caller will see why
     const std::size_t steps = state.definition.time.count;
     const std::size_t rows = state.rowCount();
     std::vector<float> row(state.definition.pointCount() / rows);
@@ -293,8 +328,8 @@ struct TsbFile::State {
     return true;
   }
 
-  Outcome readDefinition(double size) {
-    return DefinitionReader(file.id(), size, definition, itemVariables).read();
+  Outcome readDefinition() {
+    return DefinitionReader(file.id(), static_cast<double>(sizeOf(path)), definition, itemVariables).read();
   }
 
   template <class Number, class Get>
@@ -328,7 +363,7 @@ struct TsbFile::State {
   }
 
   std::size_t rowCount() const { return definition.axes.size() == 2 ? definition.axes[1].points : 1; }
-  Failure fail(const std::string& why) const { return Failure{"cannot read \"" + path + "\": " + why}; }
+  Failure fail(std::string_view why) const { return cannotRead(path, why); }
 };
 
 TsbFile::TsbFile(std::unique_ptr<State> state) : state_(std::move(state)) {}
@@ -338,29 +373,20 @@ TsbFile::~TsbFile() = default;
 
 Result<TsbFile> TsbFile::open(const std::string& path) {
   if (path.empty()) return Failure{"no data file is named"};
-  const auto fail = [&path](const std::string& why) {
-    return Failure{"cannot read \"" + path + "\": " + why};
-  };
-  std::error_code error;
-  const std::filesystem::file_status status = std::filesystem::status(path, error);
-  if (!std::filesystem::exists(status)) return fail("there is no such file");
-  if (!std::filesystem::is_regular_file(status)) return fail("it is not a file");
-  if (!isReadableFile(path)) return fail("no permission");
-  const auto size = std::filesystem::file_size(path, error);
-
-  static KnownFiles knownFiles;
-  const bool known = knownFiles.holds(path, [&] {
-    // Set up here, once, and not in each copy.
-    prepareHdf5();
-    nc_initialize();
-    return holdsApart([&] { return State::canBeRead(path, static_cast<double>(size)); }, secondsFor(size));
-  });
-  if (!known) return fail("it is no data file, or it is damaged");
+  if (const std::string_view why = hindranceOf(path); !why.empty()) return cannotRead(path, why);
+  if (!State::canBeRead({&path, 1})[0]) return cannotRead(path, kNoDataFile);
   std::optional<NetcdfFile> file = NetcdfFile::open(path);
-  if (!file) return fail("it is no data file, or it is damaged");
+  if (!file) return cannotRead(path, kNoDataFile);
   auto state = std::make_unique<State>(path, *std::move(file));
-  if (const Outcome read = state->readDefinition(static_cast<double>(size)); !read) return fail(read.error());
+  if (const Outcome read = state->readDefinition(); !read) return cannotRead(path, read.error());
   return TsbFile(std::move(state));
+}
+
+void TsbFile::lookAhead(std::span<const std::string> paths) {
+  std::vector<std::string> files;
+  std::ranges::copy_if(paths, std::back_inserter(files),
+                       [](const std::string& path) { return hindranceOf(path).empty(); });
+  State::canBeRead(files);
 }
 
 const TsbDefinition& TsbFile::definition() const {

@@ -7,9 +7,11 @@
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
+#include <ctime>
 #include <filesystem>
 #include <new>
 #include <stdexcept>
+#include <vector>
 
 #include "platform/large_memory.h"
 
@@ -26,6 +28,28 @@ TEST(Apart, WhateverEndsTheCopyTheCheckDoesNotHold) {
   EXPECT_FALSE(holdsApart([] { return std::raise(SIGSEGV) == 0; }, 10));
   EXPECT_FALSE(holdsApart([]() -> bool { std::abort(); }, 10));
   EXPECT_FALSE(holdsApart([]() -> bool { ::_exit(3); }, 10));
+}
+
+TEST(Apart, OfSeveralChecksEachHasItsAnswerUpToOneThatEndsTheCopy) {
+  using Answers = std::vector<bool>;
+  EXPECT_EQ(holdApart(
+                0, [](std::size_t) { return true; }, 10),
+            Answers());
+  EXPECT_EQ(holdApart(
+                3, [](std::size_t i) { return i != 1; }, 10),
+            (Answers{true, false, true}));
+  const auto endsAtTheSecond = [](std::size_t i) -> bool { return i != 1 || std::raise(SIGSEGV) == 0; };
+  EXPECT_EQ(holdApart(3, endsAtTheSecond, 10), (Answers{true, false, false}));
+}
+
+TEST(Apart, EachCheckHasItsOwnTime) {
+  const auto computes = [](std::size_t) {
+    const std::clock_t start = std::clock();
+    while (std::clock() - start < CLOCKS_PER_SEC * 7 / 10) {
+    }
+    return true;
+  };
+  EXPECT_EQ(holdApart(3, computes, 1), std::vector<bool>(3, true));
 }
 
 TEST(Apart, AlsoWhereChildrenAreIgnored) {

@@ -3,7 +3,9 @@
 #include <gtest/gtest.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <filesystem>
+#include <vector>
 
 #include "tests/support/temporary_folder.h"
 
@@ -15,10 +17,10 @@ class Known : public ::testing::Test {
   // Whether the check is made again.
   bool isAsked(const std::string& file, bool holds = true) {
     bool asked = false;
-    const bool held = files.holds(file, [&] {
+    const bool held = files.hold({&file, 1}, [&](std::span<const std::string> paths) {
       asked = true;
-      return holds;
-    });
+      return std::vector<bool>(paths.size(), holds);
+    })[0];
     EXPECT_EQ(held, !asked || holds);
     return asked;
   }
@@ -56,6 +58,21 @@ TEST_F(Known, AnotherFileOfTheSameNameIsChecked) {
   EXPECT_TRUE(isAsked(path));
   std::filesystem::rename(folder.path() / "b", path);
   EXPECT_TRUE(isAsked(path));
+}
+
+TEST_F(Known, OfSeveralFilesThoseNotKnownAreCheckedAtOnce) {
+  const std::vector<std::string> paths{path, folder.write("b", "text"), folder.write("c", "text")};
+  waitAMoment();
+  EXPECT_TRUE(isAsked(paths[1]));
+  const std::vector<std::string> unknown{paths[0], paths[2]};
+  EXPECT_EQ(files.hold(paths,
+                       [&unknown](std::span<const std::string> asked) {
+                         EXPECT_TRUE(std::ranges::equal(asked, unknown));
+                         return std::vector<bool>{true, false};
+                       }),
+            (std::vector<bool>{true, true, false}));
+  EXPECT_FALSE(isAsked(paths[0]));
+  EXPECT_TRUE(isAsked(paths[2]));
 }
 
 TEST_F(Known, AMissingFileIsLeftToTheCheck) {
