@@ -303,7 +303,7 @@ struct TsbFile::State {
       prepareHdf5();
       nc_initialize();
       std::uintmax_t largest = 0;
-      for (const std::string& path : unknown) largest = std::max(largest, sizeOf(path));
+      for (const std::string& name : unknown) largest = std::max(largest, sizeOf(name));
       return holdApart(
           unknown.size(), [&](std::size_t i) { return tryToRead(unknown[i]); }, secondsFor(largest));
     });
