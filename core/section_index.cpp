@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <bit>
 #include <random>
+#include <utility>
 
 #include "core/name_bytes.h"
 #include "core/parameter_tree.h"
@@ -23,11 +24,11 @@ std::uint64_t mix(std::uint64_t a, std::uint64_t b) {
 
 // A hash of a name with its case folded. The seed is drawn anew in each process, so that no file can be made
 // whose names all meet in one place.
-std::uint64_t hashName(std::string_view name, std::uint64_t occurrence) {
+std::uint64_t hashName(std::string_view name) {
   static const std::uint64_t seed =
       (std::uint64_t{std::random_device{}()} << 32) | std::random_device{}() | 1U;
   constexpr std::uint64_t kFactor = 0x9E3779B97F4A7C15U;
-  std::uint64_t state = mix(seed ^ name.size(), kFactor ^ occurrence);
+  std::uint64_t state = mix(seed ^ name.size(), kFactor);
   const char* at = name.data();
   std::size_t left = name.size();
   for (; left > 8; left -= 8, at += 8) state = mix(state ^ names::foldCase(names::load8(at)), kFactor ^ seed);
@@ -142,10 +143,39 @@ void SectionIndex::settle() {
     loose_.clear();
     for (const Node* node = section_.first(); node != nullptr; node = node->next()) loose_.push_back(node);
   }
-  repetitions_.clear();
-  occurrences_.assign(loose_.size(), 0);
   slots_.assign(std::bit_ceil(loose_.size() * 4 / 3 + 1), {});
-  for (std::size_t place = 0; place < loose_.size(); ++place) insert(place);
+  std::vector<std::uint32_t> firsts(loose_.size());
+  bool repeats = false;
+  for (std::uint32_t place = 0; place < firsts.size(); ++place) {
+    firsts[place] = firstOfItsName(place);
+    repeats = repeats || firsts[place] != place;
+  }
+  if (repeats) bringTogether(firsts);
+}
+
+// The place of the first loose node that has the name of this one; it takes a slot where it is itself the
+// first.
+std::uint32_t SectionIndex::firstOfItsName(std::uint32_t place) {
+  const Node& node = *loose_[place];
+  const std::uint64_t hash = hashName(node.name());
+  Slot& slot = slots_[slotOf(hash, node.name(), node.isSection())];
+  if (slot.place == 0) slot = {place + 1, static_cast<std::uint32_t>(hash >> 32)};
+  return slot.place - 1;
+}
+
+// `firsts`: of each loose node the place of the first one that has its name.
+void SectionIndex::bringTogether(std::span<const std::uint32_t> firsts) {
+  std::vector<std::uint32_t> starts(firsts.size(), 0);  // by the first node's place
+  for (const std::uint32_t first : firsts) ++starts[first];
+  std::uint32_t start = 0;
+  for (std::uint32_t& count : starts) start += std::exchange(count, start);
+  for (Slot& slot : slots_) {
+    if (slot.place > 0) slot.place = starts[slot.place - 1] + 1;
+  }
+  std::vector<const Node*> together(loose_.size());
+  for (std::size_t place = 0; place < firsts.size(); ++place)
+    together[starts[firsts[place]]++] = loose_[place];
+  loose_ = std::move(together);
 }
 
 const Node* SectionIndex::find(std::string_view name, std::uint32_t occurrence, bool wantSection) {
@@ -157,39 +187,21 @@ const Node* SectionIndex::find(std::string_view name, std::uint32_t occurrence, 
         return occurrence == 1 ? run.nodes[numbered.number - run.first] : nullptr;
     }
   }
-  const std::uint32_t place = slots_[slotOf(hashName(name, occurrence), name, occurrence, wantSection)].place;
-  return place == 0 ? nullptr : loose_[place - 1];
+  const std::uint32_t first = slots_[slotOf(hashName(name), name, wantSection)].place;
+  if (first == 0 || occurrence == 0 || occurrence > loose_.size() - (first - 1)) return nullptr;
+  const Node* node = loose_[first - 1 + occurrence - 1];
+  return node->isSection() == wantSection && names::same(node->name(), name) ? node : nullptr;
 }
 
-std::size_t SectionIndex::slotOf(std::uint64_t hash, std::string_view name, std::uint32_t occurrence,
-                                 bool wantSection) const {
+std::size_t SectionIndex::slotOf(std::uint64_t hash, std::string_view name, bool wantSection) const {
   const std::size_t mask = slots_.size() - 1;
   for (std::size_t at = hash & mask;; at = (at + 1) & mask) {
     const Slot& slot = slots_[at];
     if (slot.place == 0) return at;
-    if (slot.hash != static_cast<std::uint32_t>(hash >> 32) || occurrences_[slot.place - 1] != occurrence)
-      continue;
+    if (slot.hash != static_cast<std::uint32_t>(hash >> 32)) continue;
     const Node& node = *loose_[slot.place - 1];
     if (node.isSection() == wantSection && names::same(node.name(), name)) return at;
   }
-}
-
-// Takes a slot for a loose node, unless one of the same name and occurrence has it.
-bool SectionIndex::take(std::size_t place, std::uint32_t occurrence, std::size_t* slot) {
-  const Node& node = *loose_[place];
-  const std::uint64_t hash = hashName(node.name(), occurrence);
-  *slot = slotOf(hash, node.name(), occurrence, node.isSection());
-  if (slots_[*slot].place != 0) return false;
-  slots_[*slot] = {static_cast<std::uint32_t>(place) + 1, static_cast<std::uint32_t>(hash >> 32)};
-  occurrences_[place] = occurrence;
-  return true;
-}
-
-// How often a repeated name has come is kept apart: few names repeat.
-void SectionIndex::insert(std::size_t place) {
-  std::size_t first = 0;
-  std::size_t slot = 0;
-  if (!take(place, 1, &first)) take(place, 2 + repetitions_[first]++, &slot);
 }
 
 }  // namespace gridbay

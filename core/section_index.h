@@ -1,8 +1,8 @@
 #pragma once
 
 #include <cstdint>
+#include <span>
 #include <string_view>
-#include <unordered_map>
 #include <vector>
 
 namespace gridbay {
@@ -10,8 +10,8 @@ namespace gridbay {
 class Node;
 
 // Finds what a section holds by name and occurrence. Most of a large file is numbered, as POINT_1, POINT_2
-// and on: such a run is found by its number. All else is found by a hash of name and occurrence, made when it
-// is first asked for. Not to be asked from two threads at once.
+// and on: such a run is found by its number. All else is put together by name and found by a hash of it,
+// made when it is first asked for. Not to be asked from two threads at once.
 class SectionIndex {
  public:
   // With all that the section holds now.
@@ -38,7 +38,7 @@ class SectionIndex {
     bool holds(const NumberedName& name, bool wantSection) const;
   };
   struct Slot {
-    std::uint32_t place = 0;  // of the node among the loose ones, from 1; 0 where the slot is free
+    std::uint32_t place = 0;  // of a name's first node among the loose ones, from 1; 0 where the slot is free
     std::uint32_t hash = 0;
   };
 
@@ -46,19 +46,16 @@ class SectionIndex {
   void endRun();
   void settle();
   bool runsMeet() const;
-  std::size_t slotOf(std::uint64_t hash, std::string_view name, std::uint32_t occurrence,
-                     bool wantSection) const;
-  bool take(std::size_t place, std::uint32_t occurrence, std::size_t* slot);
-  void insert(std::size_t place);
+  std::size_t slotOf(std::uint64_t hash, std::string_view name, bool wantSection) const;
+  std::uint32_t firstOfItsName(std::uint32_t place);
+  void bringTogether(std::span<const std::uint32_t> firsts);
 
   const Node& section_;
-  std::vector<Run> runs_;                   // the last one may still grow, and be too short to count
-  std::vector<const Node*> loose_;          // in the order of the file
-  std::vector<std::uint32_t> occurrences_;  // of the loose ones, each among those of its name
+  std::vector<Run> runs_;           // the last one may still grow, and be too short to count
+  std::vector<const Node*> loose_;  // those of one name in the order of the file; together once settled
   bool runsAllowed_ = true;
   bool settled_ = false;
   std::vector<Slot> slots_;
-  std::unordered_map<std::size_t, std::uint32_t> repetitions_;  // beyond the first, by the first one's slot
 };
 
 }  // namespace gridbay
