@@ -5,7 +5,10 @@
 #include <QCheckBox>
 #include <QClipboard>
 #include <QComboBox>
+#include <QDialogButtonBox>
 #include <QFile>
+#include <QFileDialog>
+#include <QInputDialog>
 #include <QLineEdit>
 #include <QMessageBox>
 #include <QMimeData>
@@ -382,6 +385,41 @@ class DesktopTest : public QObject {
     QCOMPARE(QImage(file("map.png")).width(), 2 * map->width());
     QVERIFY(!data->exportPng(file("nowhere/map.png")));
     QVERIFY(data->close());
+  }
+
+  void aDataFileAndItsItemAreChosen() {
+    write("levels.csv", "time,north,south\n0,0.5,0.25\n86400,0.75,0.5\n");
+    run("v27setup", {"convert", "series", "levels.csv", "levels.tsb0", "--item-type", "100000", "--start",
+                     "1990-01-01 00:00:00", "--skip-lines", "1"});
+    QVERIFY(window_->currentDocument()->goToPage(29));
+    constexpr int kDataRow = 2;
+    QVERIFY(grid().setData(grid().index(kDataRow, 0), "Type 0 data file:", Qt::EditRole));
+
+    QStringList items;
+    QTimer::singleShot(0, qApp, [this, &items] {
+      auto* files = qobject_cast<QFileDialog*>(QApplication::activeModalWidget());
+      QVERIFY(files != nullptr);
+      files->findChild<QLineEdit*>()->setText(file("levels.tsb0"));
+      QTimer::singleShot(0, qApp, [&items] {
+        auto* dialog = qobject_cast<QInputDialog*>(QApplication::activeModalWidget());
+        QVERIFY(dialog != nullptr);
+        items = dialog->comboBoxItems();
+        QTest::keyClick(dialog->findChild<QComboBox*>(), Qt::Key_Down);
+        QTest::keyClick(dialog, Qt::Key_Return);
+      });
+      files->findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Open)->click();
+    });
+    auto* view = window_->currentDocument()->pane().findChild<GridView*>();
+    view->setFocus();
+    view->setCurrentIndex(grid().index(kDataRow, 2));
+    QTest::keyClick(view, Qt::Key_Space);
+
+    QCOMPARE(items, QStringList({"1 north", "2 south"}));
+    QCOMPARE(grid().index(kDataRow, 1).data().toString(), file("levels.tsb0"));
+    QVERIFY(window_->saveDocument());
+    const QString saved = textOf(file("s.v27"));
+    QVERIFY2(saved.contains("(file)\"levels.tsb0\""), qPrintable(saved));
+    QVERIFY2(saved.contains("Item_Numbers 2"), qPrintable(saved));
   }
 
   void dataThatCannotBeShownIsNamed() {
