@@ -116,6 +116,23 @@ TEST(SectionIndex, GrowsWithAFileInWriting) {
   expectAsAWalkFinds(target);
 }
 
+TEST(SectionIndex, GrowsBetweenLookups) {
+  ParameterTree tree;
+  std::mt19937 random(20261122);
+  Node* last = nullptr;
+  for (int i = 0; i < 400; ++i) {
+    const bool isNumbered = random() % 2 == 0;
+    const std::string name = isNumbered ? "N_" + std::to_string(i) : "Same" + std::to_string(random() % 9);
+    Node* node = random() % 3 == 0
+                     ? tree.makeKeyword(tree.keep(name), tree.makeValue(ValueKind::integer, "1"))
+                     : tree.makeSection(tree.keep(name));
+    ParameterTree::append(tree.root(), last, *node);
+    last = node;
+    if (i % 20 == 0) expectAsAWalkFinds(tree.root());
+  }
+  expectAsAWalkFinds(tree.root());
+}
+
 TEST(Values, LongTextsAndAllKinds) {
   ParameterTree tree;
   for (const std::size_t length : {0U, 1U, 8189U, 8190U, 8191U, 8192U, 100000U}) {
