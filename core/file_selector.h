@@ -43,7 +43,7 @@ class CVdRqTsbItem {
                               std::span<const std::uint32_t> items) const;
 
   // What the item has that the request does not allow; empty when it meets the request.
-  std::string fault(const TsbHeader& header, int item) const;
+  virtual std::string fault(const TsbHeader& header, int item) const;
 
  private:
   friend class CVdFileSelectorDlg;

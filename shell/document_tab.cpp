@@ -11,6 +11,9 @@
 #include <QPushButton>
 #include <QTimer>
 #include <QVBoxLayout>
+#include <algorithm>
+#include <iterator>
+#include <numeric>
 
 namespace gridbay::shell {
 namespace {
@@ -29,15 +32,44 @@ QString toolkitFilter(std::string_view filter) {
   return filters.join(";;");
 }
 
-// The items of a data file, numbered; none when it cannot be opened.
-QStringList itemNames(const std::string& file) {
-  TsbHeader header;
-  if (tsbFileRead(file, &header) != 0) return {};
-  QStringList names;
-  for (const TsbItem& item : header.file->definition().items) {
-    names << QString("%1 %2").arg(names.size() + 1).arg(QString::fromStdString(item.name));
+// The numbers of the items of a file that meet a request; of all where none does.
+std::vector<std::uint32_t> itemsFor(const CVdRqTsbItem& request, const TsbHeader& file) {
+  std::vector<std::uint32_t> all(static_cast<std::size_t>(tsbGetNoOfItems(file)));
+  std::iota(all.begin(), all.end(), 1U);
+  std::vector<std::uint32_t> fitting;
+  std::ranges::copy_if(all, std::back_inserter(fitting), [&](std::uint32_t number) {
+    return request.fault(file, static_cast<int>(number)).empty();
+  });
+  return fitting.empty() ? all : fitting;
+}
+
+// Lets the user pick an item for each request that wants one; false when he gives up. There is nothing to ask
+// where only one will do, or where the file cannot be read.
+bool chooseItems(QWidget* parent, CVdFileSelectorDlg& selector) {
+  std::vector<std::uint32_t> items = selector.GetSelectedItems();
+  TsbHeader file;
+  if (items.empty() || tsbFileRead(selector.fileName(), &file) != 0) return true;
+  for (std::size_t i = 0; i < std::min(items.size(), selector.requests().size()); ++i) {
+    const CVdRqTsbItem& request = *selector.requests()[i];
+    const std::vector<std::uint32_t> numbers = itemsFor(request, file);
+    QStringList names;
+    for (const std::uint32_t number : numbers) {
+      const TsbItem& item = *tsbItemD(file, static_cast<int>(number));
+      names << QString("%1 %2").arg(number).arg(QString::fromStdString(item.name));
+    }
+    const auto current = std::ranges::find(numbers, items[i]);
+    const auto place = static_cast<int>(current == numbers.end() ? 0 : current - numbers.begin());
+    bool chosen = true;
+    const QString name = names.size() == 1
+                             ? names[0]
+                             : QInputDialog::getItem(parent, DocumentTab::tr("Item"),
+                                                     QString::fromStdString(request.description()), names,
+                                                     place, false, &chosen);
+    if (!chosen) return false;
+    items[i] = numbers[static_cast<std::size_t>(names.indexOf(name))];
   }
-  return names;
+  selector.SetSelectedItems(items);
+  return true;
 }
 
 }  // namespace
@@ -328,19 +360,8 @@ bool DocumentTab::choose(CVdFileSelectorDlg& selector) {
   std::string name = selector.fileName();
   if (!chooseFile(selector.filter(), selector.kind(), &name)) return false;
   selector.SetFileName(name);
-  std::vector<std::uint32_t> items;
-  const QStringList names = selector.GetSelectedItems().empty() ? QStringList() : itemNames(name);
-  for (std::size_t i = 0; i < selector.GetSelectedItems().size(); ++i) {
-    bool chosen = names.size() <= 1;
-    const QString item =
-        chosen ? names.value(0)
-               : QInputDialog::getItem(this, tr("Item"),
-                                       QString::fromStdString(selector.requests().at(i)->description()),
-                                       names, 0, false, &chosen);
-    if (!chosen) return false;
-    items.push_back(static_cast<std::uint32_t>(names.indexOf(item)) + 1);
-  }
-  selector.SetSelectedItems(items);
+  if (!chooseItems(this, selector)) return false;
+  const std::vector<std::uint32_t>& items = selector.GetSelectedItems();
   std::string why;
   const bool valid =
       items.empty() ? selector.IsTsbFileValid(name, &why) : selector.IsTsbFileValid(name, items, &why);

@@ -23,6 +23,8 @@
 #include <QTimer>
 #include <csignal>
 
+#include "platform/tsb/tsb_writer.h"
+#include "platform/units/units.h"
 #include "shell/grid_view.h"
 #include "shell/main_window.h"
 #include "shell/viewers/map_plot.h"
@@ -388,9 +390,14 @@ class DesktopTest : public QObject {
   }
 
   void aDataFileAndItsItemAreChosen() {
-    write("levels.csv", "time,north,south\n0,0.5,0.25\n86400,0.75,0.5\n");
-    run("v27setup", {"convert", "series", "levels.csv", "levels.tsb0", "--item-type", "100000", "--start",
-                     "1990-01-01 00:00:00", "--skip-lines", "1"});
+    TsbDefinition levels;
+    levels.time.step = 86400;
+    levels.time.count = 2;
+    levels.items = {{"flow", item::kDischarge, "m3 s-1"},
+                    {"north", item::kWaterLevel, "m"},
+                    {"south", item::kWaterLevel, "m"}};
+    Result<TsbWriter> writer = TsbWriter::create(file("levels.tsb0").toStdString(), levels);
+    QVERIFY(writer && writer->commit());
     QVERIFY(window_->currentDocument()->goToPage(29));
     constexpr int kDataRow = 2;
     QVERIFY(grid().setData(grid().index(kDataRow, 0), "Type 0 data file:", Qt::EditRole));
@@ -414,12 +421,12 @@ class DesktopTest : public QObject {
     view->setCurrentIndex(grid().index(kDataRow, 2));
     QTest::keyClick(view, Qt::Key_Space);
 
-    QCOMPARE(items, QStringList({"1 north", "2 south"}));
+    QCOMPARE(items, QStringList({"2 north", "3 south"}));
     QCOMPARE(grid().index(kDataRow, 1).data().toString(), file("levels.tsb0"));
     QVERIFY(window_->saveDocument());
     const QString saved = textOf(file("s.v27"));
     QVERIFY2(saved.contains("(file)\"levels.tsb0\""), qPrintable(saved));
-    QVERIFY2(saved.contains("Item_Numbers 2"), qPrintable(saved));
+    QVERIFY2(saved.contains("Item_Numbers 3"), qPrintable(saved));
   }
 
   void dataThatCannotBeShownIsNamed() {
