@@ -1,5 +1,6 @@
 #include <gmock/gmock.h>
 #include <netcdf.h>
+#include <sys/stat.h>
 
 #include <filesystem>
 #include <random>
@@ -390,6 +391,18 @@ TEST_F(Tsb, AFileThatIsMendedInPlaceOpens) {
     ASSERT_TRUE(mended) << i << ": " << mended.error();
   }
   EXPECT_GT(refused, 10);
+}
+
+TEST_F(Tsb, LookingAheadWaitsForNothingAndChangesNothing) {
+  const std::string pipe = folder.file("pipe");
+  ASSERT_EQ(::mkfifo(pipe.c_str(), 0600), 0);
+  const std::string broken = folder.write("broken.tsb2", "not a data file");
+  test::writeGrid(path);
+  TsbFile::lookAhead({});
+  TsbFile::lookAhead(
+      std::vector<std::string>{"", folder.file("none"), pipe, folder.path(), broken, path, path});
+  EXPECT_EQ(openError(), "");
+  for (const std::string& bad : {pipe, broken, folder.file("none")}) EXPECT_FALSE(TsbFile::open(bad)) << bad;
 }
 
 // What other programs read in the files.
