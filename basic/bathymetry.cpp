@@ -63,9 +63,8 @@ unsigned CBathymetryKvs::Validate(ValidationList& messages, int deep) {
     for (int number = 1; number <= GetCount(); ++number)
       files.push_back(GetArea(number)->fileName.absolute());
     TsbFile::lookAhead(files);
-  }
-  for (int number = 1; deep != 0 && number <= GetCount(); ++number) {
-    faults += GetArea(number)->ReadGrid(messages, number);
+    for (int number = 1; number <= GetCount(); ++number)
+      faults += GetArea(number)->ReadGrid(messages, number);
   }
   if (faults > 0) return faults;
 
