@@ -1,6 +1,7 @@
 #include "basic/area_description_page.h"
 
 #include "basic/area_description.h"
+#include "basic/basic_parts.h"
 #include "platform/units/units.h"
 
 namespace gridbay {
@@ -13,7 +14,7 @@ void CAreaDescriptionDlg::DoDataExchange(Form& form) {
 }
 
 void CAreaDescriptionDlg::SetData() {
-  const CAreaDescriptionKvs& area = *GetKvs().areaDescription;
+  const CAreaDescriptionKvs& area = *parts<BasicParts>().areaDescription;
   enable_ = area.enableFloodAndDryChecking;
   dryingDepth_ = area.dryingDepth;
   floodingDepth_ = area.floodingDepth;
@@ -24,7 +25,7 @@ void CAreaDescriptionDlg::SetData() {
 
 int CAreaDescriptionDlg::GetData() {
   if (!UpdateData(true)) return 0;
-  CAreaDescriptionKvs& area = *GetKvs().areaDescription;
+  CAreaDescriptionKvs& area = *parts<BasicParts>().areaDescription;
   area.enableFloodAndDryChecking = enable_;
   area.dryingDepth = dryingDepth_;
   area.floodingDepth = floodingDepth_;

@@ -10,8 +10,7 @@ namespace gridbay {
 // it.
 class CAreaDescriptionDlg final : public CV27SetupFormView {
  public:
-  explicit CAreaDescriptionDlg(CV27SetupDoc& document)
-      : CV27SetupFormView(document, 18702, PageId::floodAndDry) {}
+  explicit CAreaDescriptionDlg(CVdDoc& document) : CV27SetupFormView(document, 18702, PageId::floodAndDry) {}
 
   int GetData() override;
   void SetData() override;

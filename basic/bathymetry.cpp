@@ -1,15 +1,11 @@
 #include "basic/bathymetry.h"
 
-#include <fmt/printf.h>
-
-#include <array>
 #include <cmath>
 #include <optional>
 #include <string>
 #include <vector>
 
 #include "basic/nesting.h"
-#include "core/global_kvs.h"
 #include "platform/cartography/cartography.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_operations.h"
@@ -35,7 +31,7 @@ std::optional<TsbGeography> geographyOf(const CBathymetryObjectKvs* area) {
 // "UTM" alone gets its zone from the longitude.
 std::string completeProjection(const TsbGeography& place) {
   if (place.projection != "UTM") return place.projection;
-  return fmt::sprintf("%s-%.0f", place.projection, std::floor((place.longitude + 180) / 6 + 1));
+  return formatted(texts::utmZone, place.projection, std::floor((place.longitude + 180) / 6 + 1));
 }
 
 }  // namespace
@@ -49,11 +45,6 @@ void CBathymetryKvs::OverlandFileRow::load(CBathymetryKvs& areas, KvsSection fro
                                            const std::string& documentPath) const {
   if (kvsKeywordByNameNum(from, "Overland_Solver", 1) == nullptr) return;
   areas.overlandFile.Load(from, documentPath, "Overland_Filename");
-}
-
-std::span<const Follower> CBathymetryKvs::followers() {
-  static constexpr std::array<Follower, 0> kFollowers{};
-  return kFollowers;
 }
 
 unsigned CBathymetryKvs::Validate(ValidationList& messages, int deep) {

@@ -1,7 +1,6 @@
 #pragma once
 
 #include <cstdint>
-#include <span>
 #include <string>
 
 #include "basic/texts.h"
@@ -77,7 +76,6 @@ class CBathymetryKvs final : public ListKvs<CBathymetryKvs, CBathymetryObjectKvs
                    items("AREA_%d", texts::bathymetrySectionMissing));
   }
 
-  static std::span<const Follower> followers();
   void initialise(CBathymetryObjectKvs& area, int number) { area.enclosingArea = number - 1; }
 
   unsigned Validate(ValidationList& messages, int deep) override;

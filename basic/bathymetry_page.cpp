@@ -1,5 +1,6 @@
 #include "basic/bathymetry_page.h"
 
+#include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
 #include "basic/bathymetry_requests.h"
 #include "basic/boundary.h"
@@ -17,13 +18,13 @@ constexpr const char* kOverlandBrowse = "...";
 }  // namespace
 
 CBathymetryObjectKvs& CBathymetryGrid::area(int number) {
-  return *GetKvs().bathymetry->GetArea(number);
+  return *parts<BasicParts>().bathymetry->GetArea(number);
 }
 
 void CBathymetryGrid::Initialize() {
-  CV27SetupDoc::EnableGXMultiToolTips(*this, 1);
+  CVdDoc::EnableGXMultiToolTips(*this, 1);
   const auto isOutermost = [](int n) { return n == 1; };
-  const auto placeIsFixed = [this](int n) { return n == 1 || GetKvs().bathymetry->hotStart == 1; };
+  const auto placeIsFixed = [this](int n) { return n == 1 || parts<BasicParts>().bathymetry->hotStart == 1; };
   SetColumns(30,
              {{.header = "Bathymetry",
                .width = 210,
@@ -70,12 +71,12 @@ void CBathymetryGrid::Initialize() {
 }
 
 int CBathymetryGrid::ItemCount() {
-  return GetKvs().bathymetry->GetCount();
+  return parts<BasicParts>().bathymetry->GetCount();
 }
 
 // Another grid for Area 1 makes boundaries that were detected worthless.
 void CBathymetryGrid::OnFileChanged(int row) {
-  CBoundaryKvs& boundaries = *GetKvs().boundary;
+  CBoundaryKvs& boundaries = *parts<BasicParts>().boundary;
   if (row != 1 || boundaries.defaultPosition == 0) return;
   const bool ask = boundaries.GetCount() > 0;
   if (!ask || page().document().host().askYesNo(formatted(texts::recalculateBoundaries)))
@@ -85,12 +86,12 @@ void CBathymetryGrid::OnFileChanged(int row) {
 void CBathymetryGrid::ChooseFile(int row) {
   CVdFileSelectorDlg selector(texts::mapExtension.format, area(row).fileName.text(),
                               texts::bathymetryFilter.format);
-  RequestBathymetry(selector, GetKvs().bathymetry->hotStart == 1);
+  RequestBathymetry(selector, parts<BasicParts>().bathymetry->hotStart == 1);
   selector.SetChooser(&page().document().host());
   if (selector.DoModal() != 1) return;
   area(row).fileName.Set(selector.fileName(), page().document().path());
   OnFileChanged(row);
-  if (row == 1) GetKvs().bathymetry->projectionStale = true;
+  if (row == 1) parts<BasicParts>().bathymetry->projectionStale = true;
   UpdateDoc();
   if (row == 1) page().SetData();
 }
@@ -102,7 +103,7 @@ void CBathymetryDlg::DoDataExchange(Form& form) {
   };
   form.DDX_Radio("Type", {"Cold start", "Hot start"}, type_).Changed(changed);
   AddCount(form, "Number of areas", number_, CBathymetryKvs::kMostAreas,
-           [this] { return GetKvs().bathymetry->GetCount(); });
+           [this] { return parts<BasicParts>().bathymetry->GetCount(); });
   form.DDX_CBIndex("Map projection:", {}, projection_).Changed(changed);
   form.DDX_Check("Apply Coriolis forcing:", coriolis_).Changed(changed);
   form.DDX_Check("Landslides:", landSlides_).Changed(changed);
@@ -111,7 +112,7 @@ void CBathymetryDlg::DoDataExchange(Form& form) {
   form.DDX_Text(texts::fineBathymetryFile.format, overlandFile_).Changed([this] { UpdateDoc(); });
   form.Button(kOverlandBrowse, [this] { ChooseOverlandFile(); });
   form.Button(kOverlandEdit, [this] {
-    const std::string path = GetKvs().bathymetry->overlandFile.absolute();
+    const std::string path = parts<BasicParts>().bathymetry->overlandFile.absolute();
     if (isReadableFile(path)) document().host().openFile(path);
   });
   form.DDX_Control("Areas", grid_);
@@ -124,7 +125,7 @@ int CBathymetryDlg::Initialize() {
 
 void CBathymetryDlg::SetData() {
   FillProjections();
-  const CBathymetryKvs& areas = *GetKvs().bathymetry;
+  const CBathymetryKvs& areas = *parts<BasicParts>().bathymetry;
   type_ = areas.hotStart;
   number_ = areas.GetCount();
   coriolis_ = hasProjection_ && areas.coriolis ? 1 : 0;
@@ -137,7 +138,7 @@ void CBathymetryDlg::SetData() {
 
 int CBathymetryDlg::GetData() {
   if (!UpdateData(true)) return 0;
-  CBathymetryKvs& areas = *GetKvs().bathymetry;
+  CBathymetryKvs& areas = *parts<BasicParts>().bathymetry;
   areas.hotStart = type_;
   if (number_ >= 0 && number_ <= CBathymetryKvs::kMostAreas && number_ != areas.GetCount())
     areas.SetNoAreas(number_);
@@ -154,7 +155,7 @@ int CBathymetryDlg::GetData() {
 void CBathymetryDlg::FillProjections() {
   std::string held;
   int flag = 0;
-  hasProjection_ = GetKvs().bathymetry->GetProjection(&held, &flag) == 1;
+  hasProjection_ = parts<BasicParts>().bathymetry->GetProjection(&held, &flag) == 1;
   CVdMapProjectionGXComboBox list;
   list.UpdateMapProjection(held);
   projections_ = list.choices();
@@ -179,7 +180,7 @@ void CBathymetryDlg::EnableControls() {
 
 // The fine grid is held against Area 1, and so comes after it.
 void CBathymetryDlg::ChooseOverlandFile() {
-  CBathymetryObjectKvs* area = GetKvs().bathymetry->GetArea(1);
+  CBathymetryObjectKvs* area = parts<BasicParts>().bathymetry->GetArea(1);
   ValidationList dropped;
   if (area == nullptr || area->ReadGrid(dropped, 1) != 0) {
     document().host().show(formatted(texts::area1First));

@@ -28,7 +28,7 @@ class CBathymetryGrid final : public ColumnGrid {
 // The areas, the start, the projection and the overland solver.
 class CBathymetryDlg final : public CV27SetupFormView {
  public:
-  explicit CBathymetryDlg(CV27SetupDoc& document) : CV27SetupFormView(document, 18703, PageId::bathymetry) {}
+  explicit CBathymetryDlg(CVdDoc& document) : CV27SetupFormView(document, 18703, PageId::bathymetry) {}
 
   int GetData() override;
   void SetData() override;

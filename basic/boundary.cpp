@@ -1,11 +1,8 @@
 #include "basic/boundary.h"
 
-#include <array>
-
+#include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
 #include "basic/boundary_detection.h"
-#include "core/global_kvs.h"
-#include "hydrodynamic/boundary.h"
 
 namespace gridbay {
 
@@ -30,22 +27,17 @@ std::string CBoundaryObjectKvs::Text() const {
 }
 
 float CBoundaryObjectKvs::CellSpacing() {
-  CGlobalKvs* root = model();
-  const CBathymetryObjectKvs* area = root == nullptr ? nullptr : root->bathymetry->GetArea(1);
+  auto* basic = parts<BasicParts>();
+  const CBathymetryObjectKvs* area = basic == nullptr ? nullptr : basic->bathymetry->GetArea(1);
   if (area == nullptr) return -1.0F;
   if (first.j == last.j) return area->dy;
   return first.k == last.k ? area->dx : -1.0F;
 }
 
-std::span<const Follower> CBoundaryKvs::followers() {
-  static constexpr std::array kFollowers{&resizeFollower<&CGlobalKvs::nhdBoundary>};
-  return kFollowers;
-}
-
 void CBoundaryKvs::RecalculateBoundaries() {
   SetNoBoundaries(0);
-  CGlobalKvs* root = model();
-  CBathymetryObjectKvs* area = root == nullptr ? nullptr : root->bathymetry->GetArea(1);
+  auto* basic = parts<BasicParts>();
+  CBathymetryObjectKvs* area = basic == nullptr ? nullptr : basic->bathymetry->GetArea(1);
   ValidationList dropped;
   if (area == nullptr || area->ReadGrid(dropped, 1) != 0) return;
   const std::vector<BoundaryLine> lines = findOpenBoundaries(area->grid, area->landValue);

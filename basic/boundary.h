@@ -1,7 +1,6 @@
 #pragma once
 
 #include <cstdint>
-#include <span>
 #include <string>
 
 #include "basic/texts.h"
@@ -45,8 +44,6 @@ class CBoundaryKvs final : public ListKvs<CBoundaryKvs, CBoundaryObjectKvs> {
                    keyword("Default_Position", &CBoundaryKvs::defaultPosition),
                    items("BOUNDARY_%d", texts::boundarySectionMissing));
   }
-
-  static std::span<const Follower> followers();
 
   void SetNoBoundaries(int n) { SetCount(n); }
   // Finds the boundaries along the border of Area 1, whose file it reads. All that was set for the old ones

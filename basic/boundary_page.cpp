@@ -1,5 +1,6 @@
 #include "basic/boundary_page.h"
 
+#include "basic/basic_parts.h"
 #include "basic/boundary.h"
 
 namespace gridbay {
@@ -13,10 +14,11 @@ constexpr std::int32_t kProgramDetected = 1;
 void CBoundaryGrid::Initialize() {
   constexpr int kWidth = 90;
   const auto pointColumn = [this](const char* header, GridPoint CBoundaryObjectKvs::*point) {
-    Column column = PointColumn(
-        header, kWidth, [this, point](int n) -> GridPoint& { return GetKvs().boundary->GetItem(n)->*point; });
+    Column column = PointColumn(header, kWidth, [this, point](int n) -> GridPoint& {
+      return parts<BasicParts>().boundary->GetItem(n)->*point;
+    });
     column.align = CellAlign::right;
-    column.readOnly = [this](int) { return GetKvs().boundary->defaultPosition != kUserSpecified; };
+    column.readOnly = [this](int) { return parts<BasicParts>().boundary->defaultPosition != kUserSpecified; };
     return column;
   };
   SetColumns(30, {pointColumn("First point", &CBoundaryObjectKvs::first),
@@ -24,7 +26,7 @@ void CBoundaryGrid::Initialize() {
 }
 
 int CBoundaryGrid::ItemCount() {
-  return GetKvs().boundary->GetCount();
+  return parts<BasicParts>().boundary->GetCount();
 }
 
 void CBoundaryDlg::DoDataExchange(Form& form) {
@@ -33,7 +35,7 @@ void CBoundaryDlg::DoDataExchange(Form& form) {
     SetData();
   });
   AddCount(form, "Number of boundaries", number_, CBoundaryKvs::kMostOnPage,
-           [this] { return GetKvs().boundary->GetCount(); });
+           [this] { return parts<BasicParts>().boundary->GetCount(); });
   form.DDX_Control("Boundaries", grid_);
 }
 
@@ -43,7 +45,7 @@ int CBoundaryDlg::Initialize() {
 }
 
 void CBoundaryDlg::SetData() {
-  const CBoundaryKvs& boundaries = *GetKvs().boundary;
+  const CBoundaryKvs& boundaries = *parts<BasicParts>().boundary;
   position_ = boundaries.defaultPosition;
   number_ = boundaries.GetCount();
   form().of(&number_).enabled = position_ != kProgramDetected;
@@ -52,7 +54,7 @@ void CBoundaryDlg::SetData() {
 
 int CBoundaryDlg::GetData() {
   if (!UpdateData(true)) return 0;
-  CBoundaryKvs& boundaries = *GetKvs().boundary;
+  CBoundaryKvs& boundaries = *parts<BasicParts>().boundary;
   boundaries.defaultPosition = position_;
   if (position_ != kUserSpecified) {
     boundaries.RecalculateBoundaries();

@@ -19,7 +19,7 @@ class CBoundaryGrid final : public ColumnGrid {
 // The open boundaries: found along the border of Area 1, or given by the user.
 class CBoundaryDlg final : public CV27SetupFormView {
  public:
-  explicit CBoundaryDlg(CV27SetupDoc& document) : CV27SetupFormView(document, 18704, PageId::boundary) {}
+  explicit CBoundaryDlg(CVdDoc& document) : CV27SetupFormView(document, 18704, PageId::boundary) {}
 
   // With "Program detected" each hand-over finds the boundaries anew, and resets the conditions at all of
   // them.

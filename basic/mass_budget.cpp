@@ -2,8 +2,8 @@
 
 #include <algorithm>
 
+#include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
-#include "core/global_kvs.h"
 
 namespace gridbay {
 
@@ -29,15 +29,15 @@ void CMassBudgetItemKvs::CornersRow::load(CMassBudgetItemKvs& polygon, KvsSectio
 }
 
 unsigned CMassBudgetItemKvs::Validate(ValidationList& messages, int) {
-  CGlobalKvs* root = model();
-  const int areas = root == nullptr ? 0 : root->bathymetry->GetCount();
+  auto* basic = parts<BasicParts>();
+  const int areas = basic == nullptr ? 0 : basic->bathymetry->GetCount();
   const auto fault = [&messages](const Text& text) {
     return report(messages, PageId::massBudget, Severity::fault, text);
   };
   unsigned faults = 0;
   if (associatedArea > areas) faults += fault(texts::invalidAssociatedArea);
   if (corners.empty()) faults += fault(texts::tooFewCorners);
-  const CBathymetryObjectKvs* area = root == nullptr ? nullptr : root->bathymetry->GetArea(associatedArea);
+  const CBathymetryObjectKvs* area = basic == nullptr ? nullptr : basic->bathymetry->GetArea(associatedArea);
   if (area == nullptr) return faults;
   for (const GridPoint& point : corners) {
     const bool inside = 1 <= point.j && point.j < area->noJ - 1 && 1 <= point.k && point.k < area->noK - 1;
@@ -47,8 +47,8 @@ unsigned CMassBudgetItemKvs::Validate(ValidationList& messages, int) {
 }
 
 void CMassBudgetKvs::initialise(CMassBudgetItemKvs& polygon, int) {
-  CGlobalKvs* root = model();
-  const CBathymetryObjectKvs* area = root == nullptr ? nullptr : root->bathymetry->GetArea(1);
+  auto* basic = parts<BasicParts>();
+  const CBathymetryObjectKvs* area = basic == nullptr ? nullptr : basic->bathymetry->GetArea(1);
   polygon.corners = {{1, 1}};
   if (area == nullptr) return;
   const std::int32_t lastJ = area->noJ - 2;

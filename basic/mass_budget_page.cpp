@@ -5,7 +5,7 @@
 #include <cstdio>
 
 #include "basic/mass_budget.h"
-#include "core/module_selection.h"
+#include "basic/module_selection.h"
 
 namespace gridbay {
 namespace {
@@ -17,10 +17,10 @@ constexpr int kMostCorners = 32767;
 }  // namespace
 
 int CMassBudgetGrid::GetColCount() {
-  return CMassBudgetDlg::IsAvailable(GetKvs()) ? GetKvs().massBudget->GetCount() : 0;
+  return CMassBudgetDlg::IsAvailable(parts<BasicParts>()) ? parts<BasicParts>().massBudget->GetCount() : 0;
 }
 int CMassBudgetGrid::GetRowCount() {
-  return kCountRow + (GetColCount() == 0 ? 0 : GetKvs().massBudget->GetMaxCorners());
+  return kCountRow + (GetColCount() == 0 ? 0 : parts<BasicParts>().massBudget->GetMaxCorners());
 }
 
 std::string CMassBudgetGrid::GetRowHeader(int row) {
@@ -35,7 +35,7 @@ int CMassBudgetGrid::GetColWidth(int col) {
 }
 
 bool CMassBudgetGrid::styleOf(int row, int col, CellStyle& style) {
-  const CMassBudgetItemKvs* polygon = GetKvs().massBudget->GetItem(col);
+  const CMassBudgetItemKvs* polygon = parts<BasicParts>().massBudget->GetItem(col);
   if (polygon == nullptr) return false;
   const auto corner = static_cast<std::size_t>(row - kCountRow - 1);
   if (row == kAreaRow) {
@@ -51,7 +51,7 @@ bool CMassBudgetGrid::styleOf(int row, int col, CellStyle& style) {
 }
 
 bool CMassBudgetGrid::storeCell(int row, int col, std::string_view text) {
-  CMassBudgetItemKvs& polygon = *GetKvs().massBudget->GetItem(col);
+  CMassBudgetItemKvs& polygon = *parts<BasicParts>().massBudget->GetItem(col);
   const std::string typed(text);
   GridPoint point;
   int number = 0;
@@ -74,9 +74,9 @@ std::string CMassBudgetGrid::editName(int row, int col) {
   return fmt::format("Polygon {}, {}", col, GetRowHeader(row));
 }
 
-bool CMassBudgetDlg::IsAvailable(CGlobalKvs& root) {
-  const std::int32_t code = root.moduleSelection->simulationType;
-  const std::int32_t scheme = root.moduleSelection->adScheme;
+bool CMassBudgetDlg::IsAvailable(BasicParts& basic) {
+  const std::int32_t code = basic.moduleSelection->simulationType;
+  const std::int32_t scheme = basic.moduleSelection->adScheme;
   return (code == module::kAdvectionDispersion || code == module::kMudTransportExpanded ||
           code == module::kEcological) &&
          (scheme == 1 || scheme == -1);
@@ -84,7 +84,7 @@ bool CMassBudgetDlg::IsAvailable(CGlobalKvs& root) {
 
 void CMassBudgetDlg::DoDataExchange(Form& form) {
   AddCount(form, "&Number of polygons:", number_, CMassBudgetKvs::kMostOnPage,
-           [this] { return GetKvs().massBudget->GetCount(); });
+           [this] { return parts<BasicParts>().massBudget->GetCount(); });
   form.DDX_Control("Polygons", grid_);
 }
 
@@ -94,14 +94,15 @@ int CMassBudgetDlg::Initialize() {
 }
 
 void CMassBudgetDlg::SetData() {
-  number_ = GetKvs().massBudget->GetCount();
-  form().of(&number_).enabled = IsAvailable(GetKvs());
+  number_ = parts<BasicParts>().massBudget->GetCount();
+  form().of(&number_).enabled = IsAvailable(parts<BasicParts>());
   UpdateData(false);
 }
 
 int CMassBudgetDlg::GetData() {
   if (!UpdateData(true)) return 0;
-  if (number_ >= 0 && number_ <= CMassBudgetKvs::kMostOnPage) GetKvs().massBudget->SetNoPolygons(number_);
+  if (number_ >= 0 && number_ <= CMassBudgetKvs::kMostOnPage)
+    parts<BasicParts>().massBudget->SetNoPolygons(number_);
   return 1;
 }
 

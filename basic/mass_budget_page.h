@@ -2,6 +2,7 @@
 
 #include <cstdint>
 
+#include "basic/basic_parts.h"
 #include "pages/form_view.h"
 #include "pages/grid_wnd.h"
 
@@ -25,12 +26,12 @@ class CMassBudgetGrid final : public CV27SetupGridWnd {
 // The polygons of the mass budget, for a transport module with one of two schemes.
 class CMassBudgetDlg final : public CV27SetupFormView {
  public:
-  explicit CMassBudgetDlg(CV27SetupDoc& document) : CV27SetupFormView(document, 18715, PageId::massBudget) {}
+  explicit CMassBudgetDlg(CVdDoc& document) : CV27SetupFormView(document, 18715, PageId::massBudget) {}
 
   int GetData() override;
   void SetData() override;
   // Whether the model's module and scheme have a mass budget.
-  static bool IsAvailable(CGlobalKvs& root);
+  static bool IsAvailable(BasicParts& basic);
 
  protected:
   void DoDataExchange(Form& form) override;

@@ -3,7 +3,8 @@
 #include <algorithm>
 #include <array>
 
-#include "core/module_selection.h"
+#include "basic/basic_parts.h"
+#include "basic/module_selection.h"
 
 namespace gridbay {
 namespace {
@@ -54,7 +55,7 @@ int CModuleSelectionDlg::Initialize() {
 }
 
 void CModuleSelectionDlg::SetData() {
-  const CModuleSelectionKvs& selection = *GetKvs().moduleSelection;
+  const CModuleSelectionKvs& selection = *parts<BasicParts>().moduleSelection;
   module_ = placeOf(kCodes, selection.simulationType);
   scheme_ = placeOf(kSchemes, selection.adScheme);
   inlandFlooding_ = selection.hydrodynamicFeatures == 0 ? 1 : 0;
@@ -67,7 +68,7 @@ void CModuleSelectionDlg::SetData() {
 
 int CModuleSelectionDlg::GetData() {
   if (!UpdateData(true)) return 0;
-  CModuleSelectionKvs& selection = *GetKvs().moduleSelection;
+  CModuleSelectionKvs& selection = *parts<BasicParts>().moduleSelection;
   selection.simulationType = valueAt(kCodes, module_);
   selection.adScheme = valueAt(kSchemes, scheme_);
   selection.hydrodynamicFeatures = inlandFlooding_ != 0 ? 0 : 1;

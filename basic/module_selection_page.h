@@ -10,7 +10,7 @@ namespace gridbay {
 // inland one.
 class CModuleSelectionDlg final : public CV27SetupFormView {
  public:
-  explicit CModuleSelectionDlg(CV27SetupDoc& document)
+  explicit CModuleSelectionDlg(CVdDoc& document)
       : CV27SetupFormView(document, 18716, PageId::moduleSelection) {}
 
   int GetData() override;

@@ -4,10 +4,10 @@
 #include <limits>
 #include <utility>
 
+#include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
 #include "basic/bathymetry_requests.h"
 #include "basic/simulation_period.h"
-#include "core/global_kvs.h"
 #include "platform/tsb/tsb_operations.h"
 
 namespace gridbay {
@@ -72,8 +72,8 @@ bool readLandValue(const TsbHeader& header, float& landValue) {
 }  // namespace
 
 unsigned CBathymetryObjectKvs::ReadGrid(ValidationList& messages, int areaNumber) {
-  CGlobalKvs* root = model();
-  const bool hotStart = root != nullptr && root->bathymetry->hotStart == 1;
+  auto* basic = parts<BasicParts>();
+  const bool hotStart = basic != nullptr && basic->bathymetry->hotStart == 1;
   const auto notValid = [&] {
     return report(messages, PageId::bathymetry, Severity::dependedUpon, texts::dataFileNotValid,
                   fileName.text());
@@ -144,8 +144,8 @@ unsigned CBathymetryObjectKvs::ReadGrid(ValidationList& messages, int areaNumber
   enclosingArea = truncated(file.placement(kEnclosingPlace, 0));
   origin = {truncated(file.placement(kOriginJPlace, 0)), truncated(file.placement(kOriginKPlace, 0))};
   if (areaNumber == 1) {
-    root->simulationPeriod->start = file.start;
-    root->simulationPeriod->timeStepInterval = file.timeStep;
+    basic->simulationPeriod->start = file.start;
+    basic->simulationPeriod->timeStepInterval = file.timeStep;
   }
   return 0;
 }

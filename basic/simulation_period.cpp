@@ -3,9 +3,9 @@
 #include <algorithm>
 #include <limits>
 
+#include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
 #include "basic/texts.h"
-#include "core/global_kvs.h"
 #include "platform/units/units.h"
 
 namespace gridbay {
@@ -35,8 +35,8 @@ unsigned CSimulationPeriodKvs::Validate(ValidationList& messages, int) {
   const auto fault = [&messages](const Text& text) {
     return report(messages, PageId::simulationPeriod, Severity::fault, text);
   };
-  CGlobalKvs* root = model();
-  const bool hotStart = root != nullptr && root->bathymetry->hotStart != 0;
+  auto* basic = parts<BasicParts>();
+  const bool hotStart = basic != nullptr && basic->bathymetry->hotStart != 0;
   unsigned faults = 0;
   if (timeStepInterval < kShortestStep) faults += fault(texts::timeStepTooSmall);
   if (noPointsInTime < 0) faults += fault(texts::negativeTimeSteps);

@@ -2,6 +2,7 @@
 
 #include <fmt/format.h>
 
+#include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
 #include "basic/simulation_period.h"
 #include "platform/units/units.h"
@@ -33,7 +34,7 @@ void CSimulationPeriodDlg::DoDataExchange(Form& form) {
 }
 
 void CSimulationPeriodDlg::SetData() {
-  const CSimulationPeriodKvs& period = *GetKvs().simulationPeriod;
+  const CSimulationPeriodKvs& period = *parts<BasicParts>().simulationPeriod;
   last_ = period.noPointsInTime - 1;
   timeStepInterval_ = period.timeStepInterval;
   startDate_ = dateTimeText(period.start);
@@ -53,7 +54,7 @@ int CSimulationPeriodDlg::GetData() {
     return 0;
   }
   if (!UpdateData(true)) return 0;
-  CSimulationPeriodKvs& period = *GetKvs().simulationPeriod;
+  CSimulationPeriodKvs& period = *parts<BasicParts>().simulationPeriod;
   period.noPointsInTime = last_ + 1;
   period.timeStepInterval = timeStepInterval_;
   if (start && !unchanged) period.start = *start;
@@ -62,21 +63,22 @@ int CSimulationPeriodDlg::GetData() {
 }
 
 void CSimulationPeriodDlg::EnableControls() {
-  const bool hotStart = GetKvs().bathymetry->hotStart != 0;
+  const bool hotStart = parts<BasicParts>().bathymetry->hotStart != 0;
   form().of(&timeStepInterval_).readOnly = hotStart;
   form().of(&startDate_).enabled = !hotStart;
   form().of(&warmUpLast_).enabled = !hotStart;
 }
 
 void CSimulationPeriodDlg::ShowEnd() {
-  endDate_ = dateTimeText(GetKvs().simulationPeriod->End());
+  endDate_ = dateTimeText(parts<BasicParts>().simulationPeriod->End());
   form().of(&endDate_).text = endDate_;
 }
 
 void CSimulationPeriodDlg::ShowCourant() {
   double courant = 0;
   int area = 0;
-  GetKvs().bathymetry->GetMaxCourant(GetKvs().simulationPeriod->timeStepInterval, &courant, &area);
+  parts<BasicParts>().bathymetry->GetMaxCourant(parts<BasicParts>().simulationPeriod->timeStepInterval,
+                                                &courant, &area);
   maxCourant_ = fmt::format("{:.6g}", courant);
   courantArea_ = std::to_string(area);
   form().of(&maxCourant_).text = maxCourant_;

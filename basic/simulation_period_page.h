@@ -11,7 +11,7 @@ namespace gridbay {
 // start and the step come from the file and are only shown.
 class CSimulationPeriodDlg final : public CV27SetupFormView {
  public:
-  explicit CSimulationPeriodDlg(CV27SetupDoc& document)
+  explicit CSimulationPeriodDlg(CVdDoc& document)
       : CV27SetupFormView(document, 18926, PageId::simulationPeriod) {}
 
   int GetData() override;

@@ -1,9 +1,7 @@
 #include "basic/source_sink.h"
 
-#include <array>
-
+#include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
-#include "core/global_kvs.h"
 
 namespace gridbay {
 namespace {
@@ -32,8 +30,8 @@ const Text* faultOf(GridPoint point, int areaNumber, const CBathymetryKvs* areas
 }  // namespace
 
 unsigned CSourceSinkObjectKvs::Validate(ValidationList& messages, int, int number) {
-  CGlobalKvs* root = model();
-  const CBathymetryKvs* areas = root == nullptr ? nullptr : root->bathymetry.get();
+  auto* basic = parts<BasicParts>();
+  const CBathymetryKvs* areas = basic == nullptr ? nullptr : basic->bathymetry.get();
   unsigned faults = 0;
   const auto test = [&](GridPoint point, int area, const PointTexts& texts) {
     if (const gridbay::Text* fault = faultOf(point, area, areas, texts); fault != nullptr) {
@@ -56,11 +54,6 @@ std::string CSourceSinkObjectKvs::Text() const {
     default:
       return {};
   }
-}
-
-std::span<const Follower> CSourceSinkKvs::followers() {
-  static constexpr std::array<Follower, 0> kFollowers{};
-  return kFollowers;
 }
 
 void CSourceSinkKvs::Load(KvsSection section, const std::string& documentPath) {

@@ -1,7 +1,6 @@
 #pragma once
 
 #include <cstdint>
-#include <span>
 #include <string>
 
 #include "basic/texts.h"
@@ -51,8 +50,6 @@ class CSourceSinkKvs final : public ListKvs<CSourceSinkKvs, CSourceSinkObjectKvs
     return section("SOURCE_AND_SINK", count("Number_Of_Sources"),
                    items("SOURCE_SINK_%d", texts::sourceSectionMissing));
   }
-
-  static std::span<const Follower> followers();
 
   // Empties the list first.
   void Load(KvsSection section, const std::string& documentPath) override;

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 
+#include "basic/basic_parts.h"
 #include "basic/source_sink.h"
 
 namespace gridbay {
@@ -21,7 +22,9 @@ const std::vector<std::string>& typeTexts() {
 void CSourceSinkGrid::Initialize() {
   constexpr int kTypeWidth = 125;
   constexpr int kWidth = 75;
-  const auto entry = [this](int n) -> CSourceSinkObjectKvs& { return *GetKvs().sourceSink->GetItem(n); };
+  const auto entry = [this](int n) -> CSourceSinkObjectKvs& {
+    return *parts<BasicParts>().sourceSink->GetItem(n);
+  };
   const auto isNot = [entry](std::int32_t type) {
     return [entry, type](int n) { return entry(n).type != type; };
   };
@@ -68,7 +71,7 @@ void CSourceSinkGrid::Initialize() {
 }
 
 int CSourceSinkGrid::ItemCount() {
-  return GetKvs().sourceSink->GetCount();
+  return parts<BasicParts>().sourceSink->GetCount();
 }
 
 bool CSourceSinkGrid::styleOf(int row, int col, CellStyle& style) {
@@ -85,7 +88,7 @@ bool CSourceSinkGrid::storeCell(int row, int col, std::string_view text) {
 
 void CSourceSinkDlg::DoDataExchange(Form& form) {
   AddCount(form, "Number of source sink pairs", number_, kHighestSpin,
-           [this] { return GetKvs().sourceSink->GetCount(); });
+           [this] { return parts<BasicParts>().sourceSink->GetCount(); });
   form.DDX_Control("Sources and sinks", grid_);
 }
 
@@ -95,13 +98,13 @@ int CSourceSinkDlg::Initialize() {
 }
 
 void CSourceSinkDlg::SetData() {
-  number_ = GetKvs().sourceSink->GetCount();
+  number_ = parts<BasicParts>().sourceSink->GetCount();
   UpdateData(false);
 }
 
 int CSourceSinkDlg::GetData() {
   if (!UpdateData(true)) return 0;
-  if (number_ >= 0 && number_ <= kMostOnPage) GetKvs().sourceSink->SetNoSources(number_);
+  if (number_ >= 0 && number_ <= kMostOnPage) parts<BasicParts>().sourceSink->SetNoSources(number_);
   return 1;
 }
 

@@ -23,8 +23,7 @@ class CSourceSinkGrid final : public ColumnGrid {
 // Where water enters or leaves the model.
 class CSourceSinkDlg final : public CV27SetupFormView {
  public:
-  explicit CSourceSinkDlg(CV27SetupDoc& document)
-      : CV27SetupFormView(document, 18929, PageId::sourceAndSink) {}
+  explicit CSourceSinkDlg(CVdDoc& document) : CV27SetupFormView(document, 18929, PageId::sourceAndSink) {}
 
   int GetData() override;
   void SetData() override;

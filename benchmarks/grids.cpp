@@ -9,9 +9,9 @@
 
 #include "basic/bathymetry.h"
 #include "basic/boundary_detection.h"
-#include "core/global_kvs.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_writer.h"
+#include "setup/global_kvs.h"
 
 namespace gridbay {
 namespace {

@@ -6,7 +6,7 @@
 #include <vector>
 
 #include "core/message.h"
-#include "core/setup_file.h"
+#include "setup/setup_file.h"
 
 namespace gridbay::cli {
 

@@ -7,9 +7,9 @@
 #include <limits>
 #include <numeric>
 
-#include "core/global_kvs.h"
 #include "core/kdl_writer.h"
 #include "core/number_text.h"
+#include "setup/global_kvs.h"
 
 namespace gridbay::cli {
 namespace {

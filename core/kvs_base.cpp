@@ -1,6 +1,5 @@
 #include "core/kvs_base.h"
 
-#include "core/global_kvs.h"
 #include "platform/files/paths.h"
 
 namespace gridbay {
@@ -40,10 +39,6 @@ void CKvsBase::CopySection(KvsSection source, KvsFile& destination) {
       for (const Value& value : node->values()) destination.add(value.kind(), value.text());
     }
   }
-}
-
-CGlobalKvs* CKvsBase::model() {
-  return dynamic_cast<CGlobalKvs*>(GetRoot());
 }
 
 void CKvsBase::ShowMessage(const std::string& text) {

@@ -7,8 +7,6 @@
 
 namespace gridbay {
 
-class CGlobalKvs;
-
 // Base of all parts of a model. An object knows its parameters with their defaults, writes itself under the
 // cursor of a parameter file, reads itself from a section, checks itself and copies itself from a like
 // object.
@@ -36,9 +34,14 @@ class CKvsBase {
   // Copies all that a section of a loaded file holds, in order, under the cursor of a file in writing.
   static void CopySection(KvsSection source, KvsFile& destination);
 
+  // The members that a room has in the root of the model, as `parts<BasicParts>()`; null where the object
+  // stands in no whole model.
+  template <class Parts>
+  Parts* parts() {
+    return dynamic_cast<Parts*>(GetRoot());
+  }
+
  protected:
-  // The model that this object is a part of; null where the object stands alone.
-  CGlobalKvs* model();
   // Shows a text to the user through the root's host and returns.
   virtual void ShowMessage(const std::string& text);
 

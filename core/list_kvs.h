@@ -1,23 +1,15 @@
 #pragma once
 
 #include <algorithm>
+#include <array>
 #include <memory>
-#include <span>
 #include <string>
 #include <vector>
 
+#include "core/model_root.h"
 #include "core/table_kvs.h"
 
 namespace gridbay {
-
-// Tells a list that follows another one the new count.
-using Follower = void (*)(CGlobalKvs& root, int count);
-
-// The follower behind a member of the root, for the list of followers that a leader names in order.
-template <auto member>
-void resizeFollower(CGlobalKvs& root, int count) {
-  (root.*member)->SetCount(count);
-}
 
 // A count in a file is believed as far as the sections beside it bear it out, and this much further.
 inline constexpr int kCountSlack = 1024;
@@ -25,8 +17,8 @@ inline constexpr int kCountSlack = 1024;
 // A data object that holds a list of items, in the order of file and screen. The count is the list's length
 // and stands nowhere beside it. `Derived::table()` has among its rows `count` and `items` (below). Derived
 // may have
-//   void initialise(Item&, int number)         a default that depends on the item's place, from 1
-//   static std::span<const Follower> followers()   the lists that are told of each change of the count
+//   void initialise(Item&, int number)   a default that depends on the item's place, from 1
+// The root knows which lists follow this one.
 template <class Derived, class Item>
 class ListKvs : public TableKvs<Derived> {
  public:
@@ -100,11 +92,8 @@ class ListKvs : public TableKvs<Derived> {
 
  protected:
   void notifyFollowers() {
-    CGlobalKvs* root = this->model();
-    if (root == nullptr) return;
-    if constexpr (requires { Derived::followers(); }) {
-      for (const Follower follower : Derived::followers()) follower(*root, GetCount());
-    }
+    const std::array counts{GetCount()};
+    if (auto* root = this->template parts<ModelRoot>()) root->TellFollowers(*this, counts);
   }
 
  private:

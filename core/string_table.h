@@ -1,10 +1,12 @@
 #pragma once
 
-#include <fmt/printf.h>
-
 #include <charconv>
+#include <concepts>
+#include <cstdint>
+#include <initializer_list>
 #include <string>
 #include <string_view>
+#include <variant>
 
 namespace gridbay {
 
@@ -36,9 +38,27 @@ class NumberedText {
   std::size_t prefix_;
 };
 
+// What stands for a placeholder: a whole number, a real one or a text.
+class TextArgument {
+ public:
+  TextArgument(std::integral auto number) : value_(static_cast<std::int64_t>(number)) {}
+  TextArgument(std::floating_point auto number) : value_(double{number}) {}
+  TextArgument(std::string_view text) : value_(text) {}
+  TextArgument(const std::string& text) : value_(std::string_view(text)) {}
+  TextArgument(const char* text) : value_(std::string_view(text)) {}
+
+  const auto& value() const { return value_; }
+
+ private:
+  std::variant<std::int64_t, double, std::string_view> value_;
+};
+
+// A printf format with its placeholders filled in.
+std::string formattedText(std::string_view format, std::initializer_list<TextArgument> arguments);
+
 template <class... Args>
 std::string formatted(const Text& text, const Args&... args) {
-  return fmt::sprintf(text.format, args...);
+  return formattedText(text.format, {TextArgument(args)...});
 }
 
 namespace texts {

@@ -2,9 +2,9 @@
 
 #include <cstdlib>
 
-#include "core/global_kvs.h"
 #include "core/kdl_reader.h"
 #include "core/kdl_writer.h"
+#include "setup/global_kvs.h"
 
 using namespace gridbay;
 

@@ -3,7 +3,7 @@
 #include <cstdlib>
 
 #include "cli/setup_path.h"
-#include "core/setup_file.h"
+#include "setup/setup_file.h"
 
 using namespace gridbay;
 

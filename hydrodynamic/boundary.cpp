@@ -3,9 +3,9 @@
 #include <algorithm>
 #include <filesystem>
 
+#include "basic/basic_parts.h"
 #include "basic/boundary.h"
 #include "basic/simulation_period.h"
-#include "core/global_kvs.h"
 #include "platform/files/paths.h"
 #include "platform/units/units.h"
 
@@ -104,20 +104,21 @@ void CNhdBoundaryObjectKvs::SetDataFormat(std::int32_t format) {
 }
 
 const CBoundaryObjectKvs* CNhdBoundaryObjectKvs::boundary(int number) {
-  CGlobalKvs* root = model();
-  return root == nullptr ? nullptr : root->boundary->GetItem(number);
+  auto* basic = parts<BasicParts>();
+  return basic == nullptr ? nullptr : basic->boundary->GetItem(number);
 }
 
 void CNhdBoundaryObjectKvs::requestAlongBoundary(CVdRqTsbItem& request, int number) {
-  CGlobalKvs* root = model();
-  CBoundaryObjectKvs* line = root == nullptr ? nullptr : root->boundary->GetItem(number);
+  auto* basic = parts<BasicParts>();
+  CBoundaryObjectKvs* line = basic == nullptr ? nullptr : basic->boundary->GetItem(number);
   request.SetDimensions(1);
   request.SetNoPoints(1, line == nullptr ? kNotAlongAnAxis : pointsAlong(*line));
   request.SetInterval(1, line == nullptr ? kNotAlongAnAxis : line->CellSpacing());
 }
 
 void CNhdBoundaryObjectKvs::finishRequest(CVdFileSelectorDlg& selector) {
-  if (CGlobalKvs* root = model(); root != nullptr) root->simulationPeriod->SetRequestPeriod(selector);
+  if (auto* basic = parts<BasicParts>(); basic != nullptr)
+    basic->simulationPeriod->SetRequestPeriod(selector);
   selector.EnablePlugin(0);
   selector.SetVane27Compliant();
 }

@@ -4,8 +4,10 @@
 #include <array>
 #include <cstdio>
 
+#include "basic/basic_parts.h"
 #include "basic/boundary.h"
 #include "basic/page_texts.h"
+#include "hydrodynamic/hydrodynamic_parts.h"
 #include "hydrodynamic/page_texts.h"
 #include "platform/files/paths.h"
 #include "platform/units/units.h"
@@ -106,7 +108,7 @@ void CNhdSineSeriesDlg::OnOK(Object& object) const {
 }
 
 int CNhdBoundaryGrid::GetRowCount() {
-  return kRowsPerBoundary * GetKvs().nhdBoundary->GetCount();
+  return kRowsPerBoundary * parts<HydrodynamicParts>().nhdBoundary->GetCount();
 }
 
 int CNhdBoundaryGrid::GetColWidth(int col) {
@@ -115,7 +117,7 @@ int CNhdBoundaryGrid::GetColWidth(int col) {
 }
 
 CNhdBoundaryObjectKvs* CNhdBoundaryGrid::object(int row) {
-  return GetKvs().nhdBoundary->GetItem(boundaryOf(row));
+  return parts<HydrodynamicParts>().nhdBoundary->GetItem(boundaryOf(row));
 }
 
 CVdEditStyle CNhdBoundaryGrid::levelOrFlux(const Object& object) {
@@ -124,7 +126,7 @@ CVdEditStyle CNhdBoundaryGrid::levelOrFlux(const Object& object) {
 
 bool CNhdBoundaryGrid::styleOf(int row, int col, CellStyle& style) {
   Object* it = object(row);
-  const CBoundaryObjectKvs* boundary = GetKvs().boundary->GetItem(boundaryOf(row));
+  const CBoundaryObjectKvs* boundary = parts<BasicParts>().boundary->GetItem(boundaryOf(row));
   if (it == nullptr || boundary == nullptr) return false;
   style.kind = CellKind::label;
   switch (subRowOf(row)) {

@@ -68,7 +68,7 @@ class CNhdBoundaryGrid final : public CV27SetupGridWnd {
 // The conditions at the open boundaries.
 class CNhdBoundaryDlg final : public CV27SetupFormView {
  public:
-  explicit CNhdBoundaryDlg(CV27SetupDoc& document) : CV27SetupFormView(document, 18705, PageId::hdBoundary) {}
+  explicit CNhdBoundaryDlg(CVdDoc& document) : CV27SetupFormView(document, 18705, PageId::hdBoundary) {}
 
  protected:
   void DoDataExchange(Form& form) override { form.DDX_Control("Boundary conditions", grid_); }

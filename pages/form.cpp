@@ -80,13 +80,22 @@ std::string Control::name() const {
 }
 
 Control& Form::add(ControlKind kind, std::string_view label, Control::Variable variable) {
-  controls_.push_back({.kind = kind, .label = std::string(label), .variable = variable});
+  controls_.push_back({.kind = kind, .label = std::string(label), .variable = variable, .group = group_});
   return controls_.back();
 }
 
 Control& Form::Group(std::string_view caption) {
   return add(ControlKind::group, caption);
 }
+
+Control& Form::Group(std::string_view caption, const std::function<void()>& body) {
+  Control& frame = add(ControlKind::group, caption);
+  Control* outer = std::exchange(group_, &frame);
+  body();
+  group_ = outer;
+  return frame;
+}
+
 Control& Form::Label(std::string_view label, std::string& variable) {
   return add(ControlKind::label, label, &variable);
 }

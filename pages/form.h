@@ -15,7 +15,7 @@ namespace gridbay {
 
 class CV27SetupGridWnd;
 
-enum class ControlKind { group, text, check, radio, dropDown, label, button, grid };
+enum class ControlKind { group, text, check, radio, dropDown, label, button, grid, dateTime };
 
 // One control of a page, as any renderer needs it: what it is, what it shows, whether it can be used, and
 // what happens when the user changes it.
@@ -29,12 +29,19 @@ struct Control {
   int itemCode = 0;                       // the quantity of a number; 0 for a plain one
   CV27SetupGridWnd* grid = nullptr;
 
+  // Where it stands: in a frame, or null for the page itself; and beside the control or frame before it
+  // instead of below it.
+  Control* group = nullptr;
+  bool beside = false;
+  bool isFile = false;  // an edit that holds the name of a file
+
   std::string text = {};  // what an edit or a label shows
   std::string unit = {};  // the symbol of the unit that it is shown in; empty for a plain one
   int index = -1;         // the choice; 0 or 1 of a check box
   bool enabled = true;
   bool visible = true;
   bool readOnly = false;
+  std::string fault = {};  // what is wrong with the text, which is kept as it was typed; empty for nothing
   std::string toolTip = {};
   std::vector<bool> choiceEnabled = {};  // of a radio group; empty when all are
 
@@ -51,6 +58,10 @@ struct Control {
     spinLowest = lowest;
     spinHighest = highest;
     onSpin = std::move(handler);
+    return *this;
+  }
+  Control& Beside() {
+    beside = true;
     return *this;
   }
   Control& Hidden() {
@@ -71,6 +82,8 @@ struct Control {
 class Form {
  public:
   Control& Group(std::string_view caption);
+  // A frame around all that the body adds.
+  Control& Group(std::string_view caption, const std::function<void()>& body);
   Control& Label(std::string_view label, std::string& variable);
   Control& Button(std::string_view label, std::function<void()> pressed);
   Control& DDX_Text(std::string_view label, std::int32_t& variable);
@@ -124,6 +137,7 @@ class Form {
   Control& add(ControlKind kind, std::string_view label, Control::Variable variable = {});
 
   std::deque<Control> controls_;
+  Control* group_ = nullptr;  // that is being filled
   const Control* acting_ = nullptr;
   bool spinning_ = false;
 };

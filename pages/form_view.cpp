@@ -4,7 +4,7 @@
 
 namespace gridbay {
 
-CV27SetupFormView::CV27SetupFormView(CV27SetupDoc& document, std::int32_t templateId, PageId pageId)
+CV27SetupFormView::CV27SetupFormView(CVdDoc& document, std::int32_t templateId, PageId pageId)
     : document_(document), templateId_(templateId), pageId_(pageId) {}
 
 CV27SetupFormView::~CV27SetupFormView() {

@@ -5,10 +5,9 @@
 #include <string_view>
 #include <vector>
 
-#include "core/global_kvs.h"
 #include "core/page_id.h"
 #include "pages/form.h"
-#include "pages/setup_doc.h"
+#include "pages/vd_doc.h"
 
 namespace gridbay {
 
@@ -16,7 +15,7 @@ namespace gridbay {
 // model at once, and what another view changes is loaded anew.
 class CV27SetupFormView {
  public:
-  CV27SetupFormView(CV27SetupDoc& document, std::int32_t templateId, PageId pageId);
+  CV27SetupFormView(CVdDoc& document, std::int32_t templateId, PageId pageId);
   CV27SetupFormView(const CV27SetupFormView&) = delete;
   CV27SetupFormView& operator=(const CV27SetupFormView&) = delete;
   virtual ~CV27SetupFormView();
@@ -37,8 +36,13 @@ class CV27SetupFormView {
   // Names the edit that is being made, for as long as it is made; empty for that of a control.
   void SetEditName(std::string name) { editName_ = std::move(name); }
 
-  CGlobalKvs& GetKvs() { return document_.root(); }
-  CV27SetupDoc& document() { return document_; }
+  // The root of the model, and the members that a room has in it.
+  CKvsBase& GetKvs() { return document_.GetKvs(); }
+  template <class Parts>
+  Parts& parts() {
+    return *GetKvs().parts<Parts>();
+  }
+  CVdDoc& document() { return document_; }
   bool HasBeenTouched(PageId page) const { return document_.HasBeenTouched(page); }
 
   Form& form() { return form_; }
@@ -66,7 +70,7 @@ class CV27SetupFormView {
   void AddAlignBottom(const Control& control) { alignedBottom_.push_back(&control); }
 
  private:
-  CV27SetupDoc& document_;
+  CVdDoc& document_;
   std::int32_t templateId_;
   PageId pageId_;
   Form form_;

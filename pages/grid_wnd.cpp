@@ -15,7 +15,7 @@ int CV27SetupGridWnd::GetStyleRowCol(int row, int col, CellStyle& style) {
   if (row < 0 || col < 0 || row > GetRowCount() || col > GetColCount()) return 0;
   if (!styleOf(row, col, style)) return 0;
   if (style.toolTip.empty() && toolTipColumns_.contains(col))
-    style.toolTip = CV27SetupDoc::GetToolTipsString(style.value);
+    style.toolTip = CVdDoc::GetToolTipsString(style.value);
   return 1;
 }
 

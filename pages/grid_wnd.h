@@ -12,7 +12,8 @@
 
 namespace gridbay {
 
-enum class CellKind { plain, button, dropDown, checkBox, resultFile, mapProjection, label };
+// A multiple choice holds the sum of the bits of its choices: that of the n-th, from 0, is 2 to the power n.
+enum class CellKind { plain, button, dropDown, checkBox, resultFile, mapProjection, label, multiChoice };
 enum class CellAlign { left, right };
 // Keys that mean something to a cell.
 enum class GridKey { browse /* Ctrl+D */, other };
@@ -27,10 +28,18 @@ struct CellStyle {
   bool enabled = true;
   bool readOnly = false;
   bool isHeading = false;  // stands over the rows below, across all columns
+  bool isHeader = false;   // of a further row of headers
+  int span = 1;            // columns that it covers, to the right
 
   // Whether the cell takes a value at all, and whether a user can type one.
   bool takesValue() const { return enabled && !readOnly && kind != CellKind::button; }
   bool editable() const { return takesValue() && kind != CellKind::label; }
+};
+
+// How a row stands out.
+struct RowLook {
+  double height = 1;  // in parts of a usual row's
+  bool lineBelow = false;
 };
 
 // Base of all grids. Cells are not stored: each paint reads the model, and each edit goes there. Rows and
@@ -52,6 +61,13 @@ class CV27SetupGridWnd {
   virtual std::string GetRowHeader(int row) { return std::to_string(row); }
   virtual int GetColWidth(int col) = 0;
   virtual bool ShowsHeaders() const { return true; }
+  // How many columns the header of a column covers, to the right; 0 for one that is covered.
+  virtual int GetHeaderSpan(int) { return 1; }
+  virtual RowLook GetRowLook(int) { return {}; }
+  // False while the grid as a whole does not apply: it is greyed then, and takes nothing.
+  virtual bool IsEnabled() { return true; }
+  // The current cell has come to another row; 0 for none.
+  virtual void OnCurrentRow(int) {}
 
   // Fills the cell's style; 1 when there is such a cell.
   virtual int GetStyleRowCol(int row, int col, CellStyle& style);
@@ -83,7 +99,11 @@ class CV27SetupGridWnd {
   void SetRebuilding(bool rebuilding) { rebuilding_ = rebuilding; }
 
  protected:
-  CGlobalKvs& GetKvs() { return page_->GetKvs(); }
+  CKvsBase& GetKvs() { return page_->GetKvs(); }
+  template <class Parts>
+  Parts& parts() {
+    return page_->parts<Parts>();
+  }
   CV27SetupFormView& page() { return *page_; }
   int UpdateDoc() { return page_->UpdateDoc(); }
   static void SetDisabled(CellStyle& style) { style.enabled = false; }

@@ -29,6 +29,10 @@ class SetupHost : public MessageHost, public FileChooser {
   // A plain file dialog with a filter ("Grids (*.tsb2)|*.tsb2||") and the extension to add; false when it is
   // left.
   virtual bool chooseFile(std::string_view filter, std::string_view extension, std::string* name) = 0;
+  // The same for a file that is to be written; the name gets the extension where it has none.
+  virtual bool chooseSaveFile(std::string_view filter, std::string_view extension, std::string* name) = 0;
+  // A text in a field is no value. Where the field itself shows that, there is nothing more to show.
+  virtual void showFieldFault(const std::string& text) { show(text); }
   // Shows a few controls with OK and Cancel; true for OK. `fault` says what is wrong with what the controls
   // show, and OK does nothing but tell it, until it is empty.
   virtual bool editForm(std::string_view title, Form& form, const std::function<std::string()>& fault) = 0;

@@ -3,9 +3,9 @@
 #include <memory>
 #include <string>
 
-#include "pages/child_frame.h"
 #include "pages/host.h"
 #include "plugin/setup_editor.h"
+#include "setup/child_frame.h"
 
 namespace gridbay {
 

@@ -1,9 +1,9 @@
 #include "plugin/setup_editor.h"
 
-#include "pages/graphical_view.h"
-#include "pages/gridbay_doc.h"
-#include "pages/page_factory.h"
 #include "plugin/cover_pages.h"
+#include "setup/graphical_view.h"
+#include "setup/gridbay_doc.h"
+#include "setup/page_factory.h"
 
 namespace gridbay {
 namespace {

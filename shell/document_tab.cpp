@@ -354,6 +354,15 @@ bool DocumentTab::chooseFile(std::string_view filter, std::string_view extension
   return true;
 }
 
+bool DocumentTab::chooseSaveFile(std::string_view filter, std::string_view extension, std::string* name) {
+  QFileDialog dialog(this, {}, QString::fromStdString(*name), toolkitFilter(filter));
+  dialog.setAcceptMode(QFileDialog::AcceptSave);
+  dialog.setDefaultSuffix(QString::fromUtf8(extension.data(), static_cast<qsizetype>(extension.size())));
+  if (dialog.exec() != QDialog::Accepted) return false;
+  *name = dialog.selectedFiles().value(0).toStdString();
+  return true;
+}
+
 // Picks the file, and an item for each request where the file has more than one; a file that does not meet
 // the request is told why.
 bool DocumentTab::choose(CVdFileSelectorDlg& selector) {

@@ -59,6 +59,7 @@ class DocumentTab final : public QSplitter, public SetupHost {
   bool choose(CVdFileSelectorDlg& selector) override;
   bool askYesNo(const std::string& question) override;
   bool chooseFile(std::string_view filter, std::string_view extension, std::string* name) override;
+  bool chooseSaveFile(std::string_view filter, std::string_view extension, std::string* name) override;
   bool editForm(std::string_view title, Form& form, const std::function<std::string()>& fault) override;
   void openFile(const std::string& path) override { services_.openFile(path); }
   void showMessages(const ValidationList& messages, unsigned faults) override {

@@ -13,7 +13,7 @@
 #include "basic/mass_budget.h"
 #include "basic/source_sink.h"
 #include "core/edition.h"
-#include "core/setup_file.h"
+#include "setup/setup_file.h"
 #include "tests/support/model.h"
 #include "tests/support/temporary_folder.h"
 

@@ -12,10 +12,9 @@ namespace gridbay {
 namespace {
 
 using test::load;
-using test::Model;
 using test::savedText;
 
-// A list of the tests' own that leads two others.
+// A list of the tests' own.
 class Item : public TableKvs<Item> {
  public:
   using TableKvs::TableKvs;
@@ -28,11 +27,6 @@ class Item : public TableKvs<Item> {
   }
 };
 
-std::vector<std::pair<int, int>>& told() {
-  static std::vector<std::pair<int, int>> calls;
-  return calls;
-}
-
 class List : public ListKvs<List, Item> {
  public:
   using ListKvs::ListKvs;
@@ -42,18 +36,30 @@ class List : public ListKvs<List, Item> {
                    items("ITEM_%d", {"Error in the KVS-FILE\nmissing"}));
   }
   void initialise(Item& item, int number) { item.value = 10 * number; }
-  static std::span<const Follower> followers() {
-    static constexpr Follower kFollowers[] = {[](CGlobalKvs&, int n) { told().emplace_back(1, n); },
-                                              [](CGlobalKvs&, int n) { told().emplace_back(2, n); }};
-    return kFollowers;
+};
+
+// A root that keeps who was told of which counts.
+class Root final : public ModelRoot {
+ public:
+  Root() : ModelRoot(nullptr) {}
+  void Save(KvsFile&, const std::string&) override {}
+  void Load(KvsSection, const std::string&) override {}
+  void TellFollowers(const CKvsBase& leader, std::span<const int> counts) override {
+    EXPECT_EQ(counts.size(), 1U);
+    told.emplace_back(&leader, counts.front());
   }
+
+  std::vector<std::pair<const CKvsBase*, int>> told;
+  std::vector<std::string> texts;
+
+ protected:
+  void ShowMessage(const std::string& text) override { texts.push_back(text); }
 };
 
 class ListKvsTest : public ::testing::Test {
  protected:
-  void SetUp() override { told().clear(); }
-  Model model;
-  List list{&model.root};
+  Root root;
+  List list{&root};
 };
 
 TEST_F(ListKvsTest, AnEmptyListSavesItsCountAndNoSection) {
@@ -89,13 +95,13 @@ TEST_F(ListKvsTest, FollowersAreToldEachCountInTheirOrder) {
   list.SetCount(2);
   list.SetCount(2);
   list.SetCount(-5);
-  EXPECT_EQ(told(), (std::vector<std::pair<int, int>>{{1, 2}, {2, 2}, {1, 2}, {2, 2}}));
+  EXPECT_EQ(root.told, (std::vector<std::pair<const CKvsBase*, int>>{{&list, 2}, {&list, 2}}));
 }
 
 TEST_F(ListKvsTest, AListThatStandsAloneHasNobodyToTell) {
   List alone(nullptr);
   alone.SetCount(2);
-  EXPECT_TRUE(told().empty());
+  EXPECT_TRUE(root.told.empty());
 }
 
 TEST_F(ListKvsTest, AMissingSectionIsShownAndTheItemKeepsItsDefaults) {
@@ -104,7 +110,7 @@ TEST_F(ListKvsTest, AMissingSectionIsShownAndTheItemKeepsItsDefaults) {
   EXPECT_EQ(list.GetItem(2)->value, 20);
   EXPECT_EQ(list.GetItem(3)->value, 3);
   EXPECT_EQ(list.other, 5);
-  EXPECT_EQ(model.host.texts, std::vector<std::string>{"Error in the KVS-FILE\nmissing"});
+  EXPECT_EQ(root.texts, std::vector<std::string>{"Error in the KVS-FILE\nmissing"});
 }
 
 TEST_F(ListKvsTest, CountsThatAreMissingOrNegativeOrNoNumbers) {
@@ -119,14 +125,14 @@ TEST_F(ListKvsTest, CountsThatAreMissingOrNegativeOrNoNumbers) {
   list.SetCount(2);
   load(list, "OTHER { Count 1 }");
   EXPECT_EQ(list.GetCount(), 2);
-  EXPECT_TRUE(model.host.texts.empty());
+  EXPECT_TRUE(root.texts.empty());
 }
 
 TEST_F(ListKvsTest, ACountIsBelievedOnlyAsFarAsTheFileBearsItOut) {
   load(list, "LIST { Count 2147483647; ITEM_1 { Value 1 } }");
   EXPECT_EQ(list.GetCount(), 1 + kCountSlack);
-  ASSERT_EQ(model.host.texts.size(), std::size_t{1} + kCountSlack);
-  EXPECT_EQ(model.host.texts.front(),
+  ASSERT_EQ(root.texts.size(), std::size_t{1} + kCountSlack);
+  EXPECT_EQ(root.texts.front(),
             "Error in the KVS-FILE\nSection LIST says 2147483647, which is far more than the 1 sections that "
             "follow; 1025 "
             "are kept");
@@ -147,7 +153,7 @@ TEST_F(ListKvsTest, CopyingRebuildsTheList) {
   list.SetCount(2);
   list.GetItem(2)->value = 99;
   list.other = 4;
-  List copy(&model.root);
+  List copy(&root);
   copy.SetCount(5);
   copy.CopyFrom(list);
   EXPECT_EQ(savedText(copy), savedText(list));

@@ -13,8 +13,8 @@
 #include "basic/source_sink.h"
 #include "core/kdl_reader.h"
 #include "core/kdl_writer.h"
-#include "core/setup_file.h"
 #include "hydrodynamic/boundary.h"
+#include "setup/setup_file.h"
 #include "tests/support/model.h"
 #include "tests/support/temporary_folder.h"
 

@@ -7,7 +7,7 @@
 
 #include "basic/bathymetry.h"
 #include "core/edition.h"
-#include "core/setup_file.h"
+#include "setup/setup_file.h"
 #include "tests/support/programs.h"
 #include "tests/support/temporary_folder.h"
 

@@ -4,10 +4,10 @@
 
 #include <algorithm>
 
-#include "pages/dlg_enumerator.h"
-#include "pages/page_factory.h"
 #include "pages/result_subset.h"
 #include "platform/units/units.h"
+#include "setup/dlg_enumerator.h"
+#include "setup/page_factory.h"
 #include "tests/support/cells.h"
 #include "tests/support/pages.h"
 

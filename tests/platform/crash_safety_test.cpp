@@ -12,8 +12,8 @@
 
 #include "basic/area_description.h"
 #include "basic/boundary.h"
-#include "core/setup_file.h"
 #include "platform/files/save_file.h"
+#include "setup/setup_file.h"
 #include "tests/support/faults.h"
 #include "tests/support/temporary_folder.h"
 

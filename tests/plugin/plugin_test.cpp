@@ -3,10 +3,10 @@
 
 #include "basic/area_description.h"
 #include "core/edition.h"
-#include "pages/graphical_view.h"
-#include "pages/gridbay_doc.h"
 #include "plugin/entry_points.h"
 #include "plugin/launch_records.h"
+#include "setup/graphical_view.h"
+#include "setup/gridbay_doc.h"
 #include "tests/support/pages.h"
 #include "tests/support/programs.h"
 #include "tests/support/temporary_folder.h"

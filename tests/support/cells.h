@@ -45,7 +45,7 @@ class CellsOfAllKinds final : public CV27SetupGridWnd {
 
 class OnePage final : public CV27SetupFormView {
  public:
-  explicit OnePage(CV27SetupDoc& document) : CV27SetupFormView(document, 1, PageId::bathymetry) {}
+  explicit OnePage(CVdDoc& document) : CV27SetupFormView(document, 1, PageId::bathymetry) {}
   CellsOfAllKinds cells;
 
  protected:

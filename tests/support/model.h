@@ -5,10 +5,10 @@
 #include <string_view>
 #include <vector>
 
-#include "core/global_kvs.h"
+#include "basic/module_selection.h"
 #include "core/kdl_reader.h"
 #include "core/kdl_writer.h"
-#include "core/module_selection.h"
+#include "setup/global_kvs.h"
 
 namespace gridbay::test {
 

@@ -10,8 +10,8 @@
 #include "pages/form_view.h"
 #include "pages/grid_wnd.h"
 #include "pages/host.h"
-#include "pages/page_factory.h"
-#include "pages/setup_doc.h"
+#include "setup/page_factory.h"
+#include "setup/setup_doc.h"
 
 namespace gridbay::test {
 
@@ -31,6 +31,13 @@ class TestHost : public SetupHost {
     return true;
   }
   bool chooseFile(std::string_view, std::string_view, std::string*) override { return false; }
+  bool chooseSaveFile(std::string_view filter, std::string_view extension, std::string* name) override {
+    filters.emplace_back(filter);
+    extensions.emplace_back(extension);
+    if (!chosenFile) return false;
+    *name = *chosenFile;
+    return true;
+  }
   bool editForm(std::string_view title, Form& form, const std::function<std::string()>& fault) override {
     titles.emplace_back(title);
     if (!fillForm || !fillForm(form)) return false;
@@ -48,6 +55,7 @@ class TestHost : public SetupHost {
   std::vector<std::string> texts;
   std::vector<std::string> questions;
   std::vector<std::string> filters;
+  std::vector<std::string> extensions;  // asked for by save dialogs
   std::vector<std::string> titles;
   std::vector<std::string> opened;
   ValidationList shown;

@@ -1,4 +1,4 @@
-#include "pages/navigation_tree.h"
+#include "setup/navigation_tree.h"
 
 #include <algorithm>
 #include <array>
@@ -6,8 +6,8 @@
 
 #include "basic/bathymetry.h"
 #include "basic/mass_budget.h"
+#include "basic/module_selection.h"
 #include "core/edition.h"
-#include "core/module_selection.h"
 
 namespace gridbay {
 namespace {

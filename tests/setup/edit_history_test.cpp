@@ -1,12 +1,12 @@
-#include "pages/edit_history.h"
+#include "setup/edit_history.h"
 
 #include <gmock/gmock.h>
 
 #include "basic/area_description.h"
 #include "basic/bathymetry.h"
 #include "basic/boundary.h"
+#include "basic/module_selection.h"
 #include "core/edition.h"
-#include "core/module_selection.h"
 #include "hydrodynamic/boundary.h"
 #include "tests/support/grids.h"
 #include "tests/support/pages.h"

@@ -1,4 +1,4 @@
-#include "pages/edit_history.h"
+#include "setup/edit_history.h"
 
 #include "core/kdl_reader.h"
 #include "core/kdl_writer.h"
@@ -33,14 +33,14 @@ void EditHistory::start(CGlobalKvs& model, std::string documentPath, const Touch
   saved_ = 0;
   touched_ = touched;
   texts_.clear();
-  for (CKvsBase* part : model.parts()) texts_.push_back(textOf(*part, documentPath_));
+  for (CKvsBase* part : model.children()) texts_.push_back(textOf(*part, documentPath_));
 }
 
 bool EditHistory::record(CGlobalKvs& model, PageId page, std::string name, bool continues,
                          const Touched& touched) {
   Step step{page, std::move(name), continues, {}, touched_, touched};
   touched_ = touched;
-  const std::vector<CKvsBase*> parts = model.parts();
+  const std::vector<CKvsBase*> parts = model.children();
   for (std::size_t part = 0; part < parts.size(); ++part) {
     std::string now = textOf(*parts[part], documentPath_);
     if (now == texts_[part]) continue;
@@ -84,7 +84,7 @@ const EditHistory::Step* EditHistory::nextOfRun(const Step& step, const Step* ne
 // A count that one part takes up again reaches its followers, which is why the parts are looked at once more.
 void EditHistory::restore(CGlobalKvs& model, const Step& step, std::string PartChange::*side) {
   for (const PartChange& change : step.changes) texts_[change.part] = change.*side;
-  const std::vector<CKvsBase*> parts = model.parts();
+  const std::vector<CKvsBase*> parts = model.children();
   constexpr int kPasses = 2;
   for (int pass = 0; pass < kPasses; ++pass) {
     for (std::size_t part = 0; part < parts.size(); ++part) {

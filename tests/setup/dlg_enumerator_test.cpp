@@ -1,4 +1,4 @@
-#include "pages/dlg_enumerator.h"
+#include "setup/dlg_enumerator.h"
 
 #include <gtest/gtest.h>
 

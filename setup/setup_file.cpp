@@ -1,9 +1,9 @@
-#include "core/setup_file.h"
+#include "setup/setup_file.h"
 
 #include <array>
 #include <utility>
 
-#include "core/module_selection.h"
+#include "basic/module_selection.h"
 
 namespace gridbay {
 namespace {

@@ -6,8 +6,8 @@
 #include <string_view>
 #include <vector>
 
-#include "core/global_kvs.h"
-#include "pages/dlg_enumerator.h"
+#include "setup/dlg_enumerator.h"
+#include "setup/global_kvs.h"
 
 namespace gridbay {
 

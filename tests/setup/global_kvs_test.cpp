@@ -1,4 +1,4 @@
-#include "core/global_kvs.h"
+#include "setup/global_kvs.h"
 
 #include <gmock/gmock.h>
 
@@ -9,7 +9,7 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "core/edition.h"
-#include "core/setup_file.h"
+#include "setup/setup_file.h"
 #include "tests/support/model.h"
 #include "tests/support/temporary_folder.h"
 

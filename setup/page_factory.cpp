@@ -1,4 +1,4 @@
-#include "pages/page_factory.h"
+#include "setup/page_factory.h"
 
 #include "basic/area_description_page.h"
 #include "basic/bathymetry_page.h"
@@ -13,13 +13,13 @@ namespace gridbay {
 namespace {
 
 template <class Page>
-std::unique_ptr<CV27SetupFormView> make(CV27SetupDoc& document) {
+std::unique_ptr<CV27SetupFormView> make(CVdDoc& document) {
   return std::make_unique<Page>(document);
 }
 
 struct Entry {
   std::string_view pageClass;
-  std::unique_ptr<CV27SetupFormView> (*make)(CV27SetupDoc&);
+  std::unique_ptr<CV27SetupFormView> (*make)(CVdDoc&);
 };
 
 constexpr Entry kPages[] = {
@@ -35,7 +35,7 @@ constexpr Entry kPages[] = {
 
 }  // namespace
 
-std::unique_ptr<CV27SetupFormView> makePage(std::string_view pageClass, CV27SetupDoc& document) {
+std::unique_ptr<CV27SetupFormView> makePage(std::string_view pageClass, CVdDoc& document) {
   for (const Entry& entry : kPages) {
     if (entry.pageClass != pageClass) continue;
     std::unique_ptr<CV27SetupFormView> page = entry.make(document);

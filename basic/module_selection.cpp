@@ -1,4 +1,4 @@
-#include "core/module_selection.h"
+#include "basic/module_selection.h"
 
 namespace gridbay {
 

@@ -5,8 +5,8 @@
 #include <string>
 #include <vector>
 
-#include "core/global_kvs.h"
 #include "core/page_id.h"
+#include "setup/global_kvs.h"
 
 namespace gridbay {
 
@@ -18,7 +18,7 @@ class EditHistory {
   using Touched = std::set<PageId>;
 
   struct PartChange {
-    std::size_t part;  // its place among CGlobalKvs::parts()
+    std::size_t part;  // its place among CGlobalKvs::children()
     std::string before;
     std::string after;
   };

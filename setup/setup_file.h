@@ -5,9 +5,9 @@
 #include <string>
 #include <vector>
 
-#include "core/global_kvs.h"
 #include "core/kvs.h"
 #include "platform/result.h"
+#include "setup/global_kvs.h"
 
 namespace gridbay {
 

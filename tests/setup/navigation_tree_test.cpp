@@ -1,11 +1,11 @@
-#include "pages/navigation_tree.h"
+#include "setup/navigation_tree.h"
 
 #include <gtest/gtest.h>
 
 #include "basic/bathymetry.h"
 #include "basic/mass_budget.h"
+#include "basic/module_selection.h"
 #include "core/edition.h"
-#include "core/module_selection.h"
 #include "tests/support/model.h"
 
 namespace gridbay {

@@ -5,9 +5,9 @@
 #include <string>
 #include <string_view>
 
-#include "pages/dlg_enumerator.h"
-#include "pages/navigation_tree.h"
-#include "pages/setup_doc.h"
+#include "setup/dlg_enumerator.h"
+#include "setup/navigation_tree.h"
+#include "setup/setup_doc.h"
 
 namespace gridbay {
 

@@ -1,4 +1,4 @@
-#include "pages/graphical_view.h"
+#include "setup/graphical_view.h"
 
 #include "core/string_table.h"
 #include "platform/files/paths.h"

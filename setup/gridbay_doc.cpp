@@ -1,4 +1,4 @@
-#include "pages/gridbay_doc.h"
+#include "setup/gridbay_doc.h"
 
 #include "core/edition.h"
 

@@ -1,4 +1,4 @@
-#include "pages/setup_doc.h"
+#include "setup/setup_doc.h"
 
 #include <gmock/gmock.h>
 

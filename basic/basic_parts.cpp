@@ -1,0 +1,16 @@
+#include "basic/basic_parts.h"
+
+#include "basic/area_description.h"
+#include "basic/bathymetry.h"
+#include "basic/boundary.h"
+#include "basic/mass_budget.h"
+#include "basic/module_selection.h"
+#include "basic/simulation_period.h"
+#include "basic/source_sink.h"
+
+namespace gridbay {
+
+BasicParts::BasicParts() = default;
+BasicParts::~BasicParts() = default;
+
+}  // namespace gridbay

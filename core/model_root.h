@@ -1,0 +1,18 @@
+#pragma once
+
+#include <span>
+
+#include "core/kvs_base.h"
+
+namespace gridbay {
+
+// What a part may ask of the root of its model beside its members, which each room declares for itself.
+class ModelRoot : public CKvsBase {
+ public:
+  using CKvsBase::CKvsBase;
+
+  // Tells all lists that follow this one, in their order, what its counts are now; a list has one.
+  virtual void TellFollowers(const CKvsBase& leader, std::span<const int> counts) = 0;
+};
+
+}  // namespace gridbay

@@ -1,0 +1,18 @@
+#pragma once
+
+#include <memory>
+
+namespace gridbay {
+
+class CNhdBoundaryKvs;
+
+// The conditions and results of the flow calculation, as members of the root. None is ever null while the root
+// lives.
+struct HydrodynamicParts {
+  HydrodynamicParts();
+  ~HydrodynamicParts();
+
+  std::unique_ptr<CNhdBoundaryKvs> nhdBoundary;
+};
+
+}  // namespace gridbay

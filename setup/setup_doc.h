@@ -1,0 +1,55 @@
+#pragma once
+
+#include <string>
+
+#include "pages/vd_doc.h"
+#include "setup/edit_history.h"
+#include "setup/setup_file.h"
+
+namespace gridbay {
+
+// A document: a model that is never without its parts, the file it is saved in, and the history of its edits.
+// It knows of no window.
+class CV27SetupDoc : public CVdDoc {
+ public:
+  explicit CV27SetupDoc(SetupHost& host);
+
+  CGlobalKvs& root() { return setup_.model(); }
+  CKvsBase& GetKvs() override { return root(); }
+
+  // A fresh model without a file.
+  virtual bool OnNewDocument();
+  // Reads a setup. On failure the reason is shown, and the document is as it was.
+  bool OnOpenDocument(const std::string& path);
+  // Writes the setup and makes the path the document's own. On failure the reason is shown. A setup that was
+  // read with sections which this version does not know is not written without them unless the user agrees.
+  bool OnSaveDocument(const std::string& path);
+
+  // All faults of the model.
+  unsigned ValidateData(ValidationList& messages) { return root().Validate(messages, 1); }
+  void SetEngine(std::string name) { engine_ = std::move(name); }
+  const std::string& engine() const { return engine_; }
+
+  // Writes what a save would to another file, for when this program ends before the save; and takes such a
+  // file up again as unsaved edits of the setup at `path`, which may be empty.
+  Outcome WriteRecoveryCopy(const std::string& copy);
+  bool OnRecoverDocument(const std::string& copy, const std::string& path);
+
+  void RecordEdit(PageId page, std::string name, bool continues = false) override;
+  // The step that comes next; null when there is none.
+  const EditHistory::Step* UndoStep() const { return history_.undoStep(); }
+  const EditHistory::Step* RedoStep() const { return history_.redoStep(); }
+  void Undo();
+  void Redo();
+
+ private:
+  bool mayLeaveOut(const std::string& path);
+  void start(SetupFile setup, const std::string& path, bool modified);
+
+  SetupFile setup_;
+  std::string engine_;
+  EditHistory history_;
+  bool leavesOut_ = false;  // the user has agreed
+};
+
+}  // namespace gridbay

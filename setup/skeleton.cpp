@@ -1,0 +1,173 @@
+#include "setup/skeleton.h"
+
+#include <memory>
+
+#include "basic/area_description.h"
+#include "basic/bathymetry.h"
+#include "basic/boundary.h"
+#include "basic/mass_budget.h"
+#include "basic/module_selection.h"
+#include "basic/simulation_period.h"
+#include "basic/source_sink.h"
+#include "hydrodynamic/boundary.h"
+
+namespace gridbay {
+namespace {
+
+using G = CGlobalKvs;
+
+template <auto at>
+void create(G& root) {
+  using Child = typename std::remove_reference_t<decltype(root.*at)>::element_type;
+  root.*at = std::make_unique<Child>(&root);
+}
+
+template <auto at>
+CKvsBase& object(G& root) {
+  return *(root.*at);
+}
+
+template <auto at>
+constexpr MemberRow member(void (*setUp)(G&) = nullptr) {
+  return {create<at>, object<at>, setUp};
+}
+
+constexpr FileRow in(std::string_view place, Condition condition = nullptr) {
+  return {FileRow::What::place, place, nullptr, condition};
+}
+
+template <auto at>
+constexpr FileRow child(Condition condition = nullptr) {
+  return {FileRow::What::child, {}, object<at>, condition};
+}
+
+// The engine's options, which the editor does not know and must not lose.
+constexpr FileRow options() {
+  return {FileRow::What::options};
+}
+
+constexpr FileRow zeroKeyword(std::string_view keyword) {
+  return {FileRow::What::zeroKeyword, keyword};
+}
+
+template <auto at>
+constexpr CheckRow check(Condition condition = nullptr) {
+  return {object<at>, condition};
+}
+
+template <std::int32_t code>
+bool runs(const G& root) {
+  return root.moduleSelection->simulationType == code;
+}
+
+constexpr Condition kAd = runs<module::kAdvectionDispersion>;
+constexpr Condition kMud = runs<module::kMudTransport>;
+constexpr Condition kExpandedMud = runs<module::kMudTransportExpanded>;
+constexpr Condition kEcology = runs<module::kEcological>;
+
+constexpr MemberRow kMembers[] = {
+    member<&G::moduleSelection>(), member<&G::bathymetry>(),      member<&G::simulationPeriod>(),
+    member<&G::boundary>(),        member<&G::sourceSink>(),      member<&G::massBudget>(),
+    member<&G::areaDescription>(), member<&G::nhdBoundary>(),
+};
+
+constexpr void (*kStartingCounts[])(G&) = {
+    [](G& root) { root.bathymetry->SetNoAreas(1); },
+};
+
+constexpr FileRow kSaving[] = {
+    in("NESTED_MODEL_GLOBALS"),
+    options(),
+    child<&G::moduleSelection>(),
+    child<&G::bathymetry>(),
+    child<&G::boundary>(),
+    child<&G::sourceSink>(),
+    child<&G::areaDescription>(),
+    child<&G::simulationPeriod>(),
+    child<&G::massBudget>(),
+
+    in("HYDRODYNAMIC_MODULE"),
+    options(),
+    child<&G::nhdBoundary>(),
+    in("HYDRODYNAMIC_MODULE/STRUCTURE_MODULE"),
+    in("HYDRODYNAMIC_MODULE/STRUCTURES"),
+
+    in("ADVECTION_DISPERSION_MODULE"),
+    options(),
+    in("ADVECTION_DISPERSION_MODULE/Cohesive_Sediment_Conditions", kAd),
+    zeroKeyword("No_of_Sediment_Fractions"),
+
+    in("MUD_TRANSPORT_MODULE"),
+    options(),
+    in("MUD_TRANSPORT_MODULE/MT_PARAMETERS", kMud),
+
+    in("MUD_TRANSPORT_EXPANDED_MODULE"),
+    options(),
+    in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/WAVE_DATA", kExpandedMud),
+    in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/DREDGING", kExpandedMud),
+    in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters/FALL_VELOCITY_PARAMETERS", kExpandedMud),
+    in("MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/EROSION_COEFFICIENTS", kExpandedMud),
+    in("MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/SLIDING", kExpandedMud),
+    // Saved in here, but looked for at the top of the source: so its options come through only from there.
+    in("MUD_TRANSPORT_EXPANDED_MODULE/XENOBIOTIC_MODULE", kExpandedMud),
+    options(),
+
+    in("BIO_RIG_MODULE"),
+    options(),
+    in("BIO_RIG_MODULE/AD_TRANSPORT_PARAMETERS", kEcology),
+};
+
+// The module selection comes first: what else is read depends on it.
+constexpr FileRow kLoading[] = {
+    in("NESTED_MODEL_GLOBALS"),
+    child<&G::moduleSelection>(),
+    child<&G::bathymetry>(),
+    child<&G::boundary>(),
+    child<&G::sourceSink>(),
+    child<&G::areaDescription>(),
+    child<&G::simulationPeriod>(),
+    child<&G::massBudget>(),
+
+    in("HYDRODYNAMIC_MODULE"),
+    child<&G::nhdBoundary>(),
+};
+
+constexpr CheckRow kChecking[] = {
+    check<&G::bathymetry>(), check<&G::areaDescription>(), check<&G::simulationPeriod>(),
+    check<&G::boundary>(),   check<&G::sourceSink>(),      check<&G::massBudget>(),
+    check<&G::nhdBoundary>(),
+};
+
+}  // namespace
+
+std::span<const MemberRow> members() {
+  return kMembers;
+}
+
+std::span<void (*const)(CGlobalKvs&)> startingCounts() {
+  return kStartingCounts;
+}
+
+std::span<const FileRow> savingOrder() {
+  return kSaving;
+}
+
+std::span<const FileRow> loadingOrder() {
+  return kLoading;
+}
+
+std::span<const CheckRow> checkingOrder() {
+  return kChecking;
+}
+
+std::vector<std::string_view> sectionsOf(std::string_view place) {
+  std::vector<std::string_view> parts;
+  for (std::size_t start = 0; start <= place.size();) {
+    const std::size_t end = std::min(place.find('/', start), place.size());
+    parts.push_back(place.substr(start, end - start));
+    start = end + 1;
+  }
+  return parts;
+}
+
+}  // namespace gridbay
