@@ -38,13 +38,17 @@ std::string completeProjection(const TsbGeography& place) {
 
 void CBathymetryKvs::OverlandFileRow::save(const CBathymetryKvs& areas, KvsFile& file,
                                            const std::string& documentPath) const {
-  areas.overlandFile.Save(file, documentPath, "Overland_Filename");
+  areas.overlandFile.Save(file, documentPath, name);
 }
 
 void CBathymetryKvs::OverlandFileRow::load(CBathymetryKvs& areas, KvsSection from,
                                            const std::string& documentPath) const {
-  if (kvsKeywordByNameNum(from, "Overland_Solver", 1) == nullptr) return;
-  areas.overlandFile.Load(from, documentPath, "Overland_Filename");
+  if (kvsKeywordByNameNum(from, "Overland_Solver", 1) != nullptr) set(areas, from, documentPath);
+}
+
+void CBathymetryKvs::OverlandFileRow::set(CBathymetryKvs& areas, KvsSection from,
+                                          const std::string& documentPath) const {
+  areas.overlandFile.Load(from, documentPath, name);
 }
 
 unsigned CBathymetryKvs::Validate(ValidationList& messages, int deep) {

@@ -15,6 +15,8 @@ namespace gridbay {
 // the spacing and the land value; before it has been read they are 0 and the grid is empty.
 class CBathymetryObjectKvs final : public TableKvs<CBathymetryObjectKvs> {
  public:
+  static constexpr bool kReadsOtherFiles = true;
+
   using TableKvs::TableKvs;
 
   GridPoint origin{3, 3};          // the point of the enclosing grid that holds this area's first point
@@ -28,9 +30,11 @@ class CBathymetryObjectKvs final : public TableKvs<CBathymetryObjectKvs> {
   UFileName fileName;
 
   static constexpr auto table() {
-    return keywords(section("DATA_FILE", keyword("FILE_NAME", &CBathymetryObjectKvs::fileName)),
-                    keyword("Origin", &CBathymetryObjectKvs::origin),
-                    keyword("Enclosing_Area", &CBathymetryObjectKvs::enclosingArea));
+    using Self = CBathymetryObjectKvs;
+    return keywords(
+        section("DATA_FILE", keyword("FILE_NAME", &Self::fileName)), keyword("Origin", &Self::origin),
+        keyword("Enclosing_Area", &Self::enclosingArea),
+        fromOtherFiles(&Self::noJ, &Self::noK, &Self::dx, &Self::dy, &Self::landValue, &Self::grid));
   }
 
   // Reads the area's file into the object; areaNumber from 1. Returns the number of errors, with a message
@@ -65,6 +69,9 @@ class CBathymetryKvs final : public ListKvs<CBathymetryKvs, CBathymetryObjectKvs
     void save(const CBathymetryKvs& areas, KvsFile& file, const std::string& documentPath) const;
     void load(CBathymetryKvs& areas, KvsSection from, const std::string& documentPath) const;
     void copy(CBathymetryKvs&, const CBathymetryKvs&) const {}
+    static constexpr std::string_view name = "Overland_Filename";
+    void set(CBathymetryKvs& areas, KvsSection from, const std::string& documentPath) const;
+    static constexpr auto members() { return std::tuple(&CBathymetryKvs::overlandFile); }
   };
 
   static constexpr auto table() {
@@ -73,7 +80,8 @@ class CBathymetryKvs final : public ListKvs<CBathymetryKvs, CBathymetryObjectKvs
                    notCopied(pinned(keyword("Land_Slides", &CBathymetryKvs::landSlides), false)),
                    notCopied(keyword("Overland_Solver", &CBathymetryKvs::overlandSolver)), OverlandFileRow{},
                    pinnedCount("No_Of_Areas", 1), keyword("Hot_Start", &CBathymetryKvs::hotStart),
-                   items("AREA_%d", texts::bathymetrySectionMissing));
+                   items("AREA_%d", texts::bathymetrySectionMissing),
+                   fromOtherFiles(&CBathymetryKvs::projectionStale));
   }
 
   void initialise(CBathymetryObjectKvs& area, int number) { area.enclosingArea = number - 1; }

@@ -6,6 +6,11 @@
 #include "basic/bathymetry.h"
 
 namespace gridbay {
+namespace {
+
+constexpr GridPoint kNewCorner{1, 1};
+
+}  // namespace
 
 void CMassBudgetItemKvs::CornersRow::save(const CMassBudgetItemKvs& polygon, KvsFile& file,
                                           const std::string&) const {
@@ -26,6 +31,28 @@ void CMassBudgetItemKvs::CornersRow::load(CMassBudgetItemKvs& polygon, KvsSectio
     kvsGetListParam(from, formatted(corner, number), 1, "ii", &point.j, &point.k);
     polygon.corners.push_back(point);
   }
+}
+
+bool CMassBudgetItemKvs::CornersRow::access(CMassBudgetItemKvs& polygon, std::string_view path,
+                                            PathAccess& access) const {
+  constexpr std::int32_t kMostCorners = 32767;
+  const bool isSet = access.what == PathAccess::What::set;
+  if (sameName(path, count)) {
+    auto number = static_cast<std::int32_t>(polygon.corners.size());
+    if (isSet) kvsGetParam(access.in, count, &number, 1, 1);
+    if (number >= 0 && number <= kMostCorners)
+      polygon.corners.resize(static_cast<std::size_t>(number), kNewCorner);
+    if (access.what == PathAccess::What::write)
+      kvsPutParam(*access.out, count, static_cast<std::int32_t>(polygon.corners.size()));
+    return true;
+  }
+  const std::optional<int> number = numberIn(path, corner);
+  if (!number || *number < 1 || *number > static_cast<int>(polygon.corners.size())) return false;
+  GridPoint& point = polygon.corners[static_cast<std::size_t>(*number) - 1];
+  if (isSet) kvsGetListParam(access.in, path, 1, "ii", &point.j, &point.k);
+  if (access.what == PathAccess::What::write)
+    kvsPutListParam(*access.out, formatted(corner, *number), "ii", point.j, point.k);
+  return true;
 }
 
 unsigned CMassBudgetItemKvs::Validate(ValidationList& messages, int) {

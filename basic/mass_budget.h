@@ -27,6 +27,8 @@ class CMassBudgetItemKvs final : public TableKvs<CMassBudgetItemKvs> {
     void copy(CMassBudgetItemKvs& polygon, const CMassBudgetItemKvs& other) const {
       polygon.corners = other.corners;
     }
+    static constexpr auto members() { return std::tuple(&CMassBudgetItemKvs::corners); }
+    bool access(CMassBudgetItemKvs& polygon, std::string_view path, PathAccess& access) const;
   };
 
   static constexpr auto table() {

@@ -28,11 +28,12 @@ class CModuleSelectionKvs final : public TableKvs<CModuleSelectionKvs> {
   std::int32_t hydrodynamicFeatures = 1;  // 0 for inland flooding
 
   static constexpr auto table() {
-    return section("MODULE_SELECTION",
-                   pinned(keyword("Simulation_Type", &CModuleSelectionKvs::simulationType), kPinnedType),
-                   pinned(keyword("AD_Scheme", &CModuleSelectionKvs::adScheme), kPinnedScheme),
-                   pinned(keyword("hydrodynamic_features", &CModuleSelectionKvs::hydrodynamicFeatures),
-                          kPinnedFeatures));
+    return section(
+        "MODULE_SELECTION",
+        pinned(keyword("Simulation_Type", &CModuleSelectionKvs::simulationType), kPinnedType),
+        pinned(keyword("AD_Scheme", &CModuleSelectionKvs::adScheme), kPinnedScheme),
+        pinned(keyword("hydrodynamic_features", &CModuleSelectionKvs::hydrodynamicFeatures), kPinnedFeatures),
+        offFile(&CModuleSelectionKvs::highPrecision));
   }
 
   void Load(KvsSection section, const std::string& documentPath) override;

@@ -28,6 +28,7 @@ class CSimulationPeriodKvs final : public TableKvs<CSimulationPeriodKvs> {
     void copy(CSimulationPeriodKvs& period, const CSimulationPeriodKvs& other) const {
       period.noPointsInTime = other.noPointsInTime;
     }
+    static constexpr auto members() { return std::tuple(&CSimulationPeriodKvs::noPointsInTime); }
   };
 
   static constexpr auto table() {

@@ -12,7 +12,7 @@ void Console::note(std::string_view text) const {
 }
 
 int saveSetup(SetupFile& setup, const std::string& path, const Console& console) {
-  for (const std::string& section : setup.unknownSections(path)) {
+  for (const std::string& section : setup.unknownSections()) {
     console.note("Warning: this version does not know section " + section +
                  ", which is left out of the saved file");
   }

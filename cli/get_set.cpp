@@ -1,9 +1,9 @@
 #include <fmt/format.h>
 
 #include "cli/commands.h"
+#include "cli/member_keyword.h"
 #include "cli/setup_path.h"
 #include "core/kdl_writer.h"
-#include "core/number_text.h"
 
 namespace gridbay::cli {
 namespace {
@@ -29,11 +29,13 @@ int show(const Node& node, const Console& console) {
   return kClean;
 }
 
-// What the file says, or where it says nothing the value that then stands.
+// What a keyword holds now; where the model has none of that path, what the file has there.
 int get(const GetOptions& options, const Console& console) {
   ConsoleMessageHost host(console);
   Result<SetupFile> setup = SetupFile::open(options.file, &host);
   if (!setup) return console.fail(setup.error());
+  if (const Result<MemberKeyword> keyword = findKeyword(setup->model(), options.path, options.file))
+    return show(keyword->node(), console);
   if (const Result<const Node*> found = findPath(setup->source(), options.path))
     return show(**found, console);
   const KvsHandle effective = setup->tree(options.file);
@@ -42,49 +44,60 @@ int get(const GetOptions& options, const Console& console) {
   return show(**found, console);
 }
 
-// Whether the values came through the model: an edition may have its own.
-bool stands(const Node& keyword, const std::vector<Value>& wanted) {
-  const std::span<const Value> now = keyword.values();
-  return std::ranges::equal(now, wanted, [](const Value& a, const Value& b) {
-    if (a.kind() == ValueKind::real) return floatOfText(a.text()) == floatOfText(b.text());
-    return a.text() == b.text();
-  });
+struct Setting {
+  std::string path;
+  std::string value;
+};
+
+Result<Setting> settingOf(const std::string& text) {
+  const std::size_t equals = text.find('=');
+  if (equals == text.npos) return Failure{fmt::format("\"{}\" is not of the form PATH=VALUE", text)};
+  return Setting{text.substr(0, equals), text.substr(equals + 1)};
+}
+
+// The engine's options are not in the model: a save passes on what stands in the file that was read.
+Outcome setOption(SetupFile& setup, const Setting& setting) {
+  const Result<const Node*> keyword = findPath(setup.source(), setting.path);
+  if (!keyword) return Failure{keyword.error()};
+  if ((*keyword)->isSection())
+    return Failure{fmt::format("\"{}\" is a section; name a keyword in it", setting.path)};
+  ParameterTree keeper;
+  const Result<std::vector<Value>> values = valuesOfText(**keyword, setting.value, false, keeper);
+  if (!values) return Failure{values.error()};
+  setup.replaceSource(withValues(setup.source(), *keyword, *values));
+  return {};
+}
+
+Outcome setMember(SetupFile& setup, const Setting& setting, const std::string& file) {
+  Result<MemberKeyword> keyword = findKeyword(setup.model(), setting.path, file);
+  if (!keyword) {
+    const KvsHandle effective = setup.tree(file);
+    const Result<const Node*> found = findPath(*effective, setting.path);
+    return found && (*found)->isSection()
+               ? Failure{fmt::format("\"{}\" is a section; name a keyword in it", setting.path)}
+               : Failure{found ? keyword.error() : found.error()};
+  }
+  ParameterTree keeper;
+  const Result<std::vector<Value>> values =
+      valuesOfText(keyword->node(), setting.value, keyword->takesAnyNumber(), keeper);
+  if (!values) return Failure{values.error()};
+  if (keyword->set(*values)) return {};
+  return Failure{fmt::format("{} cannot be {} here: it stays {}", setting.path, setting.value,
+                             shownValues(keyword->node()))};
 }
 
 int set(const SetOptions& options, const Console& console) {
   ConsoleMessageHost host(console);
-  Result<SetupFile> opened = SetupFile::open(options.file, &host);
-  if (!opened) return console.fail(opened.error());
-  SetupFile setup = std::move(*opened);
-  for (const std::string& setting : options.settings) {
-    const std::size_t equals = setting.find('=');
-    if (equals == setting.npos)
-      return console.fail(fmt::format("\"{}\" is not of the form PATH=VALUE", setting));
-    const std::string path = setting.substr(0, equals);
-    const KvsHandle now = setup.tree(options.file);
-    const Result<const Node*> keyword = findPath(*now, path);
-    if (!keyword) return console.fail(keyword.error());
-    if ((*keyword)->isSection())
-      return console.fail(fmt::format("\"{}\" is a section; name a keyword in it", path));
-    ParameterTree keeper;
-    const Result<std::vector<Value>> values = valuesOfText(**keyword, setting.substr(equals + 1), keeper);
-    if (!values) return console.fail(values.error());
-    // A new count has no sections for its new items yet: what the load says of that is no fault here.
-    CollectingMessageHost expected;
-    SetupFile changed = SetupFile::fromTree(withValues(*now, *keyword, *values), options.file, &expected);
-    const KvsHandle result = changed.tree(options.file);
-    const Result<const Node*> there = findPath(*result, path);
-    if (!there || !stands(**there, *values)) {
-      return console.fail(fmt::format("{} cannot be {} here: it stays {}", path, setting.substr(equals + 1),
-                                      there ? shownValues(**there) : std::string("unset")));
-    }
-    for (const std::string& section : setup.unknownSections(options.file)) {
-      console.note("Warning: this version does not know section " + section +
-                   ", which is left out of the saved file");
-    }
-    setup = std::move(changed);
+  Result<SetupFile> setup = SetupFile::open(options.file, &host);
+  if (!setup) return console.fail(setup.error());
+  for (const std::string& text : options.settings) {
+    const Result<Setting> setting = settingOf(text);
+    if (!setting) return console.fail(setting.error());
+    const Outcome done =
+        isOption(setting->path) ? setOption(*setup, *setting) : setMember(*setup, *setting, options.file);
+    if (!done) return console.fail(done.error());
   }
-  return saveSetup(setup, options.file, console);
+  return saveSetup(*setup, options.file, console);
 }
 
 }  // namespace

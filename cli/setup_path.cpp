@@ -43,15 +43,6 @@ void listPaths(const Node& section, const std::string& prefix, std::vector<std::
   }
 }
 
-std::string_view withoutTarget(std::string_view path) {
-  constexpr std::string_view kTarget = CGlobalKvs::kTarget;
-  if (path.size() > kTarget.size() && path[kTarget.size()] == '/' &&
-      sameName(path.substr(0, kTarget.size()), kTarget)) {
-    path.remove_prefix(kTarget.size() + 1);
-  }
-  return path;
-}
-
 void copySection(const Node& from, KvsFile& to, const Node* replaced, const std::vector<Value>& values) {
   for (const Node* node = from.first(); node != nullptr; node = node->next()) {
     if (node->isSection()) {
@@ -119,6 +110,25 @@ std::vector<std::string_view> piecesOf(std::string_view text) {
 
 }  // namespace
 
+std::string_view withoutTarget(std::string_view path) {
+  constexpr std::string_view kTarget = CGlobalKvs::kTarget;
+  if (path.size() > kTarget.size() && path[kTarget.size()] == '/' &&
+      sameName(path.substr(0, kTarget.size()), kTarget)) {
+    path.remove_prefix(kTarget.size() + 1);
+  }
+  return path;
+}
+
+bool isOption(std::string_view path) {
+  constexpr std::string_view kOptions = "OPTION_PARAMETERS";
+  for (std::size_t start = 0; start < path.size();) {
+    const std::size_t end = std::min(path.find('/', start), path.size());
+    if (end < path.size() && sameName(path.substr(start, end - start), kOptions)) return true;
+    start = end + 1;
+  }
+  return false;
+}
+
 Result<const Node*> findPath(const KvsFile& file, std::string_view path) {
   const Node* at = kvsTargetByNameNum(file, CGlobalKvs::kTarget, 1);
   std::string_view rest = withoutTarget(path);
@@ -157,7 +167,8 @@ std::string nearestPath(const KvsFile& file, std::string_view path) {
   return least <= std::max<std::size_t>(wantedName.size() / 2, 3) ? nearest : std::string();
 }
 
-Result<std::vector<Value>> valuesOfText(const Node& keyword, std::string_view text, ParameterTree& keeper) {
+Result<std::vector<Value>> valuesOfText(const Node& keyword, std::string_view text, bool takesAnyNumber,
+                                        ParameterTree& keeper) {
   const std::span<const Value> now = keyword.values();
   std::vector<std::string_view> pieces = piecesOf(text);
   const auto isText = [](const Value& value) {
@@ -165,16 +176,19 @@ Result<std::vector<Value>> valuesOfText(const Node& keyword, std::string_view te
            value.kind() == ValueKind::resultFileName;
   };
   if (now.size() == 1 && isText(now.front())) pieces = {text};
-  if (pieces.size() != now.size()) {
+  if (pieces.size() != now.size() && !takesAnyNumber) {
     return Failure{fmt::format("{} takes {} values, not {}", keyword.name(), now.size(), pieces.size())};
   }
   std::vector<Value> values;
-  for (std::size_t i = 0; i < now.size(); ++i) {
-    const std::optional<std::string> value = valueOf(now[i].kind(), pieces[i]);
+  for (std::size_t i = 0; i < pieces.size(); ++i) {
+    // A list has values of one kind; an empty one does not say which.
+    const ValueKind whole =
+        pieces[i].find_first_of(".eE") == pieces[i].npos ? ValueKind::integer : ValueKind::real;
+    const ValueKind kind = now.empty() ? whole : now[std::min(i, now.size() - 1)].kind();
+    const std::optional<std::string> value = valueOf(kind, pieces[i]);
     if (!value)
-      return Failure{
-          fmt::format("{} takes {}, not \"{}\"", keyword.name(), kindName(now[i].kind()), pieces[i])};
-    values.push_back(keeper.makeValue(now[i].kind(), keeper.keep(*value)));
+      return Failure{fmt::format("{} takes {}, not \"{}\"", keyword.name(), kindName(kind), pieces[i])};
+    values.push_back(keeper.makeValue(kind, keeper.keep(*value)));
   }
   return values;
 }

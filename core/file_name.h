@@ -23,6 +23,8 @@ class FileNameValue {
   bool empty() const { return name_.empty(); }
   // The name by which the file can be opened; empty for an empty name.
   std::string absolute() const;
+  // The same name from the same folder.
+  bool operator==(const FileNameValue&) const = default;
 
  protected:
   FileNameValue() = default;

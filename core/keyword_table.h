@@ -3,13 +3,10 @@
 #include <string>
 #include <string_view>
 #include <tuple>
+#include <type_traits>
 
-#include "core/date_time.h"
-#include "core/edition.h"
-#include "core/file_name.h"
-#include "core/grid_point.h"
-#include "core/kvs.h"
-#include "core/selections.h"
+#include "core/keyword_values.h"
+#include "core/object_state.h"
 
 // A data object names each field once, in a table in file order that ties keyword, type and member together:
 //
@@ -19,141 +16,117 @@
 //                    keyword("Flooding_Depth", &CAreaDescriptionKvs::floodingDepth));
 //   }
 //
-// Saving, loading and copying come from it. A row is any type with `save`, `load` and `copy`; the rows that
-// occur again and again are made by the functions below.
+// Saving, loading and copying come from it; so do the object's exact state, which is copied and compared, and
+// the way from a keyword's path to its member. A row is any type with `save`, `load` and `copy`; the rows
+// that occur again and again are made by the functions of core/keyword_rows.h and core/item_rows.h. What a
+// row has further:
+//   members()                    the members that are its part of the state, as a tuple of pointers
+//   name, and set(object, section, path) where taking a value is not what its load does
+//   access(object, path, PathAccess&)   for a row of several keywords, or of a section
+//   visitLists(object, other, visit)    for a row of items
 
 namespace gridbay {
-
-// How a type stands on file.
-inline void putValue(KvsFile& file, std::string_view name, const auto& value, const std::string&) {
-  kvsPutParam(file, name, value);
-}
-inline void putValue(KvsFile& file, std::string_view name, const std::string& value, const std::string&) {
-  kvsPutParam(file, name, std::string_view(value));
-}
-inline void putValue(KvsFile& file, std::string_view name, const GridPoint& value, const std::string&) {
-  kvsPutListParam(file, name, "ii", value.j, value.k);
-}
-inline void putValue(KvsFile& file, std::string_view name, const DateTime& value, const std::string&) {
-  const auto [year, month, day, hour, minute, second] =
-      value.parts().value_or(std::array{-1, -1, -1, -1, -1, -1});
-  kvsPutListParam(file, name, "iiiiii", year, month, day, hour, minute, second);
-}
-inline void putValue(KvsFile& file, std::string_view name, const UFileName& value,
-                     const std::string& documentPath) {
-  value.Save(file, documentPath, name);
-}
-
-inline void getValue(KvsSection from, std::string_view name, auto& value, const std::string&) {
-  kvsGetParam(from, name, &value, 1, 1);
-}
-inline void getValue(KvsSection from, std::string_view name, GridPoint& value, const std::string&) {
-  kvsGetListParam(from, name, 1, "ii", &value.j, &value.k);
-}
-inline void getValue(KvsSection from, std::string_view name, DateTime& value, const std::string&) {
-  if (kvsKeywordByNameNum(from, name, 1) == nullptr) return;
-  std::array parts{-1, -1, -1, -1, -1, -1};
-  kvsGetListParam(from, name, 1, "iiiiii", &parts[0], &parts[1], &parts[2], &parts[3], &parts[4], &parts[5]);
-  value = DateTime::of(parts);
-}
-inline void getValue(KvsSection from, std::string_view name, UFileName& value,
-                     const std::string& documentPath) {
-  value.Load(from, documentPath, name);
-}
-
-// A keyword and the member that holds its value.
-template <class Object, class T>
-struct Keyword {
-  std::string_view name;
-  T Object::*member;
-
-  void save(const Object& object, KvsFile& file, const std::string& documentPath) const {
-    putValue(file, name, object.*member, documentPath);
-  }
-  void load(Object& object, KvsSection from, const std::string& documentPath) const {
-    getValue(from, name, object.*member, documentPath);
-  }
-  void copy(Object& object, const Object& other) const { object.*member = other.*member; }
-};
-
-template <class Object, class T>
-constexpr Keyword<Object, T> keyword(std::string_view name, T Object::*member) {
-  return {name, member};
-}
-
-// A data file with its items, under keywords of its own.
-template <class Object>
-struct SelectionRow {
-  UTsbSelection Object::*member;
-  int noItems;
-
-  void save(const Object& object, KvsFile& file, const std::string& documentPath) const {
-    (object.*member).Save(file, documentPath);
-  }
-  void load(Object& object, KvsSection from, const std::string& documentPath) const {
-    (object.*member).Load(from, documentPath, noItems);
-  }
-  void copy(Object& object, const Object& other) const { (object.*member).UpdateData(other.*member); }
-};
-
-template <class Object>
-constexpr SelectionRow<Object> selection(UTsbSelection Object::*member, int noItems) {
-  return {member, noItems};
-}
-
-// A row that CopyFrom leaves out.
-template <class Row>
-struct NotCopied : Row {
-  void copy(auto&, const auto&) const {}
-};
+namespace table_detail {
 
 template <class Row>
-constexpr NotCopied<Row> notCopied(Row row) {
-  return {row};
+bool sameRow(const Row& row, const auto& a, const auto& b, StateScope scope) {
+  if constexpr (requires { row.same(a, b, scope); }) {
+    return row.same(a, b, scope);
+  } else {
+    return std::apply([&](const auto... member) { return (sameValue(a.*member, b.*member) && ...); },
+                      row.members());
+  }
 }
 
-// A keyword that the Wetland Sweep Kit does not offer: there it is written with a fixed value, and has that
-// value after a load whatever the file says.
-template <class Object, class T>
-struct Pinned {
-  Keyword<Object, T> row;
-  T fixed;
-
-  void save(const Object& object, KvsFile& file, const std::string& documentPath) const {
-    putValue(file, row.name, theEdition.wetlandSweepKit ? fixed : object.*row.member, documentPath);
+template <class Row>
+void assignRow(const Row& row, auto& object, const auto& other, StateScope scope) {
+  if constexpr (requires { row.assign(object, other, scope); }) {
+    row.assign(object, other, scope);
+  } else {
+    std::apply([&](const auto... member) { ((object.*member = other.*member), ...); }, row.members());
   }
-  void load(Object& object, KvsSection from, const std::string& documentPath) const {
-    row.load(object, from, documentPath);
-    if (theEdition.wetlandSweepKit) object.*row.member = fixed;
-  }
-  void copy(Object& object, const Object& other) const { row.copy(object, other); }
-};
-
-template <class Object, class T>
-constexpr Pinned<Object, T> pinned(Keyword<Object, T> row, T fixed) {
-  return {row, fixed};
 }
+
+template <class Row>
+void refreshRow(const Row& row, auto& object, const auto& other) {
+  if constexpr (requires { row.refresh(object, other); }) row.refresh(object, other);
+}
+
+template <class Row>
+bool accessRow(const Row& row, auto& object, std::string_view path, PathAccess& access) {
+  if constexpr (requires { row.access(object, path, access); }) {
+    return row.access(object, path, access);
+  } else if constexpr (requires { row.name; }) {
+    if (!sameName(path, row.name)) return false;
+    if (access.what == PathAccess::What::write) row.save(object, *access.out, *access.documentPath);
+    if (access.what != PathAccess::What::set) return true;
+    if constexpr (requires { row.set(object, access.in, *access.documentPath); }) {
+      row.set(object, access.in, *access.documentPath);
+    } else {
+      row.load(object, access.in, *access.documentPath);
+    }
+    return true;
+  } else {
+    return false;
+  }
+}
+
+}  // namespace table_detail
 
 // Rows in file order, inside a section of their own unless the name is empty.
 template <class... Rows>
 struct KeywordTable {
-  std::string_view name;
+  std::string_view sectionName;
   std::tuple<Rows...> rows;
 
   void save(const auto& object, KvsFile& file, const std::string& documentPath) const {
-    if (!name.empty()) kvsAddSection(file, name);
+    if (!sectionName.empty()) kvsAddSection(file, sectionName);
     std::apply([&](const auto&... row) { (row.save(object, file, documentPath), ...); }, rows);
-    if (!name.empty()) kvsEndSection(file);
+    if (!sectionName.empty()) kvsEndSection(file);
   }
   // A section that is missing leaves the object as it is; false then.
   bool load(auto& object, KvsSection from, const std::string& documentPath) const {
-    if (!name.empty()) from = kvsSectionByNameNum(from, name, 1);
+    if (!sectionName.empty()) from = kvsSectionByNameNum(from, sectionName, 1);
     if (from == nullptr) return false;
     std::apply([&](const auto&... row) { (row.load(object, from, documentPath), ...); }, rows);
     return true;
   }
   void copy(auto& object, const auto& other) const {
     std::apply([&](const auto&... row) { (row.copy(object, other), ...); }, rows);
+  }
+
+  bool same(const auto& a, const auto& b, StateScope scope) const {
+    return std::apply([&](const auto&... row) { return (table_detail::sameRow(row, a, b, scope) && ...); },
+                      rows);
+  }
+  void assign(auto& object, const auto& other, StateScope scope) const {
+    std::apply([&](const auto&... row) { (table_detail::assignRow(row, object, other, scope), ...); }, rows);
+  }
+  // Takes over what was read from other files, which is never a difference.
+  void refresh(auto& object, const auto& other) const {
+    std::apply([&](const auto&... row) { (table_detail::refreshRow(row, object, other), ...); }, rows);
+  }
+  void visitLists(auto& object, auto& other, auto&& visit) const {
+    const auto each = [&](const auto& row) {
+      if constexpr (requires { row.visitLists(object, other, visit); }) row.visitLists(object, other, visit);
+    };
+    std::apply([&](const auto&... row) { (each(row), ...); }, rows);
+  }
+  // Finds what the path names; false when there is no such thing.
+  bool access(auto& object, std::string_view path, PathAccess& access) const {
+    if (!sectionName.empty()) {
+      const PathStep step = stepOf(path);
+      if (!sameName(step.first, sectionName)) return false;
+      if (step.isLast()) {
+        access.isSection = true;
+        if (access.what == PathAccess::What::write) save(object, *access.out, *access.documentPath);
+        return true;
+      }
+      path = step.rest;
+    }
+    return std::apply(
+        [&](const auto&... row) { return (table_detail::accessRow(row, object, path, access) || ...); },
+        rows);
   }
 };
 

@@ -24,6 +24,20 @@ CKvsBase* CKvsBase::FindChildKvs() {
   return nullptr;
 }
 
+void CKvsBase::AssignState(const CKvsBase&) {}
+
+bool CKvsBase::SameState(const CKvsBase&) const {
+  return true;
+}
+
+std::unique_ptr<StateChange> CKvsBase::TakeChange(CKvsBase&) {
+  return nullptr;
+}
+
+bool CKvsBase::AccessPath(std::string_view, PathAccess&) {
+  return false;
+}
+
 bool CKvsBase::IsValidPathName(const char* path) {
   return path != nullptr && isUsablePathName(path);
 }

@@ -4,6 +4,7 @@
 
 #include "core/kvs.h"
 #include "core/message.h"
+#include "core/object_state.h"
 
 namespace gridbay {
 
@@ -29,6 +30,16 @@ class CKvsBase {
   virtual CKvsBase* GetRoot();
   virtual CKvsBase* FindChildKvs();
 
+  // The exact state, with what stands on no file: taken over from, and compared with, another object of the
+  // same class. Nobody is told.
+  virtual void AssignState(const CKvsBase& other);
+  virtual bool SameState(const CKvsBase& other) const;
+  // Brings the twin, an object of the same class, to the state of this one and returns what that changed;
+  // null when it was the same.
+  virtual std::unique_ptr<StateChange> TakeChange(CKvsBase& twin);
+  // Finds what a path names in this object; false when there is no such thing.
+  virtual bool AccessPath(std::string_view path, PathAccess& access);
+
   // Whether a text is a usable path name; the file need not exist.
   static bool IsValidPathName(const char* path);
   // Copies all that a section of a loaded file holds, in order, under the cursor of a file in writing.
@@ -41,8 +52,10 @@ class CKvsBase {
     return dynamic_cast<Parts*>(GetRoot());
   }
 
- protected:
   // Shows a text to the user through the root's host and returns.
+  void Tell(const std::string& text) { ShowMessage(text); }
+
+ protected:
   virtual void ShowMessage(const std::string& text);
 
  private:

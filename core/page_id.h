@@ -7,6 +7,7 @@ namespace gridbay {
 // The places of the setup to which a message can lead. The numbers are fixed: they tie together the pages,
 // the tree's rules and the messages.
 enum class PageId : std::int32_t {
+  none = 0,
   floodAndDry = 26,
   bathymetry = 27,
   boundary = 28,

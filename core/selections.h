@@ -5,8 +5,22 @@
 #include <vector>
 
 #include "core/file_name.h"
+#include "core/object_state.h"
 
 namespace gridbay {
+
+// The name of a data file. On file it may be that of an input or of a result; it stays what it was read as.
+class SelectionFileName : public FileNameValue {
+ public:
+  using FileNameValue::operator=;
+  void Save(KvsFile& file, const std::string& documentPath, std::string_view keyword) const;
+  void Load(KvsSection section, const std::string& documentPath, std::string_view keyword);
+
+  bool operator==(const SelectionFileName&) const = default;
+
+ private:
+  bool isResult_ = false;
+};
 
 // A data file with the numbers of the items chosen in it (counted from 1).
 class UTsbSelection {
@@ -20,9 +34,13 @@ class UTsbSelection {
   void Save(KvsFile& file, const std::string& documentPath) const;
   // Reads both: at most `n` items where the file names some, else `n`.
   void Load(KvsSection section, const std::string& documentPath, int n);
+  // One of the two keywords by its name; false for any other.
+  bool Access(std::string_view name, PathAccess& access);
+
+  bool operator==(const UTsbSelection&) const = default;
 
   std::vector<std::uint32_t> items;
-  UFileName fileName;
+  SelectionFileName fileName;
 };
 
 // First, last and interval.

@@ -1,9 +1,10 @@
-// A path and a value from the command line, on a new model: found or refused, and what is set can be read.
+// A path and a value from the command line, on a new model: found or refused. What is set can be read, and
+// what is refused leaves the model as it was.
 
 #include <cstdlib>
 
+#include "cli/member_keyword.h"
 #include "cli/setup_path.h"
-#include "setup/setup_file.h"
 
 using namespace gridbay;
 
@@ -11,15 +12,19 @@ extern "C" int LLVMFuzzerTestOneInput(const unsigned char* data, std::size_t siz
   const std::string_view setting(reinterpret_cast<const char*>(data), size);
   const std::size_t equals = setting.find('=');
   if (equals == setting.npos) return 0;
-  static const KvsHandle file = SetupFile(nullptr).tree("/nowhere/setup.v27");
-  const Result<const Node*> found = cli::findPath(*file, setting.substr(0, equals));
-  if (!found || (*found)->isSection()) return 0;
+  const std::string path(setting.substr(0, equals));
+  CGlobalKvs model;
+  CGlobalKvs before;
+  Result<cli::MemberKeyword> keyword = cli::findKeyword(model, path, "/nowhere/setup.v27");
+  if (!keyword) return 0;
   ParameterTree keeper;
-  const auto values = cli::valuesOfText(**found, setting.substr(equals + 1), keeper);
+  const auto values =
+      cli::valuesOfText(keyword->node(), setting.substr(equals + 1), keyword->takesAnyNumber(), keeper);
   if (!values) return 0;
-  CollectingMessageHost host;
-  const SetupFile changed =
-      SetupFile::fromTree(cli::withValues(*file, *found, *values), "/nowhere/setup.v27", &host);
-  if (!cli::findPath(changed.source(), setting.substr(0, equals))) std::abort();
+  if (keyword->set(*values)) {
+    if (!cli::findKeyword(model, path, "/nowhere/setup.v27")) std::abort();
+  } else if (!model.SameState(before)) {
+    std::abort();
+  }
   return 0;
 }

@@ -45,12 +45,12 @@ bool isOnLine(std::int32_t point, const CBoundaryObjectKvs& line) {
   return point == 0;
 }
 
-bool isRatingCurve(const UFileName& file) {
+bool isRatingCurve(const FileNameValue& file) {
   return !file.empty() && sameName(std::filesystem::path(file.text()).extension().string(), ".tsb0") &&
          isReadableFile(file.absolute());
 }
 
-unsigned notValid(ValidationList& messages, const UFileName& file, const std::string& why) {
+unsigned notValid(ValidationList& messages, const FileNameValue& file, const std::string& why) {
   const std::string reason = why.empty() ? "" : formatted(texts::errorMessage) + why;
   messages.push_back(
       {PageId::hdBoundary, formatted(texts::dataFileNotValid, file.text()) + reason, Severity::fault});

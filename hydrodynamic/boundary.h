@@ -54,6 +54,7 @@ class CNhdBoundaryObjectKvs final : public TableKvs<CNhdBoundaryObjectKvs> {
     void copy(CNhdBoundaryObjectKvs& object, const CNhdBoundaryObjectKvs& other) const {
       object.fabType = other.fabType;
     }
+    static constexpr auto members() { return std::tuple(&CNhdBoundaryObjectKvs::fabType); }
   };
 
   static constexpr auto table() {

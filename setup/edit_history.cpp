@@ -1,7 +1,6 @@
 #include "setup/edit_history.h"
 
-#include "core/kdl_reader.h"
-#include "core/kdl_writer.h"
+#include <iterator>
 
 namespace gridbay {
 namespace {
@@ -9,66 +8,90 @@ namespace {
 constexpr std::size_t kMostSteps = 1000;
 constexpr std::size_t kMostBytes = std::size_t{256} << 20;
 
-std::string textOf(CKvsBase& part, const std::string& documentPath) {
-  KvsFile file;
-  part.Save(file, documentPath);
-  // A text that is not UTF-8 is told of by a save; a history simply holds nothing of it.
-  const Result<std::string> text = file.text();
-  return text ? *text : std::string();
-}
-
 std::size_t bytesOf(const EditHistory::Step& step) {
   std::size_t bytes = 0;
-  for (const EditHistory::PartChange& change : step.changes)
-    bytes += change.before.size() + change.after.size();
+  for (const EditHistory::PartChange& part : step.changes) bytes += part.change->bytes();
   return bytes;
 }
 
 }  // namespace
 
-void EditHistory::start(CGlobalKvs& model, std::string documentPath, const Touched& touched) {
-  documentPath_ = std::move(documentPath);
+void EditHistory::start(CGlobalKvs& model, const Touched& touched) {
   steps_.clear();
   done_ = 0;
   saved_ = 0;
   touched_ = touched;
-  texts_.clear();
-  for (CKvsBase* part : model.children()) texts_.push_back(textOf(*part, documentPath_));
+  twin_ = std::make_unique<CGlobalKvs>();
+  twin_->AssignState(model);
+}
+
+std::vector<EditHistory::PartChange> EditHistory::takeChanges(CGlobalKvs& model) {
+  std::vector<PartChange> changes;
+  const std::vector<CKvsBase*> parts = model.children();
+  const std::vector<CKvsBase*> twins = twin_->children();
+  for (std::size_t part = 0; part < parts.size(); ++part) {
+    if (auto change = parts[part]->TakeChange(*twins[part])) changes.push_back({part, std::move(change)});
+  }
+  return changes;
 }
 
 bool EditHistory::record(CGlobalKvs& model, PageId page, std::string name, bool continues,
                          const Touched& touched) {
-  Step step{page, std::move(name), continues, {}, touched_, touched};
+  std::vector<PartChange> changes = takeChanges(model);
+  Step step{page, std::move(name), continues, std::move(changes), touched_, touched};
   touched_ = touched;
-  const std::vector<CKvsBase*> parts = model.children();
-  for (std::size_t part = 0; part < parts.size(); ++part) {
-    std::string now = textOf(*parts[part], documentPath_);
-    if (now == texts_[part]) continue;
-    step.changes.push_back({part, std::move(texts_[part]), now});
-    texts_[part] = std::move(now);
-  }
   if (step.changes.empty()) return false;
-  if (saved_ > done_) saved_ = kNeverSaved;
-  steps_.resize(done_);
+  if (saved_ != kNeverSaved && saved_ > done_) saved_ = kNeverSaved;
+  steps_.erase(steps_.begin() + static_cast<std::ptrdiff_t>(done_), steps_.end());
   steps_.push_back(std::move(step));
   ++done_;
   dropOldest();
   return true;
 }
 
+void EditHistory::apply(CGlobalKvs& model, const std::vector<PartChange>& changes, bool forward) {
+  const std::vector<CKvsBase*> parts = model.children();
+  const std::vector<CKvsBase*> twins = twin_->children();
+  const auto both = [&](const PartChange& part) {
+    part.change->apply(*parts[part.part], forward);
+    part.change->apply(*twins[part.part], forward);
+  };
+  if (forward) {
+    for (const PartChange& part : changes) both(part);
+  } else {
+    for (auto part = changes.rbegin(); part != changes.rend(); ++part) both(*part);
+  }
+}
+
+// Steps that could be done again start from a state that is gone then.
+void EditHistory::settle(CGlobalKvs& model) {
+  std::vector<PartChange> hidden = takeChanges(model);
+  if (hidden.empty()) return;
+  steps_.erase(steps_.begin() + static_cast<std::ptrdiff_t>(done_), steps_.end());
+  if (done_ == 0) return;
+  std::vector<PartChange>& last = steps_[done_ - 1].changes;
+  last.insert(last.end(), std::make_move_iterator(hidden.begin()), std::make_move_iterator(hidden.end()));
+}
+
 void EditHistory::undo(CGlobalKvs& model, Touched& touched) {
+  if (done_ == 0) return;
+  std::vector<PartChange> hidden = takeChanges(model);
+  std::vector<PartChange>& last = steps_[done_ - 1].changes;
+  last.insert(last.end(), std::make_move_iterator(hidden.begin()), std::make_move_iterator(hidden.end()));
   for (const Step* step = undoStep(); step != nullptr;) {
     --done_;
-    restore(model, *step, &PartChange::before);
+    apply(model, step->changes, false);
     touched_ = touched = step->touchedBefore;
     step = nextOfRun(*step, undoStep());
   }
 }
 
 void EditHistory::redo(CGlobalKvs& model, Touched& touched) {
+  if (redoStep() == nullptr) return;
+  apply(model, takeChanges(model), false);
   for (const Step* step = redoStep(); step != nullptr;) {
     ++done_;
-    restore(model, *step, &PartChange::after);
+    apply(model, step->changes, true);
     touched_ = touched = step->touchedAfter;
     step = nextOfRun(*step, redoStep());
   }
@@ -79,20 +102,6 @@ const EditHistory::Step* EditHistory::nextOfRun(const Step& step, const Step* ne
   const bool goesOn = next != nullptr && step.continues && next->continues && next->name == step.name &&
                       next->page == step.page && !isSaved();
   return goesOn ? next : nullptr;
-}
-
-// A count that one part takes up again reaches its followers, which is why the parts are looked at once more.
-void EditHistory::restore(CGlobalKvs& model, const Step& step, std::string PartChange::*side) {
-  for (const PartChange& change : step.changes) texts_[change.part] = change.*side;
-  const std::vector<CKvsBase*> parts = model.children();
-  constexpr int kPasses = 2;
-  for (int pass = 0; pass < kPasses; ++pass) {
-    for (std::size_t part = 0; part < parts.size(); ++part) {
-      if (textOf(*parts[part], documentPath_) == texts_[part]) continue;
-      const ReadText read = readKdl(FileText(texts_[part]));
-      if (read.tree != nullptr) parts[part]->Load(&read.tree->root(), documentPath_);
-    }
-  }
 }
 
 void EditHistory::dropOldest() {

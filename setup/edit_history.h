@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstddef>
+#include <memory>
 #include <set>
 #include <string>
 #include <vector>
@@ -10,17 +11,16 @@
 
 namespace gridbay {
 
-// The edits of a model, to be taken back and done again. Each part of the model is kept as the text that a
-// save would write for it, and a step holds the texts of the parts that it changed; so pages need not know of
-// this, and a model that is large in one part costs that part only.
+// The edits of a model, to be taken back and done again. A twin of the model holds its state as it was after
+// the last step; what differs from it is the next one. So pages need not know of this, a step is exact also
+// for what stands on no file, and costs what it has changed.
 class EditHistory {
  public:
   using Touched = std::set<PageId>;
 
   struct PartChange {
     std::size_t part;  // its place among CGlobalKvs::children()
-    std::string before;
-    std::string after;
+    std::unique_ptr<StateChange> change;
   };
   struct Step {
     PageId page;
@@ -31,11 +31,13 @@ class EditHistory {
     Touched touchedAfter;
   };
 
-  // Forgets all steps; the model as it is now is what the first one starts from. Relative file names are kept
-  // relative to the folder of `documentPath`.
-  void start(CGlobalKvs& model, std::string documentPath, const Touched& touched);
+  // Forgets all steps; the model as it is now is what the first one starts from.
+  void start(CGlobalKvs& model, const Touched& touched);
   // Notes what has changed since the last step; false when nothing has. A new step ends what could be redone.
   bool record(CGlobalKvs& model, PageId page, std::string name, bool continues, const Touched& touched);
+
+  // What has changed without a step, as what a page works out when it is shown, goes with the last one.
+  void settle(CGlobalKvs& model);
 
   // The step that an undo or a redo would do; null when there is none.
   const Step* undoStep() const { return done_ == 0 ? nullptr : &steps_[done_ - 1]; }
@@ -51,12 +53,12 @@ class EditHistory {
  private:
   static constexpr std::size_t kNeverSaved = static_cast<std::size_t>(-1);
 
+  std::vector<PartChange> takeChanges(CGlobalKvs& model);
+  void apply(CGlobalKvs& model, const std::vector<PartChange>& changes, bool forward);
   const Step* nextOfRun(const Step& step, const Step* next) const;
-  void restore(CGlobalKvs& model, const Step& step, std::string PartChange::*side);
   void dropOldest();
 
-  std::string documentPath_;
-  std::vector<std::string> texts_;  // of all parts, as they are now
+  std::unique_ptr<CGlobalKvs> twin_;
   std::vector<Step> steps_;
   std::size_t done_ = 0;
   std::size_t saved_ = 0;

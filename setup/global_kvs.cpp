@@ -1,5 +1,8 @@
 #include "setup/global_kvs.h"
 
+#include <algorithm>
+#include <optional>
+
 #include "setup/skeleton.h"
 
 namespace gridbay {
@@ -12,6 +15,13 @@ KvsSection findPlace(KvsSection from, std::string_view place) {
     if (from != nullptr) from = kvsSectionByNameNum(from, section, 1);
   }
   return from;
+}
+
+// What is left of a path behind another one that it begins with, without the slash.
+std::optional<std::string_view> behind(std::string_view path, std::string_view start) {
+  if (path.size() < start.size() || !sameName(path.substr(0, start.size()), start)) return std::nullopt;
+  if (path.size() == start.size()) return std::string_view();
+  return path[start.size()] == '/' ? std::optional(path.substr(start.size() + 1)) : std::nullopt;
 }
 
 // The cursor of a file in writing, moved from place to place with no more closing and opening than it takes.
@@ -104,6 +114,53 @@ void CGlobalKvs::Load(KvsSection file, const std::string& documentPath) {
       row.object(*this).Load(section, documentPath);
     }
   }
+}
+
+void CGlobalKvs::AssignState(const CKvsBase& other) {
+  auto& model = const_cast<CGlobalKvs&>(static_cast<const CGlobalKvs&>(other));
+  for (const MemberRow& row : members()) row.object(*this).AssignState(row.object(model));
+}
+
+bool CGlobalKvs::SameState(const CKvsBase& other) const {
+  auto& self = const_cast<CGlobalKvs&>(*this);
+  auto& model = const_cast<CGlobalKvs&>(static_cast<const CGlobalKvs&>(other));
+  return std::ranges::all_of(
+      members(), [&](const MemberRow& row) { return row.object(self).SameState(row.object(model)); });
+}
+
+bool CGlobalKvs::AccessPath(std::string_view path, PathAccess& access) {
+  std::string_view place;
+  bool isOut = false;
+  for (const FileRow& row : savingOrder()) {
+    const bool applies = holds(row.condition, *this);
+    if (row.what == FileRow::What::place) {
+      place = row.name;
+      isOut = !applies;
+      if (!isOut && access.what == PathAccess::What::look && behind(place, path)) access.isSection = true;
+      if (access.isSection) return true;
+    }
+    if (row.what != FileRow::What::child || isOut || !applies) continue;
+    const std::optional<std::string_view> rest = behind(path, place);
+    if (rest && !rest->empty() && row.object(*this).AccessPath(*rest, access)) return true;
+  }
+  return false;
+}
+
+bool CGlobalKvs::KnowsSection(std::string_view path) {
+  std::string_view place;
+  bool isOut = false;
+  for (const FileRow& row : savingOrder()) {
+    if (row.what == FileRow::What::place) {
+      place = row.name;
+      isOut = !holds(row.condition, *this);
+    }
+    if (row.what != FileRow::What::options || isOut) continue;
+    const std::string_view section = sectionsOf(place).back();
+    const std::optional<std::string_view> rest = behind(path, section);
+    if (rest && (rest->empty() || behind(*rest, kOptionParameters))) return true;
+  }
+  PathAccess access{PathAccess::What::look};
+  return AccessPath(path, access) && access.isSection;
 }
 
 std::vector<CKvsBase*> CGlobalKvs::children() {

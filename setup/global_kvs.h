@@ -39,6 +39,14 @@ class CGlobalKvs final : public ModelRoot, public BasicParts, public Hydrodynami
   // Reads a file, given by the node that holds its targets. To be called once, on a fresh root.
   void Load(KvsSection file, const std::string& documentPath) override;
 
+  // All members, each with its own.
+  void AssignState(const CKvsBase& other) override;
+  bool SameState(const CKvsBase& other) const override;
+  // A path of the target; sections that the root opens are found too.
+  bool AccessPath(std::string_view path, PathAccess& access) override;
+  // Whether a save writes what the section of a loaded file holds, or its name at least; by its path.
+  bool KnowsSection(std::string_view path);
+
   void TellFollowers(const CKvsBase& leader, std::span<const int> counts) override;
 
  protected:

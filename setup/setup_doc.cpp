@@ -5,7 +5,7 @@
 namespace gridbay {
 
 CV27SetupDoc::CV27SetupDoc(SetupHost& host) : CVdDoc(host), setup_(&host) {
-  history_.start(root(), path(), touched());
+  history_.start(root(), touched());
 }
 
 void CV27SetupDoc::start(SetupFile setup, const std::string& path, bool modified) {
@@ -14,7 +14,7 @@ void CV27SetupDoc::start(SetupFile setup, const std::string& path, bool modified
   touched().clear();
   SetModifiedFlag(modified);
   leavesOut_ = false;
-  history_.start(root(), path, touched());
+  history_.start(root(), touched());
   if (modified) history_.markUnsaved();
   UpdateAllViews(nullptr);
 }
@@ -34,9 +34,9 @@ bool CV27SetupDoc::OnOpenDocument(const std::string& path) {
   return true;
 }
 
-bool CV27SetupDoc::mayLeaveOut(const std::string& path) {
+bool CV27SetupDoc::mayLeaveOut() {
   if (leavesOut_) return true;
-  const std::vector<std::string> unknown = setup_.unknownSections(path);
+  const std::vector<std::string> unknown = setup_.unknownSections();
   if (unknown.empty()) return true;
   constexpr std::size_t kMost = 10;
   std::string question =
@@ -48,19 +48,51 @@ bool CV27SetupDoc::mayLeaveOut(const std::string& path) {
 }
 
 bool CV27SetupDoc::OnSaveDocument(const std::string& path) {
-  if (!mayLeaveOut(path)) return false;
-  if (const Outcome saved = setup_.save(path); !saved) {
+  if (!mayLeaveOut()) return false;
+  history_.settle(root());
+  const Outcome saved = saveTo(path);
+  const bool changed = history_.record(root(), PageId::none, "Save", false, touched());
+  if (saved) {
+    SetPath(path);
+    SetModifiedFlag(false);
+    history_.markSaved();
+  } else {
     host().show(saved.error());
-    return false;
+    if (changed) SetModifiedFlag();
   }
-  SetPath(path);
-  SetModifiedFlag(false);
-  history_.markSaved();
-  return true;
+  if (changed) UpdateAllViews(nullptr);
+  return bool(saved);
+}
+
+// Nothing reaches the disk before the whole text is there.
+Outcome CV27SetupDoc::saveTo(const std::string& path) {
+  try {
+    return setup_.save(path);
+  } catch (const std::exception& fault) {
+    return Failure{"The setup cannot be written: " + std::string(fault.what())};
+  }
+}
+
+unsigned CV27SetupDoc::ValidateData(ValidationList& messages) {
+  unsigned faults = 0;
+  history_.settle(root());
+  try {
+    faults = root().Validate(messages, 1);
+  } catch (const std::exception& fault) {
+    host().show("The check could not be finished: " + std::string(fault.what()));
+    ++faults;
+  }
+  if (history_.record(root(), PageId::none, "Validation", false, touched())) SetModifiedFlag();
+  UpdateAllViews(nullptr);
+  return faults;
 }
 
 Outcome CV27SetupDoc::WriteRecoveryCopy(const std::string& copy) {
-  return setup_.saveCopy(copy, path());
+  try {
+    return setup_.saveCopy(copy, path());
+  } catch (const std::exception& fault) {
+    return Failure{"The edits cannot be written: " + std::string(fault.what())};
+  }
 }
 
 bool CV27SetupDoc::OnRecoverDocument(const std::string& copy, const std::string& path) {

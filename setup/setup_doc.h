@@ -25,8 +25,8 @@ class CV27SetupDoc : public CVdDoc {
   // read with sections which this version does not know is not written without them unless the user agrees.
   bool OnSaveDocument(const std::string& path);
 
-  // All faults of the model.
-  unsigned ValidateData(ValidationList& messages) { return root().Validate(messages, 1); }
+  // All faults of the model. What a check changes, as a hot start file may, becomes a step of its own.
+  unsigned ValidateData(ValidationList& messages);
   void SetEngine(std::string name) { engine_ = std::move(name); }
   const std::string& engine() const { return engine_; }
 
@@ -43,7 +43,8 @@ class CV27SetupDoc : public CVdDoc {
   void Redo();
 
  private:
-  bool mayLeaveOut(const std::string& path);
+  bool mayLeaveOut();
+  Outcome saveTo(const std::string& path);
   void start(SetupFile setup, const std::string& path, bool modified);
 
   SetupFile setup_;

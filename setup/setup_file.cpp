@@ -8,18 +8,26 @@
 namespace gridbay {
 namespace {
 
-void listUnknown(KvsSection source, KvsSection saved, const std::string& path,
+constexpr std::string_view kOptionParameters = "OPTION_PARAMETERS";
+
+void listUnknown(KvsSection source, CGlobalKvs& model, const std::string& path,
                  std::vector<std::string>& unknown) {
   for (const Node* node = source->first(); node != nullptr; node = node->next()) {
     if (!node->isSection()) continue;
     const std::string here = path + (path.empty() ? "" : "/") + std::string(node->name());
-    const KvsSection twin = kvsSectionByNameNum(saved, node->name(), 1);
-    if (twin == nullptr) {
-      unknown.push_back(here);
-    } else {
-      listUnknown(node, twin, here, unknown);
+    const bool isOptions = sameName(node->name(), kOptionParameters);
+    if (!model.KnowsSection(here)) {
+      if (!isOptions || node->first() != nullptr) unknown.push_back(here);
+    } else if (!isOptions) {
+      listUnknown(node, model, here, unknown);
     }
   }
+}
+
+Outcome write(KvsFile& file, const std::string& path) {
+  if (kvsWrite(file, path)) return {};
+  kvsGetErrorGlb();
+  return Failure{kvsGetErrorText()};
 }
 
 bool isOfOtherModule(std::string_view name, std::int32_t selected) {
@@ -64,28 +72,34 @@ SetupFile SetupFile::fromTree(KvsHandle tree, const std::string& path, MessageHo
 }
 
 KvsHandle SetupFile::tree(const std::string& path) {
+  CGlobalKvs copy;
+  copy.AssignState(*model_);
+  copy.SetSourceFile(source_.get());
   KvsHandle file = kvsCreate();
-  model_->Save(*file, path);
+  copy.Save(*file, path);
   return file;
 }
 
 Outcome SetupFile::save(const std::string& path) {
-  return saveCopy(path, path);
+  KvsHandle file = kvsCreate();
+  model_->Save(*file, path);
+  return write(*file, path);
 }
 
 Outcome SetupFile::saveCopy(const std::string& copy, const std::string& path) {
-  KvsHandle file = tree(path);
-  if (kvsWrite(*file, copy)) return {};
-  kvsGetErrorGlb();
-  return Failure{kvsGetErrorText()};
+  return write(*tree(path), copy);
 }
 
-std::vector<std::string> SetupFile::unknownSections(const std::string& path) {
+void SetupFile::replaceSource(KvsHandle source) {
+  source_ = std::move(source);
+  model_->SetSourceFile(source_.get());
+}
+
+std::vector<std::string> SetupFile::unknownSections() {
   std::vector<std::string> unknown;
   const KvsSection target = kvsTargetByNameNum(*source_, CGlobalKvs::kTarget, 1);
   if (target == nullptr) return unknown;
-  const KvsHandle saved = tree(path);
-  listUnknown(target, kvsTargetByNameNum(*saved, CGlobalKvs::kTarget, 1), {}, unknown);
+  listUnknown(target, *model_, {}, unknown);
   std::erase_if(unknown, [this](const std::string& name) {
     return isOfOtherModule(std::string_view(name).substr(0, name.find('/')),
                            model_->moduleSelection->simulationType);

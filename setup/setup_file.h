@@ -30,12 +30,15 @@ class SetupFile {
   const KvsFile& source() const { return *source_; }
   // What a save to the path would write.
   KvsHandle tree(const std::string& path);
+  // Writes the setup. What a save does to the model, as it leaves out what can't be written, stays.
   Outcome save(const std::string& path);
-  // Writes what a save to the path would, to another file.
+  // Writes what a save to the path would, to another file; the model stays as it is.
   Outcome saveCopy(const std::string& copy, const std::string& path);
+  // Another file in the place of the one that was read: what a save passes on comes from it.
+  void replaceSource(KvsHandle source);
   // Sections of the file, as paths, that this model holds nothing of and a save leaves out. What belongs to a
   // module that is not selected is left out on purpose and is not among them.
-  std::vector<std::string> unknownSections(const std::string& path);
+  std::vector<std::string> unknownSections();
 
  private:
   KvsHandle source_;

@@ -134,7 +134,7 @@ TEST_F(ListKvsTest, ACountIsBelievedOnlyAsFarAsTheFileBearsItOut) {
   ASSERT_EQ(root.texts.size(), std::size_t{1} + kCountSlack);
   EXPECT_EQ(root.texts.front(),
             "Error in the KVS-FILE\nSection LIST says 2147483647, which is far more than the 1 sections that "
-            "follow; 1025 "
+            "follow; 2049 "
             "are kept");
 }
 

@@ -311,7 +311,7 @@ TEST(SetupFile, TellsWhatASaveLeavesOutUnawares) {
   CollectingMessageHost host;
   Result<SetupFile> setup = SetupFile::open(path, &host);
   ASSERT_TRUE(setup);
-  EXPECT_EQ(setup->unknownSections(path),
+  EXPECT_EQ(setup->unknownSections(),
             (std::vector<std::string>{"NESTED_MODEL_GLOBALS/FUTURE", "HYDRODYNAMIC_MODULE/STRANGE"}));
 }
 

@@ -1,0 +1,61 @@
+#include "cli/member_keyword.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+
+#include "cli/setup_path.h"
+#include "core/number_text.h"
+
+namespace gridbay::cli {
+namespace {
+
+// Whether a keyword has these values; the model may hold a number with fewer digits.
+bool stands(const Node& keyword, const std::vector<Value>& wanted) {
+  return std::ranges::equal(keyword.values(), wanted, [](const Value& a, const Value& b) {
+    if (a.kind() == ValueKind::real) return floatOfText(a.text()) == floatOfText(b.text());
+    return a.text() == b.text();
+  });
+}
+
+}  // namespace
+
+bool MemberKeyword::write() {
+  written_ = kvsCreate();
+  PathAccess access{PathAccess::What::write, written_.get(), nullptr, &documentPath_};
+  const bool found = model_->AccessPath(path_, access) && !access.isSection;
+  takesAnyNumber_ = access.takesAnyNumber;
+  return found && written_->tree().root().first() != nullptr;
+}
+
+void MemberKeyword::take(std::string_view name, std::span<const Value> values) {
+  KvsFile given;
+  kvsAddKeyword(given, name);
+  for (const Value& value : values) given.add(value.kind(), value.text());
+  PathAccess access{PathAccess::What::set, nullptr, &given.tree().root(), &documentPath_};
+  model_->AccessPath(path_, access);
+}
+
+bool MemberKeyword::set(const std::vector<Value>& values) {
+  const KvsHandle before = std::move(written_);
+  const Node& keyword = *before->tree().root().first();
+  take(keyword.name(), values);
+  if (write() && stands(node(), values)) return true;
+  take(keyword.name(), keyword.values());
+  write();
+  return false;
+}
+
+Result<MemberKeyword> findKeyword(CGlobalKvs& model, std::string_view path, const std::string& documentPath) {
+  MemberKeyword keyword;
+  keyword.model_ = &model;
+  keyword.path_ = withoutTarget(path);
+  keyword.documentPath_ = documentPath;
+  PathAccess look{PathAccess::What::look};
+  if (model.AccessPath(keyword.path_, look) && look.isWrittenOnly)
+    return Failure{fmt::format("\"{}\" follows from other values, and is not set by itself", path)};
+  if (!keyword.write()) return Failure{fmt::format("There is no keyword \"{}\" in this setup", path)};
+  return keyword;
+}
+
+}  // namespace gridbay::cli
