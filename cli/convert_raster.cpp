@@ -14,6 +14,7 @@
 #include "cli/raster_layout.h"
 #include "cli/tsb_raster.h"
 #include "platform/cartography/cartography.h"
+#include "platform/cartography/grid_mapping.h"
 #include "platform/result.h"
 #include "platform/tsb/tsb_writer.h"
 #include "platform/units/units.h"
@@ -148,9 +149,18 @@ Result<Target> define(const Options& options, const Raster& raster, const Raster
   const Result<const QunItem*> quantity = itemTypeOfText(
       options.itemType.value_or(std::to_string(raster.itemType().value_or(item::kBathymetry))));
   if (!quantity) return Failure{quantity.error()};
+  const std::string_view baseUnit = qunBaseUnit((*quantity)->code)->text;
+  if (const CVdUnitConverter converter(raster.unit(), baseUnit);
+      !raster.unit().empty() &&
+      !(converter.IsValid() && converter.Convert(0) == 0 && converter.Convert(1) == 1)) {
+    return Failure{fmt::format("The values are in {}, and those of {} are to be in {}", raster.unit(),
+                               (*quantity)->name, baseUnit)};
+  }
   const std::string projection = options.crs.empty() ? raster.projection() : options.crs;
   const CVdMapProjection map(projection);
   if (!map.IsValid()) return Failure{fmt::format("\"{}\" is no projection that is known here", projection)};
+  if (const auto mapping = gridMappingOf(map.Wkt2()); mapping && mapping->name == kGeographicMapping)
+    return Failure{fmt::format("\"{}\" is in degrees: a grid wants a projection in metres", map.Name())};
 
   const std::array<double, 2> first = layout.at(chosen.firstJ, chosen.firstK);
   Target target{{}, options.originX.value_or(first[0]), options.originY.value_or(first[1])};
@@ -162,8 +172,7 @@ Result<Target> define(const Options& options, const Raster& raster, const Raster
   definition.axes = {
       {static_cast<std::size_t>(chosen.noJ), isTurned ? 0 : target.east, layout.dx * chosen.every, "m"},
       {static_cast<std::size_t>(chosen.noK), isTurned ? 0 : target.north, layout.dy * chosen.every, "m"}};
-  definition.items = {
-      {std::string((*quantity)->name), (*quantity)->code, std::string(qunBaseUnit((*quantity)->code)->text)}};
+  definition.items = {{std::string((*quantity)->name), (*quantity)->code, std::string(baseUnit)}};
   definition.customBlocks = {{"V27_Misc", {0, 0, 0, options.land}}};
   if (map.IsLocal()) {
     if (isTurned) {

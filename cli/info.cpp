@@ -16,6 +16,7 @@
 #include "basic/source_sink.h"
 #include "cli/commands.h"
 #include "core/module_selection.h"
+#include "core/number_text.h"
 #include "platform/cartography/cartography.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/units/units.h"
@@ -44,12 +45,18 @@ Json describeTime(const TsbTimeAxis& time) {
   return axis;
 }
 
+// A number as the digits tell it that it has in its own width: 0.1 of 32 bits is 0.1.
+template <class Number>
+double plain(double value) {
+  return doubleOfText(NumberText(static_cast<Number>(value)).view()).value_or(value);
+}
+
 // Least and greatest value, missing values left out.
+template <class Number>
 class Range {
  public:
   explicit Range(double missing) : missing_(missing) {}
 
-  template <class Number>
   void take(std::span<const Number> values) {
     const auto missing = static_cast<Number>(missing_);
     for (const Number value : values) {
@@ -60,7 +67,9 @@ class Range {
   }
   // Null when there is no value.
   Json json() const {
-    return least_ > greatest_ ? Json(nullptr) : Json{{"least", least_}, {"greatest", greatest_}};
+    return least_ > greatest_
+               ? Json(nullptr)
+               : Json{{"least", plain<Number>(least_)}, {"greatest", plain<Number>(greatest_)}};
   }
 
  private:
@@ -80,7 +89,7 @@ Json rangeOf(const TsbFile& file, std::size_t item, std::size_t steps) {
   const TsbDefinition& definition = file.definition();
   const std::size_t points = definition.pointCount();
   constexpr std::size_t kValuesAtOnce = kBytesAtOnce / sizeof(Number);
-  Range range(definition.items[item - 1].deleteValue);
+  Range<Number> range(definition.items[item - 1].deleteValue);
   std::vector<Number> values;
   const bool byRows = definition.axes.size() == 2 && points > kValuesAtOnce;
   const std::size_t parts = byRows ? definition.axes[1].points : steps;

@@ -29,9 +29,10 @@ class Raster {
   virtual std::vector<std::string> subdatasets() const = 0;
   // The files that it is read from, by their paths or by names of the raster library that have them in.
   virtual std::vector<std::string> files() const = 0;
-  // How the file came about, and of what item type its values are, where it tells.
+  // How the file came about, and of what item type and unit its values are, where it tells.
   virtual std::string history() const { return {}; }
   virtual std::optional<int> itemType() const { return {}; }
+  virtual std::string unit() const { return {}; }
   // Takes a band; the first until then. It must be there, here and in all that follows.
   virtual void choose(int band) = 0;
 

@@ -31,6 +31,7 @@ class TsbRaster final : public Raster {
   std::vector<std::string> files() const override { return {file_.path()}; }
   std::string history() const override { return definition().history; }
   std::optional<int> itemType() const override { return definition().items[item_ - 1].type; }
+  std::string unit() const override { return definition().items[item_ - 1].unit; }
   void choose(int band) override { step_ = static_cast<std::size_t>(band) - 1; }
 
   int columns() const override { return static_cast<int>(definition().axes[0].points); }

@@ -109,7 +109,7 @@ class Reader {
       if (!readMethod(crs)) return false;
       putText("projected_crs_name", proj_get_name(crs));
     } else if (type == PJ_TYPE_GEOGRAPHIC_2D_CRS) {
-      mapping_.name = "latitude_longitude";
+      mapping_.name = kGeographicMapping;
     } else {
       return false;
     }

@@ -16,6 +16,9 @@ struct GridMapping {
   std::vector<std::pair<std::string, std::string>> texts;
 };
 
+// That of longitude and latitude without a projection.
+inline constexpr std::string_view kGeographicMapping = "latitude_longitude";
+
 // The grid mapping of a full projection text; nothing where the conventions have none for it.
 std::optional<GridMapping> gridMappingOf(std::string_view wkt);
 

@@ -157,7 +157,7 @@ class DefinitionWriter {
     if (isTurned_ && !isInDegrees()) putGeoTransform(variable, place);
   }
 
-  bool isInDegrees() const { return mapping_ && mapping_->name == "latitude_longitude"; }
+  bool isInDegrees() const { return mapping_ && mapping_->name == kGeographicMapping; }
 
   // The corner of the first point's cell and the steps along a row and from row to row, by which the raster
   // library places a grid that is turned.

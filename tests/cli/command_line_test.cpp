@@ -370,7 +370,7 @@ TEST_F(Tool, InfoTellsTheRangeOverAllSteps) {
     Result<TsbWriter> writer = TsbWriter::create(path, definition);
     ASSERT_TRUE(writer) << writer.error();
     for (std::size_t step = 0; step < 3; ++step) {
-      std::vector<float> values(9, static_cast<float>(step) - 1);
+      std::vector<float> values(9, static_cast<float>(step) - 1.1F);
       values[4] = step == 2 ? 7.5F : 0.25F;
       if (step == 1) values[0] = static_cast<float>(definition.items[0].deleteValue);
       ASSERT_TRUE(writer->write(1, step, std::span<const float>(values)));
@@ -380,10 +380,10 @@ TEST_F(Tool, InfoTellsTheRangeOverAllSteps) {
     ASSERT_TRUE(writer->commit());
   }
   const auto items = nlohmann::json::parse(runTool({"info", path, "--json"}).out)["items"];
-  EXPECT_EQ(items[0]["first_step"], (nlohmann::json{{"least", -1}, {"greatest", 0.25}}));
-  EXPECT_EQ(items[0]["range"], (nlohmann::json{{"least", -1}, {"greatest", 7.5}}));
+  EXPECT_EQ(items[0]["first_step"], (nlohmann::json{{"least", -1.1}, {"greatest", 0.25}}));
+  EXPECT_EQ(items[0]["range"], (nlohmann::json{{"least", -1.1}, {"greatest", 7.5}}));
   EXPECT_EQ(items[1]["range"], (nlohmann::json{{"least", 0}, {"greatest", 0.2}}));
-  EXPECT_THAT(runTool({"info", path}).out, HasSubstr("in m, -1 to 7.5\n"));
+  EXPECT_THAT(runTool({"info", path}).out, HasSubstr("in m, -1.1 to 7.5\n"));
 }
 
 // 272 MB of values that take no place on the disk; of them only the first step is read.

@@ -109,6 +109,8 @@ TEST_F(ConvertRaster, WhatCannotBeDone) {
   EXPECT_THAT(refused({folder.write("junk.asc", "junk"), out, "--land", "1"}), HasSubstr("junk.asc"));
   EXPECT_THAT(refused({raster, out, "--land", "1", "--crs", "nonsense"}),
               HasSubstr("\"nonsense\" is no projection that is known"));
+  EXPECT_THAT(refused({raster, out, "--land", "1", "--crs", "EPSG:4326"}),
+              HasSubstr("\"WGS 84\" is in degrees: a grid wants a projection in metres"));
   EXPECT_THAT(refused({raster, out, "--land", "1", "--item-type", "7"}),
               HasSubstr("There is no item type 7"));
   for (const char* land : {"nan", "inf", "-0.1", "1e39", "high"})
@@ -187,6 +189,9 @@ TEST_F(ConvertRaster, ADataFileIsARaster) {
               HasSubstr("Z: " + std::string(theEdition.wetlandSweepKit ? "v27setup-wsk" : "v27setup") +
                         " convert raster " + first + " " + out + " --land 50"));
   fs::remove(out);
+  test::writeGrid(folder.file("feet.tsb2"), {.unit = "ft"});
+  EXPECT_THAT(refused({folder.file("feet.tsb2"), out, "--land", "1"}),
+              HasSubstr("The values are in ft, and those of Bathymetry are to be in m"));
   test::writeSeries(folder.file("s.tsb0"), {}, 100000, "m");
   EXPECT_THAT(refused({folder.file("s.tsb0"), out, "--land", "1"}), HasSubstr("it holds no map"));
   EXPECT_THAT(refused({folder.write("broken.tsb2", "\x89HDF"), out, "--land", "1"}),
