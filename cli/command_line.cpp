@@ -1,19 +1,70 @@
 #include "cli/command_line.h"
 
+#include <fmt/format.h>
+
+#include <cmath>
+#include <optional>
+#include <span>
 #include <string>
 
 #include "cli/commands.h"
 #include "core/edition.h"
+#include "core/number_text.h"
 
 namespace gridbay::cli {
+namespace {
+
+// A command line as a shell would take it again.
+std::string commandLineText(const std::string& tool, std::span<const char* const> words) {
+  constexpr std::string_view kPlain =
+      "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789_-./:=,+@%";
+  std::string text = tool;
+  for (const std::string_view word : words) {
+    text += ' ';
+    if (!word.empty() && word.find_first_not_of(kPlain) == word.npos) {
+      text += word;
+      continue;
+    }
+    text += '\'';
+    for (const char c : word) text += c == '\'' ? std::string("'\\''") : std::string(1, c);
+    text += '\'';
+  }
+  return text;
+}
+
+}  // namespace
+
+CLI::Option* addForce(CLI::App& command, bool& force) {
+  return command.add_flag("--force", force, "Replace a file that is there");
+}
+
+std::string itemTypeHelp(std::string_view ofWhat) {
+  return fmt::format(
+      "Item type of {}: its code, its name or the beginning of it (\"{} convert types\" lists them)", ofWhat,
+      toolName());
+}
+
+CLI::Validator finite(double least) {
+  return {[least](std::string& text) {
+            const std::optional<double> number = doubleOfText(text);
+            constexpr double kMost = std::numeric_limits<float>::max();
+            if (!number || !(std::abs(*number) <= kMost))
+              return fmt::format("\"{}\" is no finite number", text);
+            return *number < least ? fmt::format("{} is below {:g}", text, least) : std::string();
+          },
+          ""};
+}
+
+std::string_view toolName() {
+  return theEdition.wetlandSweepKit ? "v27setup-wsk" : "v27setup";
+}
 
 int runCommandLine(int argc, const char* const* argv, std::ostream& out, std::ostream& err) {
-  const Console console{out, err};
   const std::string kind(theEdition.fileKind);
   CLI::App tool("Prepares, checks and starts setups (*." + kind + ") of the " +
                     std::string(theEdition.editorName.format) +
                     ".\nExit status: 0 clean, 1 faults found, 2 could not do it.",
-                theEdition.wetlandSweepKit ? "v27setup-wsk" : "v27setup");
+                std::string(toolName()));
   tool.set_version_flag("--version", "0.1.0");
   tool.require_subcommand(1);
   Action action;
@@ -21,6 +72,7 @@ int runCommandLine(int argc, const char* const* argv, std::ostream& out, std::os
   convert.require_subcommand(1);
   addConvertRaster(convert, action);
   addConvertSeries(convert, action);
+  addConvertTypes(convert, action);
   addInfo(tool, action);
   addNew(tool, action);
   addGet(tool, action);
@@ -33,7 +85,7 @@ int runCommandLine(int argc, const char* const* argv, std::ostream& out, std::os
   } catch (const CLI::ParseError& error) {
     return tool.exit(error, out, err) == 0 ? kClean : kCouldNotDoIt;
   }
-  return action(console);
+  return action(Console{out, err, commandLineText(tool.get_name(), {argv + 1, argv + argc})});
 }
 
 }  // namespace gridbay::cli

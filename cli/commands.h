@@ -2,8 +2,10 @@
 
 #include <CLI/CLI.hpp>
 #include <functional>
+#include <limits>
 #include <memory>
 #include <string>
+#include <string_view>
 
 #include "cli/console.h"
 
@@ -15,6 +17,7 @@ using Action = std::function<int(const Console&)>;
 // Each adds its command to the tool.
 void addConvertRaster(CLI::App& convert, Action& action);
 void addConvertSeries(CLI::App& convert, Action& action);
+void addConvertTypes(CLI::App& convert, Action& action);
 void addInfo(CLI::App& tool, Action& action);
 void addNew(CLI::App& tool, Action& action);
 void addGet(CLI::App& tool, Action& action);
@@ -34,5 +37,19 @@ CLI::App& addCommand(CLI::App& parent, Action& action, const char* name, const c
   });
   return command;
 }
+
+// The name by which the tool of this edition is called.
+std::string_view toolName();
+
+// Options that several commands have.
+CLI::Option* addForce(CLI::App& command, bool& force);
+// The text that names an item type; `itemType` is a std::string, or an optional one.
+std::string itemTypeHelp(std::string_view ofWhat);
+CLI::Option* addItemType(CLI::App& command, auto& itemType, std::string_view ofWhat) {
+  return command.add_option("--item-type", itemType, itemTypeHelp(ofWhat));
+}
+
+// Takes numbers that are finite as 32-bit ones and not below the least one; the tool's own number texts only.
+CLI::Validator finite(double least = std::numeric_limits<double>::lowest());
 
 }  // namespace gridbay::cli

@@ -1,5 +1,9 @@
 #include "cli/console.h"
 
+#include <fmt/chrono.h>
+
+#include <ctime>
+
 namespace gridbay::cli {
 
 int Console::fail(std::string_view why) const {
@@ -9,6 +13,16 @@ int Console::fail(std::string_view why) const {
 
 void Console::note(std::string_view text) const {
   err << text << '\n' << std::flush;
+}
+
+std::string messageLine(const CMessage& message) {
+  return fmt::format("page {}, severity {}: {}", static_cast<int>(message.page),
+                     static_cast<int>(message.severity), message.text);
+}
+
+std::string historyWith(const std::string& before, const Console& console) {
+  return fmt::format("{}{}{:%Y-%m-%dT%H:%M:%SZ}: {}", before, before.empty() ? "" : "\n",
+                     fmt::gmtime(std::time(nullptr)), console.commandLine);
 }
 
 int saveSetup(SetupFile& setup, const std::string& path, const Console& console) {

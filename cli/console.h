@@ -17,6 +17,7 @@ enum ExitStatus : int { kClean = 0, kFaultsFound = 1, kCouldNotDoIt = 2 };
 struct Console {
   std::ostream& out;
   std::ostream& err;
+  std::string commandLine;  // what was asked for, as a shell would take it again
 
   int fail(std::string_view why) const;
   void note(std::string_view text) const;
@@ -32,6 +33,13 @@ class ConsoleMessageHost : public MessageHost {
  private:
   const Console& console_;
 };
+
+// A message of a validation on one line.
+std::string messageLine(const CMessage& message);
+
+// The history of a file that is written now: that of what it is made from, if any, and a line with the moment
+// (UTC) and the command.
+std::string historyWith(const std::string& before, const Console& console);
 
 // Saves a setup to its own file, and says which of its sections this version does not know and leaves out.
 int saveSetup(SetupFile& setup, const std::string& path, const Console& console);

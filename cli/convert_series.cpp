@@ -6,6 +6,9 @@
 #include <vector>
 
 #include "cli/commands.h"
+#include "cli/item_types.h"
+#include "cli/moments.h"
+#include "cli/output_file.h"
 #include "core/date_time.h"
 #include "core/number_text.h"
 #include "platform/files/read_file.h"
@@ -22,10 +25,11 @@ constexpr double kEvenTolerance = 1e-3;
 struct Options {
   std::string in;
   std::string out;
-  int itemType = item::kUndefined;
+  std::string itemType;
   std::string start;
   std::string timeUnit = "s";
   int skipLines = 0;
+  bool force = false;
 };
 
 struct Table {
@@ -93,6 +97,13 @@ Result<Table> readTable(const Options& options) {
             table.times.empty() ? " (are there heading lines? --skip-lines N passes over them)" : "";
         return fail(number, fmt::format("\"{}\" is no number{}", fields[i], hint));
       }
+      if (!std::isfinite(*value)) {
+        return fail(number,
+                    i == 0 ? fmt::format("\"{}\" is no moment", fields[i])
+                           : fmt::format("\"{}\" is no value that can stand in a series; leave out lines "
+                                         "without a value",
+                                         fields[i]));
+      }
       (i == 0 ? table.times : table.columns[i - 1]).push_back(*value);
     }
     if (table.times.size() > 1 && !(table.times.back() > table.times[table.times.size() - 2])) {
@@ -127,8 +138,11 @@ TsbTimeAxis timeAxisOf(const Table& table, const Options& options, const DateTim
 }
 
 int convertSeries(const Options& options, const Console& console) {
-  const QunItem* quantity = qunFindItem(options.itemType);
-  if (quantity == nullptr) return console.fail(fmt::format("There is no item type {}", options.itemType));
+  if (const Outcome free = mayWrite(options.out, options.force, {&options.in, 1}); !free)
+    return console.fail(free.error());
+  const Result<const QunItem*> found = itemTypeOfText(options.itemType);
+  if (!found) return console.fail(found.error());
+  const QunItem* quantity = *found;
   const std::optional<DateTime> start = dateTimeOfText(options.start);
   if (!start)
     return console.fail(fmt::format("\"{}\" is no moment of the form YYYY-MM-DD hh:mm:ss", options.start));
@@ -140,7 +154,14 @@ int convertSeries(const Options& options, const Console& console) {
 
   TsbDefinition definition;
   definition.title = std::filesystem::path(options.in).stem().string();
+  definition.history = historyWith({}, console);
   definition.time = timeAxisOf(*table, options, *start);
+  const std::string first = momentText(definition.time, 0);
+  const std::string last = momentText(definition.time, definition.time.count - 1);
+  if (first.empty() || last.empty()) {
+    return console.fail(fmt::format("The times of \"{}\" ({:g} to {:g} {}) lead out of the calendar",
+                                    options.in, table->times.front(), table->times.back(), options.timeUnit));
+  }
   for (std::size_t i = 0; i < table->columns.size(); ++i) {
     std::string name = i < table->names.size() ? table->names[i] : std::string(quantity->name);
     if (table->names.empty() && table->columns.size() > 1) name += fmt::format(" {}", i + 1);
@@ -158,11 +179,13 @@ int convertSeries(const Options& options, const Console& console) {
   }
   if (const Outcome written = writer->commit(); !written) return console.fail(written.error());
   const bool even = definition.time.isEquidistant();
-  console.out << fmt::format(
-      "{}: {} of {} time steps{} from {}\n", options.out, definition.items.front().name,
-      definition.time.count,
-      even ? fmt::format(", {:g} {} apart,", definition.time.step, options.timeUnit) : "",
-      dateTimeText(*start));
+  console.out << fmt::format("{}: {} of {} time step{}{} from {} to {}\n", options.out,
+                             definition.items.front().name, definition.time.count,
+                             definition.time.count == 1 ? "" : "s",
+                             even && definition.time.count > 1
+                                 ? fmt::format(", {:g} {} apart,", definition.time.step, options.timeUnit)
+                                 : "",
+                             first, last);
   return kClean;
 }
 
@@ -176,12 +199,14 @@ void addConvertSeries(CLI::App& convert, Action& action) {
       .add_option("IN", options->in, "Lines of a time and values, between commas, semicolons, tabs or blanks")
       ->required();
   command.add_option("OUT", options->out, "The time series to write (*.tsb0)")->required();
-  command.add_option("--item-type", options->itemType, "Item code of the values, in base units")->required();
+  addItemType(command, options->itemType, "the values, which are in its base unit")->required();
   command.add_option("--start", options->start, "The moment of time 0, \"YYYY-MM-DD hh:mm:ss\"")->required();
-  command.add_option("--time-unit", options->timeUnit, "Unit of the times")->capture_default_str();
+  command.add_option("--time-unit", options->timeUnit, "Unit of the times: s, min, h, d")
+      ->capture_default_str();
   command.add_option("--skip-lines", options->skipLines, "Heading lines; the last one names the columns")
       ->check(CLI::NonNegativeNumber)
       ->capture_default_str();
+  addForce(command, options->force);
 }
 
 }  // namespace gridbay::cli

@@ -1,7 +1,11 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <array>
 #include <cmath>
+#include <filesystem>
+#include <fstream>
+#include <limits>
 #include <nlohmann/json.hpp>
 
 #include "basic/area_description.h"
@@ -12,8 +16,8 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "cli/commands.h"
+#include "core/number_text.h"
 #include "platform/cartography/cartography.h"
-#include "platform/files/read_file.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/units/units.h"
 
@@ -41,16 +45,83 @@ Json describeTime(const TsbTimeAxis& time) {
   return axis;
 }
 
-// Least and greatest value of an item at the first step, missing values left out.
-Json describeValues(const TsbFile& file, std::size_t item) {
+// A number as the digits tell it that it has in its own width: 0.1 of 32 bits is 0.1.
+template <class Number>
+double plain(double value) {
+  return doubleOfText(NumberText(static_cast<Number>(value)).view()).value_or(value);
+}
+
+// Least and greatest value, missing values left out.
+template <class Number>
+class Range {
+ public:
+  explicit Range(double missing) : missing_(missing) {}
+
+  void take(std::span<const Number> values) {
+    const auto missing = static_cast<Number>(missing_);
+    for (const Number value : values) {
+      if (std::isnan(value) || value == missing) continue;
+      least_ = std::min(least_, static_cast<double>(value));
+      greatest_ = std::max(greatest_, static_cast<double>(value));
+    }
+  }
+  // Null when there is no value.
+  Json json() const {
+    return least_ > greatest_
+               ? Json(nullptr)
+               : Json{{"least", plain<Number>(least_)}, {"greatest", plain<Number>(greatest_)}};
+  }
+
+ private:
+  double missing_;
+  double least_ = std::numeric_limits<double>::infinity();
+  double greatest_ = -std::numeric_limits<double>::infinity();
+};
+
+// Bytes of values that are read through to tell their range, and those that are in memory at a time.
+constexpr std::size_t kMostBytes = std::size_t{256} << 20U;
+constexpr std::size_t kBytesAtOnce = std::size_t{16} << 20U;
+
+// The range of an item over the first `steps` time steps, read a part at a time: whole steps, or some rows of
+// a large grid. Null where it can't be read.
+template <class Number>
+Json rangeOf(const TsbFile& file, std::size_t item, std::size_t steps) {
   const TsbDefinition& definition = file.definition();
-  std::vector<float> values(definition.pointCount());
-  if (!file.read(item, 0, std::span<float>(values))) return nullptr;
-  const auto missing = static_cast<float>(definition.items[item - 1].deleteValue);
-  std::erase_if(values, [missing](float value) { return std::isnan(value) || value == missing; });
-  if (values.empty()) return nullptr;
-  const auto [least, greatest] = std::ranges::minmax(values);
-  return Json{{"least", least}, {"greatest", greatest}};
+  const std::size_t points = definition.pointCount();
+  constexpr std::size_t kValuesAtOnce = kBytesAtOnce / sizeof(Number);
+  Range<Number> range(definition.items[item - 1].deleteValue);
+  std::vector<Number> values;
+  const bool byRows = definition.axes.size() == 2 && points > kValuesAtOnce;
+  const std::size_t parts = byRows ? definition.axes[1].points : steps;
+  const std::size_t partSize = byRows ? definition.axes[0].points : points;
+  const std::size_t partsAtOnce = std::max<std::size_t>(kValuesAtOnce / partSize, 1);
+  for (std::size_t step = 0; step < (byRows ? steps : 1); ++step) {
+    for (std::size_t first = 0; first < parts; first += partsAtOnce) {
+      values.resize(std::min(partsAtOnce, parts - first) * partSize);
+      const std::span<Number> part(values);
+      if (const Outcome read =
+              byRows ? file.readRows(item, step, first, part) : file.readSteps(item, first, part);
+          !read) {
+        return nullptr;
+      }
+      range.take(std::span<const Number>(part));
+    }
+  }
+  return range.json();
+}
+
+Json describeRange(const TsbFile& file, std::size_t item, std::size_t steps) {
+  return file.definition().items[item - 1].isDouble ? rangeOf<double>(file, item, steps)
+                                                    : rangeOf<float>(file, item, steps);
+}
+
+// Whether the values are few enough to be read through. They have the files' width: a double's is twice a
+// float's.
+bool canReadAll(const TsbDefinition& definition) {
+  double bytes = 0;
+  for (const TsbItem& item : definition.items) bytes += item.isDouble ? sizeof(double) : sizeof(float);
+  return bytes * static_cast<double>(definition.pointCount()) * static_cast<double>(definition.time.count) <=
+         static_cast<double>(kMostBytes);
 }
 
 Json describeDataFile(const TsbFile& file) {
@@ -67,14 +138,20 @@ Json describeDataFile(const TsbFile& file) {
     report["axes"].push_back(
         {{"points", axis.points}, {"first", axis.first}, {"spacing", axis.spacing}, {"unit", axis.unit}});
   }
+  const bool all = canReadAll(definition);
   for (std::size_t i = 0; i < definition.items.size(); ++i) {
     const TsbItem& item = definition.items[i];
+    const Json first = describeRange(file, i + 1, 1);
+    const Json range = definition.time.count == 1 ? first
+                       : all                      ? describeRange(file, i + 1, definition.time.count)
+                                                  : Json(nullptr);
     report["items"].push_back({{"number", i + 1},
                                {"name", item.name},
                                {"type", item.type},
                                {"quantity", typeName(item.type)},
                                {"unit", item.unit},
-                               {"first_step", describeValues(file, i + 1)}});
+                               {"first_step", first},
+                               {"range", range}});
   }
   for (const TsbCustomBlock& block : definition.customBlocks)
     report["custom_blocks"][block.name] = block.values;
@@ -108,10 +185,13 @@ void printDataFile(const Json& report, const Console& console) {
                      axis["first"].get<double>()));
   }
   for (const Json& item : report["items"]) {
-    const Json& range = item["first_step"];
+    // Of a file too large to be read through the first step has to do.
+    const bool isFirstStep = item["range"].is_null();
+    const Json& range = item[isFirstStep ? "first_step" : "range"];
     const std::string values = range.is_null() ? ""
-                                               : fmt::format(", {:g} to {:g}", range["least"].get<double>(),
-                                                             range["greatest"].get<double>());
+                                               : fmt::format(", {:g} to {:g}{}", range["least"].get<double>(),
+                                                             range["greatest"].get<double>(),
+                                                             isFirstStep ? " at the first step" : "");
     line(fmt::format("Item {}", item["number"].get<int>()),
          fmt::format("{}: {} (type {}) in {}{}", item["name"].get<std::string>(),
                      item["quantity"].get<std::string>(), item["type"].get<int>(),
@@ -125,6 +205,8 @@ void printDataFile(const Json& report, const Console& console) {
     line("Projection", place["projection"].get<std::string>());
     line("First point", fmt::format("longitude {:.6f}, latitude {:.6f}", place["longitude"].get<double>(),
                                     place["latitude"].get<double>()));
+    if (const double turn = place["rotation"].get<double>(); turn != 0)
+      line("Rotation", fmt::format("{:g} degrees clockwise", turn));
   } else {
     line("Projection", "none");
   }
@@ -230,14 +312,18 @@ int print(const Json& report, const Options& options, void (*readable)(const Jso
   return kClean;
 }
 
-bool looksLikeDataFile(std::string_view text) {
-  return text.starts_with("\x89HDF") || text.starts_with("CDF");
+bool looksLikeDataFile(const std::string& path) {
+  std::error_code error;
+  if (!std::filesystem::is_regular_file(path, error)) return false;
+  std::array<char, 4> start{};
+  std::ifstream file(path, std::ios::binary);
+  file.read(start.data(), start.size());
+  const std::string_view text(start.data(), start.size());
+  return text == "\x89HDF" || text.starts_with("CDF");
 }
 
 int info(const Options& options, const Console& console) {
-  const Result<FileText> text = readFile(options.file);
-  if (!text) return console.fail(text.error());
-  if (looksLikeDataFile(text->view())) {
+  if (looksLikeDataFile(options.file)) {
     const Result<TsbFile> file = TsbFile::open(options.file);
     if (!file) return console.fail(file.error());
     return print(describeDataFile(*file), options, printDataFile, console);

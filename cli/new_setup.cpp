@@ -1,11 +1,12 @@
 #include <fmt/format.h>
 
-#include <filesystem>
+#include <array>
 
 #include "basic/bathymetry.h"
 #include "basic/boundary.h"
 #include "basic/simulation_period.h"
 #include "cli/commands.h"
+#include "cli/output_file.h"
 #include "core/edition.h"
 #include "platform/tsb/tsb_file.h"
 
@@ -48,6 +49,8 @@ Result<std::vector<Area>> areasOf(const Options& options) {
       areas.push_back(areaOf(options.areas[nextArea++]));
     } else if (areas.size() < 2) {
       return Failure{"--enclosing follows the --area that it is for; the first area has none"};
+    } else if (areas.back().enclosing) {
+      return Failure{fmt::format("Area {} lies in one area only: one --enclosing, not two", areas.size())};
     } else {
       areas.back().enclosing = options.enclosing[nextEnclosing++];
     }
@@ -57,16 +60,28 @@ Result<std::vector<Area>> areasOf(const Options& options) {
     if (i > 0 && !areas[i].origin) {
       return Failure{fmt::format("Area {} lies in another: say where, as {}@J,K", i + 1, areas[i].file)};
     }
+    if (i == 0) continue;
+    if (areas[i].origin->j < 0 || areas[i].origin->k < 0) {
+      return Failure{fmt::format("Area {} cannot lie at {},{}: J and K count from 0", i + 1,
+                                 areas[i].origin->j, areas[i].origin->k)};
+    }
+    const int enclosing = areas[i].enclosing.value_or(static_cast<int>(i));
+    if (enclosing < 1 || enclosing > static_cast<int>(i)) {
+      return Failure{
+          fmt::format("Area {} cannot lie in area {}: --enclosing takes the number of an area before it{}",
+                      i + 1, enclosing, i == 1 ? ", which is 1" : fmt::format(", 1 to {}", i))};
+    }
   }
   return areas;
 }
 
 int newSetup(const Options& options, const Console& console) {
-  if (!options.force && std::filesystem::exists(options.file)) {
-    return console.fail(fmt::format("\"{}\" is there already; --force replaces it", options.file));
-  }
   const Result<std::vector<Area>> areas = areasOf(options);
   if (!areas) return console.fail(areas.error());
+  std::vector<std::string> grids;
+  for (const Area& area : *areas) grids.push_back(area.file);
+  if (const Outcome free = mayWrite(options.file, options.force, grids); !free)
+    return console.fail(free.error());
   const int most = theEdition.wetlandSweepKit ? 1 : CBathymetryKvs::kMostAreas;
   if (static_cast<int>(areas->size()) > most) {
     return console.fail(fmt::format("The {} has at most {} area{}", theEdition.editorName.format, most,
@@ -76,9 +91,23 @@ int newSetup(const Options& options, const Console& console) {
   SetupFile setup(&host);
   CGlobalKvs& model = setup.model();
   if (!areas->empty()) model.bathymetry->SetNoAreas(static_cast<int>(areas->size()));
+  std::vector<std::array<std::size_t, 2>> sizes;
   for (std::size_t i = 0; i < areas->size(); ++i) {
     const Area& given = (*areas)[i];
-    if (const Result<TsbFile> file = TsbFile::open(given.file); !file) return console.fail(file.error());
+    const Result<TsbFile> file = TsbFile::open(given.file);
+    if (!file) return console.fail(file.error());
+    const std::vector<TsbGridAxis>& axes = file->definition().axes;
+    if (axes.size() != 2) return console.fail(fmt::format("\"{}\" holds no map", given.file));
+    sizes.push_back({axes[0].points, axes[1].points});
+    if (given.origin) {
+      const auto enclosing = static_cast<std::size_t>(given.enclosing.value_or(static_cast<int>(i)));
+      const auto [noJ, noK] = sizes[enclosing - 1];
+      if (static_cast<std::size_t>(given.origin->j) >= noJ ||
+          static_cast<std::size_t>(given.origin->k) >= noK) {
+        return console.fail(fmt::format("Area {} cannot lie at {},{}: area {} has {} x {} points", i + 1,
+                                        given.origin->j, given.origin->k, enclosing, noJ, noK));
+      }
+    }
     CBathymetryObjectKvs& area = *model.bathymetry->GetArea(static_cast<int>(i) + 1);
     area.fileName = given.file;
     if (given.origin) area.origin = *given.origin;
@@ -121,10 +150,13 @@ void addNew(CLI::App& tool, Action& action) {
       .add_option("--enclosing", options->enclosing,
                   "Number of the area that encloses the --area before it (default: the area before)")
       ->each([options](const std::string&) { options->order.push_back(false); });
-  command.add_option("--start", options->start, "Start of the simulation, \"YYYY-MM-DD hh:mm:ss\"");
-  command.add_option("--step", options->step, "Time step (s)");
-  command.add_option("--steps", options->steps, "Number of time steps")->check(CLI::Range(0, 2147483645));
-  command.add_flag("--force", options->force, "Replace a setup that is there");
+  command.add_option("--start", options->start,
+                     "Start of the simulation, \"YYYY-MM-DD hh:mm:ss\" (default: 1990-01-01 12:00:00)");
+  command.add_option("--step", options->step, "Time step (s, at least 0.01; default: 30)")
+      ->check(finite(0.01));
+  command.add_option("--steps", options->steps, "Number of time steps (default: 100)")
+      ->check(CLI::Range(0, 2147483645));
+  addForce(command, options->force);
 }
 
 }  // namespace gridbay::cli

@@ -1,27 +1,47 @@
 #pragma once
 
+#include <array>
 #include <optional>
 #include <span>
 #include <string>
+#include <vector>
 
 namespace gridbay::cli {
 
-// A raster file of any kind, first band. Rows are those of the file, columns run along x.
+// Where a raster's points lie, eastwards and northwards in its projection: the centre of the point in row 0
+// and column 0, and the steps from there to the next column and to the next row.
+struct RasterPlace {
+  std::array<double, 2> first{};
+  std::array<double, 2> nextColumn{1, 0};
+  std::array<double, 2> nextRow{0, 1};
+};
+
+// A raster file of any kind, or one of the rasters in it. Rows are those of the file. Bands count from 1.
 class Raster {
  public:
   virtual ~Raster() = default;
 
+  // None where the file only holds other rasters.
+  virtual int bands() const = 0;
+  // What a band holds, as far as the file tells.
+  virtual std::string bandName(int band) const = 0;
+  // What each of the further rasters in the file holds, in the order of their numbers (from 1).
+  virtual std::vector<std::string> subdatasets() const = 0;
+  // The files that it is read from, by their paths or by names of the raster library that have them in.
+  virtual std::vector<std::string> files() const = 0;
+  // How the file came about, and of what item type and unit its values are, where it tells.
+  virtual std::string history() const { return {}; }
+  virtual std::optional<int> itemType() const { return {}; }
+  virtual std::string unit() const { return {}; }
+  // Takes a band; the first until then. It must be there, here and in all that follows.
+  virtual void choose(int band) = 0;
+
   virtual int columns() const = 0;
   virtual int rows() const = 0;
-  // The centre of the point in row 0 and column 0, and the steps to the next column and the next row.
-  virtual double firstX() const = 0;
-  virtual double firstY() const = 0;
-  virtual double stepX() const = 0;
-  virtual double stepY() const = 0;
-  // False for a raster that is turned on the map or does not say where it lies.
-  virtual bool isTurned() const = 0;
+  virtual RasterPlace place() const = 0;
   virtual bool hasPlace() const = 0;
-  virtual bool isInDegrees() const = 0;
+  // The unit of the place where it is not metres, as "degrees"; else empty.
+  virtual std::string otherUnit() const = 0;
   // The projection's full text; empty when the file has none.
   virtual std::string projection() const = 0;
   virtual std::optional<double> missingValue() const = 0;
@@ -30,8 +50,9 @@ class Raster {
   virtual bool read(int firstRow, std::span<float> values, std::string* error) = 0;
 };
 
-// The entry point of the raster module: a new raster that the caller owns, or null with the reason.
+// The entry point of the raster module: a new raster that the caller owns, or null with the reason. With a
+// `subdataset` (from 1, 0 for none) that of the rasters in the file.
 inline constexpr const char* kOpenRaster = "gridbayOpenRaster";
-using OpenRaster = Raster* (*)(const char* path, std::string* error);
+using OpenRaster = Raster* (*)(const char* path, int subdataset, std::string* error);
 
 }  // namespace gridbay::cli

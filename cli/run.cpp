@@ -18,6 +18,7 @@ constexpr const char* kEngineVariable = "GRIDBAY_ENGINE";
 struct Options {
   std::string file;
   std::string engine;
+  bool force = false;
 };
 
 bool isProgram(const std::filesystem::path& path) {
@@ -59,8 +60,26 @@ Result<std::string> findEngine(const Options& options) {
       kEngineNames[0], kEngineNames[1], programFolder().string(), kEngineVariable)};
 }
 
+// Whether the setup can be started: loadable, and without faults unless they are to be passed over.
+int check(const Options& options, const Console& console) {
+  ConsoleMessageHost host(console);
+  Result<SetupFile> setup = SetupFile::open(options.file, &host);
+  if (!setup) return console.fail(setup.error());
+  ValidationList messages;
+  const unsigned faults = setup->model().Validate(messages, 1);
+  for (const CMessage& message : messages) console.note(messageLine(message));
+  if (faults == 0) return kClean;
+  const std::string count = fmt::format("{} fault{}", faults, faults == 1 ? "" : "s");
+  if (options.force) {
+    console.note(count + ", started nevertheless");
+    return kClean;
+  }
+  console.note(count + ": not started; --force starts it nevertheless");
+  return kFaultsFound;
+}
+
 int run(const Options& options, const Console& console) {
-  if (!isReadableFile(options.file)) return console.fail(fmt::format("cannot read \"{}\"", options.file));
+  if (const int status = check(options, console); status != kClean) return status;
   const Result<std::string> engine = findEngine(options);
   if (!engine) return console.fail(engine.error());
   console.out.flush();
@@ -74,9 +93,12 @@ int run(const Options& options, const Console& console) {
 
 void addRun(CLI::App& tool, Action& action) {
   std::shared_ptr<Options> options;
-  CLI::App& command = addCommand(
-      tool, action, "run", "Hands a setup to the engine; the exit status is the engine's", run, options);
+  CLI::App& command = addCommand(tool, action, "run",
+                                 "Checks a setup and hands it to the engine; the exit status is the "
+                                 "engine's, or 1 for a setup with faults",
+                                 run, options);
   command.add_option("FILE", options->file, "The setup, as it is saved")->required();
+  command.add_flag("--force", options->force, "Start it with its faults too");
   command.add_option(
       "--engine", options->engine,
       "The engine (default: GRIDBAY_ENGINE, gridbay.exe or gridbay beside this program or on the PATH)");

@@ -28,10 +28,7 @@ int validate(const Options& options, const Console& console) {
     const nlohmann::ordered_json report{{"messages", std::move(list)}, {"faults", faults}};
     console.out << report.dump(2, ' ', false, nlohmann::json::error_handler_t::replace) << '\n';
   } else {
-    for (const CMessage& message : messages) {
-      console.out << fmt::format("page {}, severity {}: {}\n", static_cast<int>(message.page),
-                                 static_cast<int>(message.severity), message.text);
-    }
+    for (const CMessage& message : messages) console.out << messageLine(message) << '\n';
     console.out << fmt::format("{} fault{}\n", faults, faults == 1 ? "" : "s");
   }
   return faults == 0 ? kClean : kFaultsFound;

@@ -90,18 +90,26 @@ std::string CVdMapProjection::Name() const {
 
 std::string CVdMapProjection::GetProjectionString() const {
   if (!state_->crs) return IsLocal() ? std::string(kLocal) : std::string();
-  const char* options[] = {"MULTILINE=NO", nullptr};
-  const char* wkt = proj_as_wkt(state_->context.get(), state_->crs.get(), PJ_WKT1_ESRI, options);
-  return wkt == nullptr ? Wkt() : wkt;
+  const std::string text = wktOf(PJ_WKT1_ESRI);
+  return text.empty() ? Wkt() : text;
 }
 
 std::string CVdMapProjection::Wkt() const {
+  const std::string text = wktOf(PJ_WKT1_GDAL);
+  return text.empty() ? Wkt2() : text;
+}
+
+std::string CVdMapProjection::Wkt2() const {
+  return wktOf(PJ_WKT2_2019);
+}
+
+// On one line; empty where the form cannot tell the projection.
+std::string CVdMapProjection::wktOf(int type) const {
   if (!state_->crs) return {};
   const char* options[] = {"MULTILINE=NO", nullptr};
-  for (const PJ_WKT_TYPE type : {PJ_WKT1_GDAL, PJ_WKT2_2019}) {
-    if (const char* wkt = proj_as_wkt(state_->context.get(), state_->crs.get(), type, options)) return wkt;
-  }
-  return {};
+  const char* text =
+      proj_as_wkt(state_->context.get(), state_->crs.get(), static_cast<PJ_WKT_TYPE>(type), options);
+  return text == nullptr ? std::string() : text;
 }
 
 bool CVdMapProjection::Geo2Proj(double longitude, double latitude, double* east, double* north) const {

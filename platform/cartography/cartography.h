@@ -28,6 +28,8 @@ class CVdMapProjection {
   std::string GetProjectionString() const;
   // The full projection text in the form that map data files carry (WKT1 of GDAL); empty when local.
   std::string Wkt() const;
+  // The same in the second version of that form (WKT2 of 2019).
+  std::string Wkt2() const;
 
   // Longitude and latitude (degrees, on the projection's own datum) to easting and northing (metres), and
   // back. False, with the results left alone, for local coordinates and for points that the projection cannot
@@ -36,6 +38,8 @@ class CVdMapProjection {
   bool Proj2Geo(double east, double north, double* longitude, double* latitude) const;
 
  private:
+  std::string wktOf(int type) const;
+
   struct State;
   std::unique_ptr<State> state_;
 };

@@ -9,6 +9,7 @@ inline constexpr const char* kProjection = "projection";
 inline constexpr const char* kCustomBlocks = "custom_blocks";
 inline constexpr const char* kDataType = "data_type";
 inline constexpr const char* kTitle = "title";
+inline constexpr const char* kHistory = "history";
 inline constexpr const char* kAxisType = "axis_type";
 inline constexpr const char* kFirst = "first_value";
 inline constexpr const char* kStep = "step";

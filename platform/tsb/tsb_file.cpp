@@ -142,6 +142,7 @@ class DefinitionReader {
 
   Outcome read() {
     definition_.title = textAttribute(file_, NC_GLOBAL, tsb::kTitle).value_or("");
+    definition_.history = textAttribute(file_, NC_GLOBAL, tsb::kHistory).value_or("");
     definition_.dataType = integerAttribute(file_, NC_GLOBAL, tsb::kDataType).value_or(0);
     if (Outcome time = readTime(); !time) return time;
     if (Outcome axes = readAxes(); !axes) return axes;
@@ -362,6 +363,23 @@ struct TsbFile::State {
                 nc_strerror(status));
   }
 
+  template <class Number, class Get>
+  Outcome readRows(std::size_t item, std::size_t step, std::size_t firstRow, std::span<Number> values,
+                   Get get) const {
+    const std::size_t row = definition.axes.empty() ? 1 : definition.axes[0].points;
+    if (definition.axes.size() != 2 || row == 0 || values.size() % row != 0)
+      return fail("a part of it was asked for that is not of whole rows");
+    return readBlock(item, {step, 1}, {firstRow, values.size() / row}, values, get);
+  }
+
+  template <class Number, class Get>
+  Outcome readSteps(std::size_t item, std::size_t firstStep, std::span<Number> values, Get get) const {
+    const std::size_t points = definition.pointCount();
+    if (points == 0 || values.size() % points != 0)
+      return fail("a part of it was asked for that is not of whole steps");
+    return readBlock(item, {firstStep, values.size() / points}, {0, rowCount()}, values, get);
+  }
+
   std::size_t rowCount() const { return definition.axes.size() == 2 ? definition.axes[1].points : 1; }
   Failure fail(std::string_view why) const { return cannotRead(path, why); }
 };
@@ -406,18 +424,20 @@ Outcome TsbFile::read(std::size_t item, std::size_t step, std::span<double> valu
 
 Outcome TsbFile::readRows(std::size_t item, std::size_t step, std::size_t firstRow,
                           std::span<float> values) const {
-  const std::size_t row = definition().axes.empty() ? 1 : definition().axes[0].points;
-  if (definition().axes.size() != 2 || row == 0 || values.size() % row != 0)
-    return state_->fail("a part of it was asked for that is not of whole rows");
-  return state_->readBlock(item, {step, 1}, {firstRow, values.size() / row}, values, nc_get_vara_float);
+  return state_->readRows(item, step, firstRow, values, nc_get_vara_float);
+}
+
+Outcome TsbFile::readRows(std::size_t item, std::size_t step, std::size_t firstRow,
+                          std::span<double> values) const {
+  return state_->readRows(item, step, firstRow, values, nc_get_vara_double);
 }
 
 Outcome TsbFile::readSteps(std::size_t item, std::size_t firstStep, std::span<float> values) const {
-  const std::size_t points = definition().pointCount();
-  if (points == 0 || values.size() % points != 0)
-    return state_->fail("a part of it was asked for that is not of whole steps");
-  return state_->readBlock(item, {firstStep, values.size() / points}, {0, state_->rowCount()}, values,
-                           nc_get_vara_float);
+  return state_->readSteps(item, firstStep, values, nc_get_vara_float);
+}
+
+Outcome TsbFile::readSteps(std::size_t item, std::size_t firstStep, std::span<double> values) const {
+  return state_->readSteps(item, firstStep, values, nc_get_vara_double);
 }
 
 }  // namespace gridbay

@@ -36,8 +36,10 @@ class TsbFile {
 
   // Rows `firstRow` and on (from 0) of a two-dimensional item; whole rows only.
   Outcome readRows(std::size_t item, std::size_t step, std::size_t firstRow, std::span<float> values) const;
+  Outcome readRows(std::size_t item, std::size_t step, std::size_t firstRow, std::span<double> values) const;
   // All points of time steps `firstStep` and on; whole steps only.
   Outcome readSteps(std::size_t item, std::size_t firstStep, std::span<float> values) const;
+  Outcome readSteps(std::size_t item, std::size_t firstStep, std::span<double> values) const;
 
  private:
   struct State;

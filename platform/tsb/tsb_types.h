@@ -1,6 +1,7 @@
 #pragma once
 
 #include <array>
+#include <cmath>
 #include <cstdint>
 #include <optional>
 #include <string>
@@ -57,13 +58,19 @@ struct TsbItem {
   double deleteValue = -1e-35;  // stands for a missing value
 };
 
-// Where a grid lies: the projection's text, longitude and latitude of the first point, the rotation in
-// degrees.
+// Where a grid lies: the projection's text, longitude and latitude of the first point, and the direction of
+// K in degrees clockwise from the projection's north. A grid that is turned has axes of its own, in metres
+// from the first point.
 struct TsbGeography {
   std::string projection;
   double longitude = 0;
   double latitude = 0;
   double rotation = 0;
+
+  bool isTurned() const {
+    constexpr double kNoRotation = 1e-6;
+    return std::abs(rotation) >= kNoRotation;
+  }
 };
 
 // A named row of numbers that belongs to the file as a whole.
@@ -76,6 +83,7 @@ struct TsbCustomBlock {
 // All of a data file but its values. `axes` has none, one (x) or two (x, y) directions; x is fastest.
 struct TsbDefinition {
   std::string title;
+  std::string history;  // how the file came about, a line for each step; for people
   int dataType = 0;
   TsbTimeAxis time;
   std::vector<TsbGridAxis> axes;

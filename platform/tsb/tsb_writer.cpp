@@ -7,6 +7,7 @@
 #include <unistd.h>
 
 #include <algorithm>
+#include <array>
 #include <cctype>
 #include <cerrno>
 #include <filesystem>
@@ -15,6 +16,7 @@
 #include <vector>
 
 #include "platform/cartography/cartography.h"
+#include "platform/cartography/grid_mapping.h"
 #include "platform/files/file_descriptor.h"
 #include "platform/files/paths.h"
 #include "platform/tsb/netcdf_names.h"
@@ -69,11 +71,19 @@ std::string plainName(std::string_view text, std::set<std::string>& taken) {
 
 class DefinitionWriter {
  public:
-  DefinitionWriter(int file, const TsbDefinition& definition) : file_(file), definition_(definition) {}
+  DefinitionWriter(int file, const TsbDefinition& definition) : file_(file), definition_(definition) {
+    if (!definition_.geography) return;
+    const CVdMapProjection projection(definition_.geography->projection);
+    wkt1_ = projection.Wkt();
+    wkt2_ = projection.Wkt2();
+    mapping_ = gridMappingOf(wkt2_.empty() ? wkt1_ : wkt2_);
+    isTurned_ = definition_.geography->isTurned();
+  }
 
   std::vector<int> write() {
     putText(file_, NC_GLOBAL, "Conventions", "CF-1.8");
     putText(file_, NC_GLOBAL, tsb::kTitle, definition_.title);
+    if (!definition_.history.empty()) putText(file_, NC_GLOBAL, tsb::kHistory, definition_.history);
     putInteger(file_, NC_GLOBAL, tsb::kDataType, definition_.dataType);
     addTime();
     addAxes();
@@ -111,6 +121,9 @@ class DefinitionWriter {
   void addAxes() {
     constexpr const char* kNames[] = {"projection_x_coordinate", "projection_y_coordinate"};
     constexpr const char* kLetters[] = {"X", "Y"};
+    // The coordinates of a grid that is turned are its own: neither the map's axes nor eastings and
+    // northings.
+    const bool isProjected = !wkt2_.empty() && !isTurned_ && !isInDegrees();
     for (std::size_t i = definition_.axes.size(); i-- > 0;) {
       const TsbGridAxis& axis = definition_.axes[i];
       const int dimension = addDimension(file_, tsb::kAxes[i], axis.points);
@@ -118,8 +131,8 @@ class DefinitionWriter {
       const int variable = addVariable(file_, tsb::kAxes[i], NC_DOUBLE, {dimension});
       axisVariables_.insert(axisVariables_.begin(), variable);
       putText(file_, variable, "units", axis.unit);
-      putText(file_, variable, "axis", kLetters[i]);
-      if (definition_.geography) putText(file_, variable, "standard_name", kNames[i]);
+      if (!isTurned_) putText(file_, variable, "axis", kLetters[i]);
+      if (isProjected) putText(file_, variable, "standard_name", kNames[i]);
       putNumber(file_, variable, tsb::kFirst, axis.first);
       putNumber(file_, variable, tsb::kStep, axis.spacing);
     }
@@ -133,10 +146,41 @@ class DefinitionWriter {
     putNumber(file_, variable, tsb::kLongitude, place.longitude);
     putNumber(file_, variable, tsb::kLatitude, place.latitude);
     putNumber(file_, variable, tsb::kRotation, place.rotation);
-    const std::string wkt = CVdMapProjection(place.projection).Wkt();
-    if (wkt.empty()) return;
-    putText(file_, variable, "crs_wkt", wkt);
-    putText(file_, variable, "spatial_ref", wkt);
+    if (mapping_) {
+      putText(file_, variable, "grid_mapping_name", mapping_->name);
+      for (const auto& [name, values] : mapping_->numbers)
+        check(nc_put_att_double(file_, variable, name.c_str(), NC_DOUBLE, values.size(), values.data()));
+      for (const auto& [name, text] : mapping_->texts) putText(file_, variable, name.c_str(), text);
+    }
+    if (!wkt2_.empty()) putText(file_, variable, "crs_wkt", wkt2_);
+    if (!wkt1_.empty()) putText(file_, variable, "spatial_ref", wkt1_);
+    if (isTurned_ && !isInDegrees()) putGeoTransform(variable, place);
+  }
+
+  bool isInDegrees() const { return mapping_ && mapping_->name == kGeographicMapping; }
+
+  // The corner of the first point's cell and the steps along a row and from row to row, by which the raster
+  // library places a grid that is turned.
+  void putGeoTransform(int variable, const TsbGeography& place) {
+    double east = 0;
+    double north = 0;
+    if (definition_.axes.size() != 2 ||
+        !CVdMapProjection(place.projection).Geo2Proj(place.longitude, place.latitude, &east, &north))
+      return;
+    const CVdCartography grid(place.projection, east, north, place.rotation);
+    const double dx = definition_.axes[0].spacing;
+    const double dy = definition_.axes[1].spacing;
+    const auto at = [&grid](double x, double y) {
+      std::array<double, 2> there{};
+      grid.Xy2Proj(x, y, &there[0], &there[1]);
+      return there;
+    };
+    const auto corner = at(-dx / 2, -dy / 2);
+    const auto alongRow = at(dx / 2, -dy / 2);
+    const auto nextRow = at(-dx / 2, dy / 2);
+    putText(file_, variable, "GeoTransform",
+            fmt::format("{:.17g} {:.17g} {:.17g} {:.17g} {:.17g} {:.17g}", corner[0], alongRow[0] - corner[0],
+                        nextRow[0] - corner[0], corner[1], alongRow[1] - corner[1], nextRow[1] - corner[1]));
   }
 
   std::vector<int> addItems() {
@@ -158,6 +202,8 @@ class DefinitionWriter {
       }
       putText(file_, variable, "long_name", item.name);
       putText(file_, variable, "units", item.unit);
+      if (const std::string_view name = standardNameOf(item); !name.empty())
+        putText(file_, variable, "standard_name", name);
       putInteger(file_, variable, tsb::kItemType, item.type);
       putInteger(file_, variable, tsb::kItemNumber, static_cast<int>(variables.size()));
       if (definition_.geography) putText(file_, variable, "grid_mapping", tsb::kProjection);
@@ -199,8 +245,24 @@ class DefinitionWriter {
     }
   }
 
+  // None for a component of a vector, which has the code of the whole, nor for a unit of another kind.
+  static std::string_view standardNameOf(const TsbItem& item) {
+    const QunItem* quantity = qunFindItem(item.type);
+    if (quantity == nullptr || quantity->standardName.empty()) return {};
+    std::string name = item.name;
+    std::ranges::transform(name, name.begin(),
+                           [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
+    if (name.find("component") != name.npos) return {};
+    return qunAreEquivalent(item.unit, qunBaseUnit(item.type)->text) ? quantity->standardName
+                                                                     : std::string_view();
+  }
+
   int file_;
   const TsbDefinition& definition_;
+  std::string wkt1_;  // of the projection; empty without one
+  std::string wkt2_;
+  std::optional<GridMapping> mapping_;
+  bool isTurned_ = false;
   std::vector<int> dimensions_;  // time, then y, then x
   std::vector<int> axisVariables_;
   int timeVariable_ = 0;

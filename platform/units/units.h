@@ -25,6 +25,8 @@ struct QunItem {
   std::string_view name;
   std::span<const int> units;
   int usUnit;  // the unit to show where US units are chosen
+  // The name that the CF conventions have for just this quantity; empty where they have none.
+  std::string_view standardName = {};
 };
 
 namespace unit {

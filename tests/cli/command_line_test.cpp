@@ -11,6 +11,7 @@
 
 #include "core/edition.h"
 #include "platform/tsb/tsb_file.h"
+#include "platform/tsb/tsb_writer.h"
 #include "tests/support/grids.h"
 #include "tests/support/programs.h"
 #include "tests/support/temporary_folder.h"
@@ -41,9 +42,18 @@ class Tool : public ::testing::Test {
 };
 
 TEST_F(Tool, HelpOnEveryCommand) {
-  const std::vector<std::vector<std::string>> commands{
-      {},      {"convert"}, {"convert", "raster"}, {"convert", "series"}, {"info"}, {"new"},
-      {"get"}, {"set"},     {"boundaries"},        {"validate"},          {"run"}};
+  const std::vector<std::vector<std::string>> commands{{},
+                                                       {"convert"},
+                                                       {"convert", "raster"},
+                                                       {"convert", "series"},
+                                                       {"convert", "types"},
+                                                       {"info"},
+                                                       {"new"},
+                                                       {"get"},
+                                                       {"set"},
+                                                       {"boundaries"},
+                                                       {"validate"},
+                                                       {"run"}};
   for (std::vector<std::string> words : commands) {
     words.push_back("--help");
     const ProgramRun run = runTool(words);
@@ -95,7 +105,45 @@ TEST_F(Tool, NewSaysWhatIsWrongWithItsAreas) {
   EXPECT_THAT(runTool({"new", setup, "--start", "yesterday"}).err,
               HasSubstr("\"yesterday\" is no moment of the form"));
   EXPECT_EQ(runTool({"new", setup, "--steps", "-1"}).status, 2);
+  for (const char* step : {"0", "-1", "0.0099", "nan", "inf", "1e39", "soon"})
+    EXPECT_THAT(runTool({"new", setup, "--step", step}).err, HasSubstr("--step: ")) << step;
+  test::writeSeries(folder.file("s.tsb0"), {}, 100000, "m");
+  EXPECT_THAT(runTool({"new", setup, "--area", folder.file("s.tsb0")}).err, HasSubstr("holds no map"));
   EXPECT_FALSE(fs::exists(setup));
+  EXPECT_EQ(runTool({"new", setup, "--step", "0.01"}).status, 0);
+  EXPECT_EQ(get("NESTED_MODEL_GLOBALS/SIMULATION_PERIOD/Time_Step_Interval"), "0.01\n");
+}
+
+TEST_F(Tool, NewRefusesPlacesThatCannotBe) {
+  if (theEdition.wetlandSweepKit) return;  // it has one area
+  test::writeGrid(folder.file("g.tsb2"), {.noJ = 10, .noK = 8});
+  const std::string grid = folder.file("g.tsb2");
+  const auto refused = [&](std::vector<std::string> words) {
+    words.insert(words.begin(), {"new", setup, "--area", grid});
+    const ProgramRun run = runTool(words);
+    EXPECT_EQ(run.status, 2);
+    EXPECT_FALSE(fs::exists(setup));
+    return run.err;
+  };
+  EXPECT_EQ(refused({"--area", grid + "@-1,2"}), "Area 2 cannot lie at -1,2: J and K count from 0\n");
+  EXPECT_EQ(refused({"--area", grid + "@1,-2"}), "Area 2 cannot lie at 1,-2: J and K count from 0\n");
+  EXPECT_EQ(refused({"--area", grid + "@10,2"}), "Area 2 cannot lie at 10,2: area 1 has 10 x 8 points\n");
+  EXPECT_EQ(refused({"--area", grid + "@2,8"}), "Area 2 cannot lie at 2,8: area 1 has 10 x 8 points\n");
+  EXPECT_EQ(refused({"--area", grid + "@1,2", "--enclosing", "2"}),
+            "Area 2 cannot lie in area 2: --enclosing takes the number of an area before it, which is 1\n");
+  EXPECT_EQ(refused({"--area", grid + "@1,2", "--area", grid + "@1,2", "--enclosing", "0"}),
+            "Area 3 cannot lie in area 0: --enclosing takes the number of an area before it, 1 to 2\n");
+  EXPECT_THAT(refused({"--area", grid + "@1,2", "--enclosing", "1", "--enclosing", "1"}),
+              HasSubstr("one --enclosing, not two"));
+}
+
+TEST_F(Tool, NewDoesNotReplaceAGridThatItReads) {
+  test::writeGrid(folder.file("g.tsb2"), {});
+  const std::string before = textOf(folder.file("g.tsb2"));
+  const ProgramRun run = runTool({"new", folder.file("g.tsb2"), "--area", folder.file("g.tsb2"), "--force"});
+  EXPECT_EQ(run.status, 2);
+  EXPECT_THAT(run.err, HasSubstr("is a file that is read here"));
+  EXPECT_EQ(textOf(folder.file("g.tsb2")), before);
 }
 
 TEST_F(Tool, NestedAreasArePlaced) {
@@ -313,6 +361,58 @@ TEST_F(Tool, InfoOfDataFiles) {
   EXPECT_THAT(damaged.err, HasSubstr("it is no data file, or it is damaged"));
 }
 
+TEST_F(Tool, InfoTellsTheRangeOverAllSteps) {
+  // Three steps of two items, the second of 64 bits; the first value of the second step is missing.
+  TsbDefinition definition = test::definitionOf({.noJ = 3, .noK = 3, .items = 2, .steps = 3});
+  definition.items[1].isDouble = true;
+  const std::string path = folder.file("r.tsb2");
+  {
+    Result<TsbWriter> writer = TsbWriter::create(path, definition);
+    ASSERT_TRUE(writer) << writer.error();
+    for (std::size_t step = 0; step < 3; ++step) {
+      std::vector<float> values(9, static_cast<float>(step) - 1.1F);
+      values[4] = step == 2 ? 7.5F : 0.25F;
+      if (step == 1) values[0] = static_cast<float>(definition.items[0].deleteValue);
+      ASSERT_TRUE(writer->write(1, step, std::span<const float>(values)));
+      std::vector<double> doubles(9, 0.1 * static_cast<double>(step));
+      ASSERT_TRUE(writer->write(2, step, std::span<const double>(doubles)));
+    }
+    ASSERT_TRUE(writer->commit());
+  }
+  const auto items = nlohmann::json::parse(runTool({"info", path, "--json"}).out)["items"];
+  EXPECT_EQ(items[0]["first_step"], (nlohmann::json{{"least", -1.1}, {"greatest", 0.25}}));
+  EXPECT_EQ(items[0]["range"], (nlohmann::json{{"least", -1.1}, {"greatest", 7.5}}));
+  EXPECT_EQ(items[1]["range"], (nlohmann::json{{"least", 0}, {"greatest", 0.2}}));
+  EXPECT_THAT(runTool({"info", path}).out, HasSubstr("in m, -1.1 to 7.5\n"));
+}
+
+// 272 MB of values that take no place on the disk; of them only the first step is read.
+TEST_F(Tool, InfoOfALargeFileTellsTheFirstStepAlone) {
+  TsbDefinition definition = test::definitionOf({.noJ = 1000, .noK = 1000, .steps = 68});
+  definition.items[0].unit = "m";
+  const std::string path = folder.file("r.tsb2");
+  {
+    Result<TsbWriter> writer = TsbWriter::create(path, definition);
+    ASSERT_TRUE(writer) << writer.error();
+    const std::vector<float> values(1000000, 3);
+    ASSERT_TRUE(writer->write(1, 0, std::span<const float>(values)));
+    const std::vector<float> more(1000000, 9);
+    ASSERT_TRUE(writer->write(1, 67, std::span<const float>(more)));
+    ASSERT_TRUE(writer->commit());
+  }
+  const auto item = nlohmann::json::parse(runTool({"info", path, "--json"}).out)["items"][0];
+  EXPECT_EQ(item["first_step"], (nlohmann::json{{"least", 3}, {"greatest", 3}}));
+  EXPECT_TRUE(item["range"].is_null());
+  EXPECT_THAT(runTool({"info", path}).out, HasSubstr("in m, 3 to 3 at the first step\n"));
+}
+
+// A single step that is read some rows at a time.
+TEST_F(Tool, InfoOfALargeGrid) {
+  test::writeGrid(folder.file("g.tsb2"), {.noJ = 2500, .noK = 2500},
+                  [](int j, int k) { return static_cast<float>(k == 2499 && j == 2499 ? -7 : k); });
+  EXPECT_THAT(runTool({"info", folder.file("g.tsb2")}).out, HasSubstr("in m, -7 to 2499\n"));
+}
+
 TEST_F(Tool, InfoOfASetup) {
   makeSetup();
   const ProgramRun run = runTool({"info", setup});
@@ -327,143 +427,6 @@ TEST_F(Tool, InfoOfASetup) {
             "Boundary 2       (0,7) - (2,7)\n"
             "Boundary 3       (0,0) - (2,0)\n"
             "Flood and dry    drying at 0.02 m, flooding at 0.05 m\n");
-}
-
-// A raster of 4 x 3 points with one missing value, row 0 in the north.
-constexpr std::string_view kRaster =
-    "ncols 4\nnrows 3\nxllcorner 100\nyllcorner 200\ncellsize 10\nNODATA_value -99\n"
-    "8 9 10 11\n4 5 6 -99\n0 1 2 3\n";
-
-class ConvertRaster : public Tool {
- protected:
-  nlohmann::json convert(std::vector<std::string> options) {
-    std::vector<std::string> words{"convert", "raster", folder.write("r.asc", kRaster), out, "--land", "60"};
-    words.insert(words.end(), options.begin(), options.end());
-    run = runTool(words);
-    EXPECT_EQ(run.status, 0) << run.err;
-    return nlohmann::json::parse(runTool({"info", out, "--json"}).out);
-  }
-  std::vector<float> values(std::size_t count) {
-    std::vector<float> all(count);
-    Result<TsbFile> file = TsbFile::open(out);
-    EXPECT_TRUE(file->read(1, 0, std::span<float>(all)));
-    return all;
-  }
-  std::string out = folder.file("r.tsb2");
-  ProgramRun run;
-};
-
-TEST_F(ConvertRaster, RowsAreTurnedSoThatKRunsNorth) {
-  const auto info = convert({});
-  EXPECT_EQ(info["axes"][0], (nlohmann::json{{"points", 4}, {"first", 105}, {"spacing", 10}, {"unit", "m"}}));
-  EXPECT_EQ(info["axes"][1], (nlohmann::json{{"points", 3}, {"first", 205}, {"spacing", 10}, {"unit", "m"}}));
-  EXPECT_EQ(info["items"][0]["type"], 100079);
-  EXPECT_EQ(info["custom_blocks"]["V27_Misc"], (nlohmann::json{0, 0, 0, 60}));
-  EXPECT_FALSE(info.contains("geography"));
-  EXPECT_EQ(values(12), (std::vector<float>{0, 1, 2, 3, 4, 5, 6, 60, 8, 9, 10, 11}));
-  EXPECT_THAT(run.out, HasSubstr("1 missing values written as 60"));
-}
-
-TEST_F(ConvertRaster, Options) {
-  auto info = convert({"--nodata-as", "-7", "--crs", "UTM-32", "--origin-x", "500000", "--origin-y",
-                       "6094791.419", "--item-type", "100078", "--window", "1,0,3,2", "--coarsen", "2"});
-  EXPECT_EQ(values(4), (std::vector<float>{1, 3, 9, 11}));
-  EXPECT_EQ(info["axes"][0],
-            (nlohmann::json{{"points", 2}, {"first", 500000}, {"spacing", 20}, {"unit", "m"}}));
-  EXPECT_EQ(info["items"][0]["type"], 100078);
-  EXPECT_NEAR(info["geography"]["longitude"], 9, 1e-6);
-  EXPECT_NEAR(info["geography"]["latitude"], 55, 1e-4);
-  info = convert({"--window", "1,1,3,2"});
-  EXPECT_EQ(values(6), (std::vector<float>{5, 6, 60, 9, 10, 11}));
-  EXPECT_EQ(info["axes"][0]["first"], 115);
-  EXPECT_EQ(info["axes"][1]["first"], 215);
-}
-
-TEST_F(ConvertRaster, OtherFormatsAndDirections) {
-  folder.write("r.asc", kRaster);
-  const std::string tif = folder.file("r.tif");
-  ASSERT_EQ(test::runProgram("gdal_translate", {"-q", "-a_srs", "EPSG:28356", "-a_scale", "2", "-a_offset",
-                                                "1", folder.file("r.asc"), tif})
-                .status,
-            0);
-  ASSERT_EQ(runTool({"convert", "raster", tif, out, "--land", "60"}).status, 0);
-  EXPECT_EQ(values(12), (std::vector<float>{1, 3, 5, 7, 9, 11, 13, 60, 17, 19, 21, 23}));
-  EXPECT_EQ(nlohmann::json::parse(runTool({"info", out, "--json"}).out)["geography"]["projection"],
-            "GDA94 / MGA zone 56");
-}
-
-TEST_F(ConvertRaster, WhatCannotBeDone) {
-  const std::string raster = folder.write("r.asc", kRaster);
-  const auto refused = [&](std::vector<std::string> words) {
-    words.insert(words.begin(), {"convert", "raster"});
-    const ProgramRun refusal = runTool(words);
-    EXPECT_EQ(refusal.status, 2);
-    EXPECT_FALSE(fs::exists(out));
-    return refusal.err;
-  };
-  EXPECT_THAT(refused({folder.file("none.asc"), out, "--land", "1"}), HasSubstr("none.asc"));
-  EXPECT_THAT(refused({folder.write("junk.asc", "junk"), out, "--land", "1"}), HasSubstr("junk.asc"));
-  EXPECT_THAT(refused({raster, out, "--land", "1", "--crs", "nonsense"}),
-              HasSubstr("\"nonsense\" is no projection that is known"));
-  EXPECT_THAT(refused({raster, out, "--land", "1", "--item-type", "7"}),
-              HasSubstr("There is no item type 7"));
-  EXPECT_THAT(refused({raster, out, "--land", "1", "--window", "0,0,4,2"}), HasSubstr("which goes to 3,2"));
-  EXPECT_THAT(refused({raster, out, "--land", "1", "--coarsen", "0"}), HasSubstr("--coarsen"));
-  EXPECT_THAT(refused({raster, folder.file("no/r.tsb2"), "--land", "1"}),
-              HasSubstr("No such file or directory"));
-  ASSERT_EQ(
-      test::runProgram("gdal_translate", {"-q", "-a_srs", "EPSG:4326", raster, folder.file("d.tif")}).status,
-      0);
-  EXPECT_THAT(refused({folder.file("d.tif"), out, "--land", "1"}), HasSubstr("The raster is in degrees"));
-}
-
-class ConvertSeries : public Tool {
- protected:
-  ProgramRun convert(std::string_view text, std::vector<std::string> options = {}) {
-    std::vector<std::string> words{"convert", "series",  folder.write("s.txt", text), out, "--item-type",
-                                   "100000",  "--start", "2000-01-01 00:00:00"};
-    words.insert(words.end(), options.begin(), options.end());
-    return runTool(words);
-  }
-  nlohmann::json info() { return nlohmann::json::parse(runTool({"info", out, "--json"}).out); }
-  std::string out = folder.file("s.tsb0");
-};
-
-TEST_F(ConvertSeries, DelimitersColumnsAndHeadings) {
-  for (const std::string_view text :
-       {"time,Level a,b\n0,1,2\n1,3,4\n", "time;Level a;b\n0;1;2\n1;3;4",
-        "time\tLevel a\tb\r\n0\t1\t2\r\n1\t3\t4\r\n", "time  Level a  b\n 0   1 2\n\n1 3   4 \n"}) {
-    const ProgramRun run = convert(text, {"--skip-lines", "1", "--time-unit", "h"});
-    ASSERT_EQ(run.status, 0) << run.err;
-    const auto report = info();
-    EXPECT_EQ(report["items"][0]["name"], "Level a");
-    EXPECT_EQ(report["items"][1]["name"], "b");
-    EXPECT_EQ(report["items"][1]["first_step"]["least"], 2);
-    EXPECT_EQ(report["time"]["step"], 1);
-    EXPECT_EQ(report["time"]["unit"], "h");
-    EXPECT_EQ(report["dimensions"], 0);
-    double second = 0;
-    ASSERT_TRUE(TsbFile::open(out)->read(2, 1, std::span<double>(&second, 1)));
-    EXPECT_EQ(second, 4);
-  }
-}
-
-TEST_F(ConvertSeries, UnevenTimesAreKept) {
-  ASSERT_EQ(convert("0 1\n1 2\n5 3\n").status, 0);
-  EXPECT_EQ(info()["time"]["equidistant"], false);
-  EXPECT_EQ(info()["time"]["last"], 5);
-}
-
-TEST_F(ConvertSeries, WhatCannotBeDone) {
-  EXPECT_THAT(convert("time x\n0 1\n").err,
-              HasSubstr("line 1: \"time\" is no number (are there heading lines?"));
-  EXPECT_THAT(convert("0 1\n1 2 3\n").err, HasSubstr("line 2: 3 fields, where the lines before have 2"));
-  EXPECT_THAT(convert("0 1\n0 2\n").err, HasSubstr("line 2: the time does not rise"));
-  EXPECT_THAT(convert("0\n").err, HasSubstr("line 1: a time and at least one value are expected"));
-  EXPECT_THAT(convert("").err, HasSubstr("there are no values"));
-  EXPECT_THAT(convert("0 1\n", {"--time-unit", "m"}).err, HasSubstr("\"m\" is no unit of time"));
-  EXPECT_EQ(convert("0 1\n", {"--time-unit", "m"}).status, 2);
-  EXPECT_FALSE(fs::exists(out));
 }
 
 class RunEngine : public Tool {
@@ -486,6 +449,27 @@ TEST_F(RunEngine, GetsTheSavedFileAndItsStatusIsPassedOn) {
   EXPECT_EQ(runTool({"run", setup}, {"PATH=/nowhere:" + folder.path().string()}).status, 3);
   engine("exit 4", "gridbay.exe");
   EXPECT_EQ(runTool({"run", setup}, {"PATH=" + folder.path().string()}).status, 4);
+}
+
+TEST_F(RunEngine, ASetupWithFaultsIsNotStartedUnasked) {
+  makeSetup();
+  ASSERT_EQ(runTool({"set", setup, "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=-1"}).status, 0);
+  const std::string program = engine("echo started; exit 3");
+  ProgramRun run = runTool({"run", setup, "--engine", program});
+  EXPECT_EQ(run.status, 1);
+  EXPECT_EQ(run.out, "");
+  EXPECT_EQ(run.err,
+            "page 26, severity 1: Drying depth must be positive\n"
+            "1 fault: not started; --force starts it nevertheless\n");
+  run = runTool({"run", setup, "--engine", program, "--force"});
+  EXPECT_EQ(run.status, 3);
+  EXPECT_EQ(run.out, "started\n");
+  EXPECT_THAT(run.err, HasSubstr("1 fault, started nevertheless\n"));
+  const std::string broken = folder.write("broken." + std::string(theEdition.fileKind), "A {");
+  run = runTool({"run", broken, "--engine", program, "--force"});
+  EXPECT_EQ(run.status, 2);
+  EXPECT_EQ(run.out, "");
+  EXPECT_THAT(run.err, HasSubstr("found the end of the file"));
 }
 
 TEST_F(RunEngine, WithoutAnEngineItSaysWhereItLooked) {

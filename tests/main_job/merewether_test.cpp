@@ -27,7 +27,7 @@ class Merewether : public ::testing::Test {
         "convert",         "raster", std::string(GRIDBAY_SHARED_DATA) + "/merewether_terrain.asc",
         folder.file(name), "--land", "60",
         "--nodata-as",     "60",     "--crs",
-        "EPSG:28356"};
+        "EPSG:28356",      "--force"};
     words.insert(words.end(), options.begin(), options.end());
     const test::ProgramRun run = runTool(words);
     EXPECT_EQ(run.status, 0) << run.err;

@@ -2,6 +2,10 @@
 
 #include <gmock/gmock.h>
 
+#include <map>
+
+#include "platform/cartography/grid_mapping.h"
+
 namespace gridbay {
 namespace {
 
@@ -58,6 +62,40 @@ TEST(MapProjection, TextsThatNameNone) {
   for (const char* text : {"UTM-0", "UTM-61", "UTM-x", "UTM-32Q", "EPSG:1", "PROJCS[", "nonsense"}) {
     EXPECT_FALSE(CVdMapProjection(text).IsValid()) << text;
   }
+}
+
+TEST(MapProjection, TheSecondVersionOfTheFullText) {
+  EXPECT_THAT(CVdMapProjection("UTM-32").Wkt2(), StartsWith("PROJCRS[\"WGS 84 / UTM zone 32N\""));
+  EXPECT_EQ(CVdMapProjection("Local Coordinates").Wkt2(), "");
+  EXPECT_EQ(CVdMapProjection(CVdMapProjection("EPSG:28356").Wkt2()).Name(), "GDA94 / MGA zone 56");
+}
+
+TEST(GridMapping, ByTheConventions) {
+  const auto numbers = [](const std::string& projection) {
+    const std::optional<GridMapping> mapping = gridMappingOf(CVdMapProjection(projection).Wkt2());
+    EXPECT_TRUE(mapping) << projection;
+    std::map<std::string, std::vector<double>> all;
+    if (mapping) all.insert(mapping->numbers.begin(), mapping->numbers.end());
+    all[mapping ? mapping->name : ""];
+    return all;
+  };
+  auto utm = numbers("EPSG:28356");
+  EXPECT_TRUE(utm.contains("transverse_mercator"));
+  EXPECT_EQ(utm["longitude_of_central_meridian"], std::vector<double>{153});
+  EXPECT_EQ(utm["false_northing"], std::vector<double>{10000000});
+  // Lengths in feet are told in metres.
+  auto feet = numbers("EPSG:2263");
+  EXPECT_TRUE(feet.contains("lambert_conformal_conic"));
+  EXPECT_NEAR(feet["false_easting"].at(0), 300000, 1e-6);
+  EXPECT_NEAR(feet["standard_parallel"].at(1), 40.6666666666667, 1e-9);
+  EXPECT_NEAR(feet["standard_parallel"].at(0), 41.0333333333333, 1e-9);
+  EXPECT_TRUE(numbers("EPSG:4326").contains("latitude_longitude"));
+  EXPECT_TRUE(numbers("EPSG:3395").contains("mercator"));
+  EXPECT_TRUE(numbers("EPSG:28992").contains("stereographic"));
+  EXPECT_TRUE(numbers("EPSG:32661").contains("polar_stereographic"));
+  EXPECT_TRUE(numbers("EPSG:5070").contains("albers_conical_equal_area"));
+  for (const char* text : {"", "nonsense", "EPSG:2056", "EPSG:4978"})
+    EXPECT_FALSE(gridMappingOf(text)) << text;
 }
 
 TEST(Cartography, OriginAndRotation) {

@@ -2,9 +2,14 @@
 #include <netcdf.h>
 #include <sys/stat.h>
 
+#include <cmath>
 #include <filesystem>
+#include <nlohmann/json.hpp>
+#include <numbers>
 #include <random>
+#include <utility>
 
+#include "platform/cartography/cartography.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_operations.h"
 #include "platform/tsb/tsb_writer.h"
@@ -18,6 +23,7 @@ namespace {
 using ::testing::AllOf;
 using ::testing::AnyOf;
 using ::testing::HasSubstr;
+using ::testing::Not;
 
 class Tsb : public ::testing::Test {
  protected:
@@ -435,7 +441,99 @@ TEST_F(Tsb, OtherProgramsReadAxesUnitsAndProjection) {
   EXPECT_EQ(xarray.out,
             "('time', 'y', 'x') m [0.0, 20.0, 40.0, 60.0, 80.0] [0.0, 25.0, 50.0, 75.0] "
             "1990-01-01T12:00:00.000000000 43.0 "
-            "PROJCS\n");
+            "PROJCR\n");
+}
+
+// Attributes as the Python reader gives them, of a variable ("" for the whole file), one a line.
+std::string attributesOf(const std::string& path, const std::string& variable) {
+  const test::ProgramRun run =
+      test::runProgram("/usr/bin/python3", {"-c",
+                                            "import sys, netCDF4\n"
+                                            "d = netCDF4.Dataset(sys.argv[1])\n"
+                                            "v = d.variables[sys.argv[2]] if sys.argv[2] else d\n"
+                                            "for name in v.ncattrs(): print(name, '=', v.getncattr(name))\n",
+                                            path, variable});
+  EXPECT_EQ(run.status, 0) << run.err;
+  return run.out;
+}
+
+TEST_F(Tsb, ReadersOfTheConventionsFindProjectionNamesAndHistory) {
+  TsbDefinition definition = test::definitionOf({.noJ = 5, .noK = 4, .dx = 20, .dy = 25});
+  definition.title = "A bay";
+  definition.history = "2026-01-02T03:04:05Z: made";
+  definition.items = {{"Level", 100078, "m"},
+                      {"Wind X-component", 100274, "m s-1"},
+                      {"Wind speed", 100274, "m s-1"},
+                      {"Rain in a wrong unit", 100431, "m"},
+                      {"Elevation", 100079, "m"}};
+  definition.geography = TsbGeography{"UTM-32", 9, 55, 0};
+  test::writeFile(path, definition);
+  EXPECT_THAT(attributesOf(path, ""), AllOf(HasSubstr("Conventions = CF-1.8\ntitle = A bay\n"),
+                                            HasSubstr("history = 2026-01-02T03:04:05Z: made\n")));
+  EXPECT_EQ(TsbFile::open(path)->definition().history, "2026-01-02T03:04:05Z: made");
+  EXPECT_THAT(attributesOf(path, "level"),
+              HasSubstr("standard_name = water_surface_height_above_reference_datum\n"));
+  EXPECT_THAT(attributesOf(path, "wind_speed"), HasSubstr("standard_name = wind_speed\n"));
+  for (const char* variable : {"wind_x_component", "rain_in_a_wrong_unit", "elevation"})
+    EXPECT_THAT(attributesOf(path, variable), Not(HasSubstr("standard_name")));
+  EXPECT_THAT(attributesOf(path, "x"), HasSubstr("standard_name = projection_x_coordinate\n"));
+  EXPECT_THAT(
+      attributesOf(path, "projection"),
+      AllOf(HasSubstr("grid_mapping_name = transverse_mercator\n"),
+            HasSubstr("latitude_of_projection_origin = 0.0\n"),
+            HasSubstr("longitude_of_central_meridian = 9.0\n"),
+            HasSubstr("scale_factor_at_central_meridian = 0.9996\n"), HasSubstr("false_easting = 500000.0\n"),
+            HasSubstr("false_northing = 0.0\n"), HasSubstr("semi_major_axis = 6378137.0\n"),
+            HasSubstr("inverse_flattening = 298.257223563\n"), HasSubstr("crs_wkt = PROJCRS["),
+            HasSubstr("spatial_ref = PROJCS[")));
+}
+
+TEST_F(Tsb, ProjectionsWithAndWithoutAGridMappingAreFoundByOtherPrograms) {
+  const auto written = [&](const std::string& projection) {
+    TsbDefinition definition = test::definitionOf({});
+    definition.geography = TsbGeography{projection, 9, 55, 0};
+    test::writeFile(path, definition);
+    return attributesOf(path, "projection");
+  };
+  EXPECT_THAT(written("EPSG:3034"), AllOf(HasSubstr("grid_mapping_name = lambert_conformal_conic\n"),
+                                          HasSubstr("standard_parallel = [35. 65.]\n")));
+  EXPECT_THAT(written("EPSG:3035"), HasSubstr("grid_mapping_name = lambert_azimuthal_equal_area\n"));
+  // A grid mapping that the conventions don't have has its full text alone.
+  EXPECT_THAT(written("EPSG:2056"),
+              AllOf(HasSubstr("crs_wkt = PROJCRS["), Not(HasSubstr("grid_mapping_name"))));
+  const test::ProgramRun gdal = test::runProgram("gdalinfo", {"NETCDF:" + path});
+  EXPECT_THAT(gdal.out, HasSubstr("CH1903+ / LV95"));
+  EXPECT_THAT(written("Local Coordinates"), Not(AnyOf(HasSubstr("crs_wkt"), HasSubstr("grid_mapping_name"))));
+  EXPECT_THAT(attributesOf(path, "x"), Not(HasSubstr("standard_name")));
+}
+
+// K along the grid's own +y, 30 degrees clockwise of north.
+TEST_F(Tsb, OtherProgramsPlaceAGridThatIsTurned) {
+  test::GridSpec spec{.noJ = 5, .noK = 4, .dx = 20, .dy = 25};
+  spec.geography = TsbGeography{"UTM-32", 9, 55, 30};
+  test::writeGrid(path, spec, [](int j, int k) { return static_cast<float>(10 * j + k); });
+  const test::ProgramRun info = test::runProgram("gdalinfo", {"-json", "NETCDF:" + path});
+  ASSERT_EQ(info.status, 0) << info.err;
+  const auto transform = nlohmann::json::parse(info.out)["geoTransform"].get<std::vector<double>>();
+  double east = 0;
+  double north = 0;
+  ASSERT_TRUE(CVdMapProjection("UTM-32").Geo2Proj(9, 55, &east, &north));
+  const CVdCartography place("UTM-32", east, north, 30);
+  for (const auto& [column, row] : {std::pair(0, 0), {4, 0}, {0, 3}, {4, 3}, {2, 1}}) {
+    const test::ProgramRun found = test::runProgram(
+        "gdallocationinfo", {"-valonly", "NETCDF:" + path, std::to_string(column), std::to_string(row)});
+    ASSERT_EQ(found.status, 0) << found.err;
+    const double value = std::stod(found.out);
+    double wantedX = 0;
+    double wantedY = 0;
+    place.Xy2Proj(20 * std::floor(value / 10), 25 * std::fmod(value, 10), &wantedX, &wantedY);
+    EXPECT_NEAR(transform[0] + transform[1] * (column + 0.5) + transform[2] * (row + 0.5), wantedX, 1e-3)
+        << value;
+    EXPECT_NEAR(transform[3] + transform[4] * (column + 0.5) + transform[5] * (row + 0.5), wantedY, 1e-3)
+        << value;
+  }
+  EXPECT_NEAR(transform[1], 20 * std::cos(std::numbers::pi / 6), 1e-6);
+  EXPECT_NEAR(transform[4], -10, 1e-6);
 }
 
 }  // namespace

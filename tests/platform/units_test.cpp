@@ -3,6 +3,9 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <cctype>
+#include <set>
+#include <string>
 
 #include "platform/units/edit_style.h"
 
@@ -40,6 +43,23 @@ TEST(Units, TheCatalogueHasEveryQuantityOfTheSetup) {
   }
   EXPECT_EQ(qunFindItem(1), nullptr);
   EXPECT_EQ(qunBaseUnit(1), nullptr);
+}
+
+// The formulations of bed resistance, and the coefficients of weirs and discharges with the second.
+TEST(Units, ManningAndChezyNumbersHaveTheirOwnCodes) {
+  EXPECT_EQ(qunFindItem(100030)->name, "Manning number");
+  EXPECT_EQ(qunBaseUnit(100030)->symbol, "m^⅓/s");
+  EXPECT_EQ(qunFindItem(100032)->name, "Chezy number");
+  EXPECT_EQ(qunBaseUnit(100032)->symbol, "m^½/s");
+}
+
+TEST(Units, AQuantityIsKnownByItsNameToo) {
+  std::set<std::string> names;
+  for (const QunItem& item : qunItems()) {
+    std::string small(item.name);
+    for (char& c : small) c = static_cast<char>(std::tolower(static_cast<unsigned char>(c)));
+    EXPECT_TRUE(names.insert(small).second) << item.name;
+  }
 }
 
 TEST(Units, Conversions) {

@@ -1,0 +1,22 @@
+#include "cli/output_file.h"
+
+#include <fmt/format.h>
+
+#include <filesystem>
+
+namespace gridbay::cli {
+
+Outcome mayWrite(const std::string& path, bool force, std::span<const std::string> inputs) {
+  std::error_code error;
+  for (const std::string& input : inputs) {
+    if (std::filesystem::equivalent(path, input, error))
+      return Failure{
+          fmt::format("\"{}\" is a file that is read here: give what is written another name", path)};
+  }
+  if (std::filesystem::is_directory(path, error)) return Failure{fmt::format("\"{}\" is a folder", path)};
+  if (!force && std::filesystem::exists(path, error))
+    return Failure{fmt::format("\"{}\" is there already; --force replaces it", path)};
+  return {};
+}
+
+}  // namespace gridbay::cli
