@@ -31,6 +31,7 @@ void EditHistory::start(CGlobalKvs& model, std::string documentPath, const Touch
   steps_.clear();
   done_ = 0;
   saved_ = 0;
+  firstState_ = ++lastState_;
   touched_ = touched;
   texts_.clear();
   for (CKvsBase* part : model.parts()) texts_.push_back(textOf(*part, documentPath_));
@@ -38,7 +39,7 @@ void EditHistory::start(CGlobalKvs& model, std::string documentPath, const Touch
 
 bool EditHistory::record(CGlobalKvs& model, PageId page, std::string name, bool continues,
                          const Touched& touched) {
-  Step step{page, std::move(name), continues, {}, touched_, touched};
+  Step step{page, std::move(name), continues, {}, touched_, touched, lastState_ + 1};
   touched_ = touched;
   const std::vector<CKvsBase*> parts = model.parts();
   for (std::size_t part = 0; part < parts.size(); ++part) {
@@ -48,6 +49,7 @@ bool EditHistory::record(CGlobalKvs& model, PageId page, std::string name, bool 
     texts_[part] = std::move(now);
   }
   if (step.changes.empty()) return false;
+  ++lastState_;
   if (saved_ > done_) saved_ = kNeverSaved;
   steps_.resize(done_);
   steps_.push_back(std::move(step));
@@ -103,6 +105,7 @@ void EditHistory::dropOldest() {
     if (bytes > kMostBytes && keep > 0) break;
   }
   const std::size_t drop = steps_.size() - keep;
+  if (drop > 0) firstState_ = steps_[drop - 1].state;
   steps_.erase(steps_.begin(), steps_.begin() + static_cast<std::ptrdiff_t>(drop));
   done_ -= drop;
   if (saved_ != kNeverSaved) saved_ = saved_ < drop ? kNeverSaved : saved_ - drop;

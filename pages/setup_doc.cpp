@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "core/letters.h"
 #include "pages/form_view.h"
 #include "pages/grid_wnd.h"
 #include "platform/files/paths.h"
@@ -52,7 +53,7 @@ bool CV27SetupDoc::mayLeaveOut(const std::string& path) {
 }
 
 bool CV27SetupDoc::OnSaveDocument(const std::string& path) {
-  if (!mayLeaveOut(path)) return false;
+  if (!host_.mayWriteOver(path) || !mayLeaveOut(path)) return false;
   if (const Outcome saved = setup_.save(path); !saved) {
     host_.show(saved.error());
     return false;
@@ -60,6 +61,7 @@ bool CV27SetupDoc::OnSaveDocument(const std::string& path) {
   path_ = path;
   modified_ = false;
   history_.markSaved();
+  if (saved_) saved_();
   return true;
 }
 
@@ -108,9 +110,7 @@ void CV27SetupDoc::EnableGXMultiToolTips(CV27SetupGridWnd& grid, int column) {
 
 std::string CV27SetupDoc::GetToolTipsString(std::string_view value) {
   constexpr std::size_t kLine = 100;
-  std::string text;
-  for (; value.size() > kLine; value.remove_prefix(kLine)) text.append(value.substr(0, kLine)).append("\n");
-  return text.append(value);
+  return onLines(value, kLine);
 }
 
 void CV27SetupDoc::AddView(const void* owner, View update) {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstdint>
 #include <functional>
 #include <memory>
 #include <set>
@@ -39,6 +40,8 @@ class CV27SetupDoc {
   // Writes the setup and makes the path the document's own. On failure the reason is shown. A setup that was
   // read with sections which this version does not know is not written without them unless the user agrees.
   bool OnSaveDocument(const std::string& path);
+  // Called after each save.
+  void OnSaved(std::function<void()> saved) { saved_ = std::move(saved); }
   const std::string& path() const { return path_; }
 
   // All faults of the model.
@@ -62,6 +65,9 @@ class CV27SetupDoc {
   const EditHistory::Step* RedoStep() const { return history_.redoStep(); }
   void Undo();
   void Redo();
+
+  // Tells the states of the model apart: another one after each edit, the old one once it is taken back.
+  std::uint64_t ModelState() const { return history_.state(); }
 
   bool IsModified() const { return modified_; }
   void SetModifiedFlag(bool modified = true) { modified_ = modified; }
@@ -97,6 +103,7 @@ class CV27SetupDoc {
   bool modified_ = false;
   bool leavesOut_ = false;  // the user has agreed
   std::vector<std::pair<const void*, View>> views_;
+  std::function<void()> saved_;
 };
 
 }  // namespace gridbay
