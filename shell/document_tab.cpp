@@ -19,6 +19,7 @@ namespace gridbay::shell {
 namespace {
 
 constexpr int kIdRole = Qt::UserRole;
+constexpr int kValidateCommand = 46019;
 constexpr const char* kUntitled = "Untitled";
 
 // "Grids (*.tsb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||" as the toolkit writes it.
@@ -74,6 +75,12 @@ bool chooseItems(QWidget* parent, CVdFileSelectorDlg& selector) {
 
 }  // namespace
 
+QString faultsText(unsigned faults) {
+  return faults == 0   ? DocumentTab::tr("no faults")
+         : faults == 1 ? DocumentTab::tr("1 fault")
+                       : DocumentTab::tr("%1 faults").arg(faults);
+}
+
 DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)> make,
                          WindowServices services, QWidget* parent)
     : QSplitter(parent), services_(std::move(services)) {
@@ -94,8 +101,12 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
   mainLayout->setContentsMargins(0, 0, 0, 0);
   notice_ = makeNotice(main);
   pane_ = new PagePane(main);
+  cover_ = new CoverView(main);
+  summary_ = new SummaryView(main);
   mainLayout->addWidget(notice_);
   mainLayout->addWidget(pane_, 1);
+  mainLayout->addWidget(cover_, 1);
+  mainLayout->addWidget(summary_, 1);
   addWidget(side);
   addWidget(main);
   setStretchFactor(1, 1);
@@ -104,8 +115,17 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
   editor_ = make(*this);
   editor_->onChange([this] {
     applyVisibility();
+    showSummary();
     emit documentChanged();
   });
+  editor_->onSave([this] {
+    watch();
+    showSummary();
+    emit documentChanged();
+    emit saved();
+  });
+  connect(summary_, &SummaryView::pageChosen, this, [this](int page) { goToPage(page); });
+  connect(summary_, &SummaryView::checkWanted, this, [this] { runCommand(kValidateCommand); });
   fillTree();
   showFirstView();
   connect(filter_, &QLineEdit::textChanged, this, [this] { applyVisibility(); });
@@ -142,6 +162,7 @@ QFrame* DocumentTab::makeNotice(QWidget* parent) {
 }
 
 void DocumentTab::fillTree() {
+  const QSignalBlocker blocker(tree_);
   tree_->clear();
   itemsById_.clear();
   std::vector<QTreeWidgetItem*> path;
@@ -193,12 +214,16 @@ void DocumentTab::leaveHiddenPage() {
   tree_->setCurrentItem(node != nullptr ? node : tree_->topLevelItem(0));
 }
 
+bool DocumentTab::isShown(std::int32_t id) const {
+  const std::vector<SetupEditor::Item> items = editor_->items();
+  const auto found = std::ranges::find(items, id, &SetupEditor::Item::id);
+  return found != items.end() && found->visible;
+}
+
 bool DocumentTab::goToPage(std::int32_t id) {
   QTreeWidgetItem* node = itemOf(id);
-  for (const QTreeWidgetItem* at = node; at != nullptr; at = at->parent()) {
-    if (at->isHidden()) return false;
-  }
-  if (node == nullptr) return false;
+  if (node == nullptr || !isShown(id)) return false;
+  if (node->isHidden()) filter_->clear();
   tree_->setCurrentItem(node);
   return true;
 }
@@ -221,8 +246,30 @@ QString DocumentTab::caption(std::int32_t id) const {
 }
 
 void DocumentTab::showFirstView() {
+  tree_->setCurrentItem(nullptr);
+  pane_->clear();
   const SetupEditor::FirstView view = editor_->firstView();
   pane_->showPicture(QString::fromStdString(view.picture.value_or("")), QString::fromStdString(view.text));
+  cover_->hide();
+  pane_->show();
+  summary_->show();
+  showSummary();
+}
+
+// The model's lines, and one for its check.
+void DocumentTab::showSummary() {
+  if (summary_->isHidden()) return;
+  SetupSummary summary = editor_->summary();
+  if (!check_) {
+    summary.lines.push_back({0, "Check", "not checked yet", false});
+  } else {
+    const std::string faults = faultsText(check_->faults).toStdString();
+    const int page = check_->messages.empty() ? 0 : static_cast<int>(check_->messages.front().page);
+    const bool holds = isCheckCurrent();
+    summary.lines.push_back({page, "Check", holds ? faults : faults + " before the last edit", holds});
+  }
+  summary_->showSummary(summary);
+  summary_->checkButton().setVisible(!isCheckCurrent() || !summary.gridsAreRead);
 }
 
 void DocumentTab::showCurrentPage() {
@@ -231,17 +278,24 @@ void DocumentTab::showCurrentPage() {
   const int id = node->data(0, kIdRole).toInt();
   // The old page's widgets go before the form that they show.
   pane_->clear();
-  if (Form* form = editor_->openPage(id)) {
+  summary_->hide();
+  Form* form = editor_->openPage(id);
+  if (form != nullptr) {
     pane_->showForm(node->text(0), *form);
   } else {
-    pane_->showText(node->text(0), QString::fromStdString(editor_->cover(id)));
+    cover_->showCover(editor_->cover(id));
   }
+  cover_->setVisible(form == nullptr);
+  pane_->setVisible(form != nullptr);
+}
+
+QString DocumentTab::name() const {
+  const QString path = QString::fromStdString(editor_->path());
+  return path.isEmpty() ? QString(kUntitled) : QFileInfo(path).fileName();
 }
 
 QString DocumentTab::title() const {
-  const QString path = QString::fromStdString(editor_->path());
-  return (path.isEmpty() ? QString(kUntitled) : QFileInfo(path).fileName()) +
-         (editor_->isModified() ? " *" : "");
+  return name() + (editor_->isModified() ? " *" : "");
 }
 
 DocumentTab::Stamp DocumentTab::stampOf(const QString& path) {
@@ -275,39 +329,54 @@ void DocumentTab::fileChanged() {
   notice_->show();
 }
 
-bool DocumentTab::open(const QString& path) {
+// The page that was open is opened again.
+bool DocumentTab::replaceSetup(const std::function<bool()>& load) {
   const std::int32_t page = currentPage();
   pane_->clear();
-  const bool opened = editor_->open(path.toStdString());
-  if (opened) {
+  const bool loaded = load();
+  if (loaded) {
+    check_.reset();
     fillTree();
     watch();
   }
   if (page == 0 || !goToPage(page)) showFirstView();
   showCurrentPage();
-  if (opened) emit documentChanged();
-  return opened;
+  if (loaded) {
+    emit documentChanged();
+    emit checked();
+  }
+  return loaded;
+}
+
+bool DocumentTab::open(const QString& path) {
+  return replaceSetup([&] { return editor_->open(path.toStdString()); });
 }
 
 bool DocumentTab::recover(const QString& copy, const QString& path) {
-  if (!editor_->recover(copy.toStdString(), path.toStdString())) return false;
-  fillTree();
-  watch();
-  emit documentChanged();
-  return true;
+  return replaceSetup([&] { return editor_->recover(copy.toStdString(), path.toStdString()); });
 }
 
 bool DocumentTab::save(const QString& path) {
   commit();
-  const bool isOwn = path.toStdString() == editor_->path();
-  if (isOwn && isChangedOnDisk() &&
-      !askYesNo(path.toStdString() +
-                " was changed by another program since it was opened here.\n\nWrite over it?"))
-    return false;
-  if (!editor_->save(path.toStdString())) return false;
-  watch();
-  emit documentChanged();
-  return true;
+  return editor_->save(path.toStdString());
+}
+
+bool DocumentTab::mayWriteOver(const std::string& path) {
+  return path != editor_->path() || !isChangedOnDisk() ||
+         askYesNo(path + " was changed by another program since it was opened here.\n\nWrite over it?");
+}
+
+bool DocumentTab::runCommand(int id) {
+  commit();
+  const bool done = editor_->command(id);
+  pane_->refresh();
+  showSummary();
+  return done;
+}
+
+void DocumentTab::showMessages(const ValidationList& messages, unsigned faults) {
+  check_ = {messages, faults, editor_->modelState()};
+  emit checked();
 }
 
 void DocumentTab::undo() {
