@@ -71,6 +71,7 @@ StartView::StartView(QWidget* parent)
       begin_(new QVBoxLayout()),
       recent_(new QListWidget(this)),
       recentBlock_(new QWidget(this)) {
+  begin_->setSpacing(kPadding / 2);
   begin_->addWidget(heading(tr("Begin"), 1.2, this));
   auto* hint = new QLabel(tr("Setups and data files can also be dropped here."), this);
   begin_->addWidget(hint);

@@ -128,6 +128,19 @@ TEST_P(EditorOf, StatesOfTheModelAreKnownAgain) {
   for (const std::uint64_t old : {first, second, third}) EXPECT_NE(editor->modelState(), old);
 }
 
+TEST_P(EditorOf, AStateIsKnownAgainWhereTheOldestEditsAreForgotten) {
+  constexpr int kEdits = 1010;  // more than are kept
+  std::vector<std::uint64_t> states;
+  for (int i = 1; i <= kEdits; ++i) {
+    edit(39, "Last:", std::to_string(i));
+    states.push_back(editor->modelState());
+  }
+  int undone = 0;
+  for (; editor->undoable(); ++undone) editor->undo();
+  ASSERT_LT(undone, kEdits);
+  EXPECT_EQ(editor->modelState(), states[static_cast<std::size_t>(kEdits - undone) - 1]);
+}
+
 TEST_P(EditorOf, EverySaveIsTold) {
   int saves = 0;
   editor->onSave([&saves] { ++saves; });

@@ -78,10 +78,10 @@ class WindowTest final : public DesktopFixture {
       tips << action->toolTip();
     }
     QCOMPARE(tools, 9);
-    QCOMPARE(tips,
-             QStringList({"New VANE 27 Flow model (Ctrl+N)", "Open (Ctrl+O)", "Save (Ctrl+S)",
-                          "Undo (Ctrl+Z)", QString("Redo (%1)").arg(redoKey()), "Validate (F7)", "Start simulation (F5)",
-                          "Units that quantities are shown in", "Help on this page (F1)"}));
+    QCOMPARE(tips, QStringList({"New VANE 27 Flow model (Ctrl+N)", "Open (Ctrl+O)", "Save (Ctrl+S)",
+                                "Undo (Ctrl+Z)", QString("Redo (%1)").arg(redoKey()), "Validate (F7)",
+                                "Start simulation (F5)", "Units that quantities are shown in",
+                                "Help on this page (F1)"}));
   }
 
   void theToolsFollowTheDocument() {
@@ -130,6 +130,29 @@ class WindowTest final : public DesktopFixture {
       const int onDark = darkest(drawn(each, QIcon::Normal));
       QVERIFY2(onDark > 140, qPrintable(QString("%1: %2").arg(tool).arg(onDark)));
     }
+  }
+
+  void theDesktopsOwnPicturesGoWithItsColours() {
+    QDir(folder_->path()).mkpath("icons/plain/24x24/actions");
+    write(file("icons/plain/index.theme"),
+          "[Icon Theme]\nName=plain\nDirectories=24x24/actions\n[24x24/actions]\nSize=24\nType=Scalable\n");
+    QImage red(24, 24, QImage::Format_ARGB32);
+    red.fill(Qt::red);
+    QVERIFY(red.save(file("icons/plain/24x24/actions/document-save.png")));
+    const QStringList paths = QIcon::themeSearchPaths();
+    const QString name = QIcon::themeName();
+    QIcon::setThemeSearchPaths({file("icons")});
+    QIcon::setThemeName("plain");
+    const auto middle = [](Tool tool) { return toolIcon(tool).pixmap(24, 24).toImage().pixelColor(3, 12); };
+    QCOMPARE(middle(Tool::save), QColor(Qt::red));
+    QCOMPARE(middle(Tool::open).alpha() > 0, true);  // ours, for the theme has none
+    QVERIFY(middle(Tool::open) != QColor(Qt::red));
+    setAppearance(Appearance::dark);
+    QVERIFY(middle(Tool::save) != QColor(Qt::red));
+    setAppearance(Appearance::desktop);
+    QCOMPARE(middle(Tool::save), QColor(Qt::red));
+    QIcon::setThemeSearchPaths(paths);
+    QIcon::setThemeName(name);
   }
 
   void theStartViewOffersTheWaysToBegin() {
