@@ -27,6 +27,7 @@ class CBathymetryObjectKvs final : public TableKvs<CBathymetryObjectKvs> {
   float landValue = 0;     // a point at or above it is land
   CVdArray2D<float> grid;  // elevations in metres, upwards: a depth is minus the value
   UFileName fileName;
+  std::string gridFile;  // that the grid was read from, as an absolute name
 
   static constexpr auto table() {
     return keywords(section("DATA_FILE", keyword("FILE_NAME", &CBathymetryObjectKvs::fileName)),
@@ -42,6 +43,8 @@ class CBathymetryObjectKvs final : public TableKvs<CBathymetryObjectKvs> {
   void copyWhole(const CBathymetryObjectKvs& other);
 
   bool isLand(int j, int k) const { return grid(j, k) >= landValue; }
+  // Whether the grid is that of the file which is named now.
+  bool isRead() const { return noJ > 0 && gridFile == fileName.absolute(); }
   // False for every point of a grid that has not been read.
   bool contains(int j, int k) const { return grid.contains(j, k); }
 };

@@ -29,7 +29,7 @@ Line lineOf(const CBathymetryObjectKvs& area, int number) {
   const std::string place = number == 1 ? ""
                                         : fmt::format(", from ({},{}) of Area {}", area.origin.j,
                                                       area.origin.k, area.enclosingArea);
-  if (area.noJ == 0)
+  if (!area.isRead())
     return line(PageId::bathymetry, subject, area.fileName.text() + place + ", not read yet", false);
   return line(PageId::bathymetry, subject,
               fmt::format("{} x {} points, {}{}, {}", area.noJ, area.noK, spacingOf(area), place,
@@ -76,7 +76,7 @@ SetupSummary summaryOf(CGlobalKvs& model, const UnitChoices& units) {
   summary.gridsAreRead = areas.GetCount() > 0;
   for (int number = 1; number <= areas.GetCount(); ++number) {
     summary.lines.push_back(lineOf(*areas.GetItem(number), number));
-    summary.gridsAreRead = summary.gridsAreRead && areas.GetItem(number)->noJ > 0;
+    summary.gridsAreRead = summary.gridsAreRead && areas.GetItem(number)->isRead();
   }
   summary.lines.push_back(periodOf(*model.simulationPeriod, units));
   summary.lines.push_back(courantOf(areas, *model.simulationPeriod, summary.gridsAreRead));

@@ -98,6 +98,22 @@ TEST_P(EditorOf, TheSummaryFollowsTheCheckAndTheEdits) {
   EXPECT_EQ(editor->summary().lines[2].text, "1.98 in Area 1");
 }
 
+TEST_P(EditorOf, AnotherFileHasNotBeenRead) {
+  test::writeGrid(folder.file("a.tsb2"));
+  open(
+      "BATHYMETRY_SELECTION { No_Of_Areas 1; AREA_1 { DATA_FILE { FILE_NAME (file)\"a.tsb2\" } } };"
+      "OPEN_BOUNDARY { Number_Of_Boundaries 0; Default_Position 0 }");
+  editor->command(46019);
+  const Line read = editor->summary().lines[0];
+  EXPECT_EQ(read.text, "10 x 8 points, 30 m apart, a.tsb2");
+  CV27SetupGridWnd& areas = *editor->openPage(27)->find("Areas")->grid;
+  ASSERT_EQ(areas.StoreStyleRowCol(1, 1, "b.tsb2"), 1);
+  EXPECT_EQ(editor->summary().lines[0], (Line{27, "Area 1", "b.tsb2, not read yet", false}));
+  EXPECT_FALSE(editor->summary().gridsAreRead);
+  editor->undo();
+  EXPECT_EQ(editor->summary().lines[0], read);
+}
+
 TEST_P(EditorOf, AnInnerAreaIsTold) {
   if (GetParam()) GTEST_SKIP() << "this edition has one area";
   open(
