@@ -42,6 +42,7 @@ MainWindow::MainWindow(std::vector<std::unique_ptr<EditorLibrary>> libraries)
   buildMenus();
   buildTools();
   buildStartView();
+  start_->setFocus();
   restoreGeometry(QSettings().value(kGeometryKey).toByteArray());
   restoreState(QSettings().value(kStateKey).toByteArray());
   connect(tabs_, &QTabWidget::tabCloseRequested, this, [this](int index) { closeTab(index); });
@@ -124,7 +125,9 @@ void MainWindow::discardTab(DocumentTab* tab) {
 
 void MainWindow::showTabsOrStart() {
   QWidget* wanted = tabs_->count() > 0 ? static_cast<QWidget*>(tabs_) : start_;
-  if (central_->currentWidget() != wanted) central_->setCurrentWidget(wanted);
+  if (central_->currentWidget() == wanted) return;
+  central_->setCurrentWidget(wanted);
+  if (wanted == start_) start_->setFocus();
 }
 
 DocumentTab* MainWindow::tabOf(const QString& path) const {
@@ -220,6 +223,7 @@ bool MainWindow::askSave() {
 
 void MainWindow::documentChanged(DocumentTab* tab) {
   tabs_->setTabText(tabs_->indexOf(tab), tab->title());
+  tabs_->setTabToolTip(tabs_->indexOf(tab), QString::fromStdString(tab->editor().path()));
   refreshActions();
   if (tab == currentDocument()) messages_->mark();
   if (tab->editor().isModified()) {

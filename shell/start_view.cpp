@@ -114,6 +114,7 @@ void StartView::addBeginning(QAction* action, const QString& description) {
   connect(button, &QPushButton::clicked, action, &QAction::trigger);
   begin_->insertWidget(begin_->count() - 2, button);  // before the hint and what is left free
   QWidget::setTabOrder(button, recent_);
+  if (focusProxy() == nullptr) setFocusProxy(button);
 }
 
 void StartView::showRecent(const QStringList& paths) {

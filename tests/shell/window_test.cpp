@@ -184,7 +184,7 @@ class WindowTest final : public DesktopFixture {
     QCOMPARE(start.recent().item(0)->text().section('\n', 0, 0), QString("s.v27"));
     QList<QWidget*> order;
     auto* first = start.findChildren<QPushButton*>().at(0);
-    first->setFocus();
+    QVERIFY(first->hasFocus());
     for (int i = 0; i < 5; ++i) {
       order << QApplication::focusWidget();
       QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
