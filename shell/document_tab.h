@@ -30,6 +30,10 @@ QString faultsText(unsigned faults);
 class DocumentTab final : public QSplitter, public SetupHost {
   Q_OBJECT
  public:
+  // Commands of the editor that have a key and a tool here.
+  static constexpr int kValidate = 46019;
+  static constexpr int kStart = 46018;
+
   DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)> make, WindowServices services,
               QWidget* parent);
   ~DocumentTab() override;

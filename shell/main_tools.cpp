@@ -50,18 +50,18 @@ void MainWindow::buildActions() {
   });
   helpOnPage_ = make(Tool::help, tr("&Help on this page"), QKeySequence(Qt::Key_F1), [this] { showHelp(); });
   helpOnPage_->setIconText(tr("Help"));
-  commandAction(kValidate)->setText(tr("&Validate"));
-  commandAction(kStart)->setText(tr("&Start simulation"));
+  commandAction(DocumentTab::kValidate)->setText(tr("&Validate"));
+  commandAction(DocumentTab::kStart)->setText(tr("&Start simulation"));
 }
 
 QAction* MainWindow::commandAction(int id) {
   QAction*& action = commands_[id];
   if (action != nullptr) return action;
   action = new QAction(this);
-  if (id == kValidate) action->setShortcut(Qt::Key_F7);
-  if (id == kValidate) action->setIcon(toolIcon(Tool::validate));
-  if (id == kStart) action->setShortcut(Qt::Key_F5);
-  if (id == kStart) action->setIcon(toolIcon(Tool::start));
+  if (id == DocumentTab::kValidate) action->setShortcut(Qt::Key_F7);
+  if (id == DocumentTab::kValidate) action->setIcon(toolIcon(Tool::validate));
+  if (id == DocumentTab::kStart) action->setShortcut(Qt::Key_F5);
+  if (id == DocumentTab::kStart) action->setIcon(toolIcon(Tool::start));
   connect(action, &QAction::triggered, this, [this, id] {
     if (DocumentTab* tab = currentDocument()) tab->runCommand(id);
     rebuildRunMenu();
@@ -80,8 +80,8 @@ void MainWindow::buildTools() {
   tools_->addAction(undo_);
   tools_->addAction(redo_);
   tools_->addSeparator();
-  tools_->addAction(commandAction(kValidate));
-  tools_->addAction(commandAction(kStart));
+  tools_->addAction(commandAction(DocumentTab::kValidate));
+  tools_->addAction(commandAction(DocumentTab::kStart));
   tools_->addSeparator();
   tools_->addAction(units_->menuAction());
   tools_->addAction(helpOnPage_);

@@ -69,7 +69,7 @@ MainWindow::~MainWindow() {
 }
 
 void MainWindow::buildDocks() {
-  messages_ = new MessagesDock(commandAction(kValidate), this);
+  messages_ = new MessagesDock(commandAction(DocumentTab::kValidate), this);
   addDockWidget(Qt::BottomDockWidgetArea, messages_);
   connect(messages_, &MessagesDock::pageChosen, this, [this](int page) {
     DocumentTab* tab = currentDocument();

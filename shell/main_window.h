@@ -53,7 +53,7 @@ class MainWindow final : public QMainWindow {
   UnitsMenu& units() { return *units_; }
   QAction* undoAction() { return undo_; }
   QAction* redoAction() { return redo_; }
-  QAction* checkAction() { return commandAction(kValidate); }
+  QAction* checkAction() { return commandAction(DocumentTab::kValidate); }
 
  protected:
   void closeEvent(QCloseEvent* event) override;
@@ -61,10 +61,6 @@ class MainWindow final : public QMainWindow {
   void dropEvent(QDropEvent* event) override;
 
  private:
-  // Commands of the editor that have a key and a tool here.
-  static constexpr int kValidate = 46019;
-  static constexpr int kStart = 46018;
-
   static constexpr const char* kNumber = "number";  // of a document, by which its recovery copy is known
 
   void buildActions();
