@@ -28,13 +28,15 @@ class CBathymetryObjectKvs final : public TableKvs<CBathymetryObjectKvs> {
   float landValue = 0;     // a point at or above it is land
   CVdArray2D<float> grid;  // elevations in metres, upwards: a depth is minus the value
   UFileName fileName;
+  std::string gridFile;  // that the grid was read from, as an absolute name
 
   static constexpr auto table() {
     using Self = CBathymetryObjectKvs;
     return keywords(
         section("DATA_FILE", keyword("FILE_NAME", &Self::fileName)), keyword("Origin", &Self::origin),
         keyword("Enclosing_Area", &Self::enclosingArea),
-        fromOtherFiles(&Self::noJ, &Self::noK, &Self::dx, &Self::dy, &Self::landValue, &Self::grid));
+        fromOtherFiles(&Self::noJ, &Self::noK, &Self::dx, &Self::dy, &Self::landValue, &Self::grid,
+                                   &Self::gridFile));
   }
 
   // Reads the area's file into the object; areaNumber from 1. Returns the number of errors, with a message
@@ -45,6 +47,8 @@ class CBathymetryObjectKvs final : public TableKvs<CBathymetryObjectKvs> {
   void copyWhole(const CBathymetryObjectKvs& other);
 
   bool isLand(int j, int k) const { return grid(j, k) >= landValue; }
+  // Whether the grid is that of the file which is named now.
+  bool isRead() const { return noJ > 0 && gridFile == fileName.absolute(); }
   // False for every point of a grid that has not been read.
   bool contains(int j, int k) const { return grid.contains(j, k); }
 };

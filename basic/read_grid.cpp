@@ -140,6 +140,7 @@ unsigned CBathymetryObjectKvs::ReadGrid(ValidationList& messages, int areaNumber
   dy = file.dy;
   landValue = file.landValue;
   grid = std::move(file.grid);
+  gridFile = fileName.absolute();
   if (!hotStart) return 0;
   enclosingArea = truncated(file.placement(kEnclosingPlace, 0));
   origin = {truncated(file.placement(kOriginJPlace, 0)), truncated(file.placement(kOriginKPlace, 0))};
@@ -158,6 +159,7 @@ void CBathymetryObjectKvs::copyWhole(const CBathymetryObjectKvs& other) {
   dy = other.dy;
   landValue = other.landValue;
   grid = other.grid;
+  gridFile = other.gridFile;
 }
 
 }  // namespace gridbay

@@ -12,19 +12,19 @@ std::string CValidationMessageBuffer::text() const {
 }
 
 void showTogether(MessageHost& host, const std::vector<std::string>& texts) {
-  if (texts.size() == 1) host.show(texts.front());
-  if (texts.size() <= 1) return;
-  std::map<std::string, int> counts;
-  std::vector<std::string> lines;
-  for (std::string line : texts) {
-    std::ranges::replace(line, '\n', ' ');
-    if (++counts[line] == 1) lines.push_back(std::move(line));
+  if (texts.empty()) return;
+  std::map<std::string_view, int> counts;
+  std::vector<std::string_view> first;
+  for (const std::string& text : texts) {
+    if (++counts[text] == 1) first.push_back(text);
   }
+  const bool areLines = std::ranges::none_of(
+      first, [](std::string_view text) { return text.find('\n') != std::string_view::npos; });
   std::string list;
-  for (const std::string& line : lines) {
-    const int count = counts[line];
-    list += (list.empty() ? "" : "\n") + line;
-    if (count > 1) list += " (" + std::to_string(count) + " times)";
+  for (const std::string_view text : first) {
+    if (!list.empty()) list += areLines ? "\n" : "\n\n";
+    list += text;
+    if (const int count = counts[text]; count > 1) list += " (" + std::to_string(count) + " times)";
   }
   host.show(list);
 }

@@ -59,8 +59,9 @@ class MessageHost {
   virtual void show(const std::string& text) = 0;
 };
 
-// Shows texts that belong together, as what a load has to say: one as it is, more as one list with a line for
-// each, where it came first, and how often it came.
+// Shows texts that belong together, as what a load has to say, as one list: each as it stands, where it came
+// first, and behind it how often it came where that is more than once. An empty line parts them where one of
+// them has lines of its own.
 void showTogether(MessageHost& host, const std::vector<std::string>& texts);
 
 // Keeps the texts, for a caller who shows them together.

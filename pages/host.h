@@ -40,6 +40,8 @@ class SetupHost : public MessageHost, public FileChooser {
   virtual void openFile(const std::string& path) = 0;
   // Shows what a check found; each message leads to its page.
   virtual void showMessages(const ValidationList& messages, unsigned faults) = 0;
+  // Asked before a save writes over a file, which another program may have changed meanwhile.
+  virtual bool mayWriteOver(const std::string& /*path*/) { return true; }
   virtual void startEngine(const EngineStart& start) = 0;
   virtual bool isShiftHeld() = 0;
 };

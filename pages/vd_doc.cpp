@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "core/letters.h"
 #include "pages/form_view.h"
 #include "pages/grid_wnd.h"
 #include "platform/files/paths.h"
@@ -22,9 +23,7 @@ void CVdDoc::EnableGXMultiToolTips(CV27SetupGridWnd& grid, int column) {
 
 std::string CVdDoc::GetToolTipsString(std::string_view value) {
   constexpr std::size_t kLine = 100;
-  std::string text;
-  for (; value.size() > kLine; value.remove_prefix(kLine)) text.append(value.substr(0, kLine)).append("\n");
-  return text.append(value);
+  return onLines(value, kLine);
 }
 
 void CVdDoc::AddView(const void* owner, View update) {

@@ -25,6 +25,7 @@ class Editor final : public SetupEditor {
   std::string path() const override { return document_.path(); }
   std::string fileKind() const override { return document_.fileKind(); }
   bool isModified() const override { return document_.IsModified(); }
+  std::uint64_t modelState() const override { return document_.ModelState(); }
 
   std::string writeRecoveryCopy(const std::string& copy) override {
     const Outcome written = document_.WriteRecoveryCopy(copy);
@@ -48,6 +49,8 @@ class Editor final : public SetupEditor {
     return {view.picture(), std::string(CGraphicalView::kText)};
   }
 
+  SetupSummary summary() override { return summaryOf(document_.root(), document_.units()); }
+
   std::vector<Item> items() const override {
     std::vector<Item> items;
     for (const TreeItem& item : tree_.items())
@@ -64,10 +67,12 @@ class Editor final : public SetupEditor {
   void refreshPage() override {
     if (page_ != nullptr) page_->SetData();
   }
-  std::string cover(std::int32_t id) const override {
+  Cover cover(std::int32_t id) const override {
     std::string topic;
     std::string local;
-    return coverPage(id, document_.enumerator().GetPageClass(id, &topic, &local));
+    const CDlgEnumerator& pages = document_.enumerator();
+    return pages.GetPageClass(id, &topic, &local).empty() ? coverPage(local)
+                                                          : missingPage(pages.GetCaption(id));
   }
 
   std::vector<Command> commands() const override {
@@ -78,7 +83,11 @@ class Editor final : public SetupEditor {
     }
     return commands;
   }
-  bool command(int id) override { return document_.OnCommand(id); }
+  bool command(int id) override {
+    const bool done = document_.OnCommand(id);
+    refreshPage();
+    return done;
+  }
   std::int32_t helpTopic(std::int32_t id) const override {
     return document_.enumerator().GetHelpTopicNumber(id);
   }
@@ -89,6 +98,7 @@ class Editor final : public SetupEditor {
     update();
   }
   void onChange(std::function<void()> changed) override { changed_ = std::move(changed); }
+  void onSave(std::function<void()> saved) override { document_.OnSaved(std::move(saved)); }
 
  private:
   std::optional<Edit> editOf(const EditHistory::Step* step) const {

@@ -11,6 +11,7 @@
 #include "pages/form.h"
 #include "pages/grid_wnd.h"
 #include "pages/host.h"
+#include "plugin/setup_summary.h"
 
 namespace gridbay {
 
@@ -42,6 +43,13 @@ class SetupEditor {
     std::string text;
   };
 
+  // What an item without a page of its own shows.
+  struct Cover {
+    std::string title;
+    std::string text;     // Markdown
+    std::string picture;  // the name of the drawing above it
+  };
+
   virtual ~SetupEditor() = default;
 
   virtual bool open(const std::string& path) = 0;
@@ -49,6 +57,9 @@ class SetupEditor {
   virtual std::string path() const = 0;
   virtual std::string fileKind() const = 0;
   virtual bool isModified() const = 0;
+  // Tells the states of the model apart: another one after each edit, and the old one again once the edit has
+  // been taken back.
+  virtual std::uint64_t modelState() const = 0;
 
   // Writes what a save would to another file; what is wrong, or empty. Takes such a file up as unsaved edits
   // of the setup at `path`, which is empty for one that was never saved.
@@ -62,6 +73,7 @@ class SetupEditor {
   virtual void redo() = 0;
 
   virtual FirstView firstView() const = 0;
+  virtual SetupSummary summary() = 0;
   virtual std::vector<Item> items() const = 0;
   // Works out anew which items are visible; done by itself after each change.
   virtual void applyRules() = 0;
@@ -70,12 +82,12 @@ class SetupEditor {
   virtual Form* openPage(std::int32_t id) = 0;
   // Shows the model's values anew, as after a change of units.
   virtual void refreshPage() = 0;
-  // What an item without a page is for, in a few lines.
-  virtual std::string cover(std::int32_t id) const = 0;
+  virtual Cover cover(std::int32_t id) const = 0;
   // The number of an item's help topic; 0 for one that has no page.
   virtual std::int32_t helpTopic(std::int32_t id) const = 0;
 
   virtual std::vector<Command> commands() const = 0;
+  // Does a command, after which the open page's form shows the model anew.
   virtual bool command(int id) = 0;
   // The units that quantities are shown in.
   virtual const UnitChoices& units() const = 0;
@@ -83,6 +95,8 @@ class SetupEditor {
 
   // Called after each change of the model or its page.
   virtual void onChange(std::function<void()> changed) = 0;
+  // Called after each save, whoever has asked for it.
+  virtual void onSave(std::function<void()> saved) = 0;
 };
 
 std::unique_ptr<SetupEditor> makeSetupEditor(SetupHost& host);

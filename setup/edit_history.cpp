@@ -20,6 +20,7 @@ void EditHistory::start(CGlobalKvs& model, const Touched& touched) {
   steps_.clear();
   done_ = 0;
   saved_ = 0;
+  firstState_ = ++lastState_;
   touched_ = touched;
   twin_ = std::make_unique<CGlobalKvs>();
   twin_->AssignState(model);
@@ -38,9 +39,10 @@ std::vector<EditHistory::PartChange> EditHistory::takeChanges(CGlobalKvs& model)
 bool EditHistory::record(CGlobalKvs& model, PageId page, std::string name, bool continues,
                          const Touched& touched) {
   std::vector<PartChange> changes = takeChanges(model);
-  Step step{page, std::move(name), continues, std::move(changes), touched_, touched};
+  Step step{page, std::move(name), continues, std::move(changes), touched_, touched, lastState_ + 1};
   touched_ = touched;
   if (step.changes.empty()) return false;
+  ++lastState_;
   if (saved_ != kNeverSaved && saved_ > done_) saved_ = kNeverSaved;
   steps_.erase(steps_.begin() + static_cast<std::ptrdiff_t>(done_), steps_.end());
   steps_.push_back(std::move(step));
@@ -112,6 +114,7 @@ void EditHistory::dropOldest() {
     if (bytes > kMostBytes && keep > 0) break;
   }
   const std::size_t drop = steps_.size() - keep;
+  if (drop > 0) firstState_ = steps_[drop - 1].state;
   steps_.erase(steps_.begin(), steps_.begin() + static_cast<std::ptrdiff_t>(drop));
   done_ -= drop;
   if (saved_ != kNeverSaved) saved_ = saved_ < drop ? kNeverSaved : saved_ - drop;

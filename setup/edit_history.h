@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdint>
 #include <memory>
 #include <set>
 #include <string>
@@ -29,6 +30,7 @@ class EditHistory {
     std::vector<PartChange> changes;
     Touched touchedBefore;
     Touched touchedAfter;
+    std::uint64_t state = 0;  // that it leads to
   };
 
   // Forgets all steps; the model as it is now is what the first one starts from.
@@ -44,6 +46,9 @@ class EditHistory {
   const Step* redoStep() const { return done_ == steps_.size() ? nullptr : &steps_[done_]; }
   void undo(CGlobalKvs& model, Touched& touched);
   void redo(CGlobalKvs& model, Touched& touched);
+
+  // A number for the present state of the model, by which it is known again after an undo or a redo.
+  std::uint64_t state() const { return done_ == 0 ? firstState_ : steps_[done_ - 1].state; }
 
   // The present state is the one on file; whether it is so again.
   void markSaved() { saved_ = done_; }
@@ -62,6 +67,8 @@ class EditHistory {
   std::vector<Step> steps_;
   std::size_t done_ = 0;
   std::size_t saved_ = 0;
+  std::uint64_t firstState_ = 0;
+  std::uint64_t lastState_ = 0;  // that was given a number
   Touched touched_;
 };
 

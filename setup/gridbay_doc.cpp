@@ -38,10 +38,9 @@ void CGridbayDoc::RunEngineApv2(int flag, std::string_view text, int a, int b, i
     return;
   if (automaticValidation_ == 1) {
     ValidationList messages;
-    if (const unsigned faults = ValidateData(messages); faults > 0) {
-      host().showMessages(messages, faults);
-      return;
-    }
+    const unsigned faults = ValidateData(messages);
+    host().showMessages(messages, faults);
+    if (faults > 0) return;
   }
   host().startEngine({engine(), path(), flag, std::string(text), {a, b, c}});
 }

@@ -48,7 +48,7 @@ bool CV27SetupDoc::mayLeaveOut() {
 }
 
 bool CV27SetupDoc::OnSaveDocument(const std::string& path) {
-  if (!mayLeaveOut()) return false;
+  if (!host().mayWriteOver(path) || !mayLeaveOut()) return false;
   history_.settle(root());
   const Outcome saved = saveTo(path);
   const bool changed = history_.record(root(), PageId::none, "Save", false, touched());
@@ -61,6 +61,7 @@ bool CV27SetupDoc::OnSaveDocument(const std::string& path) {
     if (changed) SetModifiedFlag();
   }
   if (changed) UpdateAllViews(nullptr);
+  if (saved && saved_) saved_();
   return bool(saved);
 }
 

@@ -24,6 +24,8 @@ class CV27SetupDoc : public CVdDoc {
   // Writes the setup and makes the path the document's own. On failure the reason is shown. A setup that was
   // read with sections which this version does not know is not written without them unless the user agrees.
   bool OnSaveDocument(const std::string& path);
+  // Called after each save.
+  void OnSaved(std::function<void()> saved) { saved_ = std::move(saved); }
 
   // All faults of the model. What a check changes, as a hot start file may, becomes a step of its own.
   unsigned ValidateData(ValidationList& messages);
@@ -41,6 +43,8 @@ class CV27SetupDoc : public CVdDoc {
   const EditHistory::Step* RedoStep() const { return history_.redoStep(); }
   void Undo();
   void Redo();
+  // Tells the states of the model apart: another one after each edit, the old one once it is taken back.
+  std::uint64_t ModelState() const { return history_.state(); }
 
  private:
   bool mayLeaveOut();
@@ -51,6 +55,7 @@ class CV27SetupDoc : public CVdDoc {
   std::string engine_;
   EditHistory history_;
   bool leavesOut_ = false;  // the user has agreed
+  std::function<void()> saved_;
 };
 
 }  // namespace gridbay

@@ -1,19 +1,11 @@
 #include "shell/document_tab.h"
 
-#include <QApplication>
 #include <QDateTime>
-#include <QDialog>
-#include <QDialogButtonBox>
-#include <QFileDialog>
 #include <QFileInfo>
-#include <QInputDialog>
-#include <QMessageBox>
 #include <QPushButton>
 #include <QTimer>
 #include <QVBoxLayout>
 #include <algorithm>
-#include <iterator>
-#include <numeric>
 
 namespace gridbay::shell {
 namespace {
@@ -21,58 +13,13 @@ namespace {
 constexpr int kIdRole = Qt::UserRole;
 constexpr const char* kUntitled = "Untitled";
 
-// "Grids (*.tsb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||" as the toolkit writes it.
-QString toolkitFilter(std::string_view filter) {
-  const QStringList parts =
-      QString::fromUtf8(filter.data(), static_cast<qsizetype>(filter.size())).split('|', Qt::SkipEmptyParts);
-  QStringList filters;
-  for (qsizetype i = 0; i + 1 < parts.size(); i += 2) {
-    filters << QString("%1 (%2)").arg(parts[i].section(" (", 0, 0), QString(parts[i + 1]).replace(';', ' '));
-  }
-  return filters.join(";;");
-}
-
-// The numbers of the items of a file that meet a request; of all where none does.
-std::vector<std::uint32_t> itemsFor(const CVdRqTsbItem& request, const TsbHeader& file) {
-  std::vector<std::uint32_t> all(static_cast<std::size_t>(tsbGetNoOfItems(file)));
-  std::iota(all.begin(), all.end(), 1U);
-  std::vector<std::uint32_t> fitting;
-  std::ranges::copy_if(all, std::back_inserter(fitting), [&](std::uint32_t number) {
-    return request.fault(file, static_cast<int>(number)).empty();
-  });
-  return fitting.empty() ? all : fitting;
-}
-
-// Lets the user pick an item for each request that wants one; false when he gives up. There is nothing to ask
-// where only one will do, or where the file cannot be read.
-bool chooseItems(QWidget* parent, CVdFileSelectorDlg& selector) {
-  std::vector<std::uint32_t> items = selector.GetSelectedItems();
-  TsbHeader file;
-  if (items.empty() || tsbFileRead(selector.fileName(), &file) != 0) return true;
-  for (std::size_t i = 0; i < std::min(items.size(), selector.requests().size()); ++i) {
-    const CVdRqTsbItem& request = *selector.requests()[i];
-    const std::vector<std::uint32_t> numbers = itemsFor(request, file);
-    QStringList names;
-    for (const std::uint32_t number : numbers) {
-      const TsbItem& item = *tsbItemD(file, static_cast<int>(number));
-      names << QString("%1 %2").arg(number).arg(QString::fromStdString(item.name));
-    }
-    const auto current = std::ranges::find(numbers, items[i]);
-    const auto place = static_cast<int>(current == numbers.end() ? 0 : current - numbers.begin());
-    bool chosen = true;
-    const QString name = names.size() == 1
-                             ? names[0]
-                             : QInputDialog::getItem(parent, DocumentTab::tr("Item"),
-                                                     QString::fromStdString(request.description()), names,
-                                                     place, false, &chosen);
-    if (!chosen) return false;
-    items[i] = numbers[static_cast<std::size_t>(names.indexOf(name))];
-  }
-  selector.SetSelectedItems(items);
-  return true;
-}
-
 }  // namespace
+
+QString faultsText(unsigned faults) {
+  return faults == 0   ? DocumentTab::tr("no faults")
+         : faults == 1 ? DocumentTab::tr("1 fault")
+                       : DocumentTab::tr("%1 faults").arg(faults);
+}
 
 DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)> make,
                          WindowServices services, QWidget* parent)
@@ -94,8 +41,12 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
   mainLayout->setContentsMargins(0, 0, 0, 0);
   notice_ = makeNotice(main);
   pane_ = new PagePane(main);
+  cover_ = new CoverView(main);
+  summary_ = new SummaryView(main);
   mainLayout->addWidget(notice_);
   mainLayout->addWidget(pane_, 1);
+  mainLayout->addWidget(cover_, 1);
+  mainLayout->addWidget(summary_, 1);
   addWidget(side);
   addWidget(main);
   setStretchFactor(1, 1);
@@ -104,8 +55,17 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
   editor_ = make(*this);
   editor_->onChange([this] {
     applyVisibility();
+    showSummary();
     emit documentChanged();
   });
+  editor_->onSave([this] {
+    watch();
+    showSummary();
+    emit documentChanged();
+    emit saved();
+  });
+  connect(summary_, &SummaryView::pageChosen, this, [this](int page) { goToPage(page); });
+  connect(summary_, &SummaryView::checkWanted, this, [this] { runCommand(kValidate); });
   fillTree();
   showFirstView();
   connect(filter_, &QLineEdit::textChanged, this, [this] { applyVisibility(); });
@@ -142,6 +102,7 @@ QFrame* DocumentTab::makeNotice(QWidget* parent) {
 }
 
 void DocumentTab::fillTree() {
+  const QSignalBlocker blocker(tree_);
   tree_->clear();
   itemsById_.clear();
   std::vector<QTreeWidgetItem*> path;
@@ -193,12 +154,16 @@ void DocumentTab::leaveHiddenPage() {
   tree_->setCurrentItem(node != nullptr ? node : tree_->topLevelItem(0));
 }
 
+bool DocumentTab::isShown(std::int32_t id) const {
+  const std::vector<SetupEditor::Item> items = editor_->items();
+  const auto found = std::ranges::find(items, id, &SetupEditor::Item::id);
+  return found != items.end() && found->visible;
+}
+
 bool DocumentTab::goToPage(std::int32_t id) {
   QTreeWidgetItem* node = itemOf(id);
-  for (const QTreeWidgetItem* at = node; at != nullptr; at = at->parent()) {
-    if (at->isHidden()) return false;
-  }
-  if (node == nullptr) return false;
+  if (node == nullptr || !isShown(id)) return false;
+  if (node->isHidden()) filter_->clear();
   tree_->setCurrentItem(node);
   return true;
 }
@@ -221,8 +186,30 @@ QString DocumentTab::caption(std::int32_t id) const {
 }
 
 void DocumentTab::showFirstView() {
+  tree_->setCurrentItem(nullptr);
+  pane_->clear();
   const SetupEditor::FirstView view = editor_->firstView();
   pane_->showPicture(QString::fromStdString(view.picture.value_or("")), QString::fromStdString(view.text));
+  cover_->hide();
+  pane_->show();
+  summary_->show();
+  showSummary();
+}
+
+// The model's lines, and one for its check.
+void DocumentTab::showSummary() {
+  if (summary_->isHidden()) return;
+  SetupSummary summary = editor_->summary();
+  if (!check_) {
+    summary.lines.push_back({0, "Check", "not checked yet", false});
+  } else {
+    const std::string faults = faultsText(check_->faults).toStdString();
+    const int page = check_->messages.empty() ? 0 : static_cast<int>(check_->messages.front().page);
+    const bool holds = isCheckCurrent();
+    summary.lines.push_back({page, "Check", holds ? faults : faults + " before the last edit", holds});
+  }
+  summary_->showSummary(summary);
+  summary_->checkButton().setVisible(!isCheckCurrent() || !summary.gridsAreRead);
 }
 
 void DocumentTab::showCurrentPage() {
@@ -231,17 +218,24 @@ void DocumentTab::showCurrentPage() {
   const int id = node->data(0, kIdRole).toInt();
   // The old page's widgets go before the form that they show.
   pane_->clear();
-  if (Form* form = editor_->openPage(id)) {
+  summary_->hide();
+  Form* form = editor_->openPage(id);
+  if (form != nullptr) {
     pane_->showForm(node->text(0), *form);
   } else {
-    pane_->showText(node->text(0), QString::fromStdString(editor_->cover(id)));
+    cover_->showCover(editor_->cover(id));
   }
+  cover_->setVisible(form == nullptr);
+  pane_->setVisible(form != nullptr);
+}
+
+QString DocumentTab::name() const {
+  const QString path = QString::fromStdString(editor_->path());
+  return path.isEmpty() ? QString(kUntitled) : QFileInfo(path).fileName();
 }
 
 QString DocumentTab::title() const {
-  const QString path = QString::fromStdString(editor_->path());
-  return (path.isEmpty() ? QString(kUntitled) : QFileInfo(path).fileName()) +
-         (editor_->isModified() ? " *" : "");
+  return name() + (editor_->isModified() ? " *" : "");
 }
 
 DocumentTab::Stamp DocumentTab::stampOf(const QString& path) {
@@ -275,39 +269,54 @@ void DocumentTab::fileChanged() {
   notice_->show();
 }
 
-bool DocumentTab::open(const QString& path) {
+// The page that was open is opened again.
+bool DocumentTab::replaceSetup(const std::function<bool()>& load) {
   const std::int32_t page = currentPage();
   pane_->clear();
-  const bool opened = editor_->open(path.toStdString());
-  if (opened) {
+  const bool loaded = load();
+  if (loaded) {
+    check_.reset();
     fillTree();
     watch();
   }
   if (page == 0 || !goToPage(page)) showFirstView();
   showCurrentPage();
-  if (opened) emit documentChanged();
-  return opened;
+  if (loaded) {
+    emit documentChanged();
+    emit checked();
+  }
+  return loaded;
+}
+
+bool DocumentTab::open(const QString& path) {
+  return replaceSetup([&] { return editor_->open(path.toStdString()); });
 }
 
 bool DocumentTab::recover(const QString& copy, const QString& path) {
-  if (!editor_->recover(copy.toStdString(), path.toStdString())) return false;
-  fillTree();
-  watch();
-  emit documentChanged();
-  return true;
+  return replaceSetup([&] { return editor_->recover(copy.toStdString(), path.toStdString()); });
 }
 
 bool DocumentTab::save(const QString& path) {
   commit();
-  const bool isOwn = path.toStdString() == editor_->path();
-  if (isOwn && isChangedOnDisk() &&
-      !askYesNo(path.toStdString() +
-                " was changed by another program since it was opened here.\n\nWrite over it?"))
-    return false;
-  if (!editor_->save(path.toStdString())) return false;
-  watch();
-  emit documentChanged();
-  return true;
+  return editor_->save(path.toStdString());
+}
+
+bool DocumentTab::mayWriteOver(const std::string& path) {
+  return path != editor_->path() || !isChangedOnDisk() ||
+         askYesNo(path + " was changed by another program since it was opened here.\n\nWrite over it?");
+}
+
+bool DocumentTab::runCommand(int id) {
+  commit();
+  const bool done = editor_->command(id);
+  pane_->refresh();
+  showSummary();
+  return done;
+}
+
+void DocumentTab::showMessages(const ValidationList& messages, unsigned faults) {
+  check_ = {messages, faults, editor_->modelState()};
+  emit checked();
 }
 
 void DocumentTab::undo() {
@@ -335,72 +344,6 @@ void DocumentTab::setUnits(const UnitChoices& units) {
   commit();
   editor_->setUnits(units);
   pane_->refresh();
-}
-
-void DocumentTab::show(const std::string& text) {
-  QMessageBox::information(this, QApplication::applicationDisplayName(), QString::fromStdString(text));
-}
-
-bool DocumentTab::askYesNo(const std::string& question) {
-  return QMessageBox::question(this, QApplication::applicationDisplayName(),
-                               QString::fromStdString(question)) == QMessageBox::Yes;
-}
-
-bool DocumentTab::chooseFile(std::string_view filter, std::string_view extension, std::string* name) {
-  QFileDialog dialog(this, {}, QString::fromStdString(*name), toolkitFilter(filter));
-  dialog.setDefaultSuffix(QString::fromUtf8(extension.data(), static_cast<qsizetype>(extension.size())));
-  if (dialog.exec() != QDialog::Accepted) return false;
-  *name = dialog.selectedFiles().value(0).toStdString();
-  return true;
-}
-
-bool DocumentTab::chooseSaveFile(std::string_view filter, std::string_view extension, std::string* name) {
-  QFileDialog dialog(this, {}, QString::fromStdString(*name), toolkitFilter(filter));
-  dialog.setAcceptMode(QFileDialog::AcceptSave);
-  dialog.setDefaultSuffix(QString::fromUtf8(extension.data(), static_cast<qsizetype>(extension.size())));
-  if (dialog.exec() != QDialog::Accepted) return false;
-  *name = dialog.selectedFiles().value(0).toStdString();
-  return true;
-}
-
-// Picks the file, and an item for each request where the file has more than one; a file that does not meet
-// the request is told why.
-bool DocumentTab::choose(CVdFileSelectorDlg& selector) {
-  std::string name = selector.fileName();
-  if (!chooseFile(selector.filter(), selector.kind(), &name)) return false;
-  selector.SetFileName(name);
-  if (!chooseItems(this, selector)) return false;
-  const std::vector<std::uint32_t>& items = selector.GetSelectedItems();
-  std::string why;
-  const bool valid =
-      items.empty() ? selector.IsTsbFileValid(name, &why) : selector.IsTsbFileValid(name, items, &why);
-  return valid || askYesNo(why + "\n\nTake the file all the same?");
-}
-
-bool DocumentTab::editForm(std::string_view title, Form& form, const std::function<std::string()>& fault) {
-  QDialog dialog(this);
-  dialog.setWindowTitle(QString::fromUtf8(title.data(), static_cast<qsizetype>(title.size())));
-  auto* layout = new QVBoxLayout(&dialog);
-  auto* pane = new PagePane(&dialog);
-  pane->showForm(dialog.windowTitle(), form);
-  auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, &dialog);
-  connect(buttons, &QDialogButtonBox::accepted, &dialog, [&] {
-    pane->commit();
-    const std::string text = fault();
-    if (text.empty()) {
-      dialog.accept();
-    } else {
-      show(text);
-    }
-  });
-  connect(buttons, &QDialogButtonBox::rejected, &dialog, &QDialog::reject);
-  layout->addWidget(pane);
-  layout->addWidget(buttons);
-  return dialog.exec() == QDialog::Accepted;
-}
-
-bool DocumentTab::isShiftHeld() {
-  return QApplication::keyboardModifiers().testFlag(Qt::ShiftModifier);
 }
 
 }  // namespace gridbay::shell

@@ -7,38 +7,68 @@
 #include <QTreeWidget>
 #include <functional>
 #include <memory>
+#include <optional>
 
 #include "plugin/setup_editor.h"
+#include "shell/cover_view.h"
 #include "shell/page_pane.h"
+#include "shell/summary_view.h"
 
 namespace gridbay::shell {
 
 // What a document asks of the window that it is shown in.
 struct WindowServices {
-  std::function<void(const ValidationList&, unsigned)> showMessages;
   std::function<void(const EngineStart&)> startEngine;
   std::function<void(const std::string&)> openFile;
 };
 
-// One open document: the tree with its filter box beside the page pane.
+// "1 fault"
+QString faultsText(unsigned faults);
+
+// One open document: the tree with its search box beside what the chosen item shows, which is a page or a
+// cover; before one is chosen, the first view with a summary of the setup below it.
 class DocumentTab final : public QSplitter, public SetupHost {
   Q_OBJECT
  public:
+  // Commands of the editor that have a key and a tool here.
+  static constexpr int kValidate = 46019;
+  static constexpr int kStart = 46018;
+
   DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)> make, WindowServices services,
               QWidget* parent);
   ~DocumentTab() override;
 
+  // What a check found, and in which state of the model.
+  struct Check {
+    ValidationList messages;
+    unsigned faults = 0;
+    std::uint64_t state = 0;
+  };
+
   SetupEditor& editor() { return *editor_; }
   PagePane& pane() { return *pane_; }
+  CoverView& cover() { return *cover_; }
+  SummaryView& summary() { return *summary_; }
   QTreeWidget& tree() { return *tree_; }
+  QLineEdit& filter() { return *filter_; }
   QFrame& notice() { return *notice_; }
 
-  // Selects the tree item of a page; false when it is not to be seen.
+  // The last check of this setup since it was opened, and whether it is of the model as it is now.
+  const std::optional<Check>& check() const { return check_; }
+  bool isCheckCurrent() const { return check_ && check_->state == editor_->modelState(); }
+
+  // Does a command of the editor, with what is typed and not yet entered, and shows the model anew.
+  bool runCommand(int id);
+  // The view that comes before a page is chosen.
+  void showFirstView();
+  // Selects the tree item of a page, and ends a search that hides it; false when the page does not apply.
   bool goToPage(std::int32_t id);
   void goToNeighbour(int direction);
   // The item that is selected; 0 for none.
   std::int32_t currentPage() const;
   QString caption(std::int32_t id) const;
+  // The setup's name, and with a mark while it has unsaved edits.
+  QString name() const;
   QString title() const;
 
   // Reads or writes the setup, and watches its file from then on. What goes wrong has been said.
@@ -62,23 +92,27 @@ class DocumentTab final : public QSplitter, public SetupHost {
   bool chooseSaveFile(std::string_view filter, std::string_view extension, std::string* name) override;
   bool editForm(std::string_view title, Form& form, const std::function<std::string()>& fault) override;
   void openFile(const std::string& path) override { services_.openFile(path); }
-  void showMessages(const ValidationList& messages, unsigned faults) override {
-    services_.showMessages(messages, faults);
-  }
+  void showMessages(const ValidationList& messages, unsigned faults) override;
+  bool mayWriteOver(const std::string& path) override;
   void startEngine(const EngineStart& start) override { services_.startEngine(start); }
   bool isShiftHeld() override;
 
  signals:
   void documentChanged();
+  // The setup was checked, or there is another one whose check is not known.
+  void checked();
+  void saved();
 
  private:
   void fillTree();
   void applyVisibility();
   void showCurrentPage();
-  void showFirstView();
+  void showSummary();
   void showEdit(const SetupEditor::Edit& edit);
   QTreeWidgetItem* itemOf(std::int32_t id) const { return itemsById_.value(id); }
+  bool isShown(std::int32_t id) const;
   void leaveHiddenPage();
+  bool replaceSetup(const std::function<bool()>& load);
   void watch();
   void fileChanged();
   QFrame* makeNotice(QWidget* parent);
@@ -87,6 +121,8 @@ class DocumentTab final : public QSplitter, public SetupHost {
   QLineEdit* filter_;
   QTreeWidget* tree_;
   PagePane* pane_;
+  CoverView* cover_;
+  SummaryView* summary_;
   QFrame* notice_;
   QLabel* noticeText_ = nullptr;
   QHash<std::int32_t, QTreeWidgetItem*> itemsById_;
@@ -99,6 +135,7 @@ class DocumentTab final : public QSplitter, public SetupHost {
   };
   static Stamp stampOf(const QString& path);
   Stamp stamp_;
+  std::optional<Check> check_;
   std::unique_ptr<SetupEditor> editor_;
 };
 

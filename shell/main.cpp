@@ -11,14 +11,32 @@ using namespace gridbay::shell;
 
 namespace {
 
-// Pictures of each page that the tree shows, and of each data file that is open.
-void takeScreenshots(MainWindow& window, const QString& folder) {
+void openFiles(MainWindow& window, const QStringList& paths) {
+  for (const QString& path : paths) {
+    if (DataWindow::isDataFile(path)) {
+      window.openData(path);
+    } else {
+      window.openDocument(path);
+    }
+  }
+}
+
+// Pictures of the start view, of a setup's first view and each page that its tree shows, and of each data
+// file that is open.
+void takeScreenshots(MainWindow& window, const QStringList& paths, const QString& folder) {
+  const auto take = [&window, &folder](const QString& name) {
+    QApplication::processEvents();
+    window.grab().save(QString("%1/%2.png").arg(folder, name));
+  };
   QDir().mkpath(folder);
   window.show();
+  take("start");
+  openFiles(window, paths);
+  if (window.currentDocument() == nullptr) window.newDocument(0);
+  take("first-view");
   for (const auto& item : window.currentDocument()->editor().items()) {
     if (!item.visible || !window.currentDocument()->goToPage(item.id)) continue;
-    QApplication::processEvents();
-    window.grab().save(QString("%1/page-%2.png").arg(folder).arg(item.id));
+    take(QString("page-%1").arg(item.id));
   }
   for (DataWindow* data : window.findChildren<DataWindow*>()) {
     QApplication::processEvents();
@@ -37,6 +55,7 @@ int main(int argc, char** argv) {
   parser.setApplicationDescription("Opens setups in their editor.");
   parser.addHelpOption();
   parser.addOption({"edition", "The editor of new documents: v27 or wsk.", "edition", "v27"});
+  parser.addOption({"new", "Begins with a new document where no setup is given."});
   parser.addOption({"screenshots", "Writes a picture of each page to a folder, and ends.", "folder"});
   parser.addOption({"exit-when-shown", "Ends once the window has been painted, as a benchmark wants it."});
   parser.addOption({"appearance", "Colours for this time: light or dark.", "colours"});
@@ -58,18 +77,12 @@ int main(int argc, char** argv) {
   MainWindow window(std::move(libraries));
   if (parser.isSet("appearance"))
     setAppearance(parser.value("appearance") == "dark" ? Appearance::dark : Appearance::light);
-  for (const QString& path : parser.positionalArguments()) {
-    if (DataWindow::isDataFile(path)) {
-      window.openData(path);
-    } else {
-      window.openDocument(path);
-    }
-  }
-  if (window.currentDocument() == nullptr) window.newDocument(0);
   if (parser.isSet("screenshots")) {
-    takeScreenshots(window, parser.value("screenshots"));
+    takeScreenshots(window, parser.positionalArguments(), parser.value("screenshots"));
     return 0;
   }
+  openFiles(window, parser.positionalArguments());
+  if (parser.isSet("new") && window.currentDocument() == nullptr) window.newDocument(0);
   window.show();
   if (parser.isSet("exit-when-shown")) {
     QApplication::processEvents();

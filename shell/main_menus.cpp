@@ -11,10 +11,6 @@
 namespace gridbay::shell {
 namespace {
 
-// Commands of the editor that have a key here.
-constexpr int kValidate = 46019;
-constexpr int kStart = 46018;
-
 // Edits, grids and texts each have slots of these names.
 void toFocused(const char* slot) {
   QWidget* focused = QApplication::focusWidget();
@@ -36,20 +32,16 @@ void MainWindow::buildMenus() {
 
 QMenu* MainWindow::buildFileMenu() {
   auto* file = new QMenu(tr("&File"), this);
-  QMenu* fresh = file->addMenu(tr("&New"));
-  for (std::size_t i = 0; i < libraries_.size(); ++i) {
-    QAction* action = fresh->addAction(libraries_[i]->docString(CVdDocTemplate::kNewFileName), this,
-                                       [this, i] { newDocument(i); });
-    if (i == 0) action->setShortcut(QKeySequence::New);
-  }
-  file->addAction(tr("&Open..."), QKeySequence::Open, this, [this] { askOpen(); });
+  freshMenu_ = file->addMenu(tr("&New"));
+  for (QAction* action : fresh_) freshMenu_->addAction(action);
+  file->addAction(open_);
   recentMenu_ = file->addMenu(tr("Open &Recent"));
   rebuildRecentMenu();
-  file->addAction(tr("&Close"), QKeySequence::Close, this, [this] { closeTab(tabs_->currentIndex()); });
+  close_ =
+      file->addAction(tr("&Close"), QKeySequence::Close, this, [this] { closeTab(tabs_->currentIndex()); });
   file->addSeparator();
-  file->addAction(tr("&Save"), QKeySequence::Save, this, [this] { saveDocument(); });
-  file->addAction(tr("Save &As..."), QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_S), this,
-                  [this] { askSave(); });
+  file->addAction(save_);
+  file->addAction(saveAs_);
   file->addSeparator();
   file->addAction(tr("E&xit"), QKeySequence::Quit, this, &QWidget::close);
   return file;
@@ -57,28 +49,13 @@ QMenu* MainWindow::buildFileMenu() {
 
 QMenu* MainWindow::buildEditMenu() {
   auto* edit = new QMenu(tr("&Edit"), this);
-  undo_ = edit->addAction(tr("&Undo"), QKeySequence::Undo, this, [this] {
-    if (DocumentTab* tab = currentDocument()) tab->undo();
-  });
-  redo_ = edit->addAction(tr("&Redo"), QKeySequence::Redo, this, [this] {
-    if (DocumentTab* tab = currentDocument()) tab->redo();
-  });
+  edit->addAction(undo_);
+  edit->addAction(redo_);
   edit->addSeparator();
   edit->addAction(tr("Cu&t"), this, [] { toFocused("cut"); });
   edit->addAction(tr("&Copy"), this, [] { toFocused("copy"); });
   edit->addAction(tr("&Paste"), this, [] { toFocused("paste"); });
-  refreshEditMenu();
   return edit;
-}
-
-void MainWindow::refreshEditMenu() {
-  DocumentTab* tab = currentDocument();
-  const auto show = [](QAction* action, const QString& verb, const std::optional<SetupEditor::Edit>& edit) {
-    action->setEnabled(edit.has_value());
-    action->setText(edit ? verb + " " + QString::fromStdString(edit->name).replace('&', "&&") : verb);
-  };
-  show(undo_, tr("&Undo"), tab == nullptr ? std::nullopt : tab->editor().undoable());
-  show(redo_, tr("&Redo"), tab == nullptr ? std::nullopt : tab->editor().redoable());
 }
 
 QMenu* MainWindow::buildViewMenu() {
@@ -96,6 +73,9 @@ QMenu* MainWindow::buildViewMenu() {
   });
   view->addAction(tr("&Next page"), QKeySequence(Qt::CTRL | Qt::Key_PageDown), this, [this] {
     if (DocumentTab* tab = currentDocument()) tab->goToNeighbour(1);
+  });
+  summary_ = view->addAction(tr("&Summary of the setup"), QKeySequence(Qt::ALT | Qt::Key_Home), this, [this] {
+    if (DocumentTab* tab = currentDocument()) tab->showFirstView();
   });
   view->addSeparator();
   for (QDockWidget* dock : findChildren<QDockWidget*>()) view->addAction(dock->toggleViewAction());
@@ -128,7 +108,7 @@ void MainWindow::rebuildWindowMenu() {
 
 QMenu* MainWindow::buildHelpMenu() {
   auto* help = new QMenu(tr("&Help"), this);
-  help->addAction(tr("&Help on this page"), QKeySequence(Qt::Key_F1), this, [this] { showHelp(); });
+  help->addAction(helpOnPage_);
   help->addAction(tr("&Overview"), this, [this] {
     QString error;
     if (!help_->showTopic(0, tr("Overview"), &error)) tell(error);
@@ -146,22 +126,15 @@ void MainWindow::rebuildRunMenu() {
   DocumentTab* tab = currentDocument();
   if (tab == nullptr) return;
   for (const SetupEditor::Command& command : tab->editor().commands()) {
-    QAction* action =
-        runMenu_->addAction(QString::fromStdString(command.text), this, [this, id = command.id] {
-          DocumentTab* current = currentDocument();
-          if (current == nullptr) return;
-          current->commit();
-          current->editor().command(id);
-          // A command that starts another thing shows no check mark and needs no new menu.
-          rebuildRunMenu();
-        });
+    QAction* action = commandAction(command.id);
+    action->setText(QString::fromStdString(command.text));
     action->setCheckable(command.checked);
     action->setChecked(command.checked);
-    if (command.id == kValidate) action->setShortcut(Qt::Key_F7);
-    if (command.id == kStart) action->setShortcut(Qt::Key_F5);
+    runMenu_->addAction(action);
   }
   runMenu_->addAction(tr("S&top simulation"), QKeySequence(Qt::SHIFT | Qt::Key_F5), this,
                       [this] { run_->stop(); });
+  refreshActions();
 }
 
 void MainWindow::askOpen() {

@@ -1,19 +1,15 @@
 #include "shell/main_window.h"
 
-#include <QAction>
 #include <QApplication>
 #include <QCloseEvent>
 #include <QDesktopServices>
-#include <QDockWidget>
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QMessageBox>
 #include <QMimeData>
-#include <QPointer>
 #include <QSettings>
 #include <QStandardPaths>
 #include <QStatusBar>
-#include <QStyle>
 #include <QUrl>
 
 namespace gridbay::shell {
@@ -22,10 +18,7 @@ namespace {
 constexpr const char* kRecentKey = "recent";
 constexpr const char* kGeometryKey = "window/geometry";
 constexpr const char* kStateKey = "window/state";
-constexpr const char* kNumber = "number";  // of a document, by which its recovery copy is known
 constexpr int kMostRecent = 8;
-constexpr int kPageRole = Qt::UserRole;
-constexpr int kTabRole = Qt::UserRole + 1;
 constexpr int kRecoveryDelay = 1000;  // milliseconds after an edit
 
 }  // namespace
@@ -33,22 +26,32 @@ constexpr int kRecoveryDelay = 1000;  // milliseconds after an edit
 MainWindow::MainWindow(std::vector<std::unique_ptr<EditorLibrary>> libraries)
     : libraries_(std::move(libraries)),
       recovery_(QStandardPaths::writableLocation(QStandardPaths::AppDataLocation) + "/recovery"),
-      tabs_(new QTabWidget(this)) {
+      central_(new QStackedWidget(this)),
+      tabs_(new QTabWidget(central_)),
+      start_(new StartView(central_)) {
   setWindowTitle(QApplication::applicationDisplayName());
   resize(1100, 760);
   tabs_->setTabsClosable(true);
   tabs_->setDocumentMode(true);
-  setCentralWidget(tabs_);
+  central_->addWidget(start_);
+  central_->addWidget(tabs_);
+  setCentralWidget(central_);
   setAcceptDrops(true);
+  buildActions();
   buildDocks();
   buildMenus();
+  buildTools();
+  buildStartView();
+  start_->setFocus();
   restoreGeometry(QSettings().value(kGeometryKey).toByteArray());
   restoreState(QSettings().value(kStateKey).toByteArray());
   connect(tabs_, &QTabWidget::tabCloseRequested, this, [this](int index) { closeTab(index); });
   connect(tabs_, &QTabWidget::currentChanged, this, [this] {
     rebuildRunMenu();
     rebuildWindowMenu();
-    refreshEditMenu();
+    refreshActions();
+    messages_->showCheckOf(currentDocument());
+    showTabsOrStart();
   });
   recoveryTimer_.setSingleShot(true);
   recoveryTimer_.setInterval(kRecoveryDelay);
@@ -66,29 +69,19 @@ MainWindow::~MainWindow() {
 }
 
 void MainWindow::buildDocks() {
-  messages_ = new QTreeWidget(this);
-  messages_->setHeaderLabels({tr("Message"), tr("Page")});
-  messages_->setRootIsDecorated(false);
-  messages_->setColumnWidth(0, 700);
-  messages_->setAccessibleName(tr("Messages"));
-  auto* dock = new QDockWidget(tr("Messages"), this);
-  dock->setObjectName("messages");
-  dock->setWidget(messages_);
-  addDockWidget(Qt::BottomDockWidgetArea, dock);
-  connect(messages_, &QTreeWidget::itemActivated, this, [this](const QTreeWidgetItem* item) {
-    auto* tab = qobject_cast<DocumentTab*>(item->data(0, kTabRole).value<QObject*>());
-    if (tab == nullptr || tabs_->indexOf(tab) < 0) return;
-    tabs_->setCurrentWidget(tab);
-    const int page = item->data(0, kPageRole).toInt();
-    if (!tab->goToPage(page))
+  messages_ = new MessagesDock(commandAction(DocumentTab::kValidate), this);
+  addDockWidget(Qt::BottomDockWidgetArea, messages_);
+  connect(messages_, &MessagesDock::pageChosen, this, [this](int page) {
+    DocumentTab* tab = currentDocument();
+    if (tab != nullptr && !tab->goToPage(page))
       statusBar()->showMessage(tr("The page %1 is not shown now.").arg(tab->caption(page)));
   });
 
   run_ = new RunDock(this);
   addDockWidget(Qt::BottomDockWidgetArea, run_);
-  tabifyDockWidget(dock, run_);
-  dock->raise();
-  resizeDocks({dock}, {140}, Qt::Vertical);
+  tabifyDockWidget(messages_, run_);
+  messages_->raise();
+  resizeDocks({messages_}, {140}, Qt::Vertical);
 
   help_ = new HelpDock(this);
   addDockWidget(Qt::RightDockWidgetArea, help_);
@@ -104,25 +97,51 @@ void MainWindow::tell(const QString& text) {
 }
 
 DocumentTab* MainWindow::newDocument(std::size_t library) {
-  // The services need the tab that they are for.
-  auto self = std::make_shared<QPointer<DocumentTab>>();
-  WindowServices services{[this, self](const ValidationList& messages, unsigned faults) {
-                            showMessages(*self, messages, faults);
-                          },
-                          [this](const EngineStart& start) { startEngine(start); },
+  WindowServices services{[this](const EngineStart& start) { startEngine(start); },
                           [this](const std::string& path) { openFile(QString::fromStdString(path)); }};
   auto* tab =
       new DocumentTab([this, library](SetupHost& host) { return libraries_[library]->newDocument(host); },
                       std::move(services), this);
-  *self = tab;
   tab->setProperty(kNumber, ++lastNumber_);
   tab->setUnits(units_->units());
   const int index = tabs_->addTab(tab, tab->title());
   connect(tab, &DocumentTab::documentChanged, this, [this, tab] { documentChanged(tab); });
+  connect(tab, &DocumentTab::checked, this, [this, tab] { showMessages(tab); });
+  connect(tab, &DocumentTab::saved, this,
+          [this, tab] { remember(QString::fromStdString(tab->editor().path())); });
   tabs_->setCurrentIndex(index);
   rebuildRunMenu();
   rebuildWindowMenu();
   return tab;
+}
+
+void MainWindow::discardTab(DocumentTab* tab) {
+  unwritten_.erase(tab);
+  recovery_.forget(tab->property(kNumber).toInt());
+  tabs_->removeTab(tabs_->indexOf(tab));
+  delete tab;
+  rebuildWindowMenu();
+}
+
+void MainWindow::showTabsOrStart() {
+  QWidget* wanted = tabs_->count() > 0 ? static_cast<QWidget*>(tabs_) : start_;
+  if (central_->currentWidget() == wanted) return;
+  central_->setCurrentWidget(wanted);
+  if (wanted == start_) start_->setFocus();
+}
+
+DocumentTab* MainWindow::tabOf(const QString& path) const {
+  const QFileInfo wanted(path);
+  for (int i = 0; i < tabs_->count(); ++i) {
+    auto* tab = static_cast<DocumentTab*>(tabs_->widget(i));
+    const QString own = QString::fromStdString(tab->editor().path());
+    if (own.isEmpty() || path.isEmpty()) continue;
+    const QFileInfo info(own);
+    // A file that is gone has no canonical path.
+    if (info.absoluteFilePath() == wanted.absoluteFilePath() || (wanted.exists() && info == wanted))
+      return tab;
+  }
+  return nullptr;
 }
 
 std::size_t MainWindow::libraryOf(const QString& path) const {
@@ -133,11 +152,8 @@ std::size_t MainWindow::libraryOf(const QString& path) const {
 }
 
 DocumentTab* MainWindow::openDocument(const QString& path) {
-  for (int i = 0; i < tabs_->count(); ++i) {
-    auto* open = static_cast<DocumentTab*>(tabs_->widget(i));
-    const QString own = QString::fromStdString(open->editor().path());
-    if (own.isEmpty() || QFileInfo(own) != QFileInfo(path) || !QFileInfo::exists(path)) continue;
-    tabs_->setCurrentIndex(i);
+  if (DocumentTab* open = tabOf(path)) {
+    tabs_->setCurrentWidget(open);
     return open;
   }
   DocumentTab* tab = newDocument(libraryOf(path));
@@ -146,8 +162,7 @@ DocumentTab* MainWindow::openDocument(const QString& path) {
     return tab;
   }
   // Never an empty document that a save could write over the file.
-  tabs_->removeTab(tabs_->indexOf(tab));
-  delete tab;
+  discardTab(tab);
   return nullptr;
 }
 
@@ -190,8 +205,12 @@ bool MainWindow::saveDocument(const QString& path) {
   if (tab == nullptr) return false;
   QString target = path.isEmpty() ? QString::fromStdString(tab->editor().path()) : path;
   if (target.isEmpty()) target = askSaveName(*tab);
-  if (target.isEmpty() || !tab->save(target)) return false;
-  remember(target);
+  if (target.isEmpty()) return false;
+  if (DocumentTab* other = tabOf(target); other != nullptr && other != tab) {
+    tell(tr("%1 is open in another tab. Close it there, or choose another name.").arg(target));
+    return false;
+  }
+  if (!tab->save(target)) return false;
   statusBar()->showMessage(tr("Saved %1").arg(target), 3000);
   return true;
 }
@@ -204,7 +223,9 @@ bool MainWindow::askSave() {
 
 void MainWindow::documentChanged(DocumentTab* tab) {
   tabs_->setTabText(tabs_->indexOf(tab), tab->title());
-  refreshEditMenu();
+  tabs_->setTabToolTip(tabs_->indexOf(tab), QString::fromStdString(tab->editor().path()));
+  refreshActions();
+  if (tab == currentDocument()) messages_->mark();
   if (tab->editor().isModified()) {
     unwritten_.insert(tab);
     if (!recoveryTimer_.isActive()) recoveryTimer_.start();
@@ -214,63 +235,13 @@ void MainWindow::documentChanged(DocumentTab* tab) {
   }
 }
 
-void MainWindow::writeRecoveryCopies() {
-  for (DocumentTab* tab : unwritten_) {
-    const int number = tab->property(kNumber).toInt();
-    SetupEditor& editor = tab->editor();
-    const bool noted = recovery_.note(number, QString::fromStdString(editor.path()),
-                                      "." + QString::fromStdString(editor.fileKind()));
-    const std::string fault = editor.writeRecoveryCopy(recovery_.copyOf(number).toStdString());
-    if (!noted || !fault.empty())
-      statusBar()->showMessage(
-          tr("Unsaved edits cannot be kept for a crash: %1")
-              .arg(fault.empty() ? recovery_.copyOf(number) : QString::fromStdString(fault)));
-  }
-  unwritten_.clear();
-}
-
-void MainWindow::offerRecovery() {
-  for (const Recovery::Left& left : recovery_.left()) {
-    const QString name = left.path.isEmpty() ? tr("a setup that was never saved") : left.path;
-    QMessageBox box(QMessageBox::Question, QApplication::applicationDisplayName(),
-                    tr("There are unsaved edits of %1, from %2. The program ended before they were saved.")
-                        .arg(name, left.time.toString("yyyy-MM-dd hh:mm:ss")),
-                    QMessageBox::Open | QMessageBox::Discard | QMessageBox::Ignore, this);
-    box.button(QMessageBox::Open)->setText(tr("&Recover"));
-    box.button(QMessageBox::Ignore)->setText(tr("&Later"));
-    const int answer = box.exec();
-    if (answer == QMessageBox::Open) {
-      DocumentTab* tab = newDocument(libraryOf(left.extension));
-      if (!tab->recover(left.copy, left.path)) {
-        tabs_->removeTab(tabs_->indexOf(tab));
-        delete tab;
-        continue;
-      }
-      writeRecoveryCopies();
-    }
-    if (answer != QMessageBox::Ignore) Recovery::discard(left);
-  }
-}
-
-void MainWindow::showMessages(DocumentTab* tab, const ValidationList& messages, unsigned faults) {
-  messages_->clear();
-  for (const CMessage& message : messages) {
-    auto* item = new QTreeWidgetItem(messages_);
-    const int page = static_cast<int>(message.page);
-    item->setText(0, QString::fromStdString(message.text));
-    item->setText(1, tab->caption(page));
-    item->setData(0, kPageRole, page);
-    item->setData(0, kTabRole, QVariant::fromValue<QObject*>(tab));
-    item->setIcon(0,
-                  style()->standardIcon(message.severity == Severity::fault ? QStyle::SP_MessageBoxWarning
-                                                                            : QStyle::SP_MessageBoxCritical));
-    item->setToolTip(0, item->text(0));
-  }
-  auto* dock = qobject_cast<QDockWidget*>(messages_->parentWidget());
-  dock->show();
-  dock->raise();
-  statusBar()->showMessage(faults == 1 ? tr("%1: 1 fault").arg(tab->title())
-                                       : tr("%1: %2 faults").arg(tab->title()).arg(faults));
+void MainWindow::showMessages(DocumentTab* tab) {
+  if (tab != currentDocument()) return;
+  messages_->showCheckOf(tab);
+  if (!tab->check()) return;
+  messages_->show();
+  messages_->raise();
+  statusBar()->showMessage(tr("%1: %2").arg(tab->title(), faultsText(tab->check()->faults)));
 }
 
 void MainWindow::startEngine(const EngineStart& start) {
@@ -304,29 +275,37 @@ bool MainWindow::mayClose(DocumentTab& tab) {
 bool MainWindow::closeTab(int index) {
   auto* tab = static_cast<DocumentTab*>(tabs_->widget(index));
   if (tab == nullptr || !mayClose(*tab)) return false;
-  unwritten_.erase(tab);
-  recovery_.forget(tab->property(kNumber).toInt());
-  tabs_->removeTab(index);
-  delete tab;
-  rebuildWindowMenu();
+  discardTab(tab);
   return true;
 }
 
 void MainWindow::remember(const QString& path) {
-  QSettings settings;
-  QStringList recent = settings.value(kRecentKey).toStringList();
   const QString absolute = QFileInfo(path).absoluteFilePath();
+  QStringList recent = QSettings().value(kRecentKey).toStringList();
   recent.removeAll(absolute);
   recent.prepend(absolute);
-  settings.setValue(kRecentKey, recent.mid(0, kMostRecent));
+  QSettings().setValue(kRecentKey, recent.mid(0, kMostRecent));
   rebuildRecentMenu();
+}
+
+void MainWindow::forget(const QString& path) {
+  QStringList recent = QSettings().value(kRecentKey).toStringList();
+  recent.removeAll(path);
+  QSettings().setValue(kRecentKey, recent);
+  rebuildRecentMenu();
+}
+
+// A setup that is no longer there goes from the list, once that has been said.
+void MainWindow::openRecent(const QString& path) {
+  if (openDocument(path) == nullptr && !QFileInfo::exists(path)) forget(path);
 }
 
 void MainWindow::rebuildRecentMenu() {
   recentMenu_->clear();
   const QStringList recent = QSettings().value(kRecentKey).toStringList();
-  for (const QString& path : recent) recentMenu_->addAction(path, this, [this, path] { openDocument(path); });
+  for (const QString& path : recent) recentMenu_->addAction(path, this, [this, path] { openRecent(path); });
   recentMenu_->setEnabled(!recent.isEmpty());
+  start_->showRecent(recent);
 }
 
 void MainWindow::dragEnterEvent(QDragEnterEvent* event) {

@@ -1,9 +1,12 @@
 #pragma once
 
 #include <QMainWindow>
+#include <QStackedWidget>
 #include <QTabWidget>
 #include <QTimer>
+#include <QToolBar>
 #include <QTreeWidget>
+#include <map>
 #include <memory>
 #include <set>
 #include <vector>
@@ -11,14 +14,17 @@
 #include "shell/document_tab.h"
 #include "shell/editor_library.h"
 #include "shell/help_dock.h"
+#include "shell/messages_dock.h"
 #include "shell/recovery.h"
 #include "shell/run_dock.h"
+#include "shell/start_view.h"
 #include "shell/units_menu.h"
 #include "shell/viewers/data_window.h"
 
 namespace gridbay::shell {
 
-// The window: documents as tabs, messages, run output and help in docks.
+// The window: documents as tabs, or a start view while there are none; messages, run output and help in
+// docks.
 class MainWindow final : public QMainWindow {
   Q_OBJECT
  public:
@@ -38,12 +44,16 @@ class MainWindow final : public QMainWindow {
   void offerRecovery();
 
   DocumentTab* currentDocument() const;
-  QTreeWidget& messages() { return *messages_; }
+  QTreeWidget& messages() { return messages_->list(); }
+  MessagesDock& messagesDock() { return *messages_; }
+  StartView& startView() { return *start_; }
+  QToolBar& tools() { return *tools_; }
   RunDock& run() { return *run_; }
   HelpDock& help() { return *help_; }
   UnitsMenu& units() { return *units_; }
   QAction* undoAction() { return undo_; }
   QAction* redoAction() { return redo_; }
+  QAction* checkAction() { return commandAction(DocumentTab::kValidate); }
 
  protected:
   void closeEvent(QCloseEvent* event) override;
@@ -51,6 +61,11 @@ class MainWindow final : public QMainWindow {
   void dropEvent(QDropEvent* event) override;
 
  private:
+  static constexpr const char* kNumber = "number";  // of a document, by which its recovery copy is known
+
+  void buildActions();
+  void buildTools();
+  void buildStartView();
   void buildMenus();
   QMenu* buildFileMenu();
   QMenu* buildEditMenu();
@@ -60,7 +75,11 @@ class MainWindow final : public QMainWindow {
   void buildDocks();
   void rebuildRunMenu();
   void rebuildWindowMenu();
-  void refreshEditMenu();
+  // The action for a command of the current document's editor; each is made once.
+  QAction* commandAction(int id);
+  void refreshActions();
+  // The tabs, or the start view where there are none.
+  void showTabsOrStart();
   // Opens, and has the user save under, a name of his choice.
   void askOpen();
   bool askSave();
@@ -68,13 +87,20 @@ class MainWindow final : public QMainWindow {
   // The list of setups opened last, newest first, and the menu that offers them.
   void remember(const QString& path);
   void rebuildRecentMenu();
-  void showMessages(DocumentTab* tab, const ValidationList& messages, unsigned faults);
+  void forget(const QString& path);
+  void openRecent(const QString& path);
+  void showMessages(DocumentTab* tab);
   void startEngine(const EngineStart& start);
   void showHelp();
   void tell(const QString& text);
   void documentChanged(DocumentTab* tab);
   void writeRecoveryCopies();
+  void offerRecovery(const Recovery::Left& left);
+  bool recover(const Recovery::Left& left);
   std::size_t libraryOf(const QString& path) const;
+  // The tab that a setup is open in, or null.
+  DocumentTab* tabOf(const QString& path) const;
+  void discardTab(DocumentTab* tab);
   bool mayClose(DocumentTab& tab);
   bool closeTab(int index);
 
@@ -83,14 +109,26 @@ class MainWindow final : public QMainWindow {
   std::set<DocumentTab*> unwritten_;  // with edits that have no recovery copy yet
   QTimer recoveryTimer_;
   int lastNumber_ = 0;
+  QStackedWidget* central_;
   QTabWidget* tabs_;
+  StartView* start_;
+  QToolBar* tools_ = nullptr;
+  std::vector<QAction*> fresh_;  // a new document of each library
+  QAction* open_ = nullptr;
+  QAction* save_ = nullptr;
+  QAction* saveAs_ = nullptr;
+  QAction* close_ = nullptr;
+  QAction* undo_ = nullptr;
+  QAction* redo_ = nullptr;
+  QAction* helpOnPage_ = nullptr;
+  QAction* summary_ = nullptr;
+  std::map<int, QAction*> commands_;
+  QMenu* freshMenu_ = nullptr;
   QMenu* runMenu_ = nullptr;
   QMenu* recentMenu_ = nullptr;
   QMenu* windowMenu_ = nullptr;
   UnitsMenu* units_ = nullptr;
-  QAction* undo_ = nullptr;
-  QAction* redo_ = nullptr;
-  QTreeWidget* messages_ = nullptr;
+  MessagesDock* messages_ = nullptr;
   RunDock* run_ = nullptr;
   HelpDock* help_ = nullptr;
 };

@@ -292,7 +292,7 @@ TEST_F(Tool, WhatALoadHasToSayIsOnStandardError) {
   const ProgramRun run = runTool({"boundaries", folder.file("s.v27")});
   EXPECT_EQ(run.status, 0);
   EXPECT_EQ(run.err,
-            "Error in the KVS-FILE The number of Boundary sections does not correspond to the number of sub "
+            "Error in the KVS-FILE\nThe number of Boundary sections does not correspond to the number of sub "
             "domaines (3 times)\n");
 }
 

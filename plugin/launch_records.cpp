@@ -1,0 +1,3 @@
+// Here the plug-in libraries get the accessors that they export.
+
+#include "plugin/launch_records.h"

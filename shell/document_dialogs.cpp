@@ -1,0 +1,138 @@
+// What a document asks of its user: texts, questions, files and small forms.
+
+#include <QApplication>
+#include <QDialog>
+#include <QDialogButtonBox>
+#include <QFileDialog>
+#include <QInputDialog>
+#include <QMessageBox>
+#include <QVBoxLayout>
+#include <algorithm>
+#include <iterator>
+#include <numeric>
+
+#include "shell/document_tab.h"
+
+namespace gridbay::shell {
+namespace {
+
+// "Grids (*.tsb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||" as the toolkit writes it.
+QString toolkitFilter(std::string_view filter) {
+  const QStringList parts =
+      QString::fromUtf8(filter.data(), static_cast<qsizetype>(filter.size())).split('|', Qt::SkipEmptyParts);
+  QStringList filters;
+  for (qsizetype i = 0; i + 1 < parts.size(); i += 2) {
+    filters << QString("%1 (%2)").arg(parts[i].section(" (", 0, 0), QString(parts[i + 1]).replace(';', ' '));
+  }
+  return filters.join(";;");
+}
+
+// The numbers of the items of a file that meet a request; of all where none does.
+std::vector<std::uint32_t> itemsFor(const CVdRqTsbItem& request, const TsbHeader& file) {
+  std::vector<std::uint32_t> all(static_cast<std::size_t>(tsbGetNoOfItems(file)));
+  std::iota(all.begin(), all.end(), 1U);
+  std::vector<std::uint32_t> fitting;
+  std::ranges::copy_if(all, std::back_inserter(fitting), [&](std::uint32_t number) {
+    return request.fault(file, static_cast<int>(number)).empty();
+  });
+  return fitting.empty() ? all : fitting;
+}
+
+// Lets the user pick an item for each request that wants one; false when he gives up. There is nothing to ask
+// where only one will do, or where the file cannot be read.
+bool chooseItems(QWidget* parent, CVdFileSelectorDlg& selector) {
+  std::vector<std::uint32_t> items = selector.GetSelectedItems();
+  TsbHeader file;
+  if (items.empty() || tsbFileRead(selector.fileName(), &file) != 0) return true;
+  for (std::size_t i = 0; i < std::min(items.size(), selector.requests().size()); ++i) {
+    const CVdRqTsbItem& request = *selector.requests()[i];
+    const std::vector<std::uint32_t> numbers = itemsFor(request, file);
+    QStringList names;
+    for (const std::uint32_t number : numbers) {
+      const TsbItem& item = *tsbItemD(file, static_cast<int>(number));
+      names << QString("%1 %2").arg(number).arg(QString::fromStdString(item.name));
+    }
+    const auto current = std::ranges::find(numbers, items[i]);
+    const auto place = static_cast<int>(current == numbers.end() ? 0 : current - numbers.begin());
+    bool chosen = true;
+    const QString name = names.size() == 1
+                             ? names[0]
+                             : QInputDialog::getItem(parent, DocumentTab::tr("Item"),
+                                                     QString::fromStdString(request.description()), names,
+                                                     place, false, &chosen);
+    if (!chosen) return false;
+    items[i] = numbers[static_cast<std::size_t>(names.indexOf(name))];
+  }
+  selector.SetSelectedItems(items);
+  return true;
+}
+
+}  // namespace
+
+void DocumentTab::show(const std::string& text) {
+  QMessageBox::information(this, QApplication::applicationDisplayName(), QString::fromStdString(text));
+}
+
+bool DocumentTab::askYesNo(const std::string& question) {
+  return QMessageBox::question(this, QApplication::applicationDisplayName(),
+                               QString::fromStdString(question)) == QMessageBox::Yes;
+}
+
+bool DocumentTab::chooseFile(std::string_view filter, std::string_view extension, std::string* name) {
+  QFileDialog dialog(this, {}, QString::fromStdString(*name), toolkitFilter(filter));
+  dialog.setDefaultSuffix(QString::fromUtf8(extension.data(), static_cast<qsizetype>(extension.size())));
+  if (dialog.exec() != QDialog::Accepted) return false;
+  *name = dialog.selectedFiles().value(0).toStdString();
+  return true;
+}
+
+bool DocumentTab::chooseSaveFile(std::string_view filter, std::string_view extension, std::string* name) {
+  QFileDialog dialog(this, {}, QString::fromStdString(*name), toolkitFilter(filter));
+  dialog.setAcceptMode(QFileDialog::AcceptSave);
+  dialog.setDefaultSuffix(QString::fromUtf8(extension.data(), static_cast<qsizetype>(extension.size())));
+  if (dialog.exec() != QDialog::Accepted) return false;
+  *name = dialog.selectedFiles().value(0).toStdString();
+  return true;
+}
+
+// Picks the file, and an item for each request where the file has more than one; a file that does not meet
+// the request is told why.
+bool DocumentTab::choose(CVdFileSelectorDlg& selector) {
+  std::string name = selector.fileName();
+  if (!chooseFile(selector.filter(), selector.kind(), &name)) return false;
+  selector.SetFileName(name);
+  if (!chooseItems(this, selector)) return false;
+  const std::vector<std::uint32_t>& items = selector.GetSelectedItems();
+  std::string why;
+  const bool valid =
+      items.empty() ? selector.IsTsbFileValid(name, &why) : selector.IsTsbFileValid(name, items, &why);
+  return valid || askYesNo(why + "\n\nTake the file all the same?");
+}
+
+bool DocumentTab::editForm(std::string_view title, Form& form, const std::function<std::string()>& fault) {
+  QDialog dialog(this);
+  dialog.setWindowTitle(QString::fromUtf8(title.data(), static_cast<qsizetype>(title.size())));
+  auto* layout = new QVBoxLayout(&dialog);
+  auto* pane = new PagePane(&dialog);
+  pane->showForm(dialog.windowTitle(), form);
+  auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, &dialog);
+  connect(buttons, &QDialogButtonBox::accepted, &dialog, [&] {
+    pane->commit();
+    const std::string text = fault();
+    if (text.empty()) {
+      dialog.accept();
+    } else {
+      show(text);
+    }
+  });
+  connect(buttons, &QDialogButtonBox::rejected, &dialog, &QDialog::reject);
+  layout->addWidget(pane);
+  layout->addWidget(buttons);
+  return dialog.exec() == QDialog::Accepted;
+}
+
+bool DocumentTab::isShiftHeld() {
+  return QApplication::keyboardModifiers().testFlag(Qt::ShiftModifier);
+}
+
+}  // namespace gridbay::shell
