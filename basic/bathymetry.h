@@ -32,11 +32,10 @@ class CBathymetryObjectKvs final : public TableKvs<CBathymetryObjectKvs> {
 
   static constexpr auto table() {
     using Self = CBathymetryObjectKvs;
-    return keywords(
-        section("DATA_FILE", keyword("FILE_NAME", &Self::fileName)), keyword("Origin", &Self::origin),
-        keyword("Enclosing_Area", &Self::enclosingArea),
-        fromOtherFiles(&Self::noJ, &Self::noK, &Self::dx, &Self::dy, &Self::landValue, &Self::grid,
-                                   &Self::gridFile));
+    return keywords(section("DATA_FILE", keyword("FILE_NAME", &Self::fileName)),
+                    keyword("Origin", &Self::origin), keyword("Enclosing_Area", &Self::enclosingArea),
+                    fromOtherFiles(&Self::noJ, &Self::noK, &Self::dx, &Self::dy, &Self::landValue,
+                                   &Self::grid, &Self::gridFile));
   }
 
   // Reads the area's file into the object; areaNumber from 1. Returns the number of errors, with a message
@@ -110,9 +109,11 @@ class CBathymetryKvs final : public ListKvs<CBathymetryKvs, CBathymetryObjectKvs
   double EstimateSizeMB(double factor) const;
 };
 
-// Requires of a map that it fits an area. The request is a CVdRqTsbItem or a CVdFileSelectorDlg.
+// Requires of a map that it fits an area. The request is a CVdRqTsbItem or a CVdFileSelectorDlg. Of an area
+// whose grid has not been read only the number of dimensions is known.
 void RequestMatchesArea(const CBathymetryObjectKvs& area, auto& request) {
   request.SetDimensions(2);
+  if (area.noJ == 0) return;
   request.SetNoPoints(1, area.noJ);
   request.SetInterval(1, area.dx);
   request.SetNoPoints(2, area.noK);

@@ -27,8 +27,10 @@ void CMassBudgetItemKvs::CornersRow::load(CMassBudgetItemKvs& polygon, KvsSectio
   kvsGetParam(from, count, &stated, 1, 1);
   polygon.corners.clear();
   for (int number = 1; number <= std::min(stated, kvsGetNoKeywords(from)); ++number) {
+    const std::string name = formatted(corner, number);
+    if (kvsKeywordByNameNum(from, name, 1) == nullptr) continue;
     GridPoint point;
-    kvsGetListParam(from, formatted(corner, number), 1, "ii", &point.j, &point.k);
+    kvsGetListParam(from, name, 1, "ii", &point.j, &point.k);
     polygon.corners.push_back(point);
   }
 }

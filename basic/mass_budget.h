@@ -47,7 +47,7 @@ class CMassBudgetKvs final : public ListKvs<CMassBudgetKvs, CMassBudgetItemKvs> 
 
   static constexpr auto table() {
     return section("MASS_BUDGET", pinnedCount("NoOfPolygons", 0),
-                   items("POLYGON_%d", texts::polygonSectionMissing));
+                   flowModelOnly(items("POLYGON_%d", texts::polygonSectionMissing)));
   }
 
   // A new polygon goes once around the inside of Area 1.

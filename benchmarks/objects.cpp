@@ -5,8 +5,10 @@
 
 #include <filesystem>
 
+#include "basic/area_description.h"
 #include "core/kdl_reader.h"
 #include "core/list_kvs.h"
+#include "setup/edit_history.h"
 
 namespace gridbay {
 namespace {
@@ -75,6 +77,29 @@ void loadAndSave(benchmark::State& state) {
   std::filesystem::remove(path);
 }
 
+// One point of a long list is changed, and what has changed is found and kept for an undo, as after an edit
+// on a page: in the list, and in all else that a model has.
+void editWithHistory(benchmark::State& state) {
+  Points points(nullptr);
+  points.SetCount(static_cast<int>(state.range(0)));
+  Points twin(nullptr);
+  twin.AssignState(points);
+  CGlobalKvs model;
+  EditHistory history;
+  history.start(model, {});
+  int number = 0;
+  for (auto _ : state) {
+    number = number % points.GetCount() + 1;
+    points.GetItem(number)->z += 1;
+    model.areaDescription->dryingDepth += 0.01F;
+    const auto change = points.TakeChange(twin);
+    if (change == nullptr || !history.record(model, PageId::floodAndDry, "Drying depth", false, {}))
+      state.SkipWithError("the edit was not seen");
+    benchmark::DoNotOptimize(change);
+  }
+}
+
+BENCHMARK(editWithHistory)->Arg(10'000)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond);
 BENCHMARK(parseAlone)->Arg(10'000)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond)->MinTime(2);
 BENCHMARK(loadAndSave)->Arg(10'000)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond)->MinTime(2);
 

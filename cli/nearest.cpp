@@ -6,9 +6,7 @@
 #include <vector>
 
 namespace gridbay::cli {
-namespace {
 
-// How many letters to change, add or leave out to make one text the other.
 std::size_t slipsBetween(std::string_view a, std::string_view b) {
   std::vector<std::size_t> row(b.size() + 1);
   std::iota(row.begin(), row.end(), std::size_t{0});
@@ -22,8 +20,6 @@ std::size_t slipsBetween(std::string_view a, std::string_view b) {
   }
   return row.back();
 }
-
-}  // namespace
 
 std::string lowered(std::string_view text) {
   std::string small(text);

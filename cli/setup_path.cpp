@@ -3,38 +3,15 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <cctype>
 #include <limits>
-#include <numeric>
 
+#include "cli/nearest.h"
 #include "core/kdl_writer.h"
 #include "core/number_text.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay::cli {
 namespace {
-
-std::string lowered(std::string_view text) {
-  std::string small(text);
-  std::ranges::transform(small, small.begin(),
-                         [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
-  return small;
-}
-
-// How many letters to change, add or drop to make one text the other.
-std::size_t distance(std::string_view a, std::string_view b) {
-  std::vector<std::size_t> row(b.size() + 1);
-  std::iota(row.begin(), row.end(), std::size_t{0});
-  for (std::size_t i = 0; i < a.size(); ++i) {
-    std::size_t diagonal = row[0]++;
-    for (std::size_t j = 0; j < b.size(); ++j) {
-      const std::size_t change = diagonal + (a[i] == b[j] ? 0 : 1);
-      diagonal = row[j + 1];
-      row[j + 1] = std::min({change, row[j] + 1, diagonal + 1});
-    }
-  }
-  return row.back();
-}
 
 void listPaths(const Node& section, const std::string& prefix, std::vector<std::string>& paths) {
   for (const Node* node = section.first(); node != nullptr; node = node->next()) {
@@ -158,7 +135,7 @@ std::string nearestPath(const KvsFile& file, std::string_view path) {
     const std::string small = lowered(candidate);
     // A right name in a wrong place is as near as a slip or two.
     const std::string name = small.substr(small.rfind('/') + 1);
-    const std::size_t slips = std::min(distance(small, wanted), distance(name, wantedName) + 2);
+    const std::size_t slips = std::min(slipsBetween(small, wanted), slipsBetween(name, wantedName) + 2);
     if (slips < least) {
       least = slips;
       nearest = candidate;

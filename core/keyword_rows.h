@@ -211,6 +211,12 @@ constexpr OnlyIf<Row, Predicate> onlyIf(Predicate applies, Row row) {
   return {row, applies};
 }
 
+// A row that the Wetland Sweep Kit keeps off its files.
+template <class Row>
+constexpr auto flowModelOnly(Row row) {
+  return onlyIf([](const auto&) { return !theEdition.wetlandSweepKit; }, row);
+}
+
 // A row that is read and never written, as a keyword of older files.
 template <class Row>
 struct ReadOnly : Row {

@@ -51,9 +51,9 @@ bool isRatingCurve(const FileNameValue& file) {
 }
 
 unsigned notValid(ValidationList& messages, const FileNameValue& file, const std::string& why) {
-  const std::string reason = why.empty() ? "" : formatted(texts::errorMessage) + why;
-  messages.push_back(
-      {PageId::hdBoundary, formatted(texts::dataFileNotValid, file.text()) + reason, Severity::fault});
+  messages.push_back({PageId::hdBoundary,
+                      formatted(texts::dataFileNotValid, file.text()) + formatted(texts::errorMessage) + why,
+                      Severity::fault});
   return 1;
 }
 
@@ -113,7 +113,9 @@ void CNhdBoundaryObjectKvs::requestAlongBoundary(CVdRqTsbItem& request, int numb
   CBoundaryObjectKvs* line = basic == nullptr ? nullptr : basic->boundary->GetItem(number);
   request.SetDimensions(1);
   request.SetNoPoints(1, line == nullptr ? kNotAlongAnAxis : pointsAlong(*line));
-  request.SetInterval(1, line == nullptr ? kNotAlongAnAxis : line->CellSpacing());
+  // 0 stands for a grid that has not been read: then any spacing may be right.
+  const float spacing = line == nullptr ? kNotAlongAnAxis : line->CellSpacing();
+  if (spacing != 0) request.SetInterval(1, spacing);
 }
 
 void CNhdBoundaryObjectKvs::finishRequest(CVdFileSelectorDlg& selector) {
@@ -170,7 +172,8 @@ unsigned CNhdBoundaryObjectKvs::Validate(ValidationList& messages, int, int numb
     faults += notValid(messages, dataFile.fileName, why);
   }
   if (dataFormat == kRatingCurve && !isRatingCurve(dataFile.fileName)) {
-    faults += notValid(messages, dataFile.fileName, formatted(texts::ratingCurveMissing));
+    selector.IsTsbFileValid(path, dataFile.items, &why);
+    faults += notValid(messages, dataFile.fileName, why);
   }
   if (tiltType == 0 || tiltType == 1) {
     const CBoundaryObjectKvs* line = boundary(number);
@@ -184,7 +187,8 @@ unsigned CNhdBoundaryObjectKvs::Validate(ValidationList& messages, int, int numb
     CVdFileSelectorDlg directions;
     RequestDirectionFile(directions, number);
     if (!directions.IsTsbFileValid(directionFile.fileName.absolute(), directionFile.items, &why)) {
-      faults += notValid(messages, directionFile.fileName, {});
+      faults += report(messages, PageId::hdBoundary, Severity::fault, texts::dataFileNotValid,
+                       directionFile.fileName.text());
     }
   }
   return faults;

@@ -12,6 +12,5 @@ inline constexpr Text noBoundaryDataItem{" No Boundary Data item "};
 inline constexpr Text tiltingPointOutside{"Tilting point is outside of boundary line"};
 inline constexpr Text boundaryRequest{"Boundary"};
 inline constexpr Text flowDirectionRequest{"Flow direction"};
-inline constexpr Text ratingCurveMissing{"The rating curve is a file that exists, with the extension .tsb0"};
 
 }  // namespace gridbay::texts

@@ -182,7 +182,7 @@ void showAll(CNavigationView& tree, bool shown, std::initializer_list<std::int32
   for (const std::int32_t id : ids) tree.Show(id, shown);
 }
 
-// Which root items belong to a module code.
+// The root item of a module beside those that every model has, and the one that an option of it adds.
 struct ModuleRoots {
   std::int32_t code;
   std::int32_t ownRoot;  // 0 for hydrodynamics alone
@@ -193,7 +193,10 @@ constexpr ModuleRoots kModuleRoots[] = {
     {module::kMudTransport, 6}, {module::kMudTransportExpanded, 5}, {module::kEcological, 7},
 };
 
-void ruleModule(CNavigationView& tree, CGlobalKvs& model) {
+// The rules by their numbers. Root 8 is an option of expanded mud transport, off until a model can turn it
+// on.
+
+void rule1ModuleRoots(CNavigationView& tree, CGlobalKvs& model) {
   const auto* found =
       std::ranges::find(kModuleRoots, model.moduleSelection->simulationType, &ModuleRoots::code);
   if (found == std::end(kModuleRoots)) return;
@@ -201,11 +204,11 @@ void ruleModule(CNavigationView& tree, CGlobalKvs& model) {
   for (const std::int32_t root : {3, 6, 5, 8, 7}) tree.Show(root, root == found->ownRoot);
 }
 
-void ruleHotStart(CNavigationView& tree, CGlobalKvs& model) {
+void rule2HotStart(CNavigationView& tree, CGlobalKvs& model) {
   showAll(tree, model.bathymetry->hotStart == 0, {26, 43});
 }
 
-void ruleMassBudget(CNavigationView& tree, CGlobalKvs& model) {
+void rule11MassBudget(CNavigationView& tree, CGlobalKvs& model) {
   constexpr std::array kModules{module::kAdvectionDispersion, module::kMudTransportExpanded,
                                 module::kEcological};
   const CModuleSelectionKvs& selection = *model.moduleSelection;
@@ -214,13 +217,13 @@ void ruleMassBudget(CNavigationView& tree, CGlobalKvs& model) {
   showAll(tree, transports && budgeted && model.massBudget->GetCount() > 0, {21, 76, 119});
 }
 
-void ruleSliding(CNavigationView& tree, CGlobalKvs& model) {
-  tree.Show(83, model.bathymetry->GetCount() >= 2);
+void rule20Sliding(CNavigationView& tree, CGlobalKvs& model) {
+  tree.Show(83, model.bathymetry->GetCount() < 2);
 }
 
 // In this order. Nothing is remembered between runs.
-constexpr void (*kRules[])(CNavigationView&, CGlobalKvs&) = {ruleModule, ruleHotStart, ruleMassBudget,
-                                                             ruleSliding};
+constexpr void (*kRules[])(CNavigationView&, CGlobalKvs&) = {rule1ModuleRoots, rule2HotStart,
+                                                             rule11MassBudget, rule20Sliding};
 
 }  // namespace
 

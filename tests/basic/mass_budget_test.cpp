@@ -42,10 +42,12 @@ TEST_F(MassBudget, ANewPolygonGoesRoundTheInsideOfArea1) {
 TEST_F(MassBudget, IsWrittenInFileOrder) {
   list.SetNoPolygons(1);
   list.GetItem(1)->corners = {{1, 2}, {3, 4}};
-  EXPECT_EQ(savedText(list), std::string("MASS_BUDGET {\n    NoOfPolygons ") +
-                                 (theEdition.wetlandSweepKit ? "0" : "1") +
-                                 "\n    POLYGON_1 {\n        AssociatedArea 1\n        NoOfCornerPoints 2\n"
-                                 "        CornerPoint_1 1 2\n        CornerPoint_2 3 4\n    }\n}\n");
+  EXPECT_EQ(savedText(list),
+            theEdition.wetlandSweepKit
+                ? "MASS_BUDGET {\n    NoOfPolygons 0\n}\n"
+                : "MASS_BUDGET {\n    NoOfPolygons 1\n    POLYGON_1 {\n        AssociatedArea 1\n"
+                  "        NoOfCornerPoints 2\n        CornerPoint_1 1 2\n"
+                  "        CornerPoint_2 3 4\n    }\n}\n");
 }
 
 TEST_F(MassBudget, IsReadOrEmptied) {
@@ -72,7 +74,9 @@ TEST_F(MassBudget, IsReadOrEmptied) {
 TEST(MassBudgetItem, ACornerCountIsBelievedAsFarAsThereAreKeywords) {
   CMassBudgetItemKvs polygon(nullptr);
   load(polygon, "NoOfCornerPoints 2147483647\nCornerPoint_1 5 6\n");
-  EXPECT_EQ(polygon.corners, (Corners{{5, 6}, {0, 0}}));
+  EXPECT_EQ(polygon.corners, (Corners{{5, 6}}));
+  load(polygon, "NoOfCornerPoints 3\nCornerPoint_1 5 6\nCornerPoint_3 7 8\n");
+  EXPECT_EQ(polygon.corners, (Corners{{5, 6}, {7, 8}}));
   load(polygon, "NoOfCornerPoints -1\nCornerPoint_1 5 6\n");
   EXPECT_TRUE(polygon.corners.empty());
 }

@@ -140,7 +140,8 @@ TEST(SourceSink, TheCountAndTheTextThatSpeaksOfAnother) {
   CSourceSinkKvs& list = *model.root.sourceSink;
   list.SetNoSources(1024);
   EXPECT_TRUE(test::messagesOf(list, 0).empty());
-  list.SetNoSources(1025);
+  load(list, "SOURCE_AND_SINK { Number_Of_Sources 1025 }");
+  EXPECT_EQ(list.GetCount(), 1025);
   EXPECT_EQ(test::messagesOf(list, 0),
             (ValidationList{{PageId::bathymetry, "Number of source/sinks should be between 0 and 256",
                              Severity::dependedUpon}}));

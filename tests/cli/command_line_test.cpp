@@ -214,6 +214,40 @@ TEST_F(Tool, SetsEveryKindOfValue) {
   EXPECT_EQ(get(globals + "BATHYMETRY_SELECTION/Projection"), "UTM-32\n");
 }
 
+TEST_F(Tool, AHundredSettingsAreOneLoadAndOneSave) {
+  makeSetup();
+  std::vector<std::string> words{"set", setup, "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/Number_Of_Sources=100"};
+  for (int n = 1; n <= 100; ++n) {
+    words.push_back("NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/SOURCE_SINK_" + std::to_string(n) +
+                    "/Source_Point=" + std::to_string(n) + ",2");
+  }
+  const ProgramRun run = runTool(words);
+  ASSERT_EQ(run.status, 0) << run.err;
+  EXPECT_EQ(get("NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/SOURCE_SINK_100/Source_Point"), "100 2\n");
+  words.push_back("NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/SOURCE_SINK_101/Type=1");
+  words[2] = "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.5";
+  EXPECT_EQ(runTool(words).status, 2);
+  EXPECT_EQ(get("NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth"), "0.02\n");
+}
+
+TEST_F(Tool, SettingsLeaveTheOptionsOfASectionAtTheTopAlone) {
+  const std::string path = folder.write(
+      "x.v27",
+      "VANE27_NESTED_MODEL {\nNESTED_MODEL_GLOBALS {\nMODULE_SELECTION {\nSimulation_Type 8\n}\n}\n"
+      "XENOBIOTIC_MODULE {\nOPTION_PARAMETERS {\nTop 7\n}\n}\n}\n");
+  const ProgramRun run = runTool({"set", path, "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.01",
+                                  "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Flooding_Depth=0.3"});
+  ASSERT_EQ(run.status, 0) << run.err;
+  if (theEdition.wetlandSweepKit) {
+    EXPECT_THAT(run.err, HasSubstr("XENOBIOTIC_MODULE"));
+    return;
+  }
+  EXPECT_THAT(run.err, IsEmpty());
+  EXPECT_EQ(
+      runTool({"get", path, "MUD_TRANSPORT_EXPANDED_MODULE/XENOBIOTIC_MODULE/OPTION_PARAMETERS/Top"}).out,
+      "7\n");
+}
+
 TEST_F(Tool, ANewCountIsASetting) {
   makeSetup();
   const ProgramRun run = runTool({"set", setup, "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/Number_Of_Sources=2",

@@ -101,10 +101,14 @@ TEST_F(NavigationTree, MassBudgetPagesNeedModuleSchemeAndPolygon) {
   EXPECT_FALSE(tree.IsShown(21));
 }
 
-TEST_F(NavigationTree, ExpandedSlidingNeedsTwoAreas) {
+TEST_F(NavigationTree, ExpandedSlidingIsForOneArea) {
   rootsWith(8);
-  EXPECT_FALSE(tree.IsVisible(83));
+  EXPECT_TRUE(tree.IsVisible(83));
+  EXPECT_FALSE(tree.IsShown(8));
   model.root.bathymetry->SetNoAreas(2);
+  tree.OnUpdate(&model.root);
+  EXPECT_FALSE(tree.IsVisible(83));
+  model.root.bathymetry->SetNoAreas(1);
   tree.OnUpdate(&model.root);
   EXPECT_TRUE(tree.IsVisible(83));
 }
