@@ -124,7 +124,7 @@ TEST(State, WhatIsWrittenIsReadButForWhatIsToldOtherwise) {
   EXPECT_EQ(read.steps, 5);
   EXPECT_EQ(read.isOn, 0);
   EXPECT_EQ(read.points, std::vector<double>{3});
-  EXPECT_EQ(read.depth, 9) << "the condition is asked when its turn comes, behind the type";
+  EXPECT_EQ(read.depth, 0.5F) << "the condition is asked when its turn comes, behind the type";
 }
 
 TEST(State, AnExactCopyHasWhatStandsOnNoFile) {
