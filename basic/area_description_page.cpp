@@ -7,29 +7,12 @@
 namespace gridbay {
 
 void CAreaDescriptionDlg::DoDataExchange(Form& form) {
-  const auto changed = [this] { UpdateDoc(); };
-  form.DDX_Check("Enable flooding and drying", enable_).Hidden();
-  form.DDX_VDedit("Drying depth:", dryingDepth_, item::kFloodDepth).Changed(changed);
-  form.DDX_VDedit("Flooding depth:", floodingDepth_, item::kFloodDepth).Changed(changed);
-}
-
-void CAreaDescriptionDlg::SetData() {
-  const CAreaDescriptionKvs& area = *parts<BasicParts>().areaDescription;
-  enable_ = area.enableFloodAndDryChecking;
-  dryingDepth_ = area.dryingDepth;
-  floodingDepth_ = area.floodingDepth;
-  form().of(&dryingDepth_).enabled = enable_ != 0;
-  form().of(&floodingDepth_).enabled = enable_ != 0;
-  UpdateData(false);
-}
-
-int CAreaDescriptionDlg::GetData() {
-  if (!UpdateData(true)) return 0;
-  CAreaDescriptionKvs& area = *parts<BasicParts>().areaDescription;
-  area.enableFloodAndDryChecking = enable_;
-  area.dryingDepth = dryingDepth_;
-  area.floodingDepth = floodingDepth_;
-  return 1;
+  using Area = CAreaDescriptionKvs;
+  const auto area = objectOf(&BasicParts::areaDescription);
+  const auto isOn = [area] { return area().enableFloodAndDryChecking != 0; };
+  form.Check("Enable flooding and drying", area, &Area::enableFloodAndDryChecking).Hidden();
+  form.Number("Drying depth:", area, &Area::dryingDepth, item::kFloodDepth).EnabledIf(isOn);
+  form.Number("Flooding depth:", area, &Area::floodingDepth, item::kFloodDepth).EnabledIf(isOn);
 }
 
 }  // namespace gridbay

@@ -6,192 +6,115 @@
 #include "basic/boundary.h"
 #include "basic/page_texts.h"
 #include "core/edition.h"
-#include "pages/cell_controls.h"
-#include "platform/files/paths.h"
 
 namespace gridbay {
-namespace {
 
-constexpr const char* kOverlandEdit = "Edit";
-constexpr const char* kOverlandBrowse = "...";
-
-}  // namespace
-
-CBathymetryObjectKvs& CBathymetryGrid::area(int number) {
-  return *parts<BasicParts>().bathymetry->GetArea(number);
+void CBathymetryGrid::LayOut() {
+  using Area = CBathymetryObjectKvs;
+  const auto area = RowsOf(&BasicParts::bathymetry);
+  const auto inner = [area](GridRow row) { return row.item == 1 ? nullptr : area(row); };
+  const auto isFixed = [this](GridRow row) {
+    return row.item == 1 || parts<BasicParts>().bathymetry->hotStart == 1;
+  };
+  FileChoice file =
+      fileOf(area, &Area::fileName, FileKind{texts::mapExtension.format, texts::bathymetryFilter.format},
+             [this](CVdFileSelectorDlg& selector, GridRow) {
+               RequestBathymetry(selector, parts<BasicParts>().bathymetry->hotStart == 1);
+             });
+  file.changed = [this](GridRow row) { OnFileChanged(row); };
+  file.chosen = [this](GridRow row) {
+    if (row == 1) parts<BasicParts>().bathymetry->projectionStale = true;
+  };
+  FileName("Bathymetry", 210, file);
+  Browse(texts::browse.format, 30, file);
+  // Blank for Area 1, which lies in none.
+  Point("Origin", 60, inner, &Area::origin).Right().ReadOnlyIf(isFixed).EnabledIf({});
+  PlainInteger("Enclosing Area", 100, inner, &Area::enclosingArea).Right().ReadOnlyIf(isFixed).EnabledIf({});
+  View(texts::view.format, 45, file);
 }
 
-void CBathymetryGrid::Initialize() {
-  CVdDoc::EnableGXMultiToolTips(*this, 1);
-  const auto isOutermost = [](int n) { return n == 1; };
-  const auto placeIsFixed = [this](int n) { return n == 1 || parts<BasicParts>().bathymetry->hotStart == 1; };
-  SetColumns(30,
-             {{.header = "Bathymetry",
-               .width = 210,
-               .get = [this](int n) { return area(n).fileName.text(); },
-               .set =
-                   [this](int n, std::string_view text) {
-                     area(n).fileName.Set(text, page().document().path());
-                     OnFileChanged(n);
-                     return true;
-                   }},
-              {.header = "",
-               .width = 30,
-               .kind = CellKind::button,
-               .press = [this](int n) { ChooseFile(n); },
-               .choices = {std::string(texts::browse.format)}},
-              {.header = "Origin",
-               .width = 60,
-               .align = CellAlign::right,
-               .get = [this, isOutermost](int n) { return isOutermost(n) ? "" : pointText(area(n).origin); },
-               .set =
-                   [this](int n, std::string_view text) {
-                     const std::optional<GridPoint> typed = pointOfText(text);
-                     if (typed) area(n).origin = *typed;
-                     return typed.has_value();
-                   },
-               .readOnly = placeIsFixed},
-              {.header = "Enclosing Area",
-               .width = 100,
-               .align = CellAlign::right,
-               .get = [this, isOutermost](
-                          int n) { return isOutermost(n) ? "" : std::to_string(area(n).enclosingArea); },
-               .set =
-                   [this](int n, std::string_view text) {
-                     area(n).enclosingArea = plainInteger(text);
-                     return true;
-                   },
-               .readOnly = placeIsFixed},
-              {.header = "",
-               .width = 45,
-               .kind = CellKind::button,
-               .enabled = [this](int n) { return isReadableFile(area(n).fileName.absolute()); },
-               .press = [this](int n) { page().document().host().openFile(area(n).fileName.absolute()); },
-               .choices = {std::string(texts::view.format)}}});
-}
-
-int CBathymetryGrid::ItemCount() {
-  return parts<BasicParts>().bathymetry->GetCount();
-}
-
-// Another grid for Area 1 makes boundaries that were detected worthless.
+// Another grid for Area 1 brings its projection, and makes boundaries that were detected worthless.
 void CBathymetryGrid::OnFileChanged(int row) {
+  if (row != 1) return;
+  CBathymetryKvs& areas = *parts<BasicParts>().bathymetry;
+  std::string name;
+  double easting = 0;
+  double northing = 0;
+  if (areas.GetGeoReference(&name, &easting, &northing) == 1) areas.projectionStale = true;
   CBoundaryKvs& boundaries = *parts<BasicParts>().boundary;
-  if (row != 1 || boundaries.defaultPosition == 0) return;
+  if (boundaries.defaultPosition == 0) return;
   const bool ask = boundaries.GetCount() > 0;
-  if (!ask || page().document().host().askYesNo(formatted(texts::recalculateBoundaries)))
+  if (!ask || document().host().askYesNo(formatted(texts::recalculateBoundaries)))
     boundaries.RecalculateBoundaries();
 }
 
-void CBathymetryGrid::ChooseFile(int row) {
-  CVdFileSelectorDlg selector(texts::mapExtension.format, area(row).fileName.text(),
-                              texts::bathymetryFilter.format);
-  RequestBathymetry(selector, parts<BasicParts>().bathymetry->hotStart == 1);
-  selector.SetChooser(&page().document().host());
-  if (selector.DoModal() != 1) return;
-  area(row).fileName.Set(selector.fileName(), page().document().path());
-  OnFileChanged(row);
-  if (row == 1) parts<BasicParts>().bathymetry->projectionStale = true;
-  UpdateDoc();
-  if (row == 1) page().SetData();
-}
-
 void CBathymetryDlg::DoDataExchange(Form& form) {
-  const auto changed = [this] {
-    UpdateDoc();
-    EnableControls();
-  };
-  form.DDX_Radio("Type", {"Cold start", "Hot start"}, type_).Changed(changed);
-  AddCount(form, "Number of areas", number_, CBathymetryKvs::kMostAreas,
-           [this] { return parts<BasicParts>().bathymetry->GetCount(); });
-  form.DDX_CBIndex("Map projection:", {}, projection_).Changed(changed);
-  form.DDX_Check("Apply Coriolis forcing:", coriolis_).Changed(changed);
-  form.DDX_Check("Landslides:", landSlides_).Changed(changed);
-  form.DDX_Check("Multi-cell overland solver for inland applications:            ", overlandSolver_)
-      .Changed(changed);
-  form.DDX_Text(texts::fineBathymetryFile.format, overlandFile_).Changed([this] { UpdateDoc(); });
-  form.Button(kOverlandBrowse, [this] { ChooseOverlandFile(); });
-  form.Button(kOverlandEdit, [this] {
-    const std::string path = parts<BasicParts>().bathymetry->overlandFile.absolute();
-    if (isReadableFile(path)) document().host().openFile(path);
-  });
-  form.DDX_Control("Areas", grid_);
-}
+  using Areas = CBathymetryKvs;
+  const auto areas = objectOf(&BasicParts::bathymetry);
+  const auto isShown = [] { return !theEdition.wetlandSweepKit; };
+  const auto isOverland = [areas] { return areas().overlandSolver; };
+  const auto isNotOverland = [areas] { return !areas().overlandSolver; };
+  const Binding<std::int32_t> coriolis{
+      .get = [this, areas] { return hasProjection_ && areas().coriolis ? 1 : 0; },
+      .set = [areas](std::int32_t on) { areas().coriolis = on != 0; }};
 
-int CBathymetryDlg::Initialize() {
-  SetUpGrid("Areas");
-  return 1;
+  form.Radio("Type", Choices::numbered({"Cold start", "Hot start"}), areas, &Areas::hotStart);
+  form.Count("Number of areas", countOf(areas), Areas::kMostAreas)
+      .VisibleIf(isShown)
+      .EnabledIf(isNotOverland);
+  form.TextList(
+          "Map projection:", [this] { return projections_; }, memberOf(areas, &Areas::projection))
+      .EnabledIf([this] { return hasProjection_; });
+  form.Check("Apply Coriolis forcing:", coriolis).VisibleIf(isShown).EnabledIf([this, isNotOverland] {
+    return hasProjection_ && isNotOverland();
+  });
+  form.Check("Landslides:", areas, &Areas::landSlides).VisibleIf(isShown).EnabledIf(isNotOverland);
+  form.Check("Multi-cell overland solver for inland applications:            ", areas,
+             &Areas::overlandSolver);
+  AddFile(form, texts::fineBathymetryFile.format, overlandFile(), "...", "Edit")
+      .VisibleIf(isOverland)
+      .view.EnabledIf({});
+  form.Grid("Areas", grid_);
 }
 
 void CBathymetryDlg::SetData() {
-  FillProjections();
-  const CBathymetryKvs& areas = *parts<BasicParts>().bathymetry;
-  type_ = areas.hotStart;
-  number_ = areas.GetCount();
-  coriolis_ = hasProjection_ && areas.coriolis ? 1 : 0;
-  landSlides_ = areas.landSlides ? 1 : 0;
-  overlandSolver_ = areas.overlandSolver ? 1 : 0;
-  overlandFile_ = areas.overlandFile.text();
-  UpdateData(false);
-  EnableControls();
-}
-
-int CBathymetryDlg::GetData() {
-  if (!UpdateData(true)) return 0;
-  CBathymetryKvs& areas = *parts<BasicParts>().bathymetry;
-  areas.hotStart = type_;
-  if (number_ >= 0 && number_ <= CBathymetryKvs::kMostAreas && number_ != areas.GetCount())
-    areas.SetNoAreas(number_);
-  if (hasProjection_ && projection_ >= 0)
-    areas.projection = projections_[static_cast<std::size_t>(projection_)];
-  if (hasProjection_) areas.coriolis = coriolis_ != 0;
-  areas.landSlides = landSlides_ != 0;
-  areas.overlandSolver = overlandSolver_ != 0;
-  if (overlandFile_ != areas.overlandFile.text()) areas.overlandFile.Set(overlandFile_, document().path());
-  return 1;
-}
-
-// The projection that holds, and those that can be picked in its place.
-void CBathymetryDlg::FillProjections() {
   std::string held;
   int flag = 0;
   hasProjection_ = parts<BasicParts>().bathymetry->GetProjection(&held, &flag) == 1;
   CVdMapProjectionGXComboBox list;
   list.UpdateMapProjection(held);
   projections_ = list.choices();
-  form().of(&projection_).choices = projections_;
-  projection_ = 0;
+  CV27SetupFormView::SetData();
 }
 
-void CBathymetryDlg::EnableControls() {
-  const bool sweep = theEdition.wetlandSweepKit;
-  const bool overland = overlandSolver_ != 0;
-  form().of(&number_).visible = !sweep;
-  form().of(&coriolis_).visible = !sweep;
-  form().of(&landSlides_).visible = !sweep;
-  form().of(&number_).enabled = !overland;
-  form().of(&projection_).enabled = hasProjection_;
-  form().of(&coriolis_).enabled = hasProjection_ && !overland;
-  form().of(&landSlides_).enabled = !overland;
-  form().of(&overlandFile_).visible = overland;
-  form().find(kOverlandBrowse)->visible = overland;
-  form().find(kOverlandEdit)->visible = overland;
+// Area 1 as its file has it, beside the model, which is not changed by a look; null when the file can't be
+// read. Any number but 1 leaves the simulation period alone.
+std::unique_ptr<CBathymetryObjectKvs> CBathymetryDlg::readArea1() {
+  constexpr int kNotArea1 = 0;
+  CBathymetryObjectKvs* area = parts<BasicParts>().bathymetry->GetArea(1);
+  if (area == nullptr) return nullptr;
+  auto seen = std::make_unique<CBathymetryObjectKvs>(area->GetParent());
+  seen->CopyFrom(*area);
+  ValidationList dropped;
+  return seen->ReadGrid(dropped, kNotArea1) == 0 ? std::move(seen) : nullptr;
 }
 
 // The fine grid is held against Area 1, and so comes after it.
-void CBathymetryDlg::ChooseOverlandFile() {
-  CBathymetryObjectKvs* area = parts<BasicParts>().bathymetry->GetArea(1);
-  ValidationList dropped;
-  if (area == nullptr || area->ReadGrid(dropped, 1) != 0) {
-    document().host().show(formatted(texts::area1First));
-    return;
-  }
-  CVdFileSelectorDlg selector(texts::mapExtension.format, overlandFile_, texts::fineBathymetryFilter.format);
-  selector.AddRequest(std::make_unique<COverlandRqTsbItem>(*area));
-  selector.SetChooser(&document().host());
-  if (selector.DoModal() != 1) return;
-  form().of(&overlandFile_).text = selector.fileName();
-  UpdateDoc();
+FileChoice CBathymetryDlg::overlandFile() {
+  const auto area1 = std::make_shared<std::unique_ptr<CBathymetryObjectKvs>>();
+  FileChoice file = fileOf([areas = objectOf(&BasicParts::bathymetry)](GridRow) { return &areas(); },
+                           &CBathymetryKvs::overlandFile,
+                           FileKind{texts::mapExtension.format, texts::fineBathymetryFilter.format},
+                           [area1](CVdFileSelectorDlg& selector, GridRow) {
+                             selector.SetSelectedItems({1});
+                             selector.AddRequest(std::make_unique<COverlandRqTsbItem>(**area1));
+                           });
+  file.ready = [this, area1](GridRow) {
+    *area1 = readArea1();
+    if (*area1 == nullptr) document().host().show(formatted(texts::area1First));
+    return *area1 != nullptr;
+  };
+  return file;
 }
 
 }  // namespace gridbay

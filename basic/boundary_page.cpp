@@ -7,61 +7,35 @@ namespace gridbay {
 namespace {
 
 constexpr std::int32_t kUserSpecified = 0;
-constexpr std::int32_t kProgramDetected = 1;
 
 }  // namespace
 
-void CBoundaryGrid::Initialize() {
+void CBoundaryGrid::LayOut() {
   constexpr int kWidth = 90;
-  const auto pointColumn = [this](const char* header, GridPoint CBoundaryObjectKvs::*point) {
-    Column column = PointColumn(header, kWidth, [this, point](int n) -> GridPoint& {
-      return parts<BasicParts>().boundary->GetItem(n)->*point;
-    });
-    column.align = CellAlign::right;
-    column.readOnly = [this](int) { return parts<BasicParts>().boundary->defaultPosition != kUserSpecified; };
-    return column;
+  const auto boundary = RowsOf(&BasicParts::boundary);
+  const auto isDetected = [this](GridRow) {
+    return parts<BasicParts>().boundary->defaultPosition != kUserSpecified;
   };
-  SetColumns(30, {pointColumn("First point", &CBoundaryObjectKvs::first),
-                  pointColumn("Last point", &CBoundaryObjectKvs::last)});
-}
-
-int CBoundaryGrid::ItemCount() {
-  return parts<BasicParts>().boundary->GetCount();
+  Point("First point", kWidth, boundary, &CBoundaryObjectKvs::first).Right().ReadOnlyIf(isDetected);
+  Point("Last point", kWidth, boundary, &CBoundaryObjectKvs::last).Right().ReadOnlyIf(isDetected);
 }
 
 void CBoundaryDlg::DoDataExchange(Form& form) {
-  form.DDX_Radio("Default position", {"User specified", "Program detected"}, position_).Changed([this] {
-    UpdateDoc();
-    SetData();
-  });
-  AddCount(form, "Number of boundaries", number_, CBoundaryKvs::kMostOnPage,
-           [this] { return parts<BasicParts>().boundary->GetCount(); });
-  form.DDX_Control("Boundaries", grid_);
-}
-
-int CBoundaryDlg::Initialize() {
-  SetUpGrid("Boundaries");
-  return 1;
-}
-
-void CBoundaryDlg::SetData() {
-  const CBoundaryKvs& boundaries = *parts<BasicParts>().boundary;
-  position_ = boundaries.defaultPosition;
-  number_ = boundaries.GetCount();
-  form().of(&number_).enabled = position_ != kProgramDetected;
-  UpdateData(false);
-}
-
-int CBoundaryDlg::GetData() {
-  if (!UpdateData(true)) return 0;
-  CBoundaryKvs& boundaries = *parts<BasicParts>().boundary;
-  boundaries.defaultPosition = position_;
-  if (position_ != kUserSpecified) {
-    boundaries.RecalculateBoundaries();
-  } else if (number_ >= 0 && number_ <= CBoundaryKvs::kMostOnPage) {
-    boundaries.SetNoBoundaries(number_);
-  }
-  return 1;
+  const auto list = objectOf(&BasicParts::boundary);
+  const auto isGiven = [list] { return list().defaultPosition == kUserSpecified; };
+  const auto setPosition = [=](std::int32_t position) {
+    list().defaultPosition = position;
+    if (!isGiven()) list().RecalculateBoundaries();
+  };
+  const auto setCount = [=](std::int32_t count) {
+    if (isGiven()) list().SetNoBoundaries(count);
+  };
+  form.Radio("Default position", Choices::numbered({"User specified", "Program detected"}),
+             {.get = [=] { return list().defaultPosition; }, .set = setPosition});
+  form.Count("Number of boundaries", {.get = [=] { return list().GetCount(); }, .set = setCount},
+             CBoundaryKvs::kMostOnPage)
+      .EnabledIf(isGiven);
+  form.Grid("Boundaries", grid_);
 }
 
 }  // namespace gridbay

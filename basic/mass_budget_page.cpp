@@ -2,108 +2,78 @@
 
 #include <fmt/format.h>
 
-#include <cstdio>
+#include <algorithm>
 
+#include "basic/basic_parts.h"
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
+#include "pages/scan.h"
 
 namespace gridbay {
 namespace {
 
-constexpr int kAreaRow = 1;
-constexpr int kCountRow = 2;
+constexpr int kRowsAbove = 2;  // the area and the number of corners
 constexpr int kMostCorners = 32767;
+
+// Whether the model's module and scheme have a mass budget.
+bool isAvailable(const CModuleSelectionKvs& selection) {
+  const std::int32_t code = selection.simulationType;
+  const bool isTransport = code == module::kAdvectionDispersion || code == module::kMudTransportExpanded ||
+                           code == module::kEcological;
+  return isTransport && (selection.adScheme == 1 || selection.adScheme == -1);
+}
 
 }  // namespace
 
 int CMassBudgetGrid::GetColCount() {
-  return CMassBudgetDlg::IsAvailable(parts<BasicParts>()) ? parts<BasicParts>().massBudget->GetCount() : 0;
+  return isAvailable(*parts<BasicParts>().moduleSelection) ? parts<BasicParts>().massBudget->GetCount() : 0;
 }
 int CMassBudgetGrid::GetRowCount() {
-  return kCountRow + (GetColCount() == 0 ? 0 : parts<BasicParts>().massBudget->GetMaxCorners());
+  return kRowsAbove + (GetColCount() == 0 ? 0 : parts<BasicParts>().massBudget->GetMaxCorners());
 }
 
 std::string CMassBudgetGrid::GetRowHeader(int row) {
-  if (row == kAreaRow) return "Associated area";
-  return row == kCountRow ? "No. of corner points" : fmt::format("Corner point {}", row - kCountRow);
-}
-
-int CMassBudgetGrid::GetColWidth(int col) {
-  constexpr int kHeaderWidth = 130;
-  constexpr int kWidth = 70;
-  return col == 0 ? kHeaderWidth : kWidth;
-}
-
-bool CMassBudgetGrid::styleOf(int row, int col, CellStyle& style) {
-  const CMassBudgetItemKvs* polygon = parts<BasicParts>().massBudget->GetItem(col);
-  if (polygon == nullptr) return false;
-  const auto corner = static_cast<std::size_t>(row - kCountRow - 1);
-  if (row == kAreaRow) {
-    style.value = std::to_string(polygon->associatedArea);
-  } else if (row == kCountRow) {
-    style.value = std::to_string(polygon->corners.size());
-  } else if (corner < polygon->corners.size()) {
-    style.value = fmt::format("{},{}", polygon->corners[corner].j, polygon->corners[corner].k);
-  } else {
-    SetDisabled(style);
-  }
-  return true;
-}
-
-bool CMassBudgetGrid::storeCell(int row, int col, std::string_view text) {
-  CMassBudgetItemKvs& polygon = *parts<BasicParts>().massBudget->GetItem(col);
-  const std::string typed(text);
-  GridPoint point;
-  int number = 0;
-  if (row > kCountRow) {
-    if (std::sscanf(typed.c_str(), "%d,%d", &point.j, &point.k) != 2) return false;
-    polygon.corners[static_cast<std::size_t>(row - kCountRow - 1)] = point;
-    return true;
-  }
-  if (std::sscanf(typed.c_str(), "%d", &number) != 1) return false;
-  if (row == kAreaRow) {
-    polygon.associatedArea = number;
-    return true;
-  }
-  if (number < 0 || number > kMostCorners) return false;
-  polygon.corners.resize(static_cast<std::size_t>(number), {1, 1});
-  return true;
+  if (row <= kRowsAbove) return row == 1 ? "Associated area" : "No. of corner points";
+  return fmt::format("Corner point {}", row - kRowsAbove);
 }
 
 std::string CMassBudgetGrid::editName(int row, int col) {
   return fmt::format("Polygon {}, {}", col, GetRowHeader(row));
 }
 
-bool CMassBudgetDlg::IsAvailable(BasicParts& basic) {
-  const std::int32_t code = basic.moduleSelection->simulationType;
-  const std::int32_t scheme = basic.moduleSelection->adScheme;
-  return (code == module::kAdvectionDispersion || code == module::kMudTransportExpanded ||
-          code == module::kEcological) &&
-         (scheme == 1 || scheme == -1);
+// One cell for each of the two rows above, and one for all corners.
+void CMassBudgetGrid::LayOut() {
+  const auto polygon = itemOf(&BasicParts::massBudget);
+  const auto corner = [polygon](GridRow at) -> GridPoint* {
+    auto& corners = polygon(at)->corners;
+    const auto place = static_cast<std::size_t>(at.sub) - 1;
+    return place < corners.size() ? &corners[place] : nullptr;
+  };
+  const auto setCount = [polygon](GridRow at, std::string_view text) {
+    const std::optional<std::int32_t> number = scannedInteger(text);
+    if (!number || *number < 0 || *number > kMostCorners) return Stored::refused;
+    polygon(at)->corners.resize(static_cast<std::size_t>(*number), {1, 1});
+    return Stored::taken;
+  };
+  Integer("", 0, polygon, &CMassBudgetItemKvs::associatedArea);
+  Add({.get = [polygon](GridRow at) { return std::to_string(polygon(at)->corners.size()); },
+       .set = setCount});
+  Column& corners = Point("", 0, corner);
+  corners.get = [corner](GridRow at) {
+    const GridPoint* point = corner(at);
+    return point == nullptr ? std::string() : fmt::format("{},{}", point->j, point->k);
+  };
+}
+
+CellGrid::Place CMassBudgetGrid::placeOf(int row, int col) {
+  const std::size_t cell = std::min<std::size_t>(static_cast<std::size_t>(row) - 1, kRowsAbove);
+  return {&lines().front()[cell], {col, row - kRowsAbove}};
 }
 
 void CMassBudgetDlg::DoDataExchange(Form& form) {
-  AddCount(form, "&Number of polygons:", number_, CMassBudgetKvs::kMostOnPage,
-           [this] { return parts<BasicParts>().massBudget->GetCount(); });
-  form.DDX_Control("Polygons", grid_);
-}
-
-int CMassBudgetDlg::Initialize() {
-  SetUpGrid("Polygons");
-  return 1;
-}
-
-void CMassBudgetDlg::SetData() {
-  number_ = parts<BasicParts>().massBudget->GetCount();
-  form().of(&number_).enabled = IsAvailable(parts<BasicParts>());
-  UpdateData(false);
-}
-
-int CMassBudgetDlg::GetData() {
-  if (!UpdateData(true)) return 0;
-  if (number_ >= 0 && number_ <= CMassBudgetKvs::kMostOnPage)
-    parts<BasicParts>().massBudget->SetNoPolygons(number_);
-  return 1;
+  form.Count("&Number of polygons:", countOf(objectOf(&BasicParts::massBudget)), CMassBudgetKvs::kMostOnPage)
+      .EnabledIf([selection = objectOf(&BasicParts::moduleSelection)] { return isAvailable(selection()); });
+  form.Grid("Polygons", grid_);
 }
 
 }  // namespace gridbay

@@ -1,44 +1,29 @@
 #pragma once
 
-#include <cstdint>
-
-#include "basic/basic_parts.h"
-#include "pages/form_view.h"
-#include "pages/grid_wnd.h"
+#include "pages/cell_grid.h"
 
 namespace gridbay {
 
 // One column for each polygon: its area, its number of corners, and the corners below.
-class CMassBudgetGrid final : public CV27SetupGridWnd {
+class CMassBudgetGrid final : public CellGrid {
  public:
   int GetRowCount() override;
   int GetColCount() override;
   std::string GetColHeader(int col) override { return col == 0 ? "Polygon" : std::to_string(col); }
   std::string GetRowHeader(int row) override;
-  int GetColWidth(int col) override;
+  int GetColWidth(int col) override { return col == 0 ? 130 : 70; }
 
- protected:
-  bool styleOf(int row, int col, CellStyle& style) override;
-  bool storeCell(int row, int col, std::string_view text) override;
+ private:
+  void LayOut() override;
+  Place placeOf(int row, int col) override;
   std::string editName(int row, int col) override;
 };
 
 // The polygons of the mass budget, for a transport module with one of two schemes.
-class CMassBudgetDlg final : public CV27SetupFormView {
- public:
-  explicit CMassBudgetDlg(CVdDoc& document) : CV27SetupFormView(document, 18715, PageId::massBudget) {}
-
-  int GetData() override;
-  void SetData() override;
-  // Whether the model's module and scheme have a mass budget.
-  static bool IsAvailable(BasicParts& basic);
-
- protected:
+class CMassBudgetDlg final : public Page<18715, PageId::massBudget> {
+  using Page::Page;
   void DoDataExchange(Form& form) override;
-  int Initialize() override;
 
- private:
-  std::int32_t number_ = 0;
   CMassBudgetGrid grid_;
 };
 

@@ -10,79 +10,47 @@
 namespace gridbay {
 
 void CSimulationPeriodDlg::DoDataExchange(Form& form) {
-  const auto periodChanged = [this] {
-    if (UpdateDoc() != 0) ShowEnd();
+  using Period = CSimulationPeriodKvs;
+  const auto period = objectOf(&BasicParts::simulationPeriod);
+  const auto isHot = [areas = objectOf(&BasicParts::bathymetry)] { return areas().hotStart != 0; };
+  const auto isCold = [isHot] { return !isHot(); };
+  const auto range = [&form](const Binding<std::int32_t>& last) -> Control& {
+    Control* edit = nullptr;
+    form.Group("Time step range:", [&] {
+      form.Shown("First:", [] { return "0"; });
+      edit = &form.Number("Last:", last).Beside();
+    });
+    return *edit;
   };
-  form.Group("Simulation");
-  form.Group("Time step range:");
-  form.Label("First:", first_);
-  form.DDX_Text("Last:", last_).Changed(periodChanged);
-  form.DDX_VDedit("Time step interval:", timeStepInterval_, item::kTimeStep).Changed([this] {
-    if (UpdateDoc() == 0) return;
-    ShowEnd();
-    ShowCourant();
+  form.Group("Simulation", [&] {
+    range(lastOf(memberOf(period, &Period::noPointsInTime)));
+    form.Number("Time step interval:", period, &Period::timeStepInterval, item::kTimeStep).ReadOnlyIf(isHot);
+    form.DateTimeEdit("Simulation start date:", period, &Period::start).EnabledIf(isCold);
+    form.Shown("Simulation end date:", [period] { return dateTimeText(period().End()); }).Disabled();
   });
-  form.DDX_Text("Simulation start date:", startDate_).Changed(periodChanged);
-  form.Label("Simulation end date:", endDate_).enabled = false;
-  form.Group("Warm-up Period");
-  form.Group("Time step range:");
-  form.Label("First:", warmUpFirst_);
-  form.DDX_Text("Last:", warmUpLast_).Changed([this] { UpdateDoc(); });
-  form.Group("Courant Number");
-  form.Label("Max Courant No:", maxCourant_);
-  form.Label("Area:", courantArea_);
+  form.Group("Warm-up Period", [&] { range(memberOf(period, &Period::warmUpPeriod)).EnabledIf(isCold); });
+  form.Group("Courant Number", [&] {
+    form.Shown("Max Courant No:", [this] { return maxCourant_; }).Tip([this] { return unread_; });
+    form.Shown("Area:", [this] { return courantArea_; }).Beside();
+  });
 }
 
 void CSimulationPeriodDlg::SetData() {
-  const CSimulationPeriodKvs& period = *parts<BasicParts>().simulationPeriod;
-  last_ = period.noPointsInTime - 1;
-  timeStepInterval_ = period.timeStepInterval;
-  startDate_ = dateTimeText(period.start);
-  warmUpLast_ = period.warmUpPeriod;
-  UpdateData(false);
-  ShowEnd();
-  ShowCourant();
-  EnableControls();
-}
-
-int CSimulationPeriodDlg::GetData() {
-  const std::optional<DateTime> start = dateTimeOfText(form().of(&startDate_).text);
-  const bool unchanged = form().of(&startDate_).text == startDate_;
-  if (!start && !unchanged) {
-    document().host().show(fmt::format("Simulation start date: \"{}\" is not of the form YYYY-MM-DD hh:mm:ss",
-                                       form().of(&startDate_).text));
-    return 0;
-  }
-  if (!UpdateData(true)) return 0;
-  CSimulationPeriodKvs& period = *parts<BasicParts>().simulationPeriod;
-  period.noPointsInTime = last_ + 1;
-  period.timeStepInterval = timeStepInterval_;
-  if (start && !unchanged) period.start = *start;
-  period.warmUpPeriod = warmUpLast_;
-  return 1;
-}
-
-void CSimulationPeriodDlg::EnableControls() {
-  const bool hotStart = parts<BasicParts>().bathymetry->hotStart != 0;
-  form().of(&timeStepInterval_).readOnly = hotStart;
-  form().of(&startDate_).enabled = !hotStart;
-  form().of(&warmUpLast_).enabled = !hotStart;
-}
-
-void CSimulationPeriodDlg::ShowEnd() {
-  endDate_ = dateTimeText(parts<BasicParts>().simulationPeriod->End());
-  form().of(&endDate_).text = endDate_;
-}
-
-void CSimulationPeriodDlg::ShowCourant() {
+  CBathymetryKvs& areas = *parts<BasicParts>().bathymetry;
   double courant = 0;
   int area = 0;
-  parts<BasicParts>().bathymetry->GetMaxCourant(parts<BasicParts>().simulationPeriod->timeStepInterval,
-                                                &courant, &area);
-  maxCourant_ = fmt::format("{:.6g}", courant);
-  courantArea_ = std::to_string(area);
-  form().of(&maxCourant_).text = maxCourant_;
-  form().of(&courantArea_).text = courantArea_;
+  areas.GetMaxCourant(parts<BasicParts>().simulationPeriod->timeStepInterval, &courant, &area);
+  bool isKnown = false;
+  unread_.clear();
+  for (int number = 1; number <= areas.GetCount(); ++number) {
+    const bool isRead = areas.GetArea(number)->contains(0, 0);
+    isKnown = isKnown || isRead;
+    if (!isRead)
+      unread_ += fmt::format("{} {}", unread_.empty() ? "Not known before a validation: area" : ",", number);
+  }
+  maxCourant_ = isKnown ? fmt::format("{:.6g}", courant) : std::string();
+  courantArea_ = isKnown ? std::to_string(area) : std::string();
+  CV27SetupFormView::SetData();
 }
 
 }  // namespace gridbay

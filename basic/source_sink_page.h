@@ -1,39 +1,19 @@
 #pragma once
 
-#include <cstdint>
-
-#include "pages/form_view.h"
-#include "pages/grid_wnd.h"
+#include "pages/cell_grid.h"
 
 namespace gridbay {
 
 // One row for each source or sink, below a second row of headers.
 class CSourceSinkGrid final : public ColumnGrid {
- public:
-  void Initialize() override;
-  int GetRowCount() override { return ItemCount() + 1; }
-  std::string GetRowHeader(int row) override { return row <= 1 ? "" : std::to_string(row - 1); }
-
- protected:
-  int ItemCount() override;
-  bool styleOf(int row, int col, CellStyle& style) override;
-  bool storeCell(int row, int col, std::string_view text) override;
+  void LayOut() override;
 };
 
 // Where water enters or leaves the model.
-class CSourceSinkDlg final : public CV27SetupFormView {
- public:
-  explicit CSourceSinkDlg(CVdDoc& document) : CV27SetupFormView(document, 18929, PageId::sourceAndSink) {}
-
-  int GetData() override;
-  void SetData() override;
-
- protected:
+class CSourceSinkDlg final : public Page<18929, PageId::sourceAndSink> {
+  using Page::Page;
   void DoDataExchange(Form& form) override;
-  int Initialize() override;
 
- private:
-  std::int32_t number_ = 0;
   CSourceSinkGrid grid_;
 };
 

@@ -1,73 +1,82 @@
 #pragma once
 
+#include <cstdint>
 #include <functional>
 #include <string>
 #include <string_view>
-#include <vector>
 
 #include "core/page_id.h"
+#include "pages/file_choice.h"
 #include "pages/form.h"
+#include "pages/grid_host.h"
 #include "pages/vd_doc.h"
 
 namespace gridbay {
 
-// Base of all form pages. A page holds variables for its controls and nothing else: every edit goes to the
-// model at once, and what another view changes is loaded anew.
-class CV27SetupFormView {
+// The controls of a file: the edit, the button that lets the user choose, and the one that shows the file.
+struct FileField {
+  Control& edit;
+  Control& browse;
+  Control& view;
+
+  FileField& EnabledIf(const Control::Rule& rule);
+  FileField& VisibleIf(const Control::Rule& rule);
+};
+
+// Base of all form pages. A page lists its controls and holds nothing that matters: every edit goes to the
+// model at once, and the model is shown anew after each change of it, whoever made it.
+class CV27SetupFormView : public GridHost {
  public:
   CV27SetupFormView(CVdDoc& document, std::int32_t templateId, PageId pageId);
   CV27SetupFormView(const CV27SetupFormView&) = delete;
   CV27SetupFormView& operator=(const CV27SetupFormView&) = delete;
-  virtual ~CV27SetupFormView();
+  ~CV27SetupFormView() override;
 
-  // Lists the controls, sets up the page and fills it. To be called once, before anything else.
+  // Lists the controls, sets up the page with its grids and fills it. To be called once, before anything
+  // else.
   void OnInitialUpdate();
-  // The model changed elsewhere.
+  // The model has changed.
   virtual void OnUpdate() { SetData(); }
+  // The page is about to be left. Who shows the page calls this before it destroys it.
+  virtual void OnLeave() {}
 
-  // Controls to model: 0 when a control's text is no value, with the model untouched.
-  virtual int GetData() { return 1; }
-  // Model to controls.
-  virtual void SetData() { UpdateData(false); }
+  // Controls to model, by their bindings: 0 when a control's text is no value, with the model untouched.
+  virtual int GetData();
+  // Model to controls, by their bindings, and the enable rule.
+  virtual void SetData();
 
-  // Pushes the page into the model, marks the document as modified and lets the other views know. Nonzero on
-  // success.
-  int UpdateDoc();
-  // Names the edit that is being made, for as long as it is made; empty for that of a control.
-  void SetEditName(std::string name) { editName_ = std::move(name); }
+  // Pushes the page into the model, marks the document as modified, and has all views show it, this page
+  // included. Nonzero on success. While a text is no value nothing is pushed but what the user has just
+  // changed; the text stays in its field.
+  int UpdateDoc() override;
+  void SetEditName(std::string name) override { editName_ = std::move(name); }
+  void Refresh() override;
+  std::string nameOf(const CV27SetupGridWnd& grid) override;
 
-  // The root of the model, and the members that a room has in it.
-  CKvsBase& GetKvs() { return document_.GetKvs(); }
-  template <class Parts>
-  Parts& parts() {
-    return *GetKvs().parts<Parts>();
-  }
-  CVdDoc& document() { return document_; }
+  CVdDoc& document() override { return document_; }
   bool HasBeenTouched(PageId page) const { return document_.HasBeenTouched(page); }
 
   Form& form() { return form_; }
   PageId pageId() const { return pageId_; }
   std::int32_t templateId() const { return templateId_; }
-  // Controls that stretch with the page, to the right and downwards.
-  const std::vector<const Control*>& alignedRight() const { return alignedRight_; }
-  const std::vector<const Control*>& alignedBottom() const { return alignedBottom_; }
 
  protected:
   // The page's controls, in their order.
   virtual void DoDataExchange(Form& form) = 0;
   // Once, when the controls exist.
   virtual int Initialize() { return 1; }
+  // The rules of the controls. A page that has more of them calls this first.
+  virtual void EnableControls() { form_.applyRules(); }
 
   // With true controls to variables, and false when a text is no value; with false variables to controls.
   bool UpdateData(bool save);
-  // The common shape of a count with a spin button: a change of either hands the page over and fills it anew.
-  void AddCount(Form& form, std::string_view label, std::int32_t& variable, int highestSpin,
-                std::function<int()> count);
-  // Binds a grid to the page, runs its set-up and lets it stretch with the page.
-  void SetUpGrid(std::string_view label);
+  // The name of a file with its two buttons beside it.
+  FileField AddFile(Form& form, std::string_view label, FileChoice choice, std::string_view browse = "...",
+                    std::string_view view = "View...");
 
-  void AddAlignRight(const Control& control) { alignedRight_.push_back(&control); }
-  void AddAlignBottom(const Control& control) { alignedBottom_.push_back(&control); }
+  // What is registered stretches with the page, to the right or downwards, and nothing else does.
+  static void AddAlignRight(Control& control) { control.alignRight = true; }
+  static void AddAlignBottom(Control& control) { control.alignBottom = true; }
 
  private:
   CVdDoc& document_;
@@ -75,8 +84,14 @@ class CV27SetupFormView {
   PageId pageId_;
   Form form_;
   std::string editName_;
-  std::vector<const Control*> alignedRight_;
-  std::vector<const Control*> alignedBottom_;
+  bool keepFaults_ = false;
+};
+
+// A page by the numbers of its dialog template and of itself.
+template <std::int32_t dialogTemplate, PageId id>
+class Page : public CV27SetupFormView {
+ public:
+  explicit Page(CVdDoc& document) : CV27SetupFormView(document, dialogTemplate, id) {}
 };
 
 }  // namespace gridbay

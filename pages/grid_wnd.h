@@ -1,14 +1,13 @@
 #pragma once
 
-#include <functional>
 #include <set>
 #include <string>
 #include <string_view>
 #include <vector>
 
-#include "core/grid_point.h"
 #include "pages/cell_controls.h"
 #include "pages/form_view.h"
+#include "pages/grid_host.h"
 
 namespace gridbay {
 
@@ -17,6 +16,9 @@ enum class CellKind { plain, button, dropDown, checkBox, resultFile, mapProjecti
 enum class CellAlign { left, right };
 // Keys that mean something to a cell.
 enum class GridKey { browse /* Ctrl+D */, other };
+// What has become of a text: the model has it; it is none, and the model is as it was; it is none, and yet a
+// part of it is in the model.
+enum class Stored { taken, refused, partly };
 
 // One cell as it is painted: its value and look, taken from the model each time.
 struct CellStyle {
@@ -29,6 +31,7 @@ struct CellStyle {
   bool readOnly = false;
   bool isHeading = false;  // stands over the rows below, across all columns
   bool isHeader = false;   // of a further row of headers
+  bool isGrey = false;     // on a grey ground, though what it shows holds
   int span = 1;            // columns that it covers, to the right
 
   // Whether the cell takes a value at all, and whether a user can type one.
@@ -51,8 +54,11 @@ class CV27SetupGridWnd {
   CV27SetupGridWnd& operator=(const CV27SetupGridWnd&) = delete;
   virtual ~CV27SetupGridWnd() = default;
 
-  void SetParentPage(CV27SetupFormView* page) { page_ = page; }
+  // The page or dialog that the grid stands on.
+  void SetParentPage(GridHost* host) { host_ = host; }
   virtual void Initialize() {}
+  // The model is shown anew.
+  virtual void OnRefresh() {}
 
   virtual int GetRowCount() = 0;
   virtual int GetColCount() = 0;
@@ -65,7 +71,8 @@ class CV27SetupGridWnd {
   virtual int GetHeaderSpan(int) { return 1; }
   virtual RowLook GetRowLook(int) { return {}; }
   // False while the grid as a whole does not apply: it is greyed then, and takes nothing.
-  virtual bool IsEnabled() { return true; }
+  virtual bool IsEnabled() { return enabled_; }
+  void SetEnabled(bool enabled) { enabled_ = enabled; }
   // The current cell has come to another row; 0 for none.
   virtual void OnCurrentRow(int) {}
 
@@ -99,73 +106,33 @@ class CV27SetupGridWnd {
   void SetRebuilding(bool rebuilding) { rebuilding_ = rebuilding; }
 
  protected:
-  CKvsBase& GetKvs() { return page_->GetKvs(); }
+  GridHost& host() { return *host_; }
+  CVdDoc& document() { return host_->document(); }
+  CKvsBase& GetKvs() { return host_->GetKvs(); }
   template <class Parts>
   Parts& parts() {
-    return page_->parts<Parts>();
+    return host_->parts<Parts>();
   }
-  CV27SetupFormView& page() { return *page_; }
-  int UpdateDoc() { return page_->UpdateDoc(); }
+  int UpdateDoc() { return host_->UpdateDoc(); }
   static void SetDisabled(CellStyle& style) { style.enabled = false; }
   static void SetReadOnly(CellStyle& style) { style.readOnly = true; }
 
-  // One cell of the data; false where there is none.
+  // What the operations above ask for a cell that is there. A store gets the trimmed text.
   virtual bool styleOf(int row, int col, CellStyle& style) = 0;
-  // Takes a trimmed text; false when it is no value, with the model untouched.
-  virtual bool storeCell(int row, int col, std::string_view text) = 0;
+  virtual Stored storeCell(int row, int col, std::string_view text) = 0;
   virtual void buttonPressed(int, int) {}
-  // Says what a result file cell is browsed for.
+  // What the browsing of a result file cell is for.
   virtual void setUpResultFile(int, int, CVdGridResultFileEditCtrl&) {}
-  // What an edit of a cell is called.
+  // What an edit of the cell is called: its column and row, or the name of the grid where it shows no
+  // headers.
   virtual std::string editName(int row, int col);
 
  private:
-  CV27SetupFormView* page_ = nullptr;
+  GridHost* host_ = nullptr;
+  bool enabled_ = true;
   bool rebuilding_ = false;
   std::set<int> toolTipColumns_;
   CVdMapProjectionGXComboBox projection_;
 };
-
-// A grid with one row for each item of a list, whose columns are said once.
-class ColumnGrid : public CV27SetupGridWnd {
- public:
-  struct Column {
-    std::string header;
-    int width;
-    CellKind kind = CellKind::plain;
-    CellAlign align = CellAlign::left;
-    std::function<std::string(int item)> get = {};
-    std::function<bool(int item, std::string_view text)> set = {};
-    std::function<bool(int item)> enabled = {};   // default: always
-    std::function<bool(int item)> readOnly = {};  // default: never
-    std::function<void(int item)> press = {};
-    std::vector<std::string> choices = {};
-  };
-
-  int GetRowCount() override { return ItemCount(); }
-  int GetColCount() override { return static_cast<int>(columns_.size()); }
-  std::string GetColHeader(int col) override { return col == 0 ? "" : column(col).header; }
-  int GetColWidth(int col) override { return col == 0 ? rowHeaderWidth_ : column(col).width; }
-
- protected:
-  virtual int ItemCount() = 0;
-  // A column of grid points, shown as "(3,4)"; a store takes "3,4" too.
-  static Column PointColumn(std::string_view header, int width,
-                            const std::function<GridPoint&(int item)>& point);
-  void SetColumns(int rowHeaderWidth, std::vector<Column> columns);
-
-  bool styleOf(int row, int col, CellStyle& style) override;
-  bool storeCell(int row, int col, std::string_view text) override;
-  void buttonPressed(int row, int col) override;
-
- private:
-  const Column& column(int col) const { return columns_[static_cast<std::size_t>(col) - 1]; }
-
-  int rowHeaderWidth_ = 30;
-  std::vector<Column> columns_;
-};
-
-// Text of a cell as an integer, read as far as it is one: "12x" is 12, "x" is 0.
-int plainInteger(std::string_view text);
 
 }  // namespace gridbay

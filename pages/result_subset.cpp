@@ -26,10 +26,11 @@ CV27SetupResultSubsetDialog::CV27SetupResultSubsetDialog(const Range& range, std
                                                          std::int32_t lastK, std::int32_t lastStep)
     : range_(range), shown_(range), limits_{lastJ, lastK, lastStep} {
   for (std::size_t direction = 0; direction < kDirections.size(); ++direction) {
-    form_.Group(fmt::format("{} (0 to {})", kDirections[direction], limits_[direction]));
-    form_.DDX_Text("First:", shown_[3 * direction]);
-    form_.DDX_Text("Last:", shown_[3 * direction + 1]);
-    form_.DDX_Text("Interval:", shown_[3 * direction + 2]);
+    form_.Group(fmt::format("{} (0 to {})", kDirections[direction], limits_[direction]), [&] {
+      form_.DDX_Text("First:", shown_[3 * direction]);
+      form_.DDX_Text("Last:", shown_[3 * direction + 1]).Beside();
+      form_.DDX_Text("Interval:", shown_[3 * direction + 2]).Beside();
+    });
   }
   form_.show(UnitChoices());
 }

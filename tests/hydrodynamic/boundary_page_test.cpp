@@ -47,7 +47,7 @@ TEST_F(HdBoundaryPage, ABlockOfSixRowsForEachBoundary) {
   EXPECT_EQ(cell(row(5), 2), "0");
   EXPECT_FALSE(style(row(5), 2).enabled);
   EXPECT_EQ(cell(row(6), 1), "No user defined flow direction");
-  EXPECT_FALSE(style(row(6), 2).enabled);
+  EXPECT_TRUE(style(row(6), 2).enabled);
   EXPECT_FALSE(style(row(6), 3).enabled);
   EXPECT_FALSE(style(row(6), 4).enabled);
   CellStyle none;

@@ -32,11 +32,11 @@ class CellsOfAllKinds final : public CV27SetupGridWnd {
     style.enabled = enabled;
     return true;
   }
-  bool storeCell(int, int col, std::string_view text) override {
+  Stored storeCell(int, int col, std::string_view text) override {
     if (col == kResultFile) file = text;
     if (col == kProjection) projection = text;
     if (col == kCheckBox) flag = text == "1";
-    return true;
+    return Stored::taken;
   }
   void setUpResultFile(int, int, CVdGridResultFileEditCtrl& control) override {
     control.SetDialogPara("Maps (*.tsb2)|*.tsb2||", "tsb2");
@@ -50,10 +50,6 @@ class OnePage final : public CV27SetupFormView {
 
  protected:
   void DoDataExchange(Form& form) override { form.DDX_Control("&Cells:", cells); }
-  int Initialize() override {
-    SetUpGrid("&Cells:");
-    return 1;
-  }
 };
 
 }  // namespace gridbay::test
