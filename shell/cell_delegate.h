@@ -16,6 +16,7 @@ class CellDelegate final : public QStyledItemDelegate {
 
   // The editor that is open, or null.
   QWidget* editor() const { return editor_; }
+  void forgetEditor() { editor_ = nullptr; }
   // The button that is held down.
   void setPressed(const QModelIndex& index) { pressed_ = index; }
   const QPersistentModelIndex& pressed() const { return pressed_; }

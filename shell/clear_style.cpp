@@ -13,6 +13,7 @@ template <class Draw>
 void drawnWith(const QPalette& palette, const QStyleOption* option, const Draw& draw) {
   auto* changed = const_cast<QStyleOption*>(option);
   const QPalette kept = std::exchange(changed->palette, palette);
+  changed->palette.setCurrentColorGroup(kept.currentColorGroup());
   draw();
   changed->palette = kept;
 }

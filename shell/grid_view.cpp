@@ -1,15 +1,18 @@
 #include "shell/grid_view.h"
 
+#include <QAbstractButton>
 #include <QApplication>
 #include <QClipboard>
 #include <QComboBox>
 #include <QKeyEvent>
+#include <QPainter>
 #include <QScrollBar>
 #include <QToolTip>
 #include <algorithm>
 #include <cmath>
 
 #include "shell/cell_editors.h"
+#include "shell/shades.h"
 
 namespace gridbay::shell {
 namespace {
@@ -19,6 +22,7 @@ constexpr int kCharWidth = 5;
 constexpr int kRowPadding = 9;
 // Columns of text are those that are told to be at least this wide; they take the width that is left.
 constexpr int kTextWidth = 100;
+constexpr double kLeastText = 0.6;  // of the width that they want
 // A grid with no columns of text grows so far.
 constexpr double kMostGrowth = 1.5;
 constexpr int kSampledRows = 12;
@@ -44,6 +48,7 @@ GridView::GridView(CV27SetupGridWnd& grid, QWidget* parent)
   setWordWrap(false);
   setShowGrid(false);
   setCornerButtonEnabled(false);
+  if (auto* corner = findChild<QAbstractButton*>()) corner->installEventFilter(this);
   setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
   setHorizontalScrollMode(QAbstractItemView::ScrollPerPixel);
   setEditTriggers(QAbstractItemView::CurrentChanged | QAbstractItemView::EditKeyPressed |
@@ -107,6 +112,15 @@ int GridView::measured(int column) const {
   return width;
 }
 
+// The look of a column's cells, by the first that is no header.
+CellStyle GridView::typicalStyle(int column) const {
+  for (int row = 0; row < std::min(kSampledRows, model_->rowCount()); ++row) {
+    const CellStyle cell = model_->style(model_->index(row, column));
+    if (!cell.isHeader && !cell.isHeading) return cell;
+  }
+  return {};
+}
+
 void GridView::measureColumns() {
   CV27SetupGridWnd& grid = model_->grid();
   shownHeaders_.clear();
@@ -117,11 +131,15 @@ void GridView::measureColumns() {
     if (isColumnHidden(i)) continue;
     Column& column = columns_[static_cast<std::size_t>(i)];
     column.natural = measured(i);
-    const CellStyle first = model_->rowCount() > 0 ? model_->style(model_->index(0, i)) : CellStyle();
-    const bool isText = (first.kind == CellKind::plain || first.kind == CellKind::resultFile ||
-                         first.kind == CellKind::label || first.kind == CellKind::multiChoice) &&
-                        first.align == CellAlign::left && grid.GetColWidth(i + 1) >= kTextWidth;
-    column.growth = isText ? grid.GetColWidth(i + 1) : 0;
+    column.least = column.natural;
+    const CellStyle typical = typicalStyle(i);
+    const bool isText = (typical.kind == CellKind::plain || typical.kind == CellKind::resultFile ||
+                         typical.kind == CellKind::multiChoice) &&
+                        !typical.readOnly && typical.align == CellAlign::left &&
+                        grid.GetColWidth(i + 1) >= kTextWidth;
+    if (!isText) continue;
+    column.growth = grid.GetColWidth(i + 1);
+    column.least = static_cast<int>(column.natural * kLeastText);
   }
   const bool hasText = std::ranges::any_of(columns_, [](const Column& column) { return column.growth > 0; });
   setSizePolicy(hasText ? QSizePolicy::Expanding : QSizePolicy::Preferred, QSizePolicy::Preferred);
@@ -141,30 +159,34 @@ int GridView::naturalWidth() const {
   return width;
 }
 
-// Gives the columns the width that there is: that beyond what they want to those of text, or a part to each.
+// Gives the columns the width that there is. What is beyond their wishes goes to those of text, or a part to
+// each; what is missing is taken from those of text.
 void GridView::shareWidth() {
   isSharing_ = true;
   int left = viewport()->width();
   int growth = 0;
   int natural = 0;
+  int slack = 0;
   for (std::size_t i = 0; i < columns_.size(); ++i) {
     const Column& column = columns_[i];
     left -= column.isUserSized ? columnWidth(static_cast<int>(i)) : column.natural;
     if (column.isUserSized) continue;
     growth += column.growth;
     natural += column.natural;
+    slack += column.natural - column.least;
   }
-  const bool hasText = growth > 0;
-  const int whole = hasText ? growth : natural;
-  left = std::max(0, left);
-  if (!hasText) left = std::min(left, static_cast<int>(natural * (kMostGrowth - 1)));
+  left = std::max(left, -slack);
+  const auto weight = [&](const Column& column) {
+    return left < 0 ? column.natural - column.least : growth > 0 ? column.growth : column.natural;
+  };
+  const int whole = left < 0 ? slack : growth > 0 ? growth : natural;
   int given = 0;
-  int parts = 0;
+  int weights = 0;
   for (std::size_t i = 0; i < columns_.size(); ++i) {
     const Column& column = columns_[i];
     if (column.isUserSized || column.natural == 0) continue;
-    parts += hasText ? column.growth : column.natural;
-    const int upTo = whole == 0 ? 0 : static_cast<int>(std::lround(1.0 * left * parts / whole));
+    weights += weight(column);
+    const int upTo = whole == 0 ? 0 : static_cast<int>(std::lround(1.0 * left * weights / whole));
     const int width = column.natural + upTo - given;
     given = upTo;
     if (columnWidth(static_cast<int>(i)) != width) setColumnWidth(static_cast<int>(i), width);
@@ -184,7 +206,9 @@ void GridView::layOutRows() {
 
 int GridView::rowsHeight() const {
   const int header = columnHeader_->isHidden() ? 0 : columnHeader_->sizeHint().height();
-  const bool scrolls = naturalWidth() > width() && testAttribute(Qt::WA_Resized);
+  int slack = 0;
+  for (const Column& column : columns_) slack += column.natural - column.least;
+  const bool scrolls = naturalWidth() - slack > width() && testAttribute(Qt::WA_Resized);
   return header + rowHeader_->length() + 2 * frameWidth() +
          (scrolls ? horizontalScrollBar()->sizeHint().height() : 0);
 }
@@ -205,8 +229,7 @@ QSize GridView::minimumSizeHint() const {
 
 void GridView::fitSize() {
   const bool hasText = sizePolicy().horizontalPolicy() == QSizePolicy::Expanding;
-  const int scroll = verticalScrollBar()->sizeHint().width();
-  const QSize most(hasText ? QWIDGETSIZE_MAX : static_cast<int>(naturalWidth() * kMostGrowth) + scroll,
+  const QSize most(hasText ? QWIDGETSIZE_MAX : static_cast<int>(naturalWidth() * kMostGrowth),
                    sizeHint().height());
   if (maximumSize() != most) setMaximumSize(most);
   updateGeometry();
@@ -243,6 +266,18 @@ bool GridView::spanShownCells() {
 void GridView::paintEvent(QPaintEvent* event) {
   spanShownCells();
   QTableView::paintEvent(event);
+}
+
+// The corner between the headers is one of them.
+bool GridView::eventFilter(QObject* watched, QEvent* event) {
+  auto* corner = qobject_cast<QAbstractButton*>(watched);
+  if (corner == nullptr || event->type() != QEvent::Paint) return QTableView::eventFilter(watched, event);
+  QPainter painter(corner);
+  const QColor line = lineColour(palette());
+  painter.fillRect(corner->rect(), headerGround(palette()));
+  painter.fillRect(QRect(corner->width() - 1, 0, 1, corner->height()), line);
+  painter.fillRect(QRect(0, corner->height() - 1, corner->width(), 1), line);
+  return true;
 }
 
 void GridView::commitEdit() {
@@ -291,10 +326,11 @@ void GridView::commitData(QWidget* editor) {
 void GridView::closeEditor(QWidget* editor, QAbstractItemDelegate::EndEditHint hint) {
   if (keepsRefused(editor, hint)) return;
   const bool isEntered = hint == QAbstractItemDelegate::SubmitModelCache;
-  const bool hadFocus = editor->isAncestorOf(QApplication::focusWidget()) || editor->hasFocus();
+  const bool hadFocus = editor->hasFocus() || qobject_cast<MultiChoiceEditor*>(editor) != nullptr;
   const QModelIndex current = currentIndex();
   QTableView::closeEditor(editor, hint);
-  if (hadFocus && hint == QAbstractItemDelegate::NoHint && isVisible()) setFocus();
+  delegate_->forgetEditor();
+  if (hadFocus && isVisible() && !hasFocus()) setFocus();
   // Return goes on to the cell below, where there is one to fill in.
   const QModelIndex below = current.siblingAtRow(current.row() + 1);
   if (!isEntered || !below.isValid() || current != currentIndex()) return;
@@ -345,6 +381,13 @@ void GridView::currentChanged(const QModelIndex& current, const QModelIndex& pre
   currentRow_ = row;
   model_->grid().OnCurrentRow(row);
   emit edited();
+}
+
+// To come here by Tab makes a cell the current one, and opens none.
+void GridView::focusInEvent(QFocusEvent* event) {
+  movingByKeys_ = true;
+  QTableView::focusInEvent(event);
+  movingByKeys_ = false;
 }
 
 void GridView::mousePressEvent(QMouseEvent* event) {

@@ -39,15 +39,18 @@ class GridView final : public QTableView {
   void closeEditor(QWidget* editor, QAbstractItemDelegate::EndEditHint hint) override;
   void currentChanged(const QModelIndex& current, const QModelIndex& previous) override;
   void keyPressEvent(QKeyEvent* event) override;
+  void focusInEvent(QFocusEvent* event) override;
   void mousePressEvent(QMouseEvent* event) override;
   void mouseReleaseEvent(QMouseEvent* event) override;
   void paintEvent(QPaintEvent* event) override;
   void resizeEvent(QResizeEvent* event) override;
   bool focusNextPrevChild(bool next) override;
+  bool eventFilter(QObject* watched, QEvent* event) override;
 
  private:
   struct Column {
     int natural = 0;  // width
+    int least = 0;    // where there is not enough for all
     int growth = 0;   // its part of the width that is left
     bool isUserSized = false;
   };
@@ -55,6 +58,7 @@ class GridView final : public QTableView {
   void layOutGrid();
   void measureColumns();
   int measured(int column) const;
+  CellStyle typicalStyle(int column) const;
   void shareWidth();
   void layOutRows();
   bool spanShownCells();

@@ -167,6 +167,8 @@ const FieldLayout::Measures& FieldLayout::measures() const {
       const Extent width = widthOf(row[k], aligned ? measures_.labelWidths[k] : 0);
       end.least += from + width.least;
       end.wanted = std::max(end.wanted + from, aligned ? measures_.columns[k] : 0) + width.wanted;
+      for (const QLayoutItem* message : row[k].messages)
+        measures_.width.wanted = std::max(measures_.width.wanted, hintWidth(message));
       measures_.expands = measures_.expands || stretches(row[k]);
     });
   }
@@ -247,24 +249,27 @@ std::vector<int> FieldLayout::shared(const std::vector<Extent>& extents, int roo
   return sizes;
 }
 
-void FieldLayout::placeCell(const Cell& cell, const QRect& room, int labelWidth, int lineHeight) {
+void FieldLayout::placeCell(const Cell& cell, const QRect& room, const QRect& bounds, int labelWidth,
+                            int lineHeight) {
   int x = room.left();
   int width = room.width();
   if (cell.kind == Kind::labelled && labelWidth > 0) {
     if (isShownItem(cell.label)) {
       // Beside a tall input a label stands at its first line.
       const bool isTall = hintHeight(cell.input) > 2 * hintHeight(cell.label);
-      place(cell.label, x, room.top(), labelWidth, isTall ? hintHeight(cell.label) + 2 : lineHeight);
+      place(cell.label, x, room.top(), labelWidth, isTall ? hintHeight(cell.label) + 4 : lineHeight);
     }
     x += labelWidth + kLabelGap;
     width -= labelWidth + kLabelGap;
   }
+  // Where the field begins, or further left where the frame ends too soon.
   int messageTop = room.top() + lineHeight;
   for (QLayoutItem* message : cell.messages) {
     if (!isShownItem(message)) continue;
     messageTop += kMessageGap;
-    const int right = room.right() > x ? room.right() - x + 1 : width;
-    message->setGeometry(QRect(x, messageTop, std::max(right, hintWidth(message)), hintHeight(message)));
+    const int wanted = std::min(hintWidth(message), bounds.width());
+    const int left = std::max(bounds.left(), std::min(x, bounds.right() + 1 - wanted));
+    message->setGeometry(QRect(left, messageTop, wanted, hintHeight(message)));
     messageTop += hintHeight(message);
   }
   const int unit = isShownItem(cell.unit) ? kUnitGap + hintWidth(cell.unit) : 0;
@@ -281,8 +286,9 @@ void FieldLayout::placeFields(const Row& row, QRect room) const {
   const auto labelWidthOf = [&](std::size_t k) {
     return isAligned(row, k) ? measures_.labelWidths[k] : hintWidth(row[k].label);
   };
+  const auto first = static_cast<std::size_t>(std::ranges::find_if(row, isShown) - row.begin());
   const auto startOf = [&](std::size_t k, int end) {
-    const int gap = end == 0 ? 0 : isShownItem(row[k].label) ? kFieldGap : kButtonGap;
+    const int gap = k == first ? 0 : isShownItem(row[k].label) ? kFieldGap : kButtonGap;
     return std::max(end + gap, isAligned(row, k) ? measures_.columns[k] : 0);
   };
   int line = 0;
@@ -305,7 +311,7 @@ void FieldLayout::placeFields(const Row& row, QRect room) const {
     const Extent width = widthOf(row[k], labelWidth);
     const int start = startOf(k, end);
     const int taken = stretches(row[k]) ? std::max(share, width.least) : width.wanted;
-    placeCell(row[k], QRect(room.left() + start, room.top(), taken, room.height()), labelWidth, line);
+    placeCell(row[k], QRect(room.left() + start, room.top(), taken, room.height()), room, labelWidth, line);
     end = start + taken;
   }
 }
@@ -332,7 +338,7 @@ void FieldLayout::placeBlocks(const Row& row, QRect room) const {
       cell.input->setGeometry(QRect(x, room.top(), width, std::min(room.height(), most.height())));
     } else {
       const int line = std::max({hintHeight(cell.label), hintHeight(cell.input), hintHeight(cell.unit)});
-      placeCell(cell, QRect(x, room.top(), width, room.height()), hintWidth(cell.label), line);
+      placeCell(cell, QRect(x, room.top(), width, room.height()), room, hintWidth(cell.label), line);
     }
     x += width + kBlockGap;
   }

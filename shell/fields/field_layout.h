@@ -71,7 +71,8 @@ class FieldLayout final : public QLayout {
   int gapBefore(std::size_t row) const;
   void placeFields(const Row& row, QRect room) const;
   void placeBlocks(const Row& row, QRect room) const;
-  static void placeCell(const Cell& cell, const QRect& room, int labelWidth, int lineHeight);
+  static void placeCell(const Cell& cell, const QRect& room, const QRect& bounds, int labelWidth,
+                        int lineHeight);
   // Shares room among extents: what is missing is taken from the largest, what is left goes to who can grow.
   static std::vector<int> shared(const std::vector<Extent>& extents, int room);
 

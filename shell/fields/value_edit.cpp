@@ -77,6 +77,7 @@ QString droppedFile(const QMimeData* data) {
 
 ValueEdit::ValueEdit(QWidget* parent) : QLineEdit(parent) {
   setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
+  applyMargins();
 }
 
 void ValueEdit::setLetters(int letters) {
@@ -98,7 +99,7 @@ void ValueEdit::setTrailing(int width) {
 }
 
 QSize ValueEdit::hint(int letters) const {
-  constexpr int kPadding = 12;
+  constexpr int kPadding = 14;
   const QSize usual = QLineEdit::sizeHint();
   return {letters * fontMetrics().horizontalAdvance('0') + kPadding + trailing_, usual.height()};
 }

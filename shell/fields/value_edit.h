@@ -33,7 +33,9 @@ class ValueEdit : public QLineEdit {
  private:
   QSize hint(int letters) const;
   int faultWidth() const { return fault_.isEmpty() ? 0 : fontMetrics().height() + 4; }
-  void applyMargins() { setTextMargins(0, 0, trailing_ + faultWidth(), 0); }
+  void applyMargins() { setTextMargins(kInset, 0, trailing_ + faultWidth(), 0); }
+
+  static constexpr int kInset = 2;  // of the text from the edge
 
   int letters_ = 0;
   int trailing_ = 0;

@@ -35,14 +35,21 @@ class PagePaneTest : public QObject {
   QWidget* window_ = nullptr;
   PagePane* pane_ = nullptr;
 
-  void show(Form& form, QSize size = {900, 600}) {
+  // The window goes before the form and the grids that it shows.
+  struct WindowEnd {
+    void operator()(PagePaneTest* test) const { delete std::exchange(test->window_, nullptr); }
+  };
+  using Shown = std::unique_ptr<PagePaneTest, WindowEnd>;
+
+  Shown show(Form& form, QSize size = {900, 600}) {
     form.show({});
     window_->resize(size);
     pane_->showForm("Page", form);
     window_->show();
     window_->activateWindow();
-    QVERIFY(QTest::qWaitForWindowActive(window_));
+    if (!QTest::qWaitForWindowActive(window_)) qFatal("the window is not active");
     QCoreApplication::processEvents();
+    return Shown(this);
   }
   template <class Widget = QLineEdit>
   Widget* input(const char* label, int n = 1) {
@@ -88,7 +95,7 @@ class PagePaneTest : public QObject {
       form.Group("Inner", [&] { form.DDX_VDedit("B:", b_, 0); });
     });
     form.Group("Right", [&] { form.DDX_VDedit("C:", c_, 0); }).Beside();
-    show(form);
+    const auto shown = show(form);
     auto* outer = input<QGroupBox>("Outer");
     auto* inner = input<QGroupBox>("Inner");
     QVERIFY(outer != nullptr && inner != nullptr);
@@ -106,7 +113,7 @@ class PagePaneTest : public QObject {
     Form form;
     form.Group("Narrow", [&] { form.DDX_VDedit("A:", a_, 0); });
     form.Group("Wide", [&] { form.DDX_VDedit("A longer label in front:", b_, 0); });
-    show(form);
+    const auto shown = show(form);
     QCOMPARE(at("Narrow").width(), at("Wide").width());
     QVERIFY(at("Wide").width() < 600);
   }
@@ -116,7 +123,7 @@ class PagePaneTest : public QObject {
     form.DDX_VDedit("Short:", a_, 0);
     form.DDX_VDedit("A much longer label:", b_, 0);
     form.DDX_Text("File:", name_);
-    show(form);
+    const auto shown = show(form);
     QCOMPARE(at("Short:").left(), at("A much longer label:").left());
     QCOMPARE(at("File:").left(), at("Short:").left());
     QCOMPARE(at(text("Short:")).left(), at(text("File:")).left());
@@ -129,7 +136,7 @@ class PagePaneTest : public QObject {
     form.DDX_Text("File:", name_).isFile = true;
     form.Button("...", [] {}).Beside();
     form.Button("View...", [] {}).Beside();
-    show(form);
+    const auto shown = show(form);
     const int number = at("Depth:").width();
     const int letter = input("Depth:")->fontMetrics().horizontalAdvance('0');
     QVERIFY(number >= 10 * letter && number <= 16 * letter);
@@ -151,7 +158,7 @@ class PagePaneTest : public QObject {
     std::int32_t choice = 0;
     Form form;
     form.DDX_CBIndex("Given as:", {"Constant", "File"}, choice);
-    show(form);
+    const auto shown = show(form);
     QVERIFY(at("Given as:").width() < 200);
   }
 
@@ -159,7 +166,7 @@ class PagePaneTest : public QObject {
     Form form;
     std::deque<double> values(60, 1.5);
     for (double& value : values) form.DDX_VDedit("Value:", value, 0);
-    show(form, {500, 300});
+    const auto shown = show(form, {500, 300});
     QVERIFY(pane_->verticalScrollBar()->maximum() > 500);
     QCOMPARE(at("Value:", 60).left(), at("Value:", 1).left());
     QVERIFY(at("Value:", 60).top() > at("Value:", 59).bottom());
@@ -181,7 +188,7 @@ class PagePaneTest : public QObject {
         .Beside();
     form.DDX_Text("File:", name_);
     form.Button("...", [] {}).Beside();
-    show(form);
+    const auto shown = show(form);
     input("A:")->setFocus();
     QTest::keyClick(input("A:"), Qt::Key_Tab);
     QVERIFY(input("N:")->hasFocus());
@@ -199,7 +206,7 @@ class PagePaneTest : public QObject {
     Form form;
     checked(form.DDX_VDedit("Depth:", a_, 0));
     checked(form.DDX_VDedit("Width:", b_, 0));
-    show(form);
+    const auto shown = show(form);
     type(input("Depth:"), "deep");
     QTest::keyClick(input("Depth:"), Qt::Key_Return);
     QCOMPARE(input("Depth:")->text(), QString("deep"));
@@ -225,7 +232,7 @@ class PagePaneTest : public QObject {
     Form form;
     checked(form.DDX_VDedit("Depth:", a_, 0));
     checked(form.DDX_VDedit("Width:", b_, 0));
-    show(form);
+    const auto shown = show(form);
     type(input("Depth:"), "deep");
     QTest::keyClick(input("Depth:"), Qt::Key_Tab);
     QVERIFY(input("Depth:")->hasFocus());
@@ -243,7 +250,7 @@ class PagePaneTest : public QObject {
     Form form;
     checked(form.DDX_VDedit("Depth:", a_, 0));
     checked(form.DDX_VDedit("Width:", b_, 0));
-    show(form);
+    const auto shown = show(form);
     type(input("Depth:"), "deep");
     QTest::mouseClick(input("Width:"), Qt::LeftButton);
     QTRY_VERIFY(input("Depth:")->hasFocus());
@@ -262,7 +269,7 @@ class PagePaneTest : public QObject {
     window_->layout()->addWidget(tree);
     Form form;
     checked(form.DDX_VDedit("Depth:", a_, 0));
-    show(form);
+    const auto shown = show(form);
     type(input("Depth:"), "deep");
     tree->setFocus(Qt::MouseFocusReason);
     QCoreApplication::processEvents();
@@ -273,7 +280,7 @@ class PagePaneTest : public QObject {
   void escBringsTheValueBack() {
     Form form;
     checked(form.DDX_VDedit("Depth:", a_, 0));
-    show(form);
+    const auto shown = show(form);
     type(input("Depth:"), "deep");
     QTest::keyClick(input("Depth:"), Qt::Key_Return);
     QTest::keyClick(input("Depth:"), Qt::Key_Escape);
@@ -288,7 +295,7 @@ class PagePaneTest : public QObject {
     Form form;
     form.DDX_VDedit("Depth:", a_, 0);
     form.DDX_VDedit("Width:", b_, 0);
-    show(form);
+    const auto shown = show(form);
     type(input("Depth:"), "12345");
     QTest::keyClick(input("Depth:"), Qt::Key_Left);
     input("Depth:")->setSelection(1, 2);
@@ -309,7 +316,7 @@ class PagePaneTest : public QObject {
     std::int32_t choice = 1;
     form.DDX_CBIndex("List:", {"x", "y"}, choice);
     for (double& value : values) form.DDX_VDedit("Value:", value, 0);
-    show(form, {500, 300});
+    const auto shown = show(form, {500, 300});
     auto* list = input<QComboBox>("List:");
     list->setItemData(0, "kept");
     pane_->verticalScrollBar()->setValue(200);
@@ -332,7 +339,7 @@ class PagePaneTest : public QObject {
     });
     form.DDX_Radio("Radio", {"One", "Two"}, radio);
     form.DDX_Check("Flag", flag_);
-    show(form);
+    const auto shown = show(form);
     Control& a = form.of(&a_);
     a.label = "Depth of A:";
     a.unit = "ft";
@@ -372,7 +379,7 @@ class PagePaneTest : public QObject {
     form.DDX_VDedit("A:", a_, 0);
     form.DDX_VDedit("B:", b_, 0).ReadOnly();
     form.DDX_VDedit("C:", c_, 0).enabled = false;
-    show(form);
+    const auto shown = show(form);
     const auto ground = [this](const char* label) {
       const QImage image = input(label)->grab().toImage();
       return image.pixelColor(image.width() - 8, image.height() / 2);
@@ -389,7 +396,7 @@ class PagePaneTest : public QObject {
     form.DDX_Text("Count:", count_).Spin(0, 9, [&](int delta) {
       form.of(&count_).text = std::to_string(std::stoi(form.of(&count_).text) + delta);
     });
-    show(form);
+    const auto shown = show(form);
     QLineEdit* edit = input("Count:");
     edit->setFocus();
     QTest::keyClick(edit, Qt::Key_Up);
@@ -419,7 +426,7 @@ class PagePaneTest : public QObject {
     Control& date = form.DDX_Text("Start:", start);
     date.kind = ControlKind::dateTime;
     date.Changed([&] { date.fault = date.text.size() == 19 ? "" : "Start is no date"; });
-    show(form);
+    const auto shown = show(form);
     auto* edit = qobject_cast<DateTimeEdit*>(input("Start:"));
     QVERIFY(edit != nullptr);
     type(edit, "tomorrow");
@@ -445,7 +452,7 @@ class PagePaneTest : public QObject {
     Form form;
     form.DDX_VDedit("A:", a_, 0);
     form.DDX_CBIndex("List:", {"x", "y"}, choice);
-    show(form);
+    const auto shown = show(form);
     input("A:")->setFocus();
     auto* list = input<QComboBox>("List:");
     QWheelEvent event(QPointF(5, 5), list->mapToGlobal(QPointF(5, 5)), {}, QPoint(0, -120), Qt::NoButton,
@@ -458,7 +465,7 @@ class PagePaneTest : public QObject {
     Form form;
     form.Group("Warm-up");
     form.DDX_VDedit("A:", a_, 0);
-    show(form);
+    const auto shown = show(form);
     QVERIFY(text("Warm-up") != nullptr);
     QVERIFY(at(text("Warm-up")).bottom() < at("A:").top());
   }
@@ -469,7 +476,7 @@ class PagePaneTest : public QObject {
     Form form;
     form.DDX_Control("Few", few);
     form.DDX_Control("Many", many);
-    show(form);
+    const auto shown = show(form);
     auto* first = input<GridView>("Few");
     auto* second = input<GridView>("Many");
     // All rows are seen where there is room; the rest of the page is for the one with more.
@@ -497,7 +504,7 @@ class PagePaneTest : public QObject {
     Form form;
     form.DDX_Control("Left", left);
     form.DDX_Control("Right", right).Beside();
-    show(form);
+    const auto shown = show(form);
     QCOMPARE(at("Left").top(), at("Right").top());
     QVERIFY(at("Left").right() < at("Right").left());
     QVERIFY(std::abs(at("Left").width() - at("Right").width()) < 4);
@@ -513,7 +520,7 @@ class PagePaneTest : public QObject {
       form.of(&a_).text = text;
       return true;
     };
-    show(form);
+    const auto shown = show(form);
     QVERIFY(input<GridView>("Grid")->cells().setData(input<GridView>("Grid")->cells().index(0, 0), "8",
                                                      Qt::EditRole));
     QCOMPARE(input("A:")->text(), QString("8"));
@@ -531,12 +538,12 @@ class PagePaneTest : public QObject {
     Form other;
     test::BandedGrid grid(16, 9);
     other.DDX_Control("Grid", grid);
-    show(form);
+    const auto shown = show(form);
     other.show({});
-    const auto measured = [this](Form& shown) {
+    const auto measured = [this](Form& page) {
       QElapsedTimer timer;
       timer.start();
-      pane_->showForm("Page", shown);
+      pane_->showForm("Page", page);
       QCoreApplication::processEvents();
       return static_cast<double>(timer.nsecsElapsed()) * 1e-6;
     };
@@ -584,6 +591,7 @@ class PagePaneTest : public QObject {
       pane_->showForm("Grids", grids);
       save("grids");
     }
+    pane_->clear();
   }
 };
 
