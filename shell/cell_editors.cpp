@@ -22,7 +22,7 @@ MultiChoiceEditor::MultiChoiceEditor(const std::vector<std::string>& choices, QW
   }
   list_->installEventFilter(this);
   popup_->installEventFilter(this);
-  setFocusProxy(list_);
+  setFocusPolicy(Qt::StrongFocus);
   // A click on the text sets the mark as one on the mark does.
   connect(list_, &QListWidget::itemPressed, this,
           [this](const QListWidgetItem* item) { pressedState_ = item->checkState(); });
@@ -69,6 +69,7 @@ void MultiChoiceEditor::finish(bool taken) {
   if (isFinished_) return;
   isFinished_ = true;
   popup_->hide();
+  window()->activateWindow();
   emit finished(taken);
 }
 

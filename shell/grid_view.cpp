@@ -28,6 +28,7 @@ constexpr double kMostGrowth = 1.5;
 constexpr int kSampledRows = 12;
 constexpr int kLongestSample = 32;  // letters
 constexpr int kRowsAtLeast = 5;
+constexpr int kManyRows = 10;
 
 bool hasListEditor(CellKind kind) {
   return kind == CellKind::dropDown || kind == CellKind::mapProjection || kind == CellKind::multiChoice;
@@ -112,13 +113,17 @@ int GridView::measured(int column) const {
   return width;
 }
 
-// The look of a column's cells, by the first that is no header.
-CellStyle GridView::typicalStyle(int column) const {
+// Whether a column holds text that is typed, by its first rows: that may be long.
+bool GridView::isTextColumn(int column) const {
+  if (model_->grid().GetColWidth(column + 1) < kTextWidth) return false;
   for (int row = 0; row < std::min(kSampledRows, model_->rowCount()); ++row) {
     const CellStyle cell = model_->style(model_->index(row, column));
-    if (!cell.isHeader && !cell.isHeading) return cell;
+    const bool isTyped = cell.kind == CellKind::plain || cell.kind == CellKind::resultFile ||
+                         cell.kind == CellKind::multiChoice;
+    if (isTyped && !cell.isHeader && !cell.isHeading && !cell.readOnly && cell.align == CellAlign::left)
+      return true;
   }
-  return {};
+  return false;
 }
 
 void GridView::measureColumns() {
@@ -132,12 +137,7 @@ void GridView::measureColumns() {
     Column& column = columns_[static_cast<std::size_t>(i)];
     column.natural = measured(i);
     column.least = column.natural;
-    const CellStyle typical = typicalStyle(i);
-    const bool isText = (typical.kind == CellKind::plain || typical.kind == CellKind::resultFile ||
-                         typical.kind == CellKind::multiChoice) &&
-                        !typical.readOnly && typical.align == CellAlign::left &&
-                        grid.GetColWidth(i + 1) >= kTextWidth;
-    if (!isText) continue;
+    if (!isTextColumn(i)) continue;
     column.growth = grid.GetColWidth(i + 1);
     column.least = static_cast<int>(column.natural * kLeastText);
   }
@@ -216,7 +216,9 @@ int GridView::rowsHeight() const {
 // With no rows there is still room for one, so that a grid is seen to be one.
 QSize GridView::sizeHint() const {
   const int least = shownRows_ == 0 ? rowHeader_->defaultSectionSize() : 0;
-  return {naturalWidth(), rowsHeight() + least};
+  // Many rows are scrolled through.
+  const int scroll = shownRows_ > kManyRows ? verticalScrollBar()->sizeHint().width() : 0;
+  return {naturalWidth() + scroll, rowsHeight() + least};
 }
 
 QSize GridView::minimumSizeHint() const {
@@ -229,7 +231,7 @@ QSize GridView::minimumSizeHint() const {
 
 void GridView::fitSize() {
   const bool hasText = sizePolicy().horizontalPolicy() == QSizePolicy::Expanding;
-  const QSize most(hasText ? QWIDGETSIZE_MAX : static_cast<int>(naturalWidth() * kMostGrowth),
+  const QSize most(hasText ? QWIDGETSIZE_MAX : static_cast<int>(sizeHint().width() * kMostGrowth),
                    sizeHint().height());
   if (maximumSize() != most) setMaximumSize(most);
   updateGeometry();

@@ -58,7 +58,7 @@ class GridView final : public QTableView {
   void layOutGrid();
   void measureColumns();
   int measured(int column) const;
-  CellStyle typicalStyle(int column) const;
+  bool isTextColumn(int column) const;
   void shareWidth();
   void layOutRows();
   bool spanShownCells();
