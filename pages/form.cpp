@@ -385,16 +385,24 @@ void Form::changed(Control& control) {
   }
 }
 
+void Form::guarded(const std::function<void()>& action) {
+  if (guard_) {
+    guard_(action);
+  } else {
+    action();
+  }
+}
+
 void Form::act(Control& control) {
   acting_ = &control;
-  changed(control);
+  guarded([&] { changed(control); });
   acting_ = nullptr;
 }
 
 void Form::spin(Control& control, int delta) {
   acting_ = &control;
   spinning_ = true;
-  if (control.onSpin) control.onSpin(delta);
+  if (control.onSpin) guarded([&] { control.onSpin(delta); });
   spinning_ = false;
   acting_ = nullptr;
 }

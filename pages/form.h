@@ -237,6 +237,8 @@ class Form {
   // as long, so that what it does has a name.
   void act(Control& control);
   void spin(Control& control, int delta);
+  // Around what an act does; without one it is simply done.
+  void SetGuard(std::function<void(const std::function<void()>&)> guard) { guard_ = std::move(guard); }
   const Control* acting() const { return acting_; }
   bool isSpinning() const { return spinning_; }
 
@@ -255,6 +257,7 @@ class Form {
   bool storeActing(const UnitChoices& units);
 
  private:
+  void guarded(const std::function<void()>& action);
   Control& add(ControlKind kind, std::string_view label, Control::Variable variable = {});
   template <class Value>
   Control& addBound(std::string_view label, Binding<Value> binding, int itemCode);
@@ -267,6 +270,7 @@ class Form {
   std::deque<std::variant<std::int32_t, float, double, std::string>> owned_;  // variables of bound controls
   std::function<void()> onAnyChange_;
   Control* group_ = nullptr;  // that is being filled
+  std::function<void(const std::function<void()>&)> guard_;
   Control* acting_ = nullptr;
   bool spinning_ = false;
 };

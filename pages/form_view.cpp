@@ -29,6 +29,7 @@ void CV27SetupFormView::OnInitialUpdate() {
   form_.SetDefaultHandler([this] {
     if (UpdateDoc() == 0) EnableControls();
   });
+  form_.SetGuard([this](const std::function<void()>& edit) { document_.Attempt(edit); });
   DoDataExchange(form_);
   for (Control& control : form_.controls()) {
     if (control.grid == nullptr) continue;

@@ -26,17 +26,20 @@ int CV27SetupGridWnd::StoreStyleRowCol(int row, int col, std::string_view text) 
   CellStyle style;
   if (GetStyleRowCol(row, col, style) == 0 || !style.takesValue()) return 0;
   host_->SetEditName(editName(row, col));
-  const Stored stored = storeCell(row, col, std::string(trimmed(text)));
-  if (stored != Stored::refused) UpdateDoc();
+  Stored stored = Stored::refused;
+  const bool done = document().Attempt([&] {
+    stored = storeCell(row, col, std::string(trimmed(text)));
+    if (stored != Stored::refused) UpdateDoc();
+  });
   host_->SetEditName({});
-  return stored == Stored::taken ? 1 : 0;
+  return done && stored == Stored::taken ? 1 : 0;
 }
 
 void CV27SetupGridWnd::OnClickedButtonRowCol(int row, int col) {
   CellStyle style;
   if (GetStyleRowCol(row, col, style) == 0 || style.kind != CellKind::button || !style.enabled) return;
   host_->SetEditName(editName(row, col));
-  buttonPressed(row, col);
+  document().Attempt([&] { buttonPressed(row, col); });
   host_->SetEditName({});
 }
 

@@ -26,6 +26,18 @@ std::string CVdDoc::GetToolTipsString(std::string_view value) {
   return onLines(value, kLine);
 }
 
+bool CVdDoc::Attempt(const std::function<void()>& edit) {
+  try {
+    edit();
+    return true;
+  } catch (const std::exception& fault) {
+    TakeBackUnrecorded();
+    UpdateAllViews(nullptr);
+    host_.show("The edit could not be made, and the setup is as it was before: " + std::string(fault.what()));
+    return false;
+  }
+}
+
 void CVdDoc::AddView(const void* owner, View update) {
   views_.emplace_back(owner, std::move(update));
 }

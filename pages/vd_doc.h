@@ -39,6 +39,9 @@ class CVdDoc {
   // like one is taken back with it.
   virtual void RecordEdit(PageId page, std::string name, bool continues = false) = 0;
 
+  // Makes an edit. An exception in it is told, and the model is then as it was before; false.
+  bool Attempt(const std::function<void()>& edit);
+
   bool IsModified() const { return modified_; }
   void SetModifiedFlag(bool modified = true) { modified_ = modified; }
 
@@ -60,6 +63,8 @@ class CVdDoc {
   void UpdateAllViews(const void* sender);
 
  protected:
+  // Brings the model back to what it was after the last edit.
+  virtual void TakeBackUnrecorded() = 0;
   void SetPath(const std::string& path) { path_ = path; }
   std::set<PageId>& touched() { return touched_; }
 

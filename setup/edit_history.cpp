@@ -90,7 +90,7 @@ void EditHistory::undo(CGlobalKvs& model, Touched& touched) {
 
 void EditHistory::redo(CGlobalKvs& model, Touched& touched) {
   if (redoStep() == nullptr) return;
-  apply(model, takeChanges(model), false);
+  takeBackUnrecorded(model);
   for (const Step* step = redoStep(); step != nullptr;) {
     ++done_;
     apply(model, step->changes, true);

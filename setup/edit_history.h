@@ -40,6 +40,8 @@ class EditHistory {
 
   // What has changed without a step, as what a page works out when it is shown, goes with the last one.
   void settle(CGlobalKvs& model);
+  // The same brought back to what it was after the last step.
+  void takeBackUnrecorded(CGlobalKvs& model) { apply(model, takeChanges(model), false); }
 
   // The step that an undo or a redo would do; null when there is none.
   const Step* undoStep() const { return done_ == 0 ? nullptr : &steps_[done_ - 1]; }

@@ -46,6 +46,9 @@ class CV27SetupDoc : public CVdDoc {
   // Tells the states of the model apart: another one after each edit, the old one once it is taken back.
   std::uint64_t ModelState() const { return history_.state(); }
 
+ protected:
+  void TakeBackUnrecorded() override { history_.takeBackUnrecorded(root()); }
+
  private:
   bool mayLeaveOut();
   Outcome saveTo(const std::string& path);

@@ -66,8 +66,8 @@ constexpr Condition kExpandedMud = runs<module::kMudTransportExpanded>;
 constexpr Condition kEcology = runs<module::kEcological>;
 
 constexpr MemberRow kMembers[] = {
-    member<&G::moduleSelection>(), member<&G::bathymetry>(),      member<&G::simulationPeriod>(),
-    member<&G::boundary>(),        member<&G::sourceSink>(),      member<&G::massBudget>(),
+    member<&G::moduleSelection>(), member<&G::bathymetry>(),  member<&G::simulationPeriod>(),
+    member<&G::boundary>(),        member<&G::sourceSink>(),  member<&G::massBudget>(),
     member<&G::areaDescription>(), member<&G::nhdBoundary>(),
 };
 
@@ -119,22 +119,16 @@ constexpr FileRow kSaving[] = {
 
 // The module selection comes first: what else is read depends on it.
 constexpr FileRow kLoading[] = {
-    in("NESTED_MODEL_GLOBALS"),
-    child<&G::moduleSelection>(),
-    child<&G::bathymetry>(),
-    child<&G::boundary>(),
-    child<&G::sourceSink>(),
-    child<&G::areaDescription>(),
-    child<&G::simulationPeriod>(),
-    child<&G::massBudget>(),
+    in("NESTED_MODEL_GLOBALS"),    child<&G::moduleSelection>(), child<&G::bathymetry>(),
+    child<&G::boundary>(),         child<&G::sourceSink>(),      child<&G::areaDescription>(),
+    child<&G::simulationPeriod>(), child<&G::massBudget>(),
 
-    in("HYDRODYNAMIC_MODULE"),
-    child<&G::nhdBoundary>(),
+    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdBoundary>(),
 };
 
 constexpr CheckRow kChecking[] = {
-    check<&G::bathymetry>(), check<&G::areaDescription>(), check<&G::simulationPeriod>(),
-    check<&G::boundary>(),   check<&G::sourceSink>(),      check<&G::massBudget>(),
+    check<&G::bathymetry>(),  check<&G::areaDescription>(), check<&G::simulationPeriod>(),
+    check<&G::boundary>(),    check<&G::sourceSink>(),      check<&G::massBudget>(),
     check<&G::nhdBoundary>(),
 };
 

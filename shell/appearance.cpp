@@ -4,7 +4,10 @@
 #include <QApplication>
 #include <QPalette>
 #include <QSettings>
-#include <QStyleFactory>
+#include <QToolTip>
+
+#include "shell/clear_style.h"
+#include "shell/shades.h"
 
 namespace gridbay::shell {
 namespace {
@@ -32,6 +35,8 @@ QPalette paletteOf(bool dark) {
     palette.setColor(QPalette::Disabled, role, faint);
   }
   palette.setColor(QPalette::PlaceholderText, faint);
+  palette.setColor(QPalette::Disabled, QPalette::Base, disabledGround(palette));
+  palette.setColor(QPalette::Disabled, QPalette::Highlight, faint);
   return palette;
 }
 
@@ -42,8 +47,10 @@ void setAppearance(Appearance appearance) {
     QApplication::setPalette(QPalette());
     return;
   }
-  QApplication::setStyle(QStyleFactory::create("Fusion"));
-  QApplication::setPalette(paletteOf(appearance == Appearance::dark));
+  const QPalette palette = paletteOf(appearance == Appearance::dark);
+  QApplication::setStyle(new ClearStyle());
+  QApplication::setPalette(palette);
+  QToolTip::setPalette(palette);
 }
 
 QMenu* makeAppearanceMenu(QWidget* parent) {

@@ -1,256 +1,439 @@
 #include "shell/grid_view.h"
 
-#include <QAction>
+#include <QAbstractButton>
 #include <QApplication>
 #include <QClipboard>
 #include <QComboBox>
-#include <QHeaderView>
 #include <QKeyEvent>
-#include <QLineEdit>
 #include <QPainter>
-#include <QPalette>
+#include <QScrollBar>
+#include <QToolTip>
+#include <algorithm>
+#include <cmath>
+
+#include "shell/cell_editors.h"
+#include "shell/shades.h"
 
 namespace gridbay::shell {
 namespace {
 
 // Widths of columns are told in pixels of a font whose letters are this wide.
 constexpr int kCharWidth = 5;
+constexpr int kRowPadding = 9;
+// Columns of text are those that are told to be at least this wide; they take the width that is left.
+constexpr int kTextWidth = 100;
+constexpr double kLeastText = 0.6;  // of the width that they want
+// A grid with no columns of text grows so far.
+constexpr double kMostGrowth = 1.5;
+constexpr int kSampledRows = 12;
+constexpr int kLongestSample = 32;  // letters
+constexpr int kRowsAtLeast = 5;
+constexpr int kManyRows = 10;
+
+bool hasListEditor(CellKind kind) {
+  return kind == CellKind::dropDown || kind == CellKind::mapProjection || kind == CellKind::multiChoice;
+}
 
 }  // namespace
 
-int GridModel::rowCount(const QModelIndex& parent) const {
-  return parent.isValid() ? 0 : grid_.GetRowCount();
-}
-int GridModel::columnCount(const QModelIndex& parent) const {
-  return parent.isValid() ? 0 : grid_.GetColCount();
-}
-
-CellStyle GridModel::style(const QModelIndex& index) const {
-  CellStyle style;
-  grid_.GetStyleRowCol(index.row() + 1, index.column() + 1, style);
-  return style;
-}
-
-QVariant GridModel::data(const QModelIndex& index, int role) const {
-  const CellStyle cell = style(index);
-  switch (role) {
-    case Qt::DisplayRole:
-      if (cell.kind == CellKind::checkBox) return {};
-      [[fallthrough]];
-    case Qt::EditRole:
-      return QString::fromStdString(cell.value);
-    case Qt::ToolTipRole:
-      return QString::fromStdString(cell.toolTip);
-    case Qt::TextAlignmentRole:
-      return QVariant(static_cast<int>((cell.align == CellAlign::right ? Qt::AlignRight : Qt::AlignLeft) |
-                                       Qt::AlignVCenter));
-    case Qt::ForegroundRole:
-      return cell.enabled ? QVariant()
-                          : QVariant(QApplication::palette().brush(QPalette::Disabled, QPalette::Text));
-    case Qt::FontRole: {
-      if (!cell.isHeading) return {};
-      QFont bold;
-      bold.setBold(true);
-      return bold;
-    }
-    case Qt::CheckStateRole:
-      if (cell.kind != CellKind::checkBox) return {};
-      return static_cast<int>(cell.value == "1" ? Qt::Checked : Qt::Unchecked);
-    default:
-      return {};
-  }
-}
-
-QVariant GridModel::headerData(int section, Qt::Orientation orientation, int role) const {
-  if (role != Qt::DisplayRole) return {};
-  return QString::fromStdString(orientation == Qt::Horizontal ? grid_.GetColHeader(section + 1)
-                                                              : grid_.GetRowHeader(section + 1));
-}
-
-Qt::ItemFlags GridModel::flags(const QModelIndex& index) const {
-  const CellStyle cell = style(index);
-  Qt::ItemFlags flags = Qt::ItemIsSelectable;
-  if (cell.enabled) flags |= Qt::ItemIsEnabled;
-  if (cell.editable())
-    flags |= cell.kind == CellKind::checkBox ? Qt::ItemIsUserCheckable : Qt::ItemIsEditable;
-  return flags;
-}
-
-bool GridModel::setData(const QModelIndex& index, const QVariant& value, int role) {
-  if (role != Qt::EditRole && role != Qt::CheckStateRole) return false;
-  const QString text = role == Qt::EditRole ? value.toString() : value.toInt() == Qt::Checked ? "1" : "0";
-  const bool stored = grid_.StoreStyleRowCol(index.row() + 1, index.column() + 1, text.toStdString()) != 0;
-  refresh();
-  return stored;
-}
-
-void GridModel::press(const QModelIndex& index) {
-  grid_.OnClickedButtonRowCol(index.row() + 1, index.column() + 1);
-  refresh();
-}
-
-bool GridModel::browse(const QModelIndex& index) {
-  const bool browsed = grid_.ProcessKeys(GridKey::browse, index.row() + 1, index.column() + 1);
-  if (browsed) refresh();
-  return browsed;
-}
-
-void GridModel::refresh() {
-  if (rowCount() == shownRows_ && columnCount() == shownColumns_) {
-    if (shownRows_ > 0 && shownColumns_ > 0)
-      emit dataChanged(index(0, 0), index(shownRows_ - 1, shownColumns_ - 1));
-    return;
-  }
-  beginResetModel();
-  shownRows_ = rowCount();
-  shownColumns_ = columnCount();
-  endResetModel();
-}
-
-QWidget* CellDelegate::createEditor(QWidget* parent, const QStyleOptionViewItem&,
-                                    const QModelIndex& index) const {
-  // The model and the signals of a delegate belong to objects that are not const.
-  auto* cells = const_cast<GridModel*>(static_cast<const GridModel*>(index.model()));
-  auto* self = const_cast<CellDelegate*>(this);
-  const CellStyle cell = cells->style(index);
-  if (cell.kind != CellKind::dropDown && cell.kind != CellKind::mapProjection) {
-    auto* edit = new QLineEdit(parent);
-    if (cell.kind != CellKind::resultFile) return edit;
-    auto* browse = new QAction("...", edit);
-    browse->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_D));
-    browse->setShortcutContext(Qt::WidgetShortcut);
-    browse->setIcon(QApplication::style()->standardIcon(QStyle::SP_DirOpenIcon));
-    edit->addAction(browse, QLineEdit::TrailingPosition);
-    connect(browse, &QAction::triggered, edit, [self, cells, edit, at = QPersistentModelIndex(index)] {
-      if (cells->browse(at)) emit self->closeEditor(edit, QAbstractItemDelegate::RevertModelCache);
-    });
-    return edit;
-  }
-  auto* list = new QComboBox(parent);
-  if (cell.kind == CellKind::mapProjection) {
-    for (const std::string& choice : cells->grid().OnStartEditing(index.row() + 1, index.column() + 1))
-      list->addItem(QString::fromStdString(choice));
-  }
-  for (const std::string& choice : cell.choices) list->addItem(QString::fromStdString(choice));
-  // A choice counts at once, without a further key.
-  connect(list, &QComboBox::activated, self, [self, list] {
-    emit self->commitData(list);
-    emit self->closeEditor(list);
-  });
-  return list;
-}
-
-void CellDelegate::setEditorData(QWidget* editor, const QModelIndex& index) const {
-  const QString text = index.data(Qt::EditRole).toString();
-  if (auto* list = qobject_cast<QComboBox*>(editor)) {
-    list->setCurrentText(text);
-  } else {
-    qobject_cast<QLineEdit*>(editor)->setText(text);
-  }
-}
-
-void CellDelegate::setModelData(QWidget* editor, QAbstractItemModel* model, const QModelIndex& index) const {
-  auto* cells = static_cast<GridModel*>(model);
-  const auto* list = qobject_cast<QComboBox*>(editor);
-  const QString text = list != nullptr ? list->currentText() : qobject_cast<QLineEdit*>(editor)->text();
-  if (text == index.data(Qt::EditRole).toString()) return;
-  if (cells->style(index).kind == CellKind::mapProjection) {
-    cells->grid().OnModifyCell(text.toStdString());
-    cells->grid().OnEndEditing(index.row() + 1, index.column() + 1);
-    cells->refresh();
-    return;
-  }
-  model->setData(index, text, Qt::EditRole);
-}
-
-void CellDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
-                         const QModelIndex& index) const {
-  const CellStyle cell = static_cast<const GridModel*>(index.model())->style(index);
-  if (cell.kind != CellKind::button) {
-    QStyledItemDelegate::paint(painter, option, index);
-    const bool hasList = cell.kind == CellKind::dropDown || cell.kind == CellKind::mapProjection;
-    if (!hasList || !cell.editable()) return;
-    // So that a list is seen to be one before it is opened.
-    QStyleOption arrow;
-    const int side = option.fontMetrics.averageCharWidth();
-    arrow.rect = QRect(option.rect.right() - side, option.rect.center().y() - side / 2, side, side);
-    arrow.palette = option.palette;
-    arrow.state = QStyle::State_Enabled;
-    QApplication::style()->drawPrimitive(QStyle::PE_IndicatorArrowDown, &arrow, painter);
-    return;
-  }
-  QStyleOptionButton button;
-  button.rect = option.rect.adjusted(1, 1, -1, -1);
-  button.text = QString::fromStdString(cell.value).trimmed();
-  if (!cell.enabled) button.palette.setCurrentColorGroup(QPalette::Disabled);
-  button.state = cell.enabled ? QStyle::State_Enabled | QStyle::State_Raised : QStyle::State_None;
-  QApplication::style()->drawControl(QStyle::CE_PushButton, &button, painter);
-}
-
 GridView::GridView(CV27SetupGridWnd& grid, QWidget* parent)
-    : QTableView(parent), model_(new GridModel(grid, this)) {
+    : QTableView(parent),
+      model_(new GridModel(grid, this)),
+      delegate_(new CellDelegate(this)),
+      columnHeader_(new GridHeader(*model_, Qt::Horizontal, this)),
+      rowHeader_(new GridHeader(*model_, Qt::Vertical, this)) {
+  setHorizontalHeader(columnHeader_);
+  setVerticalHeader(rowHeader_);
   setModel(model_);
-  setItemDelegate(new CellDelegate(this));
+  setItemDelegate(delegate_);
   setWordWrap(false);
-  setEditTriggers(QAbstractItemView::AllEditTriggers);
-  horizontalHeader()->setVisible(grid.ShowsHeaders());
-  verticalHeader()->setVisible(grid.GetColWidth(0) > 0);
-  layOutColumns();
-  connect(model_, &QAbstractItemModel::modelReset, this, [this] { layOutColumns(); });
-  connect(this, &QTableView::clicked, this, [this](const QModelIndex& index) {
-    if (model_->style(index).kind == CellKind::button) {
-      model_->press(index);
-    } else {
-      model_->grid().OnLButtonHitRowCol(index.row() + 1, index.column() + 1);
-    }
+  setShowGrid(false);
+  setCornerButtonEnabled(false);
+  if (auto* corner = findChild<QAbstractButton*>()) corner->installEventFilter(this);
+  setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
+  setHorizontalScrollMode(QAbstractItemView::ScrollPerPixel);
+  setEditTriggers(QAbstractItemView::CurrentChanged | QAbstractItemView::EditKeyPressed |
+                  QAbstractItemView::AnyKeyPressed);
+  viewport()->setAttribute(Qt::WA_Hover);
+  rowHeader_->setSectionResizeMode(QHeaderView::Fixed);
+  rowHeader_->setDefaultSectionSize(fontMetrics().height() + kRowPadding);
+  columnHeader_->setVisible(grid.ShowsHeaders());
+  rowHeader_->setVisible(grid.GetColWidth(0) > 0);
+  measureColumns();
+  layOutRows();
+  fitSize();
+  connect(model_, &GridModel::dataChanged, this, [this] { layOutGrid(); });
+  connect(model_, &GridModel::rowsInserted, this, [this] { layOutGrid(); });
+  connect(model_, &GridModel::rowsRemoved, this, [this] { layOutGrid(); });
+  connect(model_, &GridModel::columnsInserted, this, [this] { layOutGrid(); });
+  connect(model_, &GridModel::columnsRemoved, this, [this] { layOutGrid(); });
+  connect(model_, &GridModel::edited, this, &GridView::edited);
+  connect(this, &QTableView::clicked, this, [this](const QModelIndex& index) { clicked(index); });
+  connect(columnHeader_, &QHeaderView::sectionResized, this, [this](int column) {
+    if (isSharing_ || column >= static_cast<int>(columns_.size())) return;
+    columns_[static_cast<std::size_t>(column)].isUserSized = true;
+    columnHeader_->setExtent(columnHeader_->neededHeight());
   });
 }
 
-void GridView::layOutColumns() {
-  CV27SetupGridWnd& grid = model_->grid();
-  const int rows = model_->rowCount();
-  for (int column = 1; column <= model_->columnCount(); ++column) {
-    int width = grid.GetColWidth(column) * fontMetrics().averageCharWidth() / kCharWidth;
-    const CellStyle first = rows == 0 ? CellStyle() : styleOfButton(column);
-    if (first.kind == CellKind::button) {
-      constexpr int kFrame = 4;  // letters
-      const int text = fontMetrics().horizontalAdvance(QString::fromStdString(first.value).trimmed());
-      width = std::max(width, text + kFrame * fontMetrics().averageCharWidth());
-    }
-    setColumnWidth(column - 1, width);
-    setColumnHidden(column - 1, !grid.OnTrackColWidth(column));
-  }
-  clearSpans();
-  for (int row = 0; row < rows && !grid.ShowsHeaders(); ++row) {
-    if (model_->style(model_->index(row, 0)).isHeading) setSpan(row, 0, 1, model_->columnCount());
-  }
+// Follows what the grid says of itself. Widths stay as they are while the columns are the same ones.
+void GridView::layOutGrid() {
+  QStringList headers;
+  for (int column = 0; column < model_->columnCount(); ++column)
+    headers << model_->headerData(column, Qt::Horizontal, Qt::DisplayRole).toString();
+  if (headers != shownHeaders_ || (shownRows_ == 0 && model_->rowCount() > 0)) measureColumns();
+  layOutRows();
+  fitSize();
+  const bool isEnabled = model_->grid().IsEnabled();
+  const Qt::FocusPolicy policy = isEnabled ? Qt::StrongFocus : Qt::NoFocus;
+  if (focusPolicy() != policy) setFocusPolicy(policy);
 }
 
-// The first button in a column; a plain cell where there is none near the top.
-CellStyle GridView::styleOfButton(int column) const {
-  constexpr int kNear = 8;
-  for (int row = 0; row < std::min(kNear, model_->rowCount()); ++row) {
-    CellStyle style = model_->style(model_->index(row, column - 1));
-    if (style.kind == CellKind::button) return style;
+// The width that a column wants: what it is told, and no less than its header's longest word and what stands
+// in its first rows.
+int GridView::measured(int column) const {
+  const QFontMetrics metrics = fontMetrics();
+  CV27SetupGridWnd& grid = model_->grid();
+  int width = grid.GetColWidth(column + 1) * metrics.averageCharWidth() / kCharWidth;
+  if (grid.ShowsHeaders() && grid.GetHeaderSpan(column + 1) == 1) {
+    const QString header = model_->headerData(column, Qt::Horizontal, Qt::DisplayRole).toString();
+    for (const QString& word : header.split(' ', Qt::SkipEmptyParts))
+      width = std::max(width, metrics.horizontalAdvance(word) + 2 * metrics.averageCharWidth());
   }
-  return {};
+  for (int row = 0; row < std::min(kSampledRows, model_->rowCount()); ++row) {
+    const CellStyle cell = model_->style(model_->index(row, column));
+    if (cell.isHeading || cell.isHeader || cell.span > 1) continue;
+    int text = metrics.horizontalAdvance(shownText(cell).trimmed().left(kLongestSample));
+    for (const std::string& choice : cell.choices) {
+      if (cell.kind == CellKind::dropDown)
+        text = std::max(text, metrics.horizontalAdvance(QString::fromStdString(choice).left(kLongestSample)));
+    }
+    width = std::max(width, text + CellDelegate::aroundText(cell.kind, metrics));
+  }
+  return width;
+}
+
+// Whether a column holds text that is typed, by its first rows: that may be long.
+bool GridView::isTextColumn(int column) const {
+  if (model_->grid().GetColWidth(column + 1) < kTextWidth) return false;
+  for (int row = 0; row < std::min(kSampledRows, model_->rowCount()); ++row) {
+    const CellStyle cell = model_->style(model_->index(row, column));
+    const bool isTyped = cell.kind == CellKind::plain || cell.kind == CellKind::resultFile ||
+                         cell.kind == CellKind::multiChoice;
+    if (isTyped && !cell.isHeader && !cell.isHeading && !cell.readOnly && cell.align == CellAlign::left)
+      return true;
+  }
+  return false;
+}
+
+void GridView::measureColumns() {
+  CV27SetupGridWnd& grid = model_->grid();
+  shownHeaders_.clear();
+  columns_.assign(static_cast<std::size_t>(model_->columnCount()), {});
+  for (int i = 0; i < model_->columnCount(); ++i) {
+    shownHeaders_ << model_->headerData(i, Qt::Horizontal, Qt::DisplayRole).toString();
+    setColumnHidden(i, !grid.OnTrackColWidth(i + 1));
+    if (isColumnHidden(i)) continue;
+    Column& column = columns_[static_cast<std::size_t>(i)];
+    column.natural = measured(i);
+    column.least = column.natural;
+    if (!isTextColumn(i)) continue;
+    column.growth = grid.GetColWidth(i + 1);
+    column.least = static_cast<int>(column.natural * kLeastText);
+  }
+  const bool hasText = std::ranges::any_of(columns_, [](const Column& column) { return column.growth > 0; });
+  setSizePolicy(hasText ? QSizePolicy::Expanding : QSizePolicy::Preferred, QSizePolicy::Preferred);
+  int rowHeader = grid.GetColWidth(0) * fontMetrics().averageCharWidth() / kCharWidth;
+  for (int row = 0; row < std::min(kSampledRows, model_->rowCount()); ++row) {
+    const QString text = model_->headerData(row, Qt::Vertical, Qt::DisplayRole).toString().trimmed();
+    rowHeader = std::max(rowHeader, fontMetrics().horizontalAdvance(text.left(2 * kLongestSample)) +
+                                        CellDelegate::aroundText(CellKind::plain, fontMetrics()));
+  }
+  rowHeader_->setExtent(rowHeader);
+  shareWidth();
+}
+
+int GridView::naturalWidth() const {
+  int width = 2 * frameWidth() + (rowHeader_->isHidden() ? 0 : rowHeader_->sizeHint().width());
+  for (const Column& column : columns_) width += column.natural;
+  return width;
+}
+
+// Gives the columns the width that there is. What is beyond their wishes goes to those of text, or a part to
+// each; what is missing is taken from those of text.
+void GridView::shareWidth() {
+  isSharing_ = true;
+  int left = viewport()->width();
+  int growth = 0;
+  int natural = 0;
+  int slack = 0;
+  for (std::size_t i = 0; i < columns_.size(); ++i) {
+    const Column& column = columns_[i];
+    left -= column.isUserSized ? columnWidth(static_cast<int>(i)) : column.natural;
+    if (column.isUserSized) continue;
+    growth += column.growth;
+    natural += column.natural;
+    slack += column.natural - column.least;
+  }
+  left = std::max(left, -slack);
+  const auto weight = [&](const Column& column) {
+    return left < 0 ? column.natural - column.least : growth > 0 ? column.growth : column.natural;
+  };
+  const int whole = left < 0 ? slack : growth > 0 ? growth : natural;
+  int given = 0;
+  int weights = 0;
+  for (std::size_t i = 0; i < columns_.size(); ++i) {
+    const Column& column = columns_[i];
+    if (column.isUserSized || column.natural == 0) continue;
+    weights += weight(column);
+    const int upTo = whole == 0 ? 0 : static_cast<int>(std::lround(1.0 * left * weights / whole));
+    const int width = column.natural + upTo - given;
+    given = upTo;
+    if (columnWidth(static_cast<int>(i)) != width) setColumnWidth(static_cast<int>(i), width);
+  }
+  isSharing_ = false;
+  if (!columnHeader_->isHidden()) columnHeader_->setExtent(columnHeader_->neededHeight());
+}
+
+void GridView::layOutRows() {
+  const int usual = rowHeader_->defaultSectionSize();
+  for (int row = 0; row < model_->rowCount(); ++row) {
+    const int height = static_cast<int>(std::lround(model_->grid().GetRowLook(row + 1).height * usual));
+    if (rowHeight(row) != height) setRowHeight(row, height);
+  }
+  shownRows_ = model_->rowCount();
+}
+
+int GridView::rowsHeight() const {
+  const int header = columnHeader_->isHidden() ? 0 : columnHeader_->sizeHint().height();
+  int slack = 0;
+  for (const Column& column : columns_) slack += column.natural - column.least;
+  const bool scrolls = naturalWidth() - slack > width() && testAttribute(Qt::WA_Resized);
+  return header + rowHeader_->length() + 2 * frameWidth() +
+         (scrolls ? horizontalScrollBar()->sizeHint().height() : 0);
+}
+
+// With no rows there is still room for one, so that a grid is seen to be one.
+QSize GridView::sizeHint() const {
+  const int least = shownRows_ == 0 ? rowHeader_->defaultSectionSize() : 0;
+  // Many rows are scrolled through.
+  const int scroll = shownRows_ > kManyRows ? verticalScrollBar()->sizeHint().width() : 0;
+  return {naturalWidth() + scroll, rowsHeight() + least};
+}
+
+QSize GridView::minimumSizeHint() const {
+  constexpr int kLetters = 40;
+  const int rows = std::max(0, shownRows_ - kRowsAtLeast) * rowHeader_->defaultSectionSize();
+  const QSize wanted = sizeHint();
+  return {std::min(wanted.width(), kLetters * fontMetrics().averageCharWidth()),
+          std::max(wanted.height() - rows, 0)};
+}
+
+void GridView::fitSize() {
+  const bool hasText = sizePolicy().horizontalPolicy() == QSizePolicy::Expanding;
+  const QSize most(hasText ? QWIDGETSIZE_MAX : static_cast<int>(sizeHint().width() * kMostGrowth),
+                   sizeHint().height());
+  if (maximumSize() != most) setMaximumSize(most);
+  updateGeometry();
+}
+
+void GridView::resizeEvent(QResizeEvent* event) {
+  QTableView::resizeEvent(event);
+  shareWidth();
+  fitSize();
+}
+
+// Cells that cover others, and titles across all columns, are found among those that are seen.
+bool GridView::spanShownCells() {
+  bool changed = false;
+  const int columns = model_->columnCount();
+  const int first = std::max(0, rowAt(0));
+  int last = rowAt(viewport()->height() - 1);
+  if (last < 0) last = model_->rowCount() - 1;
+  for (int row = first; row <= last && columns > 0; ++row) {
+    for (int column = 0; column < columns;) {
+      const CellStyle cell = model_->style(model_->index(row, column));
+      const int wanted = cell.isHeading && column == 0 ? columns : std::clamp(cell.span, 1, columns - column);
+      if (columnSpan(row, column) != wanted) {
+        // A span that covers this cell no longer does.
+        setSpan(row, column, 1, wanted);
+        changed = true;
+      }
+      column += wanted;
+    }
+  }
+  return changed;
+}
+
+void GridView::paintEvent(QPaintEvent* event) {
+  spanShownCells();
+  QTableView::paintEvent(event);
+}
+
+// The corner between the headers is one of them.
+bool GridView::eventFilter(QObject* watched, QEvent* event) {
+  auto* corner = qobject_cast<QAbstractButton*>(watched);
+  if (corner == nullptr || event->type() != QEvent::Paint) return QTableView::eventFilter(watched, event);
+  QPainter painter(corner);
+  const QColor line = lineColour(palette());
+  painter.fillRect(corner->rect(), headerGround(palette()));
+  painter.fillRect(QRect(corner->width() - 1, 0, 1, corner->height()), line);
+  painter.fillRect(QRect(0, corner->height() - 1, corner->width(), 1), line);
+  return true;
+}
+
+void GridView::commitEdit() {
+  QWidget* editor = delegate_->editor();
+  if (editor == nullptr) return;
+  commitData(editor);
+  closeEditor(editor, QAbstractItemDelegate::NoHint);
+}
+
+bool GridView::edit(const QModelIndex& index, EditTrigger trigger, QEvent* event) {
+  if (isReturning_) return false;
+  if (trigger == CurrentChanged && (movingByKeys_ || QApplication::mouseButtons() != Qt::NoButton))
+    return false;
+  if (!opening_ && index.isValid() && model_->style(index).kind == CellKind::multiChoice) {
+    if (trigger == EditKeyPressed) openCell(index, true);
+    return trigger == EditKeyPressed;
+  }
+  return QTableView::edit(index, trigger, event);
+}
+
+// `withList` opens the list of a cell that has one.
+void GridView::openCell(const QModelIndex& index, bool withList) {
+  opening_ = true;
+  edit(index, AllEditTriggers, nullptr);
+  opening_ = false;
+  if (!withList) return;
+  if (auto* list = qobject_cast<QComboBox*>(delegate_->editor())) list->showPopup();
+  if (auto* choice = qobject_cast<MultiChoiceEditor*>(delegate_->editor())) choice->open();
+}
+
+void GridView::clicked(const QModelIndex& index) {
+  if (isReturning_ || index != currentIndex()) return;
+  const QPersistentModelIndex at(index);
+  if (model_->style(index).kind == CellKind::button) return model_->press(index);
+  model_->grid().OnLButtonHitRowCol(index.row() + 1, index.column() + 1);
+  const bool isOne = selectionModel()->selectedIndexes().size() <= 1;
+  if (at.isValid() && isOne && QApplication::keyboardModifiers() == Qt::NoModifier &&
+      model_->flags(at).testFlag(Qt::ItemIsEditable))
+    openCell(at, true);
+}
+
+void GridView::commitData(QWidget* editor) {
+  if (!isReturning_) QTableView::commitData(editor);
+}
+
+void GridView::closeEditor(QWidget* editor, QAbstractItemDelegate::EndEditHint hint) {
+  if (keepsRefused(editor, hint)) return;
+  const bool isEntered = hint == QAbstractItemDelegate::SubmitModelCache;
+  const bool hadFocus = editor->hasFocus() || qobject_cast<MultiChoiceEditor*>(editor) != nullptr;
+  const QModelIndex current = currentIndex();
+  QTableView::closeEditor(editor, hint);
+  delegate_->forgetEditor();
+  if (hadFocus && isVisible() && !hasFocus()) setFocus();
+  // Return goes on to the cell below, where there is one to fill in.
+  const QModelIndex below = current.siblingAtRow(current.row() + 1);
+  if (!isEntered || !below.isValid() || current != currentIndex()) return;
+  if (!model_->flags(below).testFlag(Qt::ItemIsEnabled)) return;
+  movingByKeys_ = true;
+  setCurrentIndex(below);
+  movingByKeys_ = false;
+}
+
+// Whether an editor with a refused text stays open. Who leaves it for elsewhere is brought back once.
+bool GridView::keepsRefused(QWidget* editor, QAbstractItemDelegate::EndEditHint hint) {
+  auto* edit = qobject_cast<CellEdit*>(editor);
+  if (edit == nullptr || !edit->isRefused() || hint == QAbstractItemDelegate::RevertModelCache) return false;
+  if (isReturning_) return true;
+  const bool isLeft = !edit->hasFocus();
+  if (isLeft && edit->hasReturned) return false;
+  if (isLeft) {
+    edit->hasReturned = true;
+    isReturning_ = true;
+    // Not at once: the click that leaves it is still on its way.
+    QMetaObject::invokeMethod(
+        edit, [this, edit] { returnToEditor(edit); }, Qt::QueuedConnection);
+  }
+  if (edit->isVisible())
+    QToolTip::showText(edit->mapToGlobal(QPoint(0, edit->height())), edit->fault(), edit, {}, 10000);
+  return true;
+}
+
+// Into another part of the window the user may go: the text waits for him.
+void GridView::returnToEditor(QWidget* editor) {
+  isReturning_ = false;
+  const QModelIndex index = indexAt(editor->geometry().center());
+  const QWidget* now = QApplication::focusWidget();
+  if (!index.isValid() || now == nullptr || now->window() != window()) return;
+  if (!parentWidget()->isAncestorOf(now)) return;
+  movingByKeys_ = true;
+  if (currentIndex() != index) setCurrentIndex(index);
+  movingByKeys_ = false;
+  editor->setFocus(Qt::OtherFocusReason);
+}
+
+void GridView::currentChanged(const QModelIndex& current, const QModelIndex& previous) {
+  QTableView::currentChanged(current, previous);
+  rowHeader_->viewport()->update();
+  columnHeader_->viewport()->update();
+  const int row = current.isValid() ? current.row() + 1 : 0;
+  if (row == currentRow_) return;
+  currentRow_ = row;
+  model_->grid().OnCurrentRow(row);
+  emit edited();
+}
+
+// To come here by Tab makes a cell the current one, and opens none.
+void GridView::focusInEvent(QFocusEvent* event) {
+  movingByKeys_ = true;
+  QTableView::focusInEvent(event);
+  movingByKeys_ = false;
+}
+
+void GridView::mousePressEvent(QMouseEvent* event) {
+  const QModelIndex index = indexAt(event->position().toPoint());
+  const CellStyle cell = index.isValid() ? model_->style(index) : CellStyle();
+  if (event->button() == Qt::LeftButton && cell.kind == CellKind::button && cell.enabled) {
+    delegate_->setPressed(index);
+    viewport()->update();
+  }
+  QTableView::mousePressEvent(event);
+}
+
+void GridView::mouseReleaseEvent(QMouseEvent* event) {
+  if (delegate_->pressed().isValid()) {
+    delegate_->setPressed({});
+    viewport()->update();
+  }
+  QTableView::mouseReleaseEvent(event);
 }
 
 void GridView::keyPressEvent(QKeyEvent* event) {
   const QModelIndex index = currentIndex();
-  const bool isPress =
-      event->key() == Qt::Key_Space || event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter;
+  const CellKind kind = index.isValid() ? model_->style(index).kind : CellKind::label;
+  const bool isEnter = event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter;
+  const bool isPress = event->key() == Qt::Key_Space || isEnter;
+  const bool opensList = isPress || event->key() == Qt::Key_F4 ||
+                         (event->key() == Qt::Key_Down && event->modifiers().testFlag(Qt::AltModifier));
   if (event->matches(QKeySequence::Copy)) {
     copy();
   } else if (event->matches(QKeySequence::Paste)) {
     paste();
-  } else if (isPress && index.isValid() && model_->style(index).kind == CellKind::button) {
+  } else if (isPress && kind == CellKind::button) {
     model_->press(index);
+  } else if (opensList && hasListEditor(kind)) {
+    if (model_->flags(index).testFlag(Qt::ItemIsEditable)) openCell(index, true);
+  } else if (isEnter && index.isValid()) {
+    if (model_->flags(index).testFlag(Qt::ItemIsEditable)) openCell(index, false);
   } else if (event->modifiers() == Qt::ControlModifier && event->key() == Qt::Key_D && index.isValid() &&
              model_->browse(index)) {
     return;
   } else {
+    movingByKeys_ = true;
     QTableView::keyPressEvent(event);
+    movingByKeys_ = false;
   }
 }
 
@@ -263,9 +446,15 @@ bool GridView::focusNextPrevChild(bool next) {
   const auto isUsable = [this, columns](int n) {
     return model_->flags(model_->index(n / columns, n % columns)).testFlag(Qt::ItemIsEnabled);
   };
+  movingByKeys_ = true;
+  bool moved = false;
   for (cell += next ? 1 : -1; cell >= 0 && cell < cells; cell += next ? 1 : -1) {
-    if (isUsable(cell)) return QTableView::focusNextPrevChild(next);
+    if (!isUsable(cell)) continue;
+    moved = QTableView::focusNextPrevChild(next);
+    movingByKeys_ = false;
+    return moved;
   }
+  movingByKeys_ = false;
   return QAbstractScrollArea::focusNextPrevChild(next);
 }
 

@@ -1,73 +1,87 @@
 #pragma once
 
-#include <QAbstractTableModel>
-#include <QStyledItemDelegate>
 #include <QTableView>
+#include <set>
 
-#include "pages/grid_wnd.h"
+#include "shell/cell_delegate.h"
+#include "shell/grid_header.h"
+#include "shell/grid_model.h"
 
 namespace gridbay::shell {
 
-// The cells of a grid for the toolkit; each question goes through to the grid, and so to the model.
-class GridModel final : public QAbstractTableModel {
-  Q_OBJECT
- public:
-  GridModel(CV27SetupGridWnd& grid, QObject* parent) : QAbstractTableModel(parent), grid_(grid) { refresh(); }
-
-  int rowCount(const QModelIndex& parent = {}) const override;
-  int columnCount(const QModelIndex& parent = {}) const override;
-  QVariant data(const QModelIndex& index, int role) const override;
-  QVariant headerData(int section, Qt::Orientation orientation, int role) const override;
-  Qt::ItemFlags flags(const QModelIndex& index) const override;
-  bool setData(const QModelIndex& index, const QVariant& value, int role) override;
-
-  CellStyle style(const QModelIndex& index) const;
-  void press(const QModelIndex& index);
-  // Lets the user browse for a cell's file, where it has one.
-  bool browse(const QModelIndex& index);
-  CV27SetupGridWnd& grid() const { return grid_; }
-  // The grid or the model behind it has changed.
-  void refresh();
-
- private:
-  CV27SetupGridWnd& grid_;
-  int shownRows_ = -1;
-  int shownColumns_ = -1;
-};
-
-// Editors of cells: an edit, a list for a drop-down or a map projection, an edit with a browse button.
-class CellDelegate final : public QStyledItemDelegate {
-  Q_OBJECT
- public:
-  using QStyledItemDelegate::QStyledItemDelegate;
-
-  QWidget* createEditor(QWidget* parent, const QStyleOptionViewItem& option,
-                        const QModelIndex& index) const override;
-  void setEditorData(QWidget* editor, const QModelIndex& index) const override;
-  void setModelData(QWidget* editor, QAbstractItemModel* model, const QModelIndex& index) const override;
-  void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override;
-};
-
-// The widget of a grid.
+// The widget of a grid: as high as its rows and as wide as its columns, where there is the room.
+//
+// A click opens the editor of a cell; typing, F2 or Return does for the current one. The arrow keys go from
+// cell to cell. A text that is refused stays in its editor, marked and explained, and Esc brings the value
+// back; who clicks elsewhere comes back to it once.
 class GridView final : public QTableView {
   Q_OBJECT
  public:
   GridView(CV27SetupGridWnd& grid, QWidget* parent);
   GridModel& cells() { return *model_; }
+  // Hands over what is typed in a cell and not yet entered.
+  void commitEdit();
+
+  QSize sizeHint() const override;
+  QSize minimumSizeHint() const override;
 
  public slots:
   void copy() const;
   void paste();
 
+ signals:
+  // The model, or the current row, has changed.
+  void edited();
+
  protected:
+  bool edit(const QModelIndex& index, EditTrigger trigger, QEvent* event) override;
+  void commitData(QWidget* editor) override;
+  void closeEditor(QWidget* editor, QAbstractItemDelegate::EndEditHint hint) override;
+  void currentChanged(const QModelIndex& current, const QModelIndex& previous) override;
   void keyPressEvent(QKeyEvent* event) override;
+  void focusInEvent(QFocusEvent* event) override;
+  void mousePressEvent(QMouseEvent* event) override;
+  void mouseReleaseEvent(QMouseEvent* event) override;
+  void paintEvent(QPaintEvent* event) override;
+  void resizeEvent(QResizeEvent* event) override;
   bool focusNextPrevChild(bool next) override;
+  bool eventFilter(QObject* watched, QEvent* event) override;
 
  private:
-  void layOutColumns();
-  CellStyle styleOfButton(int column) const;
+  struct Column {
+    int natural = 0;  // width
+    int least = 0;    // where there is not enough for all
+    int growth = 0;   // its part of the width that is left
+    bool isUserSized = false;
+  };
+
+  void layOutGrid();
+  void measureColumns();
+  int measured(int column) const;
+  bool isTextColumn(int column) const;
+  void shareWidth();
+  void layOutRows();
+  bool spanShownCells();
+  void fitSize();
+  int naturalWidth() const;
+  int rowsHeight() const;
+  void clicked(const QModelIndex& index);
+  void openCell(const QModelIndex& index, bool withList);
+  bool keepsRefused(QWidget* editor, QAbstractItemDelegate::EndEditHint hint);
+  void returnToEditor(QWidget* editor);
 
   GridModel* model_;
+  CellDelegate* delegate_;
+  GridHeader* columnHeader_;
+  GridHeader* rowHeader_;
+  std::vector<Column> columns_;
+  QStringList shownHeaders_;
+  int shownRows_ = 0;
+  int currentRow_ = 0;
+  bool isSharing_ = false;     // widths are set by us, not dragged
+  bool movingByKeys_ = false;  // no editor opens where the arrow keys pass
+  bool opening_ = false;
+  bool isReturning_ = false;  // to an editor with a refused text
 };
 
 }  // namespace gridbay::shell

@@ -1,25 +1,19 @@
 #include "shell/page_pane.h"
 
 #include <QApplication>
-#include <QButtonGroup>
-#include <QCheckBox>
-#include <QComboBox>
-#include <QFormLayout>
-#include <QKeyEvent>
 #include <QLabel>
-#include <QLineEdit>
-#include <QPushButton>
-#include <QRadioButton>
-#include <QSignalBlocker>
-#include <QToolButton>
+#include <QVBoxLayout>
+#include <unordered_map>
+#include <unordered_set>
 
+#include "shell/fields/frame.h"
 #include "shell/grid_view.h"
 
 namespace gridbay::shell {
 namespace {
 
 constexpr int kMargin = 16;
-constexpr const char* kMenuKeys = "FEVRWH";
+constexpr QMargins kFrameMargins(12, 10, 12, 12);
 
 QLabel* makeCaption(const QString& text, QWidget* parent) {
   auto* caption = new QLabel(text, parent);
@@ -27,44 +21,18 @@ QLabel* makeCaption(const QString& text, QWidget* parent) {
   font.setPointSizeF(font.pointSizeF() * 1.4);
   font.setBold(true);
   caption->setFont(font);
+  caption->setTextFormat(Qt::PlainText);
   return caption;
 }
 
-// An edit with a button on either side of its count; the up and down keys do the same.
-class CountEdit final : public QWidget {
- public:
-  CountEdit(Control& control, QWidget* parent, std::function<void(int)> step)
-      : QWidget(parent), edit(new QLineEdit(this)), step_(std::move(step)) {
-    auto* layout = new QHBoxLayout(this);
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->addWidget(edit);
-    edit->installEventFilter(this);
-    for (const int delta : {-1, 1}) {
-      auto* button = new QToolButton(this);
-      button->setText(delta < 0 ? "-" : "+");
-      button->setToolTip(tr("%1 to %2").arg(control.spinLowest).arg(control.spinHighest));
-      button->setFocusPolicy(Qt::NoFocus);
-      button->setAutoRepeat(true);
-      connect(button, &QToolButton::clicked, this, [this, delta] { step_(delta); });
-      layout->addWidget(button);
-    }
-    setFocusProxy(edit);
-  }
-
-  QLineEdit* edit;
-
- protected:
-  bool eventFilter(QObject*, QEvent* event) override {
-    if (event->type() != QEvent::KeyPress) return false;
-    const int key = static_cast<QKeyEvent*>(event)->key();
-    if (key != Qt::Key_Up && key != Qt::Key_Down) return false;
-    step_(key == Qt::Key_Up ? 1 : -1);
-    return true;
-  }
-
- private:
-  std::function<void(int)> step_;
-};
+QLabel* makeHeading(QWidget* parent) {
+  auto* heading = new QLabel(parent);
+  QFont font = heading->font();
+  font.setWeight(QFont::DemiBold);
+  heading->setFont(font);
+  heading->setTextFormat(Qt::PlainText);
+  return heading;
+}
 
 class Picture final : public QLabel {
  public:
@@ -90,30 +58,33 @@ PagePane::PagePane(QWidget* parent) : QScrollArea(parent) {
 }
 
 void PagePane::clear() {
-  bound_.clear();
+  if (form_ != nullptr) commit();
+  parts_.clear();
   form_ = nullptr;
-  usedKeys_ = kMenuKeys;
+  keys_ = {};
   delete takeWidget();
 }
 
-QVBoxLayout* PagePane::startPage(const QString& caption) {
+QWidget* PagePane::startPage(const QString& caption) {
   clear();
   auto* page = new QWidget(this);
   auto* layout = new QVBoxLayout(page);
   layout->setContentsMargins(kMargin, kMargin, kMargin, kMargin);
+  layout->setSpacing(kMargin - 4);
   layout->addWidget(makeCaption(caption, page));
-  return layout;
+  return page;
 }
 
 void PagePane::showText(const QString& caption, const QString& text) {
-  QVBoxLayout* layout = startPage(caption);
-  auto* body = new QLabel(text, layout->parentWidget());
+  QWidget* page = startPage(caption);
+  auto* body = new QLabel(text, page);
   body->setWordWrap(true);
   body->setTextFormat(Qt::MarkdownText);
   body->setTextInteractionFlags(Qt::TextBrowserInteraction);
+  auto* layout = static_cast<QVBoxLayout*>(page->layout());
   layout->addWidget(body);
   layout->addStretch();
-  setWidget(layout->parentWidget());
+  setWidget(page);
 }
 
 void PagePane::showPicture(const QString& path, const QString& text) {
@@ -122,157 +93,105 @@ void PagePane::showPicture(const QString& path, const QString& text) {
 }
 
 void PagePane::showForm(const QString& caption, Form& form) {
-  QVBoxLayout* layout = startPage(caption);
-  QWidget* page = layout->parentWidget();
+  QWidget* page = startPage(caption);
   form_ = &form;
-  auto* rows = new QFormLayout();
-  rows->setFieldGrowthPolicy(QFormLayout::ExpandingFieldsGrow);
-  layout->addLayout(rows);
-  bool hasGrid = false;
+  auto* body = new QWidget(page);
+  auto* bodyLayout = new FieldLayout(body);
+  bodyLayout->setContentsMargins(0, 0, 0, 0);
+  static_cast<QVBoxLayout*>(page->layout())->addWidget(body, 1);
+
+  std::unordered_set<const Control*> bodies;
+  for (const Control& control : form.controls()) bodies.insert(control.group);
+  std::unordered_map<const Control*, QWidget*> insides{{nullptr, body}};
   for (Control& control : form.controls()) {
-    QWidget* widget = makeWidget(control, page);
-    QLabel* label = nullptr;
-    QString text = QString::fromStdString(control.label);
-    if (control.kind == ControlKind::grid) {
-      widget->setAccessibleName(text);
-      layout->addWidget(widget, 1);
-      hasGrid = true;
-    } else if (control.kind == ControlKind::group || control.kind == ControlKind::check ||
-               control.kind == ControlKind::button) {
-      rows->addRow(widget);
-    } else {
-      label = new QLabel(page);
-      label->setBuddy(widget);
-      const bool takesFocus = control.kind == ControlKind::text || control.kind == ControlKind::dropDown;
-      if (takesFocus) text = withAccelerator(text);
-      rows->addRow(label, widget);
+    QWidget* inside = insides[control.group];
+    parts_.push_back(makePart(control, inside, bodies.contains(&control)));
+    const Part& part = parts_.back();
+    auto& layout = static_cast<FieldLayout&>(*inside->layout());
+    place(part, layout, control.beside);
+    if (part.field != nullptr) connectField(*part.field, layout);
+    if (bodies.contains(&control)) {
+      auto* frameLayout = new FieldLayout(part.widget);
+      frameLayout->setContentsMargins(kFrameMargins);
+      insides[&control] = part.widget;
     }
-    bound_.push_back({&control, widget, label, text});
   }
-  if (!hasGrid) layout->addStretch();
-  setWidget(page);
+  setTabOrder();
   refresh();
+  setWidget(page);
 }
 
-// A label's own key, or the first letter that no other label of the page and no menu has.
-QString PagePane::withAccelerator(const QString& text) {
-  const qsizetype own = text.indexOf('&');
-  if (own >= 0 && own + 1 < text.size()) {
-    usedKeys_ += text[own + 1].toUpper();
-    return text;
+PagePane::Part PagePane::makePart(Control& control, QWidget* parent, bool hasBody) {
+  if (control.kind == ControlKind::group)
+    return {&control, hasBody ? static_cast<QWidget*>(new Frame(parent)) : makeHeading(parent)};
+  if (control.kind == ControlKind::grid) {
+    auto* grid = new GridView(*control.grid, parent);
+    // What a cell changes may show in other controls.
+    connect(grid, &GridView::edited, this, &PagePane::refresh);
+    return {&control, grid, nullptr, grid};
   }
-  for (qsizetype i = 0; i < text.size(); ++i) {
-    const QChar letter = text[i].toUpper();
-    if (!letter.isLetter() || letter.unicode() > 127 || usedKeys_.contains(letter)) continue;
-    usedKeys_ += letter;
-    return QString(text).insert(i, '&');
-  }
-  return text;
+  Part part{&control, nullptr, makeField(control, keys_, parent)};
+  part.widget = part.field->input();
+  return part;
 }
 
-QWidget* PagePane::makeWidget(Control& control, QWidget* parent) {
-  const QString text = QString::fromStdString(control.label).trimmed();
-  switch (control.kind) {
-    case ControlKind::group:
-      return new QLabel("<b>" + text.toHtmlEscaped() + "</b>", parent);
-    case ControlKind::label:
-      return new QLabel(parent);
-    case ControlKind::grid:
-      return new GridView(*control.grid, parent);
-    case ControlKind::button: {
-      auto* button = new QPushButton(text == "..." ? text : withAccelerator(text), parent);
-      connect(button, &QPushButton::clicked, this, [this, &control] { changed(control); });
-      return button;
-    }
-    case ControlKind::check: {
-      auto* box = new QCheckBox(withAccelerator(text), parent);
-      connect(box, &QCheckBox::toggled, this, [this, &control](bool on) {
-        control.index = on ? 1 : 0;
-        changed(control);
-      });
-      return box;
-    }
-    case ControlKind::dropDown: {
-      auto* list = new QComboBox(parent);
-      connect(list, &QComboBox::activated, this, [this, &control](int index) {
-        control.index = index;
-        changed(control);
-      });
-      return list;
-    }
-    case ControlKind::radio:
-      return makeRadio(control, parent);
-    case ControlKind::text:
-      break;
+void PagePane::place(const Part& part, FieldLayout& layout, bool beside) {
+  using Kind = FieldLayout::Kind;
+  if (part.field == nullptr) {
+    const bool isHeading = qobject_cast<QLabel*>(part.widget) != nullptr;
+    return layout.addField(isHeading ? Kind::free : Kind::block, nullptr, part.widget, nullptr, beside);
   }
-  return makeEdit(control, parent);
+  const ControlKind kind = part.control->kind;
+  const bool isFree =
+      kind == ControlKind::check || kind == ControlKind::button ||
+      ((kind == ControlKind::radio || kind == ControlKind::label) && nameOf(*part.control).isEmpty());
+  layout.addField(isFree ? Kind::free : Kind::labelled, part.field->label(), part.widget, part.field->unit(),
+                  beside);
 }
 
-QWidget* PagePane::makeRadio(Control& control, QWidget* parent) {
-  auto* box = new QWidget(parent);
-  auto* layout = new QVBoxLayout(box);
-  layout->setContentsMargins(0, 0, 0, 0);
-  auto* group = new QButtonGroup(box);
-  for (std::size_t i = 0; i < control.choices.size(); ++i) {
-    auto* button = new QRadioButton(withAccelerator(QString::fromStdString(control.choices[i])), box);
-    group->addButton(button, static_cast<int>(i));
-    layout->addWidget(button);
-  }
-  connect(group, &QButtonGroup::idClicked, this, [this, &control](int index) {
-    control.index = index;
-    changed(control);
+void PagePane::connectField(Field& field, FieldLayout& layout) {
+  connect(&field, &Field::changed, this, [this, &field] { changed(field.control()); });
+  connect(&field, &Field::stepped, this, [this, &field](int delta) {
+    form_->spin(field.control(), delta);
+    refresh();
   });
-  return box;
-}
-
-QWidget* PagePane::makeEdit(Control& control, QWidget* parent) {
-  QLineEdit* edit = nullptr;
-  QWidget* widget = nullptr;
-  if (control.onSpin) {
-    auto* count = new CountEdit(control, parent, [this, &control](int delta) {
-      form_->spin(control, delta);
-      refresh();
-    });
-    edit = count->edit;
-    widget = count;
-  } else {
-    edit = new QLineEdit(parent);
-    widget = edit;
-  }
-  // A number needs no more room than its digits; a text may be long.
-  if (!std::holds_alternative<std::string*>(control.variable)) {
-    for (QWidget* each : {widget, static_cast<QWidget*>(edit)})
-      each->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed);
-  }
-  edit->installEventFilter(this);
-  connect(edit, &QLineEdit::editingFinished, this, [this, edit, &control] {
-    if (edit->text().toStdString() == control.text) return;
-    control.text = edit->text().toStdString();
-    changed(control);
+  connect(&field, &Field::explained, this,
+          [&layout, &field](QLabel* text) { layout.addMessage(field.input(), text); });
+  connect(&field, &Field::returnWanted, this, [this, input = field.input()] {
+    // Not at once: the focus is on its way to where the user has clicked. Out of the page he may go.
+    QMetaObject::invokeMethod(
+        input,
+        [this, input] {
+          const QWidget* now = QApplication::focusWidget();
+          if (now != nullptr && isAncestorOf(now)) input->setFocus(Qt::OtherFocusReason);
+        },
+        Qt::QueuedConnection);
   });
-  return widget;
 }
 
-// An edit keeps the keys of undo and redo to itself only while there is typing of its own to take back.
-bool PagePane::eventFilter(QObject* watched, QEvent* event) {
-  const auto* edit = qobject_cast<QLineEdit*>(watched);
-  if (edit != nullptr && event->type() == QEvent::ShortcutOverride) {
-    const auto* key = static_cast<QKeyEvent*>(event);
-    const bool isUndo = key->matches(QKeySequence::Undo) && !edit->isUndoAvailable();
-    const bool isRedo = key->matches(QKeySequence::Redo) && !edit->isRedoAvailable();
-    if (isUndo || isRedo) {
-      event->ignore();
-      return true;
+void PagePane::setTabOrder() {
+  QWidget* last = nullptr;
+  for (const Part& part : parts_) {
+    for (QWidget* input : part.control->kind == ControlKind::radio
+                              ? part.widget->findChildren<QWidget*>(Qt::FindDirectChildrenOnly)
+                              : QList<QWidget*>{part.widget}) {
+      if (input->focusPolicy() == Qt::NoFocus) continue;
+      if (last != nullptr) QWidget::setTabOrder(last, input);
+      last = input;
     }
   }
-  return QScrollArea::eventFilter(watched, event);
 }
 
 void PagePane::commit() {
   QWidget* focused = QApplication::focusWidget();
   if (focused == nullptr || !isAncestorOf(focused)) return;
-  focused->clearFocus();
-  focused->setFocus();
+  for (const Part& part : parts_) {
+    if (part.field != nullptr && part.widget == focused) {
+      part.field->commit();
+      return;
+    }
+    if (part.grid != nullptr && part.grid->isAncestorOf(focused)) return part.grid->commitEdit();
+  }
 }
 
 void PagePane::changed(Control& control) {
@@ -281,53 +200,45 @@ void PagePane::changed(Control& control) {
   refresh();
 }
 
+// A frame is seen while anything in it is.
 void PagePane::refresh() {
+  if (refreshing_ || form_ == nullptr) return;
   refreshing_ = true;
-  for (const Bound& bound : bound_) refresh(bound);
+  std::unordered_set<const Control*> filled;
+  for (auto part = parts_.rbegin(); part != parts_.rend(); ++part) {
+    const Control& control = *part->control;
+    const bool isFrame = qobject_cast<Frame*>(part->widget) != nullptr;
+    const bool isShown = control.visible && (!isFrame || filled.contains(&control));
+    if (isShown) filled.insert(control.group);
+    if (part->field == nullptr) refreshGroup(*part, isShown);
+  }
+  for (const Part& part : parts_) {
+    if (part.field != nullptr) part.field->refresh();
+  }
   refreshing_ = false;
 }
 
-void PagePane::refresh(const Bound& bound) {
-  const Control& control = *bound.control;
-  const QSignalBlocker blocker(bound.widget);
-  bound.widget->setVisible(control.visible);
-  bound.widget->setEnabled(control.enabled);
-  bound.widget->setToolTip(QString::fromStdString(control.toolTip));
-  if (bound.label != nullptr) {
-    const QString unit =
-        control.unit.empty() ? QString() : QString(" [%1]").arg(QString::fromStdString(control.unit));
-    bound.label->setText(bound.text + unit);
-    bound.label->setVisible(control.visible);
+// A frame, heading or table.
+void PagePane::refreshGroup(const Part& part, bool isShown) {
+  const Control& control = *part.control;
+  const QString caption = QString::fromStdString(control.label).trimmed();
+  if (auto* frame = qobject_cast<Frame*>(part.widget)) {
+    if (frame->title() != caption) frame->setTitle(caption);
+  } else if (auto* heading = qobject_cast<QLabel*>(part.widget)) {
+    if (heading->text() != caption) heading->setText(caption);
   }
-  const QString text = QString::fromStdString(control.text);
-  if (control.kind == ControlKind::label) {
-    qobject_cast<QLabel*>(bound.widget)->setText(text);
-  } else if (control.kind == ControlKind::text) {
-    auto* edit = qobject_cast<QLineEdit*>(control.onSpin ? bound.widget->focusProxy() : bound.widget);
-    if (edit->text() != text || edit->isModified()) edit->setText(text);
-    edit->setReadOnly(control.readOnly);
-  } else if (control.kind == ControlKind::check) {
-    qobject_cast<QCheckBox*>(bound.widget)->setChecked(control.index == 1);
-  } else if (control.kind == ControlKind::dropDown) {
-    auto* list = qobject_cast<QComboBox*>(bound.widget);
-    list->clear();
-    for (const std::string& choice : control.choices) list->addItem(QString::fromStdString(choice));
-    list->setCurrentIndex(control.index);
-  } else if (control.kind == ControlKind::radio) {
-    auto* group = bound.widget->findChild<QButtonGroup*>();
-    for (QAbstractButton* button : group->buttons()) {
-      const int id = group->id(button);
-      button->setChecked(id == control.index);
-      button->setEnabled(control.choiceEnabled[static_cast<std::size_t>(id)]);
-    }
-  } else if (control.kind == ControlKind::grid) {
-    static_cast<GridView*>(bound.widget)->cells().refresh();
-  }
+  if (part.widget->isHidden() == isShown) part.widget->setVisible(isShown);
+  part.widget->setEnabled(control.enabled);
+  const QString tip = QString::fromStdString(control.toolTip);
+  if (part.widget->toolTip() != tip) part.widget->setToolTip(tip);
+  const QString name = nameOf(control);
+  if (part.widget->accessibleName() != name) part.widget->setAccessibleName(name);
+  if (part.grid != nullptr) part.grid->cells().refresh();
 }
 
 QWidget* PagePane::widgetOf(const QString& label, int n) const {
-  for (const Bound& bound : bound_) {
-    if (QString::fromStdString(bound.control->label) == label && --n == 0) return bound.widget;
+  for (const Part& part : parts_) {
+    if (QString::fromStdString(part.control->label) == label && --n == 0) return part.widget;
   }
   return nullptr;
 }

@@ -1,14 +1,16 @@
 #pragma once
 
-#include <QLabel>
 #include <QScrollArea>
-#include <QVBoxLayout>
-#include <functional>
+#include <memory>
 #include <vector>
 
-#include "pages/form.h"
+#include "shell/fields/accelerators.h"
+#include "shell/fields/field.h"
+#include "shell/fields/field_layout.h"
 
 namespace gridbay::shell {
+
+class GridView;
 
 // The one renderer of all pages: builds widgets from a form, hands what the user does to it, and shows what
 // it says.
@@ -21,36 +23,34 @@ class PagePane final : public QScrollArea {
   void showText(const QString& caption, const QString& text);
   // A picture in the whole pane, or a text in its middle where there is no picture.
   void showPicture(const QString& path, const QString& text);
-  // Shows nothing: to be called before the form that is shown goes.
+  // Hands over what is typed and shows nothing: to be called before the form that is shown goes.
   void clear();
-  // Brings the widgets in line with the form.
+  // Brings the widgets in line with the form. Where the user is at work, nothing moves.
   void refresh();
   // Hands over what is typed and not yet entered.
   void commit();
-  // The widget of the n-th control of a label; null when there is none.
+  // The input of the n-th control of a label; null when there is none.
   QWidget* widgetOf(const QString& label, int n = 1) const;
 
- protected:
-  bool eventFilter(QObject* watched, QEvent* event) override;
-
  private:
-  struct Bound {
+  // A control with what shows it: a field, a table, a frame, or a heading.
+  struct Part {
     Control* control;
     QWidget* widget;
-    QLabel* label;
-    QString text;  // of the label, with its accelerator
+    std::unique_ptr<Field> field = {};
+    GridView* grid = nullptr;
   };
-  QWidget* makeWidget(Control& control, QWidget* parent);
-  QWidget* makeEdit(Control& control, QWidget* parent);
-  QWidget* makeRadio(Control& control, QWidget* parent);
-  QVBoxLayout* startPage(const QString& caption);
-  QString withAccelerator(const QString& text);
+  Part makePart(Control& control, QWidget* parent, bool hasBody);
+  void place(const Part& part, FieldLayout& layout, bool beside);
+  void connectField(Field& field, FieldLayout& layout);
+  void setTabOrder();
+  void refreshGroup(const Part& part, bool isShown);
+  QWidget* startPage(const QString& caption);
   void changed(Control& control);
-  void refresh(const Bound& bound);
 
   Form* form_ = nullptr;
-  std::vector<Bound> bound_;
-  QString usedKeys_;
+  std::vector<Part> parts_;
+  Accelerators keys_;
   bool refreshing_ = false;
 };
 

@@ -3,6 +3,11 @@
 #include <gmock/gmock.h>
 
 #include "basic/area_description.h"
+#include "basic/bathymetry.h"
+#include "basic/simulation_period.h"
+#include "basic/source_sink.h"
+#include "tests/support/grids.h"
+#include "tests/support/model.h"
 #include "tests/support/pages.h"
 #include "tests/support/temporary_folder.h"
 
@@ -95,6 +100,60 @@ TEST_F(SetupDoc, APageFollowsTheModelWhileItIsOpen) {
   other.reset();
   page->UpdateDoc();
   EXPECT_EQ(makePage("CNowhereDlg", document), nullptr);
+}
+
+TEST_F(SetupDoc, AnExceptionInAnEditIsToldAndTheModelStays) {
+  document.root().areaDescription->dryingDepth = 0.5F;
+  document.RecordEdit(PageId::floodAndDry, "before");
+  EXPECT_FALSE(document.Attempt([this] {
+    document.root().areaDescription->dryingDepth = 0.7F;
+    document.root().sourceSink->SetNoSources(3);
+    throw std::invalid_argument("There is no item 4");
+  }));
+  EXPECT_EQ(document.root().areaDescription->dryingDepth, 0.5F);
+  EXPECT_EQ(document.root().sourceSink->GetCount(), 0);
+  ASSERT_EQ(host.texts.size(), 1U);
+  EXPECT_NE(host.texts.front().find("There is no item 4"), std::string::npos);
+  EXPECT_EQ(document.UndoStep()->name, "before");
+}
+
+TEST_F(SetupDoc, WhatAHotStartFileChangesIsAStepOfItsOwn) {
+  test::GridSpec spec;
+  spec.dataType = 11;
+  spec.items = 2;
+  spec.time.type = TsbTimeAxisType::calendarEquidistant;
+  spec.time.start = {2001, 2, 3, 4, 5, 6};
+  spec.time.step = 12;
+  test::writeHotStart(folder.file("hot.tsb2"), spec, test::flat, 0, 3, 3);
+  document.root().bathymetry->hotStart = 1;
+  document.root().bathymetry->GetArea(1)->fileName = folder.file("hot.tsb2");
+  document.RecordEdit(PageId::bathymetry, "before");
+  const DateTime before = document.root().simulationPeriod->start;
+  int updates = 0;
+  document.AddView(this, [&updates] { ++updates; });
+  ValidationList messages;
+  document.ValidateData(messages);
+  ASSERT_NE(document.root().simulationPeriod->start, before)
+      << ::testing::PrintToString(test::textsOf(messages));
+  EXPECT_TRUE(document.IsModified());
+  EXPECT_EQ(updates, 1);
+  ASSERT_NE(document.UndoStep(), nullptr);
+  EXPECT_EQ(document.UndoStep()->name, "Validation");
+  document.Undo();
+  EXPECT_EQ(document.root().simulationPeriod->start, before);
+  EXPECT_EQ(document.UndoStep()->name, "before");
+  document.RemoveView(this);
+}
+
+TEST_F(SetupDoc, ReadingGridsIsNoEdit) {
+  test::writeGrid(folder.file("grid.tsb2"), {});
+  document.root().bathymetry->GetArea(1)->fileName = folder.file("grid.tsb2");
+  ASSERT_TRUE(document.OnSaveDocument(folder.file("s.v27")));
+  ValidationList messages;
+  document.ValidateData(messages);
+  EXPECT_GT(document.root().bathymetry->GetArea(1)->noJ, 0);
+  EXPECT_FALSE(document.IsModified());
+  EXPECT_EQ(document.UndoStep(), nullptr);
 }
 
 }  // namespace

@@ -1,0 +1,96 @@
+#pragma once
+
+#include <QButtonGroup>
+#include <QCheckBox>
+#include <QComboBox>
+#include <QPushButton>
+
+#include "shell/fields/field.h"
+
+namespace gridbay::shell {
+
+// A list that the wheel changes only where the user is, so that a page that is scrolled changes nothing.
+class ChoiceList final : public QComboBox {
+  Q_OBJECT
+ public:
+  explicit ChoiceList(QWidget* parent);
+
+ protected:
+  void wheelEvent(QWheelEvent* event) override;
+};
+
+class DropDownField final : public Field {
+  Q_OBJECT
+ public:
+  DropDownField(Control& control, Accelerators& keys, QWidget* parent);
+  QWidget* input() const override { return list_; }
+
+ protected:
+  void show() override;
+
+ private:
+  ChoiceList* list_;
+  std::vector<std::string> shownChoices_;
+};
+
+class RadioField final : public Field {
+  Q_OBJECT
+ public:
+  RadioField(Control& control, Accelerators& keys, QWidget* parent);
+  QWidget* input() const override { return box_; }
+
+ protected:
+  void show() override;
+
+ private:
+  void makeButtons();
+
+  QWidget* box_;
+  QButtonGroup* group_ = nullptr;
+  QStringList captions_;  // with their letters
+  std::vector<std::string> shownChoices_;
+};
+
+class CheckField final : public Field {
+  Q_OBJECT
+ public:
+  CheckField(Control& control, Accelerators& keys, QWidget* parent);
+  QWidget* input() const override { return box_; }
+
+ protected:
+  void show() override;
+  void setCaption(const QString& text) override { box_->setText(text); }
+
+ private:
+  QCheckBox* box_;
+};
+
+class ButtonField final : public Field {
+  Q_OBJECT
+ public:
+  ButtonField(Control& control, Accelerators& keys, QWidget* parent);
+  QWidget* input() const override { return button_; }
+
+ protected:
+  void show() override {}
+  void setCaption(const QString& text) override;
+
+ private:
+  QPushButton* button_;
+};
+
+// A value that is only read.
+class LabelField final : public Field {
+  Q_OBJECT
+ public:
+  LabelField(Control& control, Accelerators& keys, QWidget* parent);
+  QWidget* input() const override { return value_; }
+
+ protected:
+  void show() override;
+
+ private:
+  QLabel* value_;
+};
+
+}  // namespace gridbay::shell
