@@ -37,8 +37,11 @@ class GridModel final : public QAbstractTableModel {
 
  private:
   CV27SetupGridWnd& grid_;
+  void showCounts(int rows, int columns);
+
   int shownRows_ = 0;
   int shownColumns_ = 0;
+  bool isRefreshing_ = false;
 };
 
 // The texts of the choices that a multiple choice cell holds.

@@ -326,6 +326,7 @@ void GridView::commitData(QWidget* editor) {
 }
 
 void GridView::closeEditor(QWidget* editor, QAbstractItemDelegate::EndEditHint hint) {
+  if (delegate_->isEditorLost()) return delegate_->forgetEditor();
   if (keepsRefused(editor, hint)) return;
   const bool isEntered = hint == QAbstractItemDelegate::SubmitModelCache;
   const bool hadFocus = editor->hasFocus() || qobject_cast<MultiChoiceEditor*>(editor) != nullptr;

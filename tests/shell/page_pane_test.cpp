@@ -526,6 +526,38 @@ class PagePaneTest : public QObject {
     QCOMPARE(input("A:")->text(), QString("8"));
   }
 
+  void aCellThatTakesItsOwnRowAway() {
+    FreeGrid grid({{"Value", 60}, {"More", 60}}, 4);
+    Form form;
+    form.DDX_Control("Grid", grid);
+    form.DDX_VDedit("A:", a_, 0);
+    grid.accepts = [&](int, int, std::string_view) {
+      grid.setRows(1);
+      return false;
+    };
+    const auto shown = show(form);
+    auto* view = input<GridView>("Grid");
+    QTest::mouseClick(view->viewport(), Qt::LeftButton, Qt::NoModifier,
+                      view->visualRect(view->cells().index(3, 1)).center());
+    QTest::keyClicks(QApplication::focusWidget(), "5");
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
+    QCoreApplication::processEvents();
+    QCOMPARE(view->cells().rowCount(), 1);
+    QCOMPARE(grid.currentRows.back(), 1);
+  }
+
+  void aDialogIsAsLargeAsItsForm() {
+    FreeGrid grid({{"Value", 60}, {"File name", 160}, {"Title", 160}}, 12);
+    Form form;
+    form.DDX_Control("Grid", grid);
+    const auto shown = show(form);
+    const QSize wanted = pane_->sizeHint();
+    QVERIFY(wanted.height() > 300 && wanted.width() > 400);
+    grid.setRows(1000);
+    pane_->refresh();
+    QVERIFY(pane_->sizeHint().height() <= pane_->screen()->availableSize().height());
+  }
+
   void aPageIsShownInTime() {
     Form form;
     std::deque<double> values(60, 1.5);
@@ -590,8 +622,42 @@ class PagePaneTest : public QObject {
       grids.show({});
       pane_->showForm("Grids", grids);
       save("grids");
+      test::GridOfAllKinds kinds;
+      kinds.accepts = [](int, int, std::string_view) { return false; };
+      Form cells;
+      cells.DDX_Control("Cells", kinds);
+      std::string start = "2026-03-21 06:00:00";
+      cells.DDX_Text("Start:", start).kind = ControlKind::dateTime;
+      cells.show({});
+      pane_->showForm("Cells", cells);
+      window_->activateWindow();
+      QTest::qWait(50);
+      auto* view = input<GridView>("Cells");
+      const auto click = [view](int col) {
+        QTest::mouseClick(view->viewport(), Qt::LeftButton, Qt::NoModifier,
+                          view->visualRect(view->cells().index(0, col - 1)).center());
+      };
+      click(test::GridOfAllKinds::kItems);
+      QTest::qWait(50);
+      const auto savePopup = [&, named = name](const char* what) {
+        if (QWidget* popup = QApplication::activePopupWidget()) {
+          popup->grab().save(QString("%1/%2-%3-%4.png").arg(folder, what, named, at.c_str()));
+          popup->close();
+        }
+      };
+      savePopup("choices");
+      click(test::GridOfAllKinds::kType);
+      QTest::qWait(50);
+      savePopup("list");
+      qobject_cast<DateTimeEdit*>(input("Start:"))->openCalendar();
+      QTest::qWait(50);
+      savePopup("calendar");
+      click(1);
+      QTest::keyClicks(QApplication::focusWidget(), "nowhere");
+      QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
+      save("refused");
+      pane_->clear();
     }
-    pane_->clear();
   }
 };
 
