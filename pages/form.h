@@ -149,6 +149,7 @@ struct Control {
 class Form {
  public:
   Form() = default;
+  virtual ~Form() = default;
   Form(const Form&) = delete;
   Form& operator=(const Form&) = delete;
 
@@ -235,8 +236,9 @@ class Form {
   void SetDefaultHandler(std::function<void()> handler) { onAnyChange_ = std::move(handler); }
   // The user has changed a control, or stepped its count: its handler runs, and `acting` is the control for
   // as long, so that what it does has a name.
-  void act(Control& control);
-  void spin(Control& control, int delta);
+  // These two are what a renderer calls, which links nothing of this.
+  virtual void act(Control& control);
+  virtual void spin(Control& control, int delta);
   // Around what an act does; without one it is simply done.
   void SetGuard(std::function<void(const std::function<void()>&)> guard) { guard_ = std::move(guard); }
   const Control* acting() const { return acting_; }

@@ -45,6 +45,7 @@ QPalette paletteOf(bool dark) {
 void setAppearance(Appearance appearance) {
   if (appearance == Appearance::desktop) {
     QApplication::setPalette(QPalette());
+    QToolTip::setPalette(QPalette());
     return;
   }
   const QPalette palette = paletteOf(appearance == Appearance::dark);

@@ -103,6 +103,7 @@ int CellDelegate::aroundText(CellKind kind, const QFontMetrics& metrics) {
 QWidget* CellDelegate::createEditor(QWidget* parent, const QStyleOptionViewItem&,
                                     const QModelIndex& index) const {
   const CellStyle cell = gridOf(index).style(index);
+  edited_ = index;
   switch (cell.kind) {
     case CellKind::dropDown:
     case CellKind::mapProjection:

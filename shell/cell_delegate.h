@@ -17,6 +17,8 @@ class CellDelegate final : public QStyledItemDelegate {
   // The editor that is open, or null.
   QWidget* editor() const { return editor_; }
   void forgetEditor() { editor_ = nullptr; }
+  // Whether the cell of the editor has gone, and the editor with it.
+  bool isEditorLost() const { return editor_ != nullptr && !edited_.isValid(); }
   // The button that is held down.
   void setPressed(const QModelIndex& index) { pressed_ = index; }
   const QPersistentModelIndex& pressed() const { return pressed_; }
@@ -41,6 +43,7 @@ class CellDelegate final : public QStyledItemDelegate {
   QWidget* makeMultiChoice(QWidget* parent, const CellStyle& cell) const;
 
   mutable QPointer<QWidget> editor_;
+  mutable QPersistentModelIndex edited_;
   QPersistentModelIndex pressed_;
 };
 

@@ -7,6 +7,11 @@
 #include <algorithm>
 
 namespace gridbay::shell {
+namespace {
+
+constexpr int kSpacing = 2;  // around each choice
+
+}  // namespace
 
 MultiChoiceEditor::MultiChoiceEditor(const std::vector<std::string>& choices, QWidget* parent)
     : QWidget(parent), popup_(new QFrame(this, Qt::Popup)), list_(new QListWidget(popup_)) {
@@ -15,6 +20,7 @@ MultiChoiceEditor::MultiChoiceEditor(const std::vector<std::string>& choices, QW
   layout->setContentsMargins(1, 1, 1, 1);
   layout->addWidget(list_);
   list_->setFrameShape(QFrame::NoFrame);
+  list_->setSpacing(kSpacing);
   for (const std::string& choice : choices) {
     auto* item = new QListWidgetItem(QString::fromStdString(choice).trimmed(), list_);
     item->setFlags(Qt::ItemIsEnabled | Qt::ItemIsSelectable | Qt::ItemIsUserCheckable);
@@ -52,7 +58,7 @@ void MultiChoiceEditor::open() {
   const int rows = std::clamp(list_->count(), 1, kRows);
   const int scroll = list_->count() > kRows ? 24 : 0;
   const QSize size(std::max(width(), list_->sizeHintForColumn(0) + 2 * kAround + scroll),
-                   rows * std::max(1, list_->sizeHintForRow(0)) + kAround);
+                   rows * (std::max(1, list_->sizeHintForRow(0)) + 2 * kSpacing) + kAround);
   popup_->resize(size);
   QPoint at = mapToGlobal(QPoint(0, height()));
   const QRect room = screen()->availableGeometry();

@@ -114,14 +114,17 @@ bool DocumentTab::editForm(std::string_view title, Form& form, const std::functi
   dialog.setWindowTitle(QString::fromUtf8(title.data(), static_cast<qsizetype>(title.size())));
   auto* layout = new QVBoxLayout(&dialog);
   auto* pane = new PagePane(&dialog);
-  pane->showForm(dialog.windowTitle(), form);
+  pane->showForm({}, form);
   auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, &dialog);
   connect(buttons, &QDialogButtonBox::accepted, &dialog, [&] {
     pane->commit();
     const std::string text = fault();
+    pane->refresh();
+    const bool isMarked =
+        std::ranges::any_of(form.controls(), [](const Control& control) { return !control.fault.empty(); });
     if (text.empty()) {
       dialog.accept();
-    } else {
+    } else if (!isMarked) {
       show(text);
     }
   });

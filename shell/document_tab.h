@@ -87,6 +87,8 @@ class DocumentTab final : public QSplitter, public SetupHost {
 
   void show(const std::string& text) override;
   bool choose(CVdFileSelectorDlg& selector) override;
+  // The field itself shows what is wrong with it.
+  void showFieldFault(const std::string&) override {}
   bool askYesNo(const std::string& question) override;
   bool chooseFile(std::string_view filter, std::string_view extension, std::string* name) override;
   bool chooseSaveFile(std::string_view filter, std::string_view extension, std::string* name) override;

@@ -3,6 +3,7 @@
 #include <QApplication>
 #include <QFont>
 #include <QPalette>
+#include <QPointer>
 
 namespace gridbay::shell {
 
@@ -83,35 +84,46 @@ Qt::ItemFlags GridModel::flags(const QModelIndex& index) const {
   return flags;
 }
 
+// What a change leads to may close the grid, so that nothing is done after it then.
 bool GridModel::setData(const QModelIndex& index, const QVariant& value, int role) {
   if (role != Qt::EditRole && role != Qt::CheckStateRole) return false;
   if (!grid_.IsEnabled()) return false;
   const QString text = role == Qt::EditRole ? value.toString() : value.toInt() == Qt::Checked ? "1" : "0";
+  const QPointer<GridModel> self(this);
   const bool stored = grid_.StoreStyleRowCol(index.row() + 1, index.column() + 1, text.toStdString()) != 0;
-  refresh();
-  if (stored) emit edited();
+  if (self != nullptr) refresh();
+  if (self != nullptr && stored) emit edited();
   return stored;
 }
 
 void GridModel::press(const QModelIndex& index) {
   if (!grid_.IsEnabled()) return;
+  const QPointer<GridModel> self(this);
   grid_.OnClickedButtonRowCol(index.row() + 1, index.column() + 1);
-  refresh();
-  emit edited();
+  if (self != nullptr) refresh();
+  if (self != nullptr) emit edited();
 }
 
 bool GridModel::browse(const QModelIndex& index) {
   if (!grid_.IsEnabled()) return false;
+  const QPointer<GridModel> self(this);
   const bool browsed = grid_.ProcessKeys(GridKey::browse, index.row() + 1, index.column() + 1);
-  if (!browsed) return false;
-  refresh();
-  emit edited();
-  return true;
+  if (self != nullptr && browsed) refresh();
+  if (self != nullptr && browsed) emit edited();
+  return browsed;
 }
 
+// Rows that go may move the current cell, and who hears of that may refresh in turn.
 void GridModel::refresh() {
-  const int rows = grid_.GetRowCount();
-  const int columns = grid_.GetColCount();
+  if (isRefreshing_) return;
+  isRefreshing_ = true;
+  showCounts(grid_.GetRowCount(), grid_.GetColCount());
+  isRefreshing_ = false;
+  if (shownRows_ > 0 && shownColumns_ > 0)
+    emit dataChanged(index(0, 0), index(shownRows_ - 1, shownColumns_ - 1));
+}
+
+void GridModel::showCounts(int rows, int columns) {
   if (columns > shownColumns_) {
     beginInsertColumns({}, shownColumns_, columns - 1);
     shownColumns_ = columns;
@@ -130,8 +142,6 @@ void GridModel::refresh() {
     shownRows_ = rows;
     endRemoveRows();
   }
-  if (shownRows_ > 0 && shownColumns_ > 0)
-    emit dataChanged(index(0, 0), index(shownRows_ - 1, shownColumns_ - 1));
 }
 
 }  // namespace gridbay::shell

@@ -30,6 +30,8 @@ class GridModel final : public QAbstractTableModel {
   // The grid or the model behind it has changed. Rows and columns come and go at the end, so that the current
   // cell, the selection and what is scrolled to stay.
   void refresh();
+  // Rows and columns are coming and going.
+  bool isRefreshing() const { return isRefreshing_; }
 
  signals:
   // A cell has changed the model.
@@ -37,8 +39,11 @@ class GridModel final : public QAbstractTableModel {
 
  private:
   CV27SetupGridWnd& grid_;
+  void showCounts(int rows, int columns);
+
   int shownRows_ = 0;
   int shownColumns_ = 0;
+  bool isRefreshing_ = false;
 };
 
 // The texts of the choices that a multiple choice cell holds.

@@ -291,8 +291,9 @@ void GridView::commitEdit() {
 
 bool GridView::edit(const QModelIndex& index, EditTrigger trigger, QEvent* event) {
   if (isReturning_) return false;
-  if (trigger == CurrentChanged && (movingByKeys_ || QApplication::mouseButtons() != Qt::NoButton))
-    return false;
+  const bool isOnItsWay =
+      movingByKeys_ || model_->isRefreshing() || QApplication::mouseButtons() != Qt::NoButton;
+  if (trigger == CurrentChanged && isOnItsWay) return false;
   if (!opening_ && index.isValid() && model_->style(index).kind == CellKind::multiChoice) {
     if (trigger == EditKeyPressed) openCell(index, true);
     return trigger == EditKeyPressed;
@@ -326,6 +327,8 @@ void GridView::commitData(QWidget* editor) {
 }
 
 void GridView::closeEditor(QWidget* editor, QAbstractItemDelegate::EndEditHint hint) {
+  // Its cell may have gone with what was stored, and the editor with that.
+  if (delegate_->isEditorLost()) return delegate_->forgetEditor();
   if (keepsRefused(editor, hint)) return;
   const bool isEntered = hint == QAbstractItemDelegate::SubmitModelCache;
   const bool hadFocus = editor->hasFocus() || qobject_cast<MultiChoiceEditor*>(editor) != nullptr;

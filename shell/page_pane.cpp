@@ -2,6 +2,8 @@
 
 #include <QApplication>
 #include <QLabel>
+#include <QScreen>
+#include <QStyle>
 #include <QVBoxLayout>
 #include <unordered_map>
 #include <unordered_set>
@@ -71,7 +73,7 @@ QWidget* PagePane::startPage(const QString& caption) {
   auto* layout = new QVBoxLayout(page);
   layout->setContentsMargins(kMargin, kMargin, kMargin, kMargin);
   layout->setSpacing(kMargin - 4);
-  layout->addWidget(makeCaption(caption, page));
+  if (!caption.isEmpty()) layout->addWidget(makeCaption(caption, page));
   return page;
 }
 
@@ -163,7 +165,9 @@ void PagePane::connectField(Field& field, FieldLayout& layout) {
         input,
         [this, input] {
           const QWidget* now = QApplication::focusWidget();
-          if (now != nullptr && isAncestorOf(now)) input->setFocus(Qt::OtherFocusReason);
+          if (now == nullptr || !isAncestorOf(now)) return;
+          input->setFocus(Qt::OtherFocusReason);
+          ensureWidgetVisible(input);
         },
         Qt::QueuedConnection);
   });
@@ -234,6 +238,12 @@ void PagePane::refreshGroup(const Part& part, bool isShown) {
   const QString name = nameOf(control);
   if (part.widget->accessibleName() != name) part.widget->setAccessibleName(name);
   if (part.grid != nullptr) part.grid->cells().refresh();
+}
+
+QSize PagePane::sizeHint() const {
+  if (widget() == nullptr) return QScrollArea::sizeHint();
+  const int scroll = style()->pixelMetric(QStyle::PM_ScrollBarExtent);
+  return (widget()->sizeHint() + QSize(scroll, 0)).boundedTo(screen()->availableSize() * 0.75);
 }
 
 QWidget* PagePane::widgetOf(const QString& label, int n) const {

@@ -19,6 +19,7 @@ class PagePane final : public QScrollArea {
  public:
   explicit PagePane(QWidget* parent);
 
+  // With no caption there is none above the form.
   void showForm(const QString& caption, Form& form);
   void showText(const QString& caption, const QString& text);
   // A picture in the whole pane, or a text in its middle where there is no picture.
@@ -31,6 +32,9 @@ class PagePane final : public QScrollArea {
   void commit();
   // The input of the n-th control of a label; null when there is none.
   QWidget* widgetOf(const QString& label, int n = 1) const;
+
+  // The whole page, as far as the screen has the room.
+  QSize sizeHint() const override;
 
  private:
   // A control with what shows it: a field, a table, a frame, or a heading.

@@ -8,6 +8,7 @@
 #include <QMimeData>
 #include <QPainter>
 #include <QStyleOptionFrame>
+#include <QTextCharFormat>
 #include <QUrl>
 #include <QVBoxLayout>
 
@@ -242,6 +243,8 @@ QCalendarWidget* DateTimeEdit::openCalendar() {
   auto* calendar = new QCalendarWidget(popup);
   calendar->setVerticalHeaderFormat(QCalendarWidget::NoVerticalHeader);
   calendar->setFirstDayOfWeek(Qt::Monday);
+  // Days of all kinds are days of a simulation.
+  for (const auto day : {Qt::Saturday, Qt::Sunday}) calendar->setWeekdayTextFormat(day, QTextCharFormat());
   const QDate date = QDate::fromString(text().trimmed().left(kDateLength), Qt::ISODate);
   if (date.isValid()) calendar->setSelectedDate(date);
   layout->addWidget(calendar);

@@ -336,7 +336,8 @@ class GridViewTest : public QObject {
     // The merged header is one: no line where its columns meet.
     const QImage header = view_->horizontalHeader()->viewport()->grab().toImage();
     const auto lineAt = [&](int column) {
-      const int x = view_->horizontalHeader()->sectionViewportPosition(column) - 1;
+      const double scale = header.devicePixelRatio();
+      const int x = static_cast<int>(scale * view_->horizontalHeader()->sectionViewportPosition(column)) - 1;
       return header.pixelColor(x, 3) != header.pixelColor(x - 3, 3);
     };
     QVERIFY(lineAt(1) && !lineAt(2) && !lineAt(3) && lineAt(4));

@@ -260,7 +260,7 @@ class PagePaneTest : public QObject {
     QVERIFY(input("Width:")->hasFocus());
     type(input("Width:"), "7");
     QTest::keyClick(input("Width:"), Qt::Key_Return);
-    QCOMPARE(form.of(&b_).text, std::string("7"));
+    QCOMPARE(test::of(form, &b_).text, std::string("7"));
     QCOMPARE(input("Depth:")->text(), QString("deep"));
   }
 
@@ -274,7 +274,7 @@ class PagePaneTest : public QObject {
     tree->setFocus(Qt::MouseFocusReason);
     QCoreApplication::processEvents();
     QVERIFY(tree->hasFocus());
-    QCOMPARE(form.of(&a_).text, std::string("deep"));
+    QCOMPARE(test::of(form, &a_).text, std::string("deep"));
   }
 
   void escBringsTheValueBack() {
@@ -285,7 +285,7 @@ class PagePaneTest : public QObject {
     QTest::keyClick(input("Depth:"), Qt::Key_Return);
     QTest::keyClick(input("Depth:"), Qt::Key_Escape);
     QCOMPARE(input("Depth:")->text(), QString("1"));
-    QCOMPARE(form.of(&a_).fault, std::string());
+    QCOMPARE(test::of(form, &a_).fault, std::string());
     type(input("Depth:"), "12");
     QTest::keyClick(input("Depth:"), Qt::Key_Escape);
     QCOMPARE(input("Depth:")->text(), QString("1"));
@@ -299,7 +299,7 @@ class PagePaneTest : public QObject {
     type(input("Depth:"), "12345");
     QTest::keyClick(input("Depth:"), Qt::Key_Left);
     input("Depth:")->setSelection(1, 2);
-    form.of(&b_).text = "9";
+    test::of(form, &b_).text = "9";
     pane_->refresh();
     QCOMPARE(input("Depth:")->text(), QString("12345"));
     QCOMPARE(input("Depth:")->selectedText(), QString("23"));
@@ -307,7 +307,7 @@ class PagePaneTest : public QObject {
     QCOMPARE(input("Width:")->text(), QString("9"));
     // What is typed and not entered counts when the page goes.
     pane_->clear();
-    QCOMPARE(form.of(&a_).text, std::string("12345"));
+    QCOMPARE(test::of(form, &a_).text, std::string("12345"));
   }
 
   void aRefreshLeavesTheScrollAndTheList() {
@@ -323,8 +323,8 @@ class PagePaneTest : public QObject {
     pane_->refresh();
     QCOMPARE(pane_->verticalScrollBar()->value(), 200);
     QCOMPARE(list->itemData(0).toString(), QString("kept"));
-    form.of(&choice).choices = {"x", "y", "z"};
-    form.of(&choice).index = 2;
+    test::of(form, &choice).choices = {"x", "y", "z"};
+    test::of(form, &choice).index = 2;
     pane_->refresh();
     QCOMPARE(list->count(), 3);
     QCOMPARE(list->currentText(), QString("z"));
@@ -340,15 +340,15 @@ class PagePaneTest : public QObject {
     form.DDX_Radio("Radio", {"One", "Two"}, radio);
     form.DDX_Check("Flag", flag_);
     const auto shown = show(form);
-    Control& a = form.of(&a_);
+    Control& a = test::of(form, &a_);
     a.label = "Depth of A:";
     a.unit = "ft";
     outer.label = "Sediment";
-    form.of(&radio).choices = {"One", "Two", "Three"};
-    form.of(&radio).choiceEnabled = {true, true, false};
-    form.of(&radio).index = 1;
-    form.of(&flag_).index = 1;
-    form.of(&b_).enabled = false;
+    test::of(form, &radio).choices = {"One", "Two", "Three"};
+    test::of(form, &radio).choiceEnabled = {true, true, false};
+    test::of(form, &radio).index = 1;
+    test::of(form, &flag_).index = 1;
+    test::of(form, &b_).enabled = false;
     pane_->refresh();
     QVERIFY(text("Depth of A:") != nullptr && text("A:") == nullptr && text("ft") != nullptr);
     QCOMPARE(input<QGroupBox>("Sediment")->title(), QString("Sediment"));
@@ -357,7 +357,7 @@ class PagePaneTest : public QObject {
     QVERIFY(!pane_->findChildren<QRadioButton*>()[2]->isEnabled());
     QVERIFY(input<QCheckBox>("Flag")->isChecked());
     QVERIFY(!input("B:")->isEnabled());
-    form.of(&radio).index = -1;
+    test::of(form, &radio).index = -1;
     pane_->refresh();
     for (const auto* button : pane_->findChildren<QRadioButton*>()) QVERIFY(!button->isChecked());
 
@@ -394,7 +394,7 @@ class PagePaneTest : public QObject {
   void aCountIsStepped() {
     Form form;
     form.DDX_Text("Count:", count_).Spin(0, 9, [&](int delta) {
-      form.of(&count_).text = std::to_string(std::stoi(form.of(&count_).text) + delta);
+      test::of(form, &count_).text = std::to_string(std::stoi(test::of(form, &count_).text) + delta);
     });
     const auto shown = show(form);
     QLineEdit* edit = input("Count:");
@@ -461,15 +461,6 @@ class PagePaneTest : public QObject {
     QCOMPARE(list->currentIndex(), 0);
   }
 
-  void anOldHeadingIsOne() {
-    Form form;
-    form.Group("Warm-up");
-    form.DDX_VDedit("A:", a_, 0);
-    const auto shown = show(form);
-    QVERIFY(text("Warm-up") != nullptr);
-    QVERIFY(at(text("Warm-up")).bottom() < at("A:").top());
-  }
-
   void gridsTakeTheRoomTheyNeed() {
     FreeGrid few({{"Value", 60}}, 2);
     FreeGrid many({{"Value", 60}, {"File name", 160}}, 100);
@@ -517,13 +508,47 @@ class PagePaneTest : public QObject {
     form.DDX_Control("Grid", grid);
     form.DDX_VDedit("A:", a_, 0).ReadOnly();
     grid.accepts = [&](int, int, std::string_view text) {
-      form.of(&a_).text = text;
+      test::of(form, &a_).text = text;
       return true;
     };
     const auto shown = show(form);
     QVERIFY(input<GridView>("Grid")->cells().setData(input<GridView>("Grid")->cells().index(0, 0), "8",
                                                      Qt::EditRole));
     QCOMPARE(input("A:")->text(), QString("8"));
+  }
+
+  void aCellThatTakesItsOwnRowAway() {
+    FreeGrid grid({{"Value", 60}, {"More", 60}}, 4);
+    Form form;
+    form.DDX_Control("Grid", grid);
+    form.DDX_VDedit("A:", a_, 0);
+    grid.accepts = [&](int, int, std::string_view) {
+      grid.setRows(1);
+      return false;
+    };
+    const auto shown = show(form);
+    auto* view = input<GridView>("Grid");
+    QTest::mouseClick(view->viewport(), Qt::LeftButton, Qt::NoModifier,
+                      view->visualRect(view->cells().index(3, 1)).center());
+    QTest::keyClicks(QApplication::focusWidget(), "5");
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
+    QCoreApplication::processEvents();
+    QCOMPARE(view->cells().rowCount(), 1);
+    QCOMPARE(grid.currentRows.back(), 1);
+  }
+
+  void aDialogIsAsLargeAsItsForm() {
+    FreeGrid grid({{"Value", 60}, {"File name", 160}, {"Title", 160}}, 12);
+    Form form;
+    form.DDX_Control("Grid", grid);
+    const auto shown = show(form);
+    const QSize wanted = pane_->sizeHint();
+    const QSize room = pane_->screen()->availableSize();
+    QVERIFY(wanted.height() > std::min(300, room.height() / 2));
+    QVERIFY(wanted.width() > std::min(400, room.width() / 2));
+    grid.setRows(1000);
+    pane_->refresh();
+    QVERIFY(pane_->sizeHint().height() <= pane_->screen()->availableSize().height());
   }
 
   void aPageIsShownInTime() {
@@ -590,8 +615,42 @@ class PagePaneTest : public QObject {
       grids.show({});
       pane_->showForm("Grids", grids);
       save("grids");
+      test::GridOfAllKinds kinds;
+      kinds.accepts = [](int, int, std::string_view) { return false; };
+      Form cells;
+      cells.DDX_Control("Cells", kinds);
+      std::string start = "2026-03-21 06:00:00";
+      cells.DDX_Text("Start:", start).kind = ControlKind::dateTime;
+      cells.show({});
+      pane_->showForm("Cells", cells);
+      window_->activateWindow();
+      QTest::qWait(50);
+      auto* view = input<GridView>("Cells");
+      const auto click = [view](int col) {
+        QTest::mouseClick(view->viewport(), Qt::LeftButton, Qt::NoModifier,
+                          view->visualRect(view->cells().index(0, col - 1)).center());
+      };
+      click(test::GridOfAllKinds::kItems);
+      QTest::qWait(50);
+      const auto savePopup = [&, named = name](const char* what) {
+        if (QWidget* popup = QApplication::activePopupWidget()) {
+          popup->grab().save(QString("%1/%2-%3-%4.png").arg(folder, what, named, at.c_str()));
+          popup->close();
+        }
+      };
+      savePopup("choices");
+      click(test::GridOfAllKinds::kType);
+      QTest::qWait(50);
+      savePopup("list");
+      qobject_cast<DateTimeEdit*>(input("Start:"))->openCalendar();
+      QTest::qWait(50);
+      savePopup("calendar");
+      click(1);
+      QTest::keyClicks(QApplication::focusWidget(), "nowhere");
+      QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
+      save("refused");
+      pane_->clear();
     }
-    pane_->clear();
   }
 };
 

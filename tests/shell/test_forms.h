@@ -92,7 +92,7 @@ class FreeGrid : public CV27SetupGridWnd {
     style = at(row, col);
     return true;
   }
-  bool storeCell(int, int, std::string_view) override { return false; }
+  Stored storeCell(int, int, std::string_view) override { return Stored::refused; }
 
  private:
   std::vector<Column> columns_;
@@ -174,6 +174,21 @@ class BandedGrid final : public FreeGrid {
   }
 };
 
+// The control that is tied to a variable.
+inline Control& of(Form& form, const void* variable) {
+  for (Control& control : form.controls()) {
+    const auto isTied = [variable](const auto& tied) {
+      if constexpr (std::is_pointer_v<std::remove_cvref_t<decltype(tied)>>) {
+        return static_cast<const void*>(tied) == variable;
+      } else {
+        return false;
+      }
+    };
+    if (std::visit(isTied, control.variable)) return control;
+  }
+  std::abort();
+}
+
 // A page with every kind of control, in frames, rows and side by side.
 class ShowcaseForm {
  public:
@@ -181,7 +196,7 @@ class ShowcaseForm {
     form.Group("Simulation", [this] {
       checked(form.DDX_Text("Last step:", last_)).Spin(0, 18, [this](int delta) {
         last_ = std::clamp(last_ + delta, 0, 18);
-        form.of(&last_).text = std::to_string(last_);
+        of(form, &last_).text = std::to_string(last_);
       });
       checked(form.DDX_VDedit("Time step interval:", step_, 100212));
       form.DDX_Text("Start date:", start_).kind = ControlKind::dateTime;
@@ -211,13 +226,13 @@ class ShowcaseForm {
       form.Button("...", [] {}).Beside();
       form.Button("View...", [] {}).Beside();
       form.DDX_Text("Title:", title_);
-      form.Label("Size of the results:", size_);
+      form.DDX_Text("Size of the results:", size_).kind = ControlKind::label;
     });
     form.DDX_Control("Cells", cells);
     form.DDX_Control("Greyed", greyed);
     greyed.enabled = false;
     form.show({});
-    Control& wrong = form.of(&highest_);
+    Control& wrong = of(form, &highest_);
     wrong.text = "deep";
     wrong.onChange();
   }
