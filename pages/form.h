@@ -47,7 +47,8 @@ struct Control {
   bool enabled = true;
   bool visible = true;
   bool readOnly = false;
-  bool absent = false;     // there is nothing that it would edit: it shows nothing
+  bool absent = false;  // there is nothing that it would edit: it shows nothing, and is disabled
+  bool wasAbsent = false;
   std::string fault = {};  // what is wrong with the text, which is kept as it was typed; empty for nothing
   std::string toolTip = {};
   std::vector<bool> choiceEnabled = {};  // of a radio group; empty when all are

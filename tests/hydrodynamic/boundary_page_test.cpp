@@ -181,6 +181,11 @@ TEST_F(HdBoundaryPage, TiltingAndDirections) {
   EXPECT_EQ(host.opened, Labels{*host.chosenFile});
 }
 
+TEST_F(HdBoundaryPage, AConstantThatIsNoFiniteNumberIsRefused) {
+  for (const char* bad : {"1e60", "nan", "inf", ""}) EXPECT_EQ(store(row(3), 2, bad), 0) << bad;
+  EXPECT_EQ(object().value, 0.0F);
+}
+
 TEST_F(HdBoundaryPage, BlocksAreMarkedOff) {
   for (int n = 1; n <= 12; ++n) EXPECT_EQ(grid().GetRowLook(n).lineBelow, n % 6 == 0) << n;
 }

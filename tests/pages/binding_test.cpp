@@ -243,6 +243,28 @@ TEST_F(Bound, AFileHasTwoButtonsBesideIt) {
   EXPECT_EQ(host.opened, Labels{*host.chosenFile});
 }
 
+TEST_F(Bound, AFileThatIsToBeWrittenIsAskedForByItsExtent) {
+  struct Output {
+    std::int32_t extent = 2;
+    UResultFileName file;
+  } output;
+  ShapeTest::open([&output](test::OwnPage& own, Form& form) {
+    own.AddFile(form, "File",
+                resultFileOf([&output](GridRow) { return &output; }, &Output::file,
+                             [&output](GridRow) {
+                               return output.extent == 2 ? FileKind{"tsb2", "Maps (*.tsb2)|*.tsb2||"}
+                                                         : FileKind{"tsb0", "Time series (*.tsb0)|*.tsb0||"};
+                             }));
+  });
+  host.chosenFile = "depth.tsb2";
+  press("...");
+  output.extent = 0;
+  press("...");
+  EXPECT_EQ(host.extensions, (Labels{"tsb2", "tsb0"}));
+  EXPECT_EQ(text("File"), "depth.tsb2");
+  EXPECT_TRUE(document.IsModified());
+}
+
 TEST_F(Bound, ANameThatIsNotTypedAnewStaysWhereItWasRelativeTo) {
   const test::TemporaryFolder folder;
   std::filesystem::create_directory(folder.path() / "sub");
