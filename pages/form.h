@@ -157,6 +157,7 @@ class Form {
   Control& Group(std::string_view caption, const std::function<void()>& body);
   // A text that is worked out anew each time.
   Control& Shown(std::string_view label, std::function<std::string()> text);
+  // What a press changes it changes in the model, and then tells the page.
   Control& Button(std::string_view label, std::function<void()> pressed);
   Control& Grid(std::string_view label, CV27SetupGridWnd& grid);
 
