@@ -17,10 +17,9 @@ void CBathymetryGrid::LayOut() {
     return row.item == 1 || parts<BasicParts>().bathymetry->hotStart == 1;
   };
   FileChoice file =
-      fileOf(area, &Area::fileName, FileKind{texts::mapExtension.format, texts::bathymetryFilter.format},
-             [this](CVdFileSelectorDlg& selector, GridRow) {
-               RequestBathymetry(selector, parts<BasicParts>().bathymetry->hotStart == 1);
-             });
+      fileOf(area, &Area::fileName, texts::bathymetryFile, [this](CVdFileSelectorDlg& selector, GridRow) {
+        RequestBathymetry(selector, parts<BasicParts>().bathymetry->hotStart == 1);
+      });
   file.changed = [this](GridRow row) { OnFileChanged(row); };
   file.chosen = [this](GridRow row) {
     if (row == 1) parts<BasicParts>().bathymetry->projectionStale = true;
@@ -102,9 +101,8 @@ std::unique_ptr<CBathymetryObjectKvs> CBathymetryDlg::readArea1() {
 // The fine grid is held against Area 1, and so comes after it.
 FileChoice CBathymetryDlg::overlandFile() {
   const auto area1 = std::make_shared<std::unique_ptr<CBathymetryObjectKvs>>();
-  FileChoice file = fileOf([areas = objectOf(&BasicParts::bathymetry)](GridRow) { return &areas(); },
-                           &CBathymetryKvs::overlandFile,
-                           FileKind{texts::mapExtension.format, texts::fineBathymetryFilter.format},
+  const auto areas = [this](GridRow) { return parts<BasicParts>().bathymetry.get(); };
+  FileChoice file = fileOf(areas, &CBathymetryKvs::overlandFile, texts::fineBathymetry,
                            [area1](CVdFileSelectorDlg& selector, GridRow) {
                              selector.SetSelectedItems({1});
                              selector.AddRequest(std::make_unique<COverlandRqTsbItem>(**area1));

@@ -1,6 +1,7 @@
 #include "hydrodynamic/boundary_page.h"
 
 #include <array>
+#include <cmath>
 
 #include "basic/basic_parts.h"
 #include "basic/boundary.h"
@@ -32,14 +33,8 @@ bool isFile(const Object& object) {
 }
 
 FileKind fileKind(const Object& object) {
-  switch (object.dataFormat) {
-    case Object::kRatingCurve:
-      return {texts::seriesExtension.format, texts::ratingCurveFilter.format};
-    case Object::kType0File:
-      return {texts::seriesExtension.format, texts::timeSeriesFilter.format};
-    default:
-      return {texts::profileExtension.format, texts::profileFilter.format};
-  }
+  if (object.dataFormat == Object::kRatingCurve) return texts::ratingCurveFile;
+  return object.dataFormat == Object::kType0File ? texts::timeSeriesFile : texts::profileFile;
 }
 
 int quantityOf(const Object& object) {
@@ -115,8 +110,8 @@ void CNhdBoundaryGrid::LayOut() {
   List("", 0, object, &Object::enableUserDirections,
        Choices::numbered({"No user defined flow direction", "Flow direction from file:"}));
   // The name can be typed before directions are switched on.
-  const FileKind kind{texts::profileExtension.format, texts::flowDirectionFilter.format};
-  const FileChoice file = fileOf(object, &Object::directionFile, kind, &Object::RequestDirectionFile);
+  const FileChoice file =
+      fileOf(object, &Object::directionFile, texts::flowDirectionFile, &Object::RequestDirectionFile);
   File({.file = file, .browse = "...", .enabled = hasDirections}).EnabledIf({});
 }
 
@@ -171,8 +166,9 @@ Stored CNhdBoundaryGrid::storeData(Object& object, std::string_view text) {
   };
   if (object.dataFormat == Object::kConstant) {
     const std::optional<double> value = scannedReal(text);
-    if (value) object.value = inBase(*value);
-    return value ? Stored::taken : Stored::refused;
+    if (!value || !std::isfinite(inBase(*value))) return Stored::refused;
+    object.value = inBase(*value);
+    return Stored::taken;
   }
   float amplitude = 0;
   float reference = 0;

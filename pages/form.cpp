@@ -427,7 +427,9 @@ void Form::show(const UnitChoices& units, bool keepFaults) {
 
 void Form::applyRules() {
   for (Control& control : controls_) {
+    if (std::exchange(control.wasAbsent, control.absent) && !control.absent) control.enabled = true;
     apply(control, &Control::enabledIf, &Control::enabled);
+    if (control.absent) control.enabled = false;
     apply(control, &Control::visibleIf, &Control::visible);
     if (control.readOnlyIf) control.readOnly = control.readOnlyIf();
     for (std::size_t i = 0; control.choiceIf && i < control.choiceEnabled.size(); ++i)

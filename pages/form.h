@@ -47,7 +47,8 @@ struct Control {
   bool enabled = true;
   bool visible = true;
   bool readOnly = false;
-  bool absent = false;     // there is nothing that it would edit: it shows nothing
+  bool absent = false;  // there is nothing that it would edit: it shows nothing, and is disabled
+  bool wasAbsent = false;
   std::string fault = {};  // what is wrong with the text, which is kept as it was typed; empty for nothing
   std::string toolTip = {};
   std::vector<bool> choiceEnabled = {};  // of a radio group; empty when all are
@@ -157,6 +158,7 @@ class Form {
   Control& Group(std::string_view caption, const std::function<void()>& body);
   // A text that is worked out anew each time.
   Control& Shown(std::string_view label, std::function<std::string()> text);
+  // What a press changes it changes in the model, and then tells the page.
   Control& Button(std::string_view label, std::function<void()> pressed);
   Control& Grid(std::string_view label, CV27SetupGridWnd& grid);
 

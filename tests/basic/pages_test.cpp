@@ -65,6 +65,13 @@ TEST_F(ModuleSelectionPage, Code3BecomesHydrodynamicOnTheFirstStore) {
   EXPECT_EQ(selection().simulationType, 0);
 }
 
+TEST_F(ModuleSelectionPage, TheTwoFramesStretchAndNothingElse) {
+  for (Control& it : page->form().controls()) {
+    EXPECT_EQ(it.alignRight, it.kind == ControlKind::group) << it.label;
+    EXPECT_FALSE(it.alignBottom) << it.label;
+  }
+}
+
 TEST_F(ModuleSelectionPage, EachSchemeIsAValue) {
   choose("Module", 1);
   for (const auto& [place, scheme] : {std::pair{1, 5}, {2, -5}, {3, -1}, {0, 1}}) {
@@ -193,6 +200,45 @@ TEST_F(SimulationPeriodPage, TheCourantNumberFollowsTheTimeStep) {
   edit("Time step interval:", "2");
   EXPECT_EQ(text("Max Courant No:"), fmt::format("{:.6g}", 2 * std::sqrt(10 * 9.82 / 100)));
   EXPECT_EQ(text("Area:"), "1");
+}
+
+TEST_F(SimulationPeriodPage, TheCourantNumberIsKnownOnceTheGridsAre) {
+  EXPECT_EQ(text("Max Courant No:"), "");
+  EXPECT_EQ(text("Area:"), "");
+  EXPECT_EQ(control("Max Courant No:").toolTip, "Not known before a validation: area 1");
+  CBathymetryObjectKvs& area = *root().bathymetry->GetArea(1);
+  area.dx = 10;
+  area.grid = CVdArray2D<float>(1, 1);
+  area.grid.values()[0] = -10;
+  document.UpdateAllViews(nullptr);
+  EXPECT_EQ(text("Max Courant No:"), fmt::format("{:.6g}", 30 * std::sqrt(10 * 9.82 / 100)));
+  EXPECT_EQ(control("Max Courant No:").toolTip, "");
+}
+
+TEST_F(SimulationPeriodPage, MoreStepsThanCanBeCountedAreRefused) {
+  edit("Last:", "2147483646");
+  EXPECT_EQ(period().noPointsInTime, 2147483647);
+  edit("Last:", "2147483647");
+  EXPECT_EQ(period().noPointsInTime, 2147483647);
+  EXPECT_NE(control("Last:").fault, "");
+}
+
+TEST_F(SimulationPeriodPage, FramesHoldTheirControls) {
+  EXPECT_EQ(control("Last:").group, &control("Time step range:"));
+  EXPECT_EQ(control("Time step range:").group, &control("Simulation"));
+  EXPECT_EQ(control("Last:", 2).group->group, &control("Warm-up Period"));
+  EXPECT_EQ(control("Simulation start date:").kind, ControlKind::dateTime);
+}
+
+TEST_F(SimulationPeriodPage, AStartThatIsNoDateIsKeptUntilThereIsOne) {
+  period().start = DateTime::invalid();
+  page->SetData();
+  EXPECT_EQ(text("Simulation start date:"), "no date");
+  edit("Last:", "50");
+  EXPECT_EQ(period().noPointsInTime, 51);
+  EXPECT_FALSE(period().start.valid());
+  edit("Simulation start date:", "2001-02-03 04:05:06");
+  EXPECT_EQ(dateTimeText(period().start), "2001-02-03 04:05:06");
 }
 
 class BathymetryPage : public PageTest {
@@ -351,6 +397,99 @@ TEST_F(BathymetryPage, TheOverlandSolver) {
   EXPECT_TRUE(control("Number of areas").enabled);
 }
 
+TEST_F(BathymetryPage, APointIsReadFromTheFront) {
+  areas().SetNoAreas(2);
+  EXPECT_EQ(store(2, 3, "(1,2"), 1);
+  EXPECT_EQ(cell(2, 3), "(1,2)");
+  EXPECT_EQ(store(2, 3, "3,4x"), 1);
+  EXPECT_EQ(areas().GetArea(2)->origin, (GridPoint{3, 4}));
+}
+
+TEST_F(BathymetryPage, WithNoProjectionThereIsNoCoriolisForce) {
+  areas().coriolis = true;
+  page->SetData();
+  EXPECT_EQ(control("Apply Coriolis forcing:").index, 0);
+  choose("Type", 1);
+  EXPECT_FALSE(areas().coriolis);
+}
+
+TEST_F(BathymetryPage, TheCoriolisForceCanBeSwitchedOff) {
+  if (theEdition.wetlandSweepKit) GTEST_SKIP() << "this edition has none";
+  test::writeGrid(path, {.geography = TsbGeography{"UTM-32", 9, 55, 0}});
+  store(1, 1, path);
+  EXPECT_EQ(control("Apply Coriolis forcing:").index, 1);
+  choose("Apply Coriolis forcing:", 0);
+  EXPECT_FALSE(areas().coriolis);
+  EXPECT_EQ(control("Apply Coriolis forcing:").index, 0);
+}
+
+TEST_F(BathymetryPage, ATypedFileBringsItsProjection) {
+  test::writeGrid(path, {.geography = TsbGeography{"UTM-32", 9, 55, 0}});
+  areas().projection = "UTM-31";
+  store(1, 1, path);
+  EXPECT_EQ(areas().projection, "UTM-32");
+  EXPECT_EQ(control("Map projection:").choices[0], "UTM-32");
+  EXPECT_EQ(control("Map projection:").index, 0);
+  EXPECT_TRUE(control("Map projection:").enabled);
+  EXPECT_FALSE(areas().projectionStale);
+}
+
+// Keeps what it was asked for.
+class SelectorHost final : public test::TestHost {
+ public:
+  bool choose(CVdFileSelectorDlg& selector) override {
+    started = selector.GetSelectedItems();
+    for (const std::vector<std::uint32_t>& items : {std::vector<std::uint32_t>{1}, {2}, {1, 2}}) {
+      std::string why;
+      selector.IsTsbFileValid(file, items, &why);
+      faults.push_back(why);
+    }
+    return false;
+  }
+  std::string file;
+  std::vector<std::uint32_t> started;
+  std::vector<std::string> faults;
+};
+
+TEST_F(BathymetryPage, AFineBathymetryMayHaveSeveralItems) {
+  SelectorHost selecting;
+  CV27SetupDoc own(selecting);
+  selecting.file = folder.file("fine.tsb2");
+  test::writeGrid(selecting.file, {.noJ = 8, .noK = 6, .dx = 15, .dy = 15, .items = 2});
+  own.root().bathymetry->GetArea(1)->fileName = path;
+  own.root().bathymetry->overlandSolver = true;
+  const auto opened = makePage("CBathymetryDlg", own);
+  opened->form().act(*opened->form().find("..."));
+  EXPECT_EQ(selecting.started, std::vector<std::uint32_t>{1});
+  EXPECT_EQ(selecting.faults,
+            (Labels{"", "Please select the first item only.", "Please select the first item only."}));
+}
+
+TEST_F(BathymetryPage, ALookAtArea1ChangesNothing) {
+  const CBathymetryObjectKvs& area = *areas().GetArea(1);
+  areas().GetArea(1)->fileName = path;
+  choose(kOverland, 1);
+  press("...");
+  EXPECT_EQ(host.filters.size(), 1U);
+  EXPECT_EQ(area.noJ, 0);
+  EXPECT_EQ(area.dx, 0);
+  EXPECT_FALSE(area.contains(0, 0));
+  test::writeHotStart(path, {}, test::flat, 1, 2, 3);
+  areas().hotStart = 1;
+  page->SetData();
+  press("...");
+  EXPECT_EQ(host.filters.size(), 2U);
+  EXPECT_EQ(area.origin, (GridPoint{3, 3}));
+  EXPECT_EQ(area.enclosingArea, 0);
+  EXPECT_EQ(dateTimeText(root().simulationPeriod->start), "1990-01-01 12:00:00");
+}
+
+TEST_F(BathymetryPage, AFileIsAnEditWithItsButtonsBesideIt) {
+  EXPECT_TRUE(control("Fine bathymetry file").isFile);
+  EXPECT_TRUE(control("...").beside);
+  EXPECT_TRUE(control("Edit").beside);
+}
+
 class BoundaryPage : public PageTest {
  protected:
   BoundaryPage() { open("CBoundaryDlg"); }
@@ -397,6 +536,31 @@ TEST_F(BoundaryPage, ProgramDetectedFindsThemAndResetsAllConditions) {
   EXPECT_EQ(root().nhdBoundary->GetItem(1)->value, 0);
 }
 
+TEST_F(BoundaryPage, MoreThanThePageGivesCanBeChangedAndTakenAway) {
+  boundaries().defaultPosition = 0;
+  boundaries().SetNoBoundaries(20);
+  page->SetData();
+  EXPECT_EQ(text("Number of boundaries"), "20");
+  EXPECT_EQ(store(20, 1, "1,2"), 1);
+  EXPECT_EQ(boundaries().GetCount(), 20);
+  EXPECT_EQ(boundaries().GetItem(20)->first, (GridPoint{1, 2}));
+  spin("Number of boundaries", 1);
+  EXPECT_EQ(boundaries().GetCount(), 20);
+  spin("Number of boundaries", -1);
+  EXPECT_EQ(boundaries().GetCount(), 19);
+  edit("Number of boundaries", "15");
+  EXPECT_EQ(boundaries().GetCount(), 15);
+  edit("Number of boundaries", "16");
+  EXPECT_EQ(boundaries().GetCount(), 15);
+}
+
+TEST_F(BoundaryPage, ItsGridStretchesAndNothingElse) {
+  EXPECT_TRUE(control("Boundaries").alignRight);
+  EXPECT_TRUE(control("Boundaries").alignBottom);
+  EXPECT_FALSE(control("Default position").alignRight);
+  EXPECT_FALSE(control("Number of boundaries").alignRight);
+}
+
 class SourceSinkPage : public PageTest {
  protected:
   SourceSinkPage() {
@@ -434,6 +598,18 @@ TEST_F(SourceSinkPage, TheTypeDecidesWhatCanBeEdited) {
   EXPECT_FALSE(style(2, 3).editable());
   EXPECT_EQ(store(2, 3, "2x"), 1);
   EXPECT_EQ(entry().sourceArea, 2);
+}
+
+TEST_F(SourceSinkPage, AreasAreGreyAndHeadersCoverTwoColumns) {
+  for (const int col : {3, 5}) {
+    EXPECT_EQ(style(2, col).kind, CellKind::label);
+    EXPECT_TRUE(style(2, col).isGrey);
+  }
+  EXPECT_TRUE(style(2, 3).enabled);
+  EXPECT_TRUE(style(1, 2).isHeader);
+  EXPECT_EQ(grid().GetHeaderSpan(2), 2);
+  EXPECT_EQ(grid().GetHeaderSpan(3), 0);
+  EXPECT_EQ(grid().GetHeaderSpan(4), 2);
 }
 
 TEST_F(SourceSinkPage, TheCount) {

@@ -181,6 +181,38 @@ TEST_F(HdBoundaryPage, TiltingAndDirections) {
   EXPECT_EQ(host.opened, Labels{*host.chosenFile});
 }
 
+TEST_F(HdBoundaryPage, AConstantThatIsNoFiniteNumberIsRefused) {
+  for (const char* bad : {"1e60", "nan", "inf", ""}) EXPECT_EQ(store(row(3), 2, bad), 0) << bad;
+  EXPECT_EQ(object().value, 0.0F);
+}
+
+TEST_F(HdBoundaryPage, BlocksAreMarkedOff) {
+  for (int n = 1; n <= 12; ++n) EXPECT_EQ(grid().GetRowLook(n).lineBelow, n % 6 == 0) << n;
+}
+
+TEST_F(HdBoundaryPage, ASineTextThatIsRefusedIsAnEditAllTheSame) {
+  object().SetDataFormat(CNhdBoundaryObjectKvs::kSineSeries);
+  document.RecordEdit(PageId::hdBoundary, "before");
+  document.SetModifiedFlag(false);
+  EXPECT_EQ(store(row(3), 2, "abc"), 0);
+  EXPECT_EQ(object().range, 0.0F);
+  EXPECT_TRUE(document.IsModified());
+  EXPECT_EQ(document.UndoStep()->name, "Boundary 2, data");
+  document.Undo();
+  EXPECT_EQ(object().range, 1.0F);
+  store(row(2), 2, "Level");
+  document.SetModifiedFlag(false);
+  object().SetDataFormat(CNhdBoundaryObjectKvs::kConstant);
+  EXPECT_EQ(store(row(3), 2, "abc"), 0);
+  EXPECT_FALSE(document.IsModified());
+}
+
+TEST_F(HdBoundaryPage, ADirectionFileCanBeNamedBeforeItIsSwitchedOn) {
+  EXPECT_EQ(store(row(6), 2, "d.tsb1"), 1);
+  EXPECT_EQ(object().directionFile.fileName.text(), "d.tsb1");
+  EXPECT_FALSE(style(row(6), 3).enabled);
+}
+
 TEST_F(HdBoundaryPage, AStoredFabType3ShowsAsTheFourthChoice) {
   object().fabType = 3;
   EXPECT_EQ(cell(row(4), 2), "12");
