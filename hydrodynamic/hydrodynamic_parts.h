@@ -6,8 +6,8 @@ namespace gridbay {
 
 class CNhdBoundaryKvs;
 
-// The conditions and results of the flow calculation, as members of the root. None is ever null while the root
-// lives.
+// The conditions and results of the flow calculation, as members of the root. None is ever null while the
+// root lives.
 struct HydrodynamicParts {
   HydrodynamicParts();
   ~HydrodynamicParts();

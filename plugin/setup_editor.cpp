@@ -61,6 +61,7 @@ class Editor final : public SetupEditor {
   Form* openPage(std::int32_t id) override {
     std::string topic;
     std::string local;
+    if (page_ != nullptr) page_->OnLeave();
     page_ = makePage(document_.enumerator().GetPageClass(id, &topic, &local), document_);
     return page_ == nullptr ? nullptr : &page_->form();
   }

@@ -6,8 +6,8 @@
 #include "basic/boundary.h"
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
-#include "setup/global_kvs.h"
 #include "platform/units/units.h"
+#include "setup/global_kvs.h"
 
 namespace gridbay {
 namespace {

@@ -26,7 +26,7 @@ const GridModel& gridOf(const QModelIndex& index) {
 
 QColor groundOf(const CellStyle& cell, const QPalette& palette) {
   if (cell.isHeader || cell.isHeading) return headerGround(palette);
-  if (!cell.enabled) return disabledGround(palette);
+  if (!cell.enabled || cell.isGrey) return disabledGround(palette);
   if (!cell.editable() && cell.kind != CellKind::button) return readOnlyGround(palette);
   return palette.color(QPalette::Active, QPalette::Base);
 }

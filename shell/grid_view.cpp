@@ -77,6 +77,12 @@ GridView::GridView(CV27SetupGridWnd& grid, QWidget* parent)
 }
 
 // Follows what the grid says of itself. Widths stay as they are while the columns are the same ones.
+void GridView::setStretches(bool stretches) {
+  stretches_ = stretches;
+  setSizePolicy(stretches && hasText_ ? QSizePolicy::Expanding : QSizePolicy::Preferred,
+                QSizePolicy::Preferred);
+}
+
 void GridView::layOutGrid() {
   QStringList headers;
   for (int column = 0; column < model_->columnCount(); ++column)
@@ -142,7 +148,8 @@ void GridView::measureColumns() {
     column.least = static_cast<int>(column.natural * kLeastText);
   }
   const bool hasText = std::ranges::any_of(columns_, [](const Column& column) { return column.growth > 0; });
-  setSizePolicy(hasText ? QSizePolicy::Expanding : QSizePolicy::Preferred, QSizePolicy::Preferred);
+  hasText_ = hasText;
+  setStretches(stretches_);
   int rowHeader = grid.GetColWidth(0) * fontMetrics().averageCharWidth() / kCharWidth;
   for (int row = 0; row < std::min(kSampledRows, model_->rowCount()); ++row) {
     const QString text = model_->headerData(row, Qt::Vertical, Qt::DisplayRole).toString().trimmed();

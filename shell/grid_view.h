@@ -18,6 +18,8 @@ class GridView final : public QTableView {
   Q_OBJECT
  public:
   GridView(CV27SetupGridWnd& grid, QWidget* parent);
+  // Whether it takes the width that is left over; a table of numbers alone has no use for it.
+  void setStretches(bool stretches);
   GridModel& cells() { return *model_; }
   // Hands over what is typed in a cell and not yet entered.
   void commitEdit();
@@ -48,6 +50,8 @@ class GridView final : public QTableView {
   bool eventFilter(QObject* watched, QEvent* event) override;
 
  private:
+  bool stretches_ = true;
+  bool hasText_ = false;
   struct Column {
     int natural = 0;  // width
     int least = 0;    // where there is not enough for all

@@ -124,10 +124,16 @@ void PagePane::showForm(const QString& caption, Form& form) {
 }
 
 PagePane::Part PagePane::makePart(Control& control, QWidget* parent, bool hasBody) {
-  if (control.kind == ControlKind::group)
-    return {&control, hasBody ? static_cast<QWidget*>(new Frame(parent)) : makeHeading(parent)};
+  if (control.kind == ControlKind::group) {
+    if (!hasBody) return {&control, makeHeading(parent)};
+    auto* frame = new Frame(parent);
+    if (control.alignRight)
+      frame->setSizePolicy(QSizePolicy::Expanding, frame->sizePolicy().verticalPolicy());
+    return {&control, frame};
+  }
   if (control.kind == ControlKind::grid) {
     auto* grid = new GridView(*control.grid, parent);
+    grid->setStretches(control.alignRight);
     // What a cell changes may show in other controls.
     connect(grid, &GridView::edited, this, &PagePane::refresh);
     return {&control, grid, nullptr, grid};

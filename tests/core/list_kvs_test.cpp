@@ -45,8 +45,7 @@ class Root final : public ModelRoot {
   void Save(KvsFile&, const std::string&) override {}
   void Load(KvsSection, const std::string&) override {}
   void TellFollowers(const CKvsBase& leader, std::span<const int> counts) override {
-    EXPECT_EQ(counts.size(), 1U);
-    told.emplace_back(&leader, counts.front());
+    for (const int count : counts) told.emplace_back(&leader, count);
   }
 
   std::vector<std::pair<const CKvsBase*, int>> told;
@@ -56,11 +55,28 @@ class Root final : public ModelRoot {
   void ShowMessage(const std::string& text) override { texts.push_back(text); }
 };
 
+// A leader that is no list, of two counts at once.
+class Task final : public TableKvs<Task> {
+ public:
+  using TableKvs::TableKvs;
+  static constexpr auto table() { return keywords(); }
+  void SetCounts(int layers, int fractions) {
+    const std::array counts{layers, fractions};
+    parts<ModelRoot>()->TellFollowers(*this, counts);
+  }
+};
+
 class ListKvsTest : public ::testing::Test {
  protected:
   Root root;
   List list{&root};
 };
+
+TEST_F(ListKvsTest, ALeaderOfSeveralCountsTellsThemTogether) {
+  Task task(&root);
+  task.SetCounts(3, 2);
+  EXPECT_EQ(root.told, (std::vector<std::pair<const CKvsBase*, int>>{{&task, 3}, {&task, 2}}));
+}
 
 TEST_F(ListKvsTest, AnEmptyListSavesItsCountAndNoSection) {
   EXPECT_EQ(savedText(list), "LIST {\n    Count 0\n    Other 1\n}\n");

@@ -344,6 +344,36 @@ TEST_F(MemberPaths, WhatFollowsFromOtherValuesIsToldApart) {
   EXPECT_FALSE(list.isWrittenOnly);
 }
 
+// What one edition fixes, on file and after a load, or after a load alone.
+class Fixed final : public TableKvs<Fixed> {
+ public:
+  using TableKvs::TableKvs;
+  std::int32_t both = 3;
+  std::int32_t loaded = 3;
+  std::int32_t isOn = 1;
+  static constexpr auto table() {
+    return keywords(pinned(keyword("Both", &Fixed::both), 0),
+                    pinned(keyword("Loaded", &Fixed::loaded), 1, Pin::onLoad),
+                    pinned(flag("Is_On", &Fixed::isOn), 0));
+  }
+};
+
+TEST(Pinned, IsFixedOnFileOrAfterALoad) {
+  Fixed object(nullptr);
+  const bool sweep = theEdition.wetlandSweepKit;
+  EXPECT_EQ(test::savedText(object),
+            sweep ? "Both 0\nLoaded 3\nIs_On #false\n" : "Both 3\nLoaded 3\nIs_On #true\n");
+  test::load(object, "Both 5\nLoaded 6\nIs_On #true\n");
+  EXPECT_EQ(object.both, sweep ? 0 : 5);
+  EXPECT_EQ(object.loaded, sweep ? 1 : 6);
+  EXPECT_EQ(object.isOn, sweep ? 0 : 1);
+  const KvsHandle file = test::fileOf("Loaded 8");
+  PathAccess access{PathAccess::What::set, nullptr, &file->tree().root(), &kPath};
+  EXPECT_TRUE(object.AccessPath("Loaded", access));
+  EXPECT_EQ(access.isPinned, sweep);
+  EXPECT_EQ(object.loaded, sweep ? 1 : 8);
+}
+
 TEST(SelectionFileName, BothKindsAreReadAndTheKindIsKept) {
   Holder holder(nullptr);
   test::load(holder, "HOLDER { FILE { File_Name (result)\"r.tsb2\" } }");
