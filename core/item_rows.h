@@ -16,7 +16,7 @@ namespace gridbay {
 // A count in a file is believed as far as the sections beside it bear it out, and this much further.
 inline constexpr int kCountSlack = 2048;
 // The highest count that can be set by its path.
-inline constexpr int kMostItems = 1'000'000;
+inline constexpr int kMostItems = 65535;
 
 // As much of a count as the section bears out; what is left off is told.
 template <class Show>
