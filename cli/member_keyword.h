@@ -17,7 +17,7 @@ class MemberKeyword {
   // The keyword with the values that it has now.
   const Node& node() const { return *written_->tree().root().first(); }
   bool takesAnyNumber() const { return takesAnyNumber_; }
-  // Gives the member other values, of the kinds that it has. False, with the member as it was, when they do
+  // Gives the member other values, of the kinds that it has. False, with its old values, when they do
   // not stand then, as where an edition has its own.
   bool set(const std::vector<Value>& values);
 
