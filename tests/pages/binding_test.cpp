@@ -3,6 +3,8 @@
 #include <gmock/gmock.h>
 
 #include <cmath>
+#include <cstdint>
+#include <string>
 
 #include "platform/units/units.h"
 #include "tests/support/shapes.h"
@@ -39,7 +41,7 @@ class Bound : public test::ShapeTest {
       form.Text("Name:", thing, &Thing::name);
       form.DateTimeEdit("Start:", thing, &Thing::start);
       form.Number("Last:", lastOf(memberOf(thing, &Thing::points)));
-      form.Shown("Sum:", [thing] { return std::to_string(thing().count + thing().points); });
+      form.Shown("Sum:", [thing] { return std::to_string(std::int64_t{thing().count} + thing().points); });
     });
   }
   Thing first;
