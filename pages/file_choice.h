@@ -60,20 +60,21 @@ struct FileChoice {
 // object, gets the selector and the number of the item.
 template <class Access, class Owner, class Member, class Request>
 FileChoice fileOf(Access object, Member Owner::*file, ByRow<FileKind> kind, Request request) {
-  return {.file = [object, file](GridRow row) -> FileRef {
-            auto* owner = pointerTo(object(row));
-            return owner == nullptr ? FileRef() : FileRef(owner->*file);
-          },
-          .kind = std::move(kind),
-          .request =
-              [object, request](CVdFileSelectorDlg& selector, GridRow row) {
-                if constexpr (std::is_member_function_pointer_v<Request>) {
-                  (pointerTo(object(row))->*request)(selector, row.item);
-                } else {
-                  request(selector, row);
-                }
-              }};
+  FileChoice choice{.file = [object, file](GridRow row) -> FileRef {
+                      auto* owner = pointerTo(object(row));
+                      return owner == nullptr ? FileRef() : FileRef(owner->*file);
+                    },
+                    .kind = std::move(kind)};
+  if constexpr (std::is_member_function_pointer_v<Request>) {
+    choice.request = [object, request](CVdFileSelectorDlg& selector, GridRow row) {
+      (pointerTo(object(row))->*request)(selector, row.item);
+    };
+  } else {
+    choice.request = std::move(request);
+  }
+  return choice;
 }
+
 // The same for a file that the engine will make.
 template <class Access, class Owner, class Member>
 FileChoice resultFileOf(Access object, Member Owner::*file, ByRow<FileKind> kind) {
