@@ -28,41 +28,16 @@
 #include "shell/grid_view.h"
 #include "shell/main_window.h"
 #include "shell/viewers/map_plot.h"
+#include "tests/shell/desktop_fixture.h"
 #include "tests/support/cells.h"
 #include "tests/support/pages.h"
 
 namespace gridbay::shell {
 
-class DesktopTest : public QObject {
+class DesktopTest : public DesktopFixture {
   Q_OBJECT
 
  private:
-  static std::vector<std::unique_ptr<EditorLibrary>> libraries() {
-    std::vector<std::unique_ptr<EditorLibrary>> found;
-    for (const char* name : {"v27nested", "v27nestedwsk"}) {
-      QString error;
-      found.push_back(EditorLibrary::load(name, &error));
-      if (found.back() == nullptr) qFatal("%s", qPrintable(error));
-    }
-    return found;
-  }
-
-  // Runs the command-line tool or the terrain maker of this build.
-  void run(const QString& program, const QStringList& arguments) {
-    QProcess process;
-    process.setWorkingDirectory(folder_->path());
-    process.start(QCoreApplication::applicationDirPath() + "/" + program, arguments);
-    QVERIFY(process.waitForFinished());
-    QCOMPARE(process.exitCode(), 0);
-  }
-
-  QString file(const QString& name) const { return folder_->filePath(name); }
-
-  static QString textOf(const QString& path) {
-    QFile opened(path);
-    return opened.open(QFile::ReadOnly) ? QString::fromUtf8(opened.readAll()) : QString();
-  }
-
   void type(const QString& label, const QString& text, int n = 1) {
     QWidget* widget = window_->currentDocument()->pane().widgetOf(label, n);
     auto* edit = qobject_cast<QLineEdit*>(widget->focusProxy() != nullptr ? widget->focusProxy() : widget);
@@ -122,30 +97,19 @@ class DesktopTest : public QObject {
     });
   }
 
-  QTemporaryDir* folder_ = nullptr;
-  MainWindow* window_ = nullptr;
-
  private slots:
-  void initTestCase() {
-    folder_ = new QTemporaryDir();
-    QSettings::setDefaultFormat(QSettings::IniFormat);
-    QSettings::setPath(QSettings::IniFormat, QSettings::UserScope, folder_->path());
-    for (const char* home : {"XDG_DATA_HOME", "XDG_CONFIG_HOME"}) qputenv(home, folder_->path().toUtf8());
-    run("make_terrain", {folder_->path()});
-    run("v27setup", {"convert", "raster", "estuary.asc", "estuary.tsb2", "--land", "5", "--crs", "UTM-32"});
-    run("v27setup", {"convert", "raster", "inlet.asc", "inlet.tsb2", "--land", "5", "--crs", "UTM-32"});
-  }
-  void cleanupTestCase() { delete folder_; }
+  void initTestCase() { makeFolder(); }
+  void cleanupTestCase() { folder_.reset(); }
 
   void init() {
     run("v27setup", {"new", "s.v27", "--force", "--area", "estuary.tsb2", "--area", "inlet.tsb2@36,33"});
-    window_ = new MainWindow(libraries());
+    window_ = std::make_unique<MainWindow>(libraries());
     window_->show();
     window_->activateWindow();
-    QVERIFY(QTest::qWaitForWindowActive(window_));
+    QVERIFY(QTest::qWaitForWindowActive(window_.get()));
     QVERIFY(window_->openDocument(file("s.v27")) != nullptr);
   }
-  void cleanup() { delete window_; }
+  void cleanup() { window_.reset(); }
 
   void everyVisiblePageOpens() {
     DocumentTab* tab = window_->currentDocument();
@@ -300,16 +264,16 @@ class DesktopTest : public QObject {
     DocumentTab* tab = window_->currentDocument();
     for (const int page : {26, 27, 28, 29, 34, 35, 39, 40}) {
       QVERIFY(tab->goToPage(page));
-      QTest::keyClick(window_, Qt::Key_F1);
+      QTest::keyClick(window_.get(), Qt::Key_F1);
       QVERIFY(window_->help().isVisible());
       QString heading = window_->help().browser().toPlainText().section('\n', 0, 0);
       QVERIFY2(heading.startsWith(tab->caption(page)), qPrintable(heading));
     }
     QVERIFY(tab->goToPage(1));
-    QTest::keyClick(window_, Qt::Key_F1);
+    QTest::keyClick(window_.get(), Qt::Key_F1);
     QVERIFY(window_->help().browser().toPlainText().startsWith("The setup editor"));
     QVERIFY(tab->goToPage(43));
-    const QString text = answer(QMessageBox::Ok, [this] { QTest::keyClick(window_, Qt::Key_F1); });
+    const QString text = answer(QMessageBox::Ok, [this] { QTest::keyClick(window_.get(), Qt::Key_F1); });
     QVERIFY2(text.contains("Initial Surface Elevation") && text.contains("150003") && text.contains("/help"),
              qPrintable(text));
   }
@@ -530,9 +494,9 @@ class DesktopTest : public QObject {
   void keysLeadThroughAPage() {
     DocumentTab* tab = window_->currentDocument();
     QVERIFY(tab->goToPage(26));
-    QTest::keyClick(window_, Qt::Key_PageUp, Qt::ControlModifier);
+    QTest::keyClick(window_.get(), Qt::Key_PageUp, Qt::ControlModifier);
     QCOMPARE(tab->currentPage(), 40);
-    QTest::keyClick(window_, Qt::Key_PageDown, Qt::ControlModifier);
+    QTest::keyClick(window_.get(), Qt::Key_PageDown, Qt::ControlModifier);
     QCOMPARE(tab->currentPage(), 26);
     edit("Drying depth:")->setFocus();
     QTest::keyClick(edit("Drying depth:"), Qt::Key_Tab);
@@ -657,11 +621,11 @@ class DesktopTest : public QObject {
     QVERIFY(QFile::copy(file("s.v27"), file("dropped.v27")));
     dropped.setUrls({QUrl::fromLocalFile(file("dropped.v27")), QUrl::fromLocalFile(file("s.v27"))});
     QDragEnterEvent enter(QPoint(5, 5), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
-    QApplication::sendEvent(window_, &enter);
+    QApplication::sendEvent(window_.get(), &enter);
     QVERIFY(enter.isAccepted());
     QDropEvent drop(QPointF(5, 5), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
     DocumentTab* before = window_->currentDocument();
-    QApplication::sendEvent(window_, &drop);
+    QApplication::sendEvent(window_.get(), &drop);
     // What is open already is not opened twice.
     QVERIFY(window_->currentDocument() == before);
     QCOMPARE(QSettings().value("recent").toStringList().value(0), file("dropped.v27"));
