@@ -5,7 +5,7 @@
 
 #include "basic/basic_parts.h"
 #include "basic/boundary.h"
-#include "basic/simulation_period.h"
+#include "families/data_files.h"
 #include "platform/files/paths.h"
 #include "platform/units/units.h"
 
@@ -48,13 +48,6 @@ bool isOnLine(std::int32_t point, const CBoundaryObjectKvs& line) {
 bool isRatingCurve(const FileNameValue& file) {
   return !file.empty() && sameName(std::filesystem::path(file.text()).extension().string(), ".tsb0") &&
          isReadableFile(file.absolute());
-}
-
-unsigned notValid(ValidationList& messages, const FileNameValue& file, const std::string& why) {
-  messages.push_back({PageId::hdBoundary,
-                      formatted(texts::dataFileNotValid, file.text()) + formatted(texts::errorMessage) + why,
-                      Severity::fault});
-  return 1;
 }
 
 }  // namespace
@@ -119,10 +112,8 @@ void CNhdBoundaryObjectKvs::requestAlongBoundary(CVdRqTsbItem& request, int numb
 }
 
 void CNhdBoundaryObjectKvs::finishRequest(CVdFileSelectorDlg& selector) {
-  if (auto* basic = parts<BasicParts>(); basic != nullptr)
-    basic->simulationPeriod->SetRequestPeriod(selector);
-  selector.EnablePlugin(0);
-  selector.SetVane27Compliant();
+  requestSimulationPeriod(selector, *this);
+  requestForEngine(selector);
 }
 
 void CNhdBoundaryObjectKvs::RequestDataFile(CVdFileSelectorDlg& selector, int number) {
@@ -162,18 +153,16 @@ void CNhdBoundaryObjectKvs::RequestDirectionFile(CVdFileSelectorDlg& selector, i
 
 unsigned CNhdBoundaryObjectKvs::Validate(ValidationList& messages, int, int number) {
   unsigned faults = 0;
-  std::string why;
   CVdFileSelectorDlg selector;
   RequestDataFile(selector, number);
-  const std::string path = dataFile.fileName.absolute();
-  const bool isChosen = dataFormat == kType0File || dataFormat == kType1File;
-  if ((isChosen && !selector.IsTsbFileValid(path, dataFile.items, &why)) ||
-      (dataFormat == kTransferFile && !selector.IsTsbFileValid(path, &why))) {
-    faults += notValid(messages, dataFile.fileName, why);
-  }
-  if (dataFormat == kRatingCurve && !isRatingCurve(dataFile.fileName)) {
-    selector.IsTsbFileValid(path, dataFile.items, &why);
-    faults += notValid(messages, dataFile.fileName, why);
+  if (dataFormat == kType0File || dataFormat == kType1File) {
+    faults += checkDataFile(messages, PageId::hdBoundary, selector, dataFile, Reason::told);
+  } else if (dataFormat == kTransferFile) {
+    faults += checkDataFile(messages, PageId::hdBoundary, selector, dataFile.fileName, Reason::told);
+  } else if (dataFormat == kRatingCurve && !isRatingCurve(dataFile.fileName)) {
+    std::string why;
+    selector.IsTsbFileValid(dataFile.fileName.absolute(), dataFile.items, &why);
+    faults += reportDataFile(messages, PageId::hdBoundary, dataFile.fileName, why);
   }
   if (tiltType == 0 || tiltType == 1) {
     const CBoundaryObjectKvs* line = boundary(number);
@@ -186,10 +175,7 @@ unsigned CNhdBoundaryObjectKvs::Validate(ValidationList& messages, int, int numb
   if ((fabType == kFabTransfer || fabType == kFabDefault) && enableUserDirections) {
     CVdFileSelectorDlg directions;
     RequestDirectionFile(directions, number);
-    if (!directions.IsTsbFileValid(directionFile.fileName.absolute(), directionFile.items, &why)) {
-      faults += report(messages, PageId::hdBoundary, Severity::fault, texts::dataFileNotValid,
-                       directionFile.fileName.text());
-    }
+    faults += checkDataFile(messages, PageId::hdBoundary, directions, directionFile);
   }
   return faults;
 }

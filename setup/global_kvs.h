@@ -4,16 +4,22 @@
 #include <string_view>
 #include <vector>
 
+#include "advection_dispersion/advection_dispersion_parts.h"
 #include "basic/basic_parts.h"
 #include "core/model_root.h"
 #include "hydrodynamic/hydrodynamic_parts.h"
+#include "structures/structures_parts.h"
 
 namespace gridbay {
 
 // The root of a model: owns one object for each page-sized part of the setup, and knows the skeleton of the
 // parameter file. Each room declares its members; a part reaches any other one through them. The orders of
 // saving, loading and checking stand in setup/skeleton.cpp, who follows whom in setup/followers.cpp.
-class CGlobalKvs final : public ModelRoot, public BasicParts, public HydrodynamicParts {
+class CGlobalKvs final : public ModelRoot,
+                         public BasicParts,
+                         public HydrodynamicParts,
+                         public StructureParts,
+                         public AdvectionDispersionParts {
  public:
   static constexpr std::string_view kTarget = "VANE27_NESTED_MODEL";
 

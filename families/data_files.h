@@ -1,0 +1,51 @@
+#pragma once
+
+#include <string>
+
+#include "basic/basic_parts.h"
+#include "basic/bathymetry.h"
+#include "core/file_selector.h"
+#include "core/kvs_base.h"
+#include "core/message.h"
+#include "core/selections.h"
+
+// What the objects of all modules ask of their data files, and how they tell that a file is not what it must
+// be.
+
+namespace gridbay {
+
+// Requires of a file that it covers the simulation.
+void requestSimulationPeriod(CVdFileSelectorDlg& selector, CKvsBase& object);
+
+// Requires of a map that it fits area `number` (from 1); without such an area only that it is a map. The
+// request is a CVdRqTsbItem or a CVdFileSelectorDlg.
+void requestArea(auto& request, CKvsBase& object, int number) {
+  auto* basic = object.parts<BasicParts>();
+  const CBathymetryObjectKvs* area = basic == nullptr ? nullptr : basic->bathymetry->GetArea(number);
+  if (area == nullptr) {
+    request.SetDimensions(2);
+  } else {
+    RequestMatchesArea(*area, request);
+  }
+}
+
+// The last word of nearly all requests: no plug-ins, and a file that the engine takes as it is.
+void requestForEngine(CVdFileSelectorDlg& selector);
+
+// A message that a file is not valid, with the selector's reason behind it where that is wanted. Returns 1.
+enum class Reason { left, told };
+unsigned reportDataFile(ValidationList& messages, PageId page, const FileNameValue& file,
+                        const std::string& why, Reason reason = Reason::told,
+                        Severity severity = Severity::fault);
+
+// Whether a file, with the items chosen in it, meets what the selector asks; else that message. Returns the
+// number of faults.
+unsigned checkDataFile(ValidationList& messages, PageId page, const CVdFileSelectorDlg& selector,
+                       const UTsbSelection& file, Reason reason = Reason::left,
+                       Severity severity = Severity::fault);
+// The same for a file with no items to choose.
+unsigned checkDataFile(ValidationList& messages, PageId page, const CVdFileSelectorDlg& selector,
+                       const FileNameValue& file, Reason reason = Reason::left,
+                       Severity severity = Severity::fault);
+
+}  // namespace gridbay
