@@ -139,6 +139,31 @@ int CBathymetryKvs::GetGeoReference(std::string* projectionName, double* easting
   return 1;
 }
 
+void CBathymetryKvs::OnArea1FileChanged() {
+  std::string name;
+  double easting = 0;
+  double northing = 0;
+  if (GetGeoReference(&name, &easting, &northing) == 1) projectionStale = true;
+}
+
+std::unique_ptr<CBathymetryObjectKvs> CBathymetryKvs::ReadArea1Aside() {
+  constexpr int kNotArea1 = 0;  // so that the simulation period is left alone
+  const CBathymetryObjectKvs* area = GetArea(1);
+  if (area == nullptr) return nullptr;
+  auto aside = std::make_unique<CBathymetryObjectKvs>(this);
+  aside->CopyFrom(*area);
+  ValidationList dropped;
+  return aside->ReadGrid(dropped, kNotArea1) == 0 ? std::move(aside) : nullptr;
+}
+
+std::vector<int> CBathymetryKvs::UnreadAreas() const {
+  std::vector<int> unread;
+  for (int number = 1; number <= GetCount(); ++number) {
+    if (!GetItem(number)->contains(0, 0)) unread.push_back(number);
+  }
+  return unread;
+}
+
 double CBathymetryKvs::EstimateSizeMB(double factor) const {
   constexpr double kBytes = 4;
   constexpr double kMegabyte = 1024.0 * 1024.0;

@@ -1,7 +1,9 @@
 #pragma once
 
 #include <cstdint>
+#include <memory>
 #include <string>
+#include <vector>
 
 #include "basic/texts.h"
 #include "core/array2d.h"
@@ -105,6 +107,12 @@ class CBathymetryKvs final : public ListKvs<CBathymetryKvs, CBathymetryObjectKvs
   int GetProjection(std::string* text, int* flag);
   // The projection of Area 1's file and the place of its first point (metres). Returns 1 when it has one.
   int GetGeoReference(std::string* projectionName, double* easting, double* northing) const;
+  // Area 1 has another file: the projection that this gives a place by counts from now on.
+  void OnArea1FileChanged();
+  // Area 1 as its file has it, beside the model, which a look does not change; null when it can't be read.
+  std::unique_ptr<CBathymetryObjectKvs> ReadArea1Aside();
+  // The numbers of the areas whose grids have not been read.
+  std::vector<int> UnreadAreas() const;
   // Megabytes of `factor` 4-byte values for each point of all areas.
   double EstimateSizeMB(double factor) const;
 };

@@ -36,12 +36,9 @@ void CBathymetryGrid::LayOut() {
 void CBathymetryGrid::OnFileChanged(int row) {
   if (row != 1) return;
   CBathymetryKvs& areas = *parts<BasicParts>().bathymetry;
-  std::string name;
-  double easting = 0;
-  double northing = 0;
-  if (areas.GetGeoReference(&name, &easting, &northing) == 1) areas.projectionStale = true;
+  areas.OnArea1FileChanged();
   CBoundaryKvs& boundaries = *parts<BasicParts>().boundary;
-  if (boundaries.defaultPosition == 0) return;
+  if (boundaries.isUserSpecified()) return;
   const bool ask = boundaries.GetCount() > 0;
   if (!ask || document().host().askYesNo(formatted(texts::recalculateBoundaries)))
     boundaries.RecalculateBoundaries();
@@ -86,18 +83,6 @@ void CBathymetryDlg::SetData() {
   CV27SetupFormView::SetData();
 }
 
-// Area 1 as its file has it, beside the model, which is not changed by a look; null when the file can't be
-// read. Any number but 1 leaves the simulation period alone.
-std::unique_ptr<CBathymetryObjectKvs> CBathymetryDlg::readArea1() {
-  constexpr int kNotArea1 = 0;
-  CBathymetryObjectKvs* area = parts<BasicParts>().bathymetry->GetArea(1);
-  if (area == nullptr) return nullptr;
-  auto seen = std::make_unique<CBathymetryObjectKvs>(area->GetParent());
-  seen->CopyFrom(*area);
-  ValidationList dropped;
-  return seen->ReadGrid(dropped, kNotArea1) == 0 ? std::move(seen) : nullptr;
-}
-
 // The fine grid is held against Area 1, and so comes after it.
 FileChoice CBathymetryDlg::overlandFile() {
   const auto area1 = std::make_shared<std::unique_ptr<CBathymetryObjectKvs>>();
@@ -108,7 +93,7 @@ FileChoice CBathymetryDlg::overlandFile() {
                              selector.AddRequest(std::make_unique<COverlandRqTsbItem>(**area1));
                            });
   file.ready = [this, area1](GridRow) {
-    *area1 = readArea1();
+    *area1 = parts<BasicParts>().bathymetry->ReadArea1Aside();
     if (*area1 == nullptr) document().host().show(formatted(texts::area1First));
     return *area1 != nullptr;
   };

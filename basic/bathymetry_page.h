@@ -1,14 +1,11 @@
 #pragma once
 
-#include <memory>
 #include <string>
 #include <vector>
 
 #include "pages/cell_grid.h"
 
 namespace gridbay {
-
-class CBathymetryObjectKvs;
 
 // One row for each area: its grid file and where it lies.
 class CBathymetryGrid final : public ColumnGrid {
@@ -24,7 +21,6 @@ class CBathymetryDlg final : public Page<18703, PageId::bathymetry> {
 
  private:
   void DoDataExchange(Form& form) override;
-  std::unique_ptr<CBathymetryObjectKvs> readArea1();
   FileChoice overlandFile();
 
   std::vector<std::string> projections_;  // the one that holds, and those that can be picked in its place

@@ -45,6 +45,7 @@ class CBoundaryKvs final : public ListKvs<CBoundaryKvs, CBoundaryObjectKvs> {
                    items("BOUNDARY_%d", texts::boundarySectionMissing));
   }
 
+  bool isUserSpecified() const { return defaultPosition == 0; }
   void SetNoBoundaries(int n) { SetCount(n); }
   // Finds the boundaries along the border of Area 1, whose file it reads. All that was set for the old ones
   // is lost, also when the file cannot be read.

@@ -4,25 +4,17 @@
 #include "basic/boundary.h"
 
 namespace gridbay {
-namespace {
-
-constexpr std::int32_t kUserSpecified = 0;
-
-}  // namespace
-
 void CBoundaryGrid::LayOut() {
   constexpr int kWidth = 90;
   const auto boundary = RowsOf(&BasicParts::boundary);
-  const auto isDetected = [this](GridRow) {
-    return parts<BasicParts>().boundary->defaultPosition != kUserSpecified;
-  };
+  const auto isDetected = [this](GridRow) { return !parts<BasicParts>().boundary->isUserSpecified(); };
   Point("First point", kWidth, boundary, &CBoundaryObjectKvs::first).Right().ReadOnlyIf(isDetected);
   Point("Last point", kWidth, boundary, &CBoundaryObjectKvs::last).Right().ReadOnlyIf(isDetected);
 }
 
 void CBoundaryDlg::DoDataExchange(Form& form) {
   const auto list = objectOf(&BasicParts::boundary);
-  const auto isGiven = [list] { return list().defaultPosition == kUserSpecified; };
+  const auto isGiven = [list] { return list().isUserSpecified(); };
   const auto setPosition = [=](std::int32_t position) {
     list().defaultPosition = position;
     if (!isGiven()) list().RecalculateBoundaries();

@@ -15,18 +15,11 @@ namespace {
 constexpr int kRowsAbove = 2;  // the area and the number of corners
 constexpr int kMostCorners = 32767;
 
-// Whether the model's module and scheme have a mass budget.
-bool isAvailable(const CModuleSelectionKvs& selection) {
-  const std::int32_t code = selection.simulationType;
-  const bool isTransport = code == module::kAdvectionDispersion || code == module::kMudTransportExpanded ||
-                           code == module::kEcological;
-  return isTransport && (selection.adScheme == 1 || selection.adScheme == -1);
-}
-
 }  // namespace
 
 int CMassBudgetGrid::GetColCount() {
-  return isAvailable(*parts<BasicParts>().moduleSelection) ? parts<BasicParts>().massBudget->GetCount() : 0;
+  return parts<BasicParts>().moduleSelection->HasMassBudget() ? parts<BasicParts>().massBudget->GetCount()
+                                                              : 0;
 }
 int CMassBudgetGrid::GetRowCount() {
   return kRowsAbove + (GetColCount() == 0 ? 0 : parts<BasicParts>().massBudget->GetMaxCorners());
@@ -72,7 +65,8 @@ CellGrid::Place CMassBudgetGrid::placeOf(int row, int col) {
 
 void CMassBudgetDlg::DoDataExchange(Form& form) {
   form.Count("&Number of polygons:", countOf(objectOf(&BasicParts::massBudget)), CMassBudgetKvs::kMostOnPage)
-      .EnabledIf([selection = objectOf(&BasicParts::moduleSelection)] { return isAvailable(selection()); });
+      .EnabledIf(
+          [selection = objectOf(&BasicParts::moduleSelection)] { return selection().HasMassBudget(); });
   form.Grid("Polygons", grid_);
 }
 

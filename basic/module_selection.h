@@ -38,6 +38,13 @@ class CModuleSelectionKvs final : public TableKvs<CModuleSelectionKvs> {
 
   void Load(KvsSection section, const std::string& documentPath) override;
 
+  // Whether the module is one of transport, with a scheme that has mass budgets.
+  bool HasMassBudget() const {
+    return (simulationType == module::kAdvectionDispersion ||
+            simulationType == module::kMudTransportExpanded || simulationType == module::kEcological) &&
+           (adScheme == 1 || adScheme == -1);
+  }
+
  private:
   static constexpr std::int32_t kPinnedType = module::kHydrodynamic;
   static constexpr std::int32_t kPinnedScheme = 1;

@@ -1,6 +1,6 @@
 #include "basic/simulation_period_page.h"
 
-#include <fmt/format.h>
+#include <fmt/ranges.h>
 
 #include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
@@ -40,14 +40,10 @@ void CSimulationPeriodDlg::SetData() {
   double courant = 0;
   int area = 0;
   areas.GetMaxCourant(parts<BasicParts>().simulationPeriod->timeStepInterval, &courant, &area);
-  bool isKnown = false;
-  unread_.clear();
-  for (int number = 1; number <= areas.GetCount(); ++number) {
-    const bool isRead = areas.GetArea(number)->contains(0, 0);
-    isKnown = isKnown || isRead;
-    if (!isRead)
-      unread_ += fmt::format("{} {}", unread_.empty() ? "Not known before a validation: area" : ",", number);
-  }
+  const std::vector<int> unread = areas.UnreadAreas();
+  const bool isKnown = static_cast<int>(unread.size()) < areas.GetCount();
+  unread_ =
+      unread.empty() ? "" : fmt::format("Not known before a validation: area {}", fmt::join(unread, ", "));
   maxCourant_ = isKnown ? fmt::format("{:.6g}", courant) : std::string();
   courantArea_ = isKnown ? std::to_string(area) : std::string();
   CV27SetupFormView::SetData();

@@ -96,6 +96,16 @@ void CNhdBoundaryObjectKvs::SetDataFormat(std::int32_t format) {
   }
 }
 
+int CNhdBoundaryObjectKvs::quantity() const {
+  return formulation == kFlux ? item::kDischarge : item::kWaterLevel;
+}
+
+int CNhdBoundaryObjectKvs::dataQuantity() const {
+  if (formulation != kFlux) return dataFormat == kTransferFile ? item::kFlowFlux : item::kWaterLevel;
+  if (dataFormat <= kType0File) return item::kDischarge;
+  return dataFormat == kRatingCurve ? item::kUndefined : item::kFlowFlux;
+}
+
 const CBoundaryObjectKvs* CNhdBoundaryObjectKvs::boundary(int number) {
   auto* basic = parts<BasicParts>();
   return basic == nullptr ? nullptr : basic->boundary->GetItem(number);

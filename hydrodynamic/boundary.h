@@ -80,6 +80,10 @@ class CNhdBoundaryObjectKvs final : public TableKvs<CNhdBoundaryObjectKvs> {
   // Changes the data format with what depends on it: the number of items chosen, and the FAB type. A format
   // that is set already changes nothing.
   void SetDataFormat(std::int32_t format);
+  bool isFromFile() const { return dataFormat != kConstant && dataFormat != kSineSeries; }
+  // The quantity of its values; of what its cell of data holds, a file's items included.
+  int quantity() const;
+  int dataQuantity() const;
   // What the data file, and the file of flow directions, of boundary `number` must be.
   void RequestDataFile(CVdFileSelectorDlg& selector, int number);
   void RequestDirectionFile(CVdFileSelectorDlg& selector, int number);

@@ -8,7 +8,7 @@
 #include "basic/page_texts.h"
 #include "hydrodynamic/hydrodynamic_parts.h"
 #include "hydrodynamic/page_texts.h"
-#include "pages/dialog.h"
+#include "hydrodynamic/sine_series_dialog.h"
 #include "pages/scan.h"
 #include "platform/units/units.h"
 
@@ -28,51 +28,10 @@ Choices dataFormats(const Object& object) {
   return object.formulation == Object::kFlux ? all : all.first(5);
 }
 
-bool isFile(const Object& object) {
-  return object.dataFormat != Object::kConstant && object.dataFormat != Object::kSineSeries;
-}
-
 FileKind fileKind(const Object& object) {
   if (object.dataFormat == Object::kRatingCurve) return texts::ratingCurveFile;
   return object.dataFormat == Object::kType0File ? texts::timeSeriesFile : texts::profileFile;
 }
-
-int quantityOf(const Object& object) {
-  return object.formulation == Object::kFlux ? item::kDischarge : item::kWaterLevel;
-}
-
-int tipQuantityOf(const Object& object) {
-  if (object.formulation != Object::kFlux) {
-    return object.dataFormat == Object::kTransferFile ? item::kFlowFlux : item::kWaterLevel;
-  }
-  if (object.dataFormat <= Object::kType0File) return item::kDischarge;
-  return object.dataFormat == Object::kRatingCurve ? item::kUndefined : item::kFlowFlux;
-}
-
-CVdEditStyle levelOrFlux(const Object& object, const CVdDoc& document) {
-  return CVdEditStyle(document.units()).SetQunUnitBaseGroup(quantityOf(object));
-}
-
-// The dialog of a sine series, over a copy of it; OK copies the four values back.
-class CNhdSineSeriesDlg final : public CV27SetupDialog {
- public:
-  CNhdSineSeriesDlg(CVdDoc& document, const Object& object)
-      : CV27SetupDialog(document, texts::sineTitle.format) {
-    copy_.copyWhole(object);
-    const auto copy = [this]() -> Object& { return copy_; };
-    form().Number("Reference level:", copy, &Object::referenceLevel, quantityOf(object));
-    form().Number("Range", copy, &Object::range, quantityOf(object));
-    form().Number("Period", copy, &Object::period);
-    form().Number("Phase", copy, &Object::phase);
-  }
-  void OnOK(Object& object) const {
-    for (float Object::*value : {&Object::referenceLevel, &Object::range, &Object::period, &Object::phase})
-      object.*value = copy_.*value;
-  }
-
- private:
-  Object copy_{nullptr};
-};
 
 }  // namespace
 
@@ -134,56 +93,40 @@ void CNhdBoundaryGrid::layOutData() {
   Column& data = FileName("", 0, file);
   data.get = [this, object](GridRow row) { return dataText(*object(row)); };
   data.set = [this, object, typed = data.set](GridRow row, std::string_view text) {
-    return isFile(*object(row)) ? typed(row, text) : storeData(*object(row), text);
+    return object(row)->isFromFile() ? typed(row, text) : storeData(*object(row), text);
   };
   data.Look([this, object](GridRow row, CellStyle& style) {
-    style.align = isFile(*object(row)) ? CellAlign::left : CellAlign::right;
+    style.align = object(row)->isFromFile() ? CellAlign::left : CellAlign::right;
     style.toolTip =
-        CVdEditStyle(document().units()).SetQunUnitBaseGroup(tipQuantityOf(*object(row))).GetQunToolTipText();
+        CVdEditStyle(document().units()).SetQunUnitBaseGroup(object(row)->dataQuantity()).GetQunToolTipText();
   });
   Column& browse = Browse("...", 0, file);
   browse.EnabledIf([object](GridRow row) { return object(row)->dataFormat != Object::kConstant; });
   browse.press = [=, this, chooseFile = browse.press](GridRow row) {
-    isSine(row) ? editSine(*object(row)) : chooseFile(row);
+    if (!isSine(row)) {
+      chooseFile(row);
+    } else if (CNhdSineSeriesDlg dialog(document(), *object(row)); dialog.DoModal() == 1) {
+      dialog.OnOK(*object(row));
+      UpdateDoc();
+    }
   };
-  View(texts::view.format, 0, file, [object](GridRow row) { return isFile(*object(row)); });
+  View(texts::view.format, 0, file, [object](GridRow row) { return object(row)->isFromFile(); });
 }
 
 std::string CNhdBoundaryGrid::dataText(const Object& object) {
-  const CVdEditStyle style = levelOrFlux(object, document());
+  const CVdEditStyle style = CVdEditStyle(document().units()).SetQunUnitBaseGroup(object.quantity());
   if (object.dataFormat == Object::kConstant) return style.Text(object.value);
-  if (object.dataFormat != Object::kSineSeries) return object.dataFile.fileName.text();
-  return formatted(texts::sineText, style.UnitConvertFromBase(object.range / 2, 1), double{object.phase},
-                   double{object.period}, style.UnitConvertFromBase(object.referenceLevel, 1));
+  return object.isFromFile() ? object.dataFile.fileName.text() : sineText(object, style);
 }
 
-// The fields of a sine series go into the object as they are read, also when the text then turns out to be
-// too short: phase and period that were read, and amplitude and reference level as 0 where they were not.
 Stored CNhdBoundaryGrid::storeData(Object& object, std::string_view text) {
-  const CVdEditStyle style = levelOrFlux(object, document());
-  const auto inBase = [&style](double typed) {
-    return static_cast<float>(style.UnitConvertFromBase(typed, 0));
-  };
-  if (object.dataFormat == Object::kConstant) {
-    const std::optional<double> value = scannedReal(text);
-    if (!value || !std::isfinite(inBase(*value))) return Stored::refused;
-    object.value = inBase(*value);
-    return Stored::taken;
-  }
-  float amplitude = 0;
-  float reference = 0;
-  const int read =
-      scan(text, texts::sineForm.format, {&amplitude, &object.phase, &object.period, &reference});
-  object.range = inBase(2.0 * amplitude);
-  object.referenceLevel = inBase(reference);
-  return read == 4 ? Stored::taken : Stored::partly;
-}
-
-void CNhdBoundaryGrid::editSine(Object& object) {
-  CNhdSineSeriesDlg dialog(document(), object);
-  if (dialog.DoModal() != 1) return;
-  dialog.OnOK(object);
-  UpdateDoc();
+  const CVdEditStyle style = CVdEditStyle(document().units()).SetQunUnitBaseGroup(object.quantity());
+  if (object.dataFormat != Object::kConstant) return storeSineText(object, text, style);
+  const std::optional<double> typed = scannedReal(text);
+  const auto value = static_cast<float>(style.UnitConvertFromBase(typed.value_or(NAN), 0));
+  if (!std::isfinite(value)) return Stored::refused;
+  object.value = value;
+  return Stored::taken;
 }
 
 }  // namespace gridbay

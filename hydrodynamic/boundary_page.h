@@ -25,7 +25,6 @@ class CNhdBoundaryGrid final : public BlockGrid {
   void layOutData();
   std::string dataText(const CNhdBoundaryObjectKvs& object);
   Stored storeData(CNhdBoundaryObjectKvs& object, std::string_view text);
-  void editSine(CNhdBoundaryObjectKvs& object);
 };
 
 // The conditions at the open boundaries.

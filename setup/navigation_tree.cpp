@@ -209,12 +209,7 @@ void rule2HotStart(CNavigationView& tree, CGlobalKvs& model) {
 }
 
 void rule11MassBudget(CNavigationView& tree, CGlobalKvs& model) {
-  constexpr std::array kModules{module::kAdvectionDispersion, module::kMudTransportExpanded,
-                                module::kEcological};
-  const CModuleSelectionKvs& selection = *model.moduleSelection;
-  const bool transports = std::ranges::find(kModules, selection.simulationType) != kModules.end();
-  const bool budgeted = selection.adScheme == 1 || selection.adScheme == -1;
-  showAll(tree, transports && budgeted && model.massBudget->GetCount() > 0, {21, 76, 119});
+  showAll(tree, model.moduleSelection->HasMassBudget() && model.massBudget->GetCount() > 0, {21, 76, 119});
 }
 
 void rule20Sliding(CNavigationView& tree, CGlobalKvs& model) {
