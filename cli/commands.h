@@ -43,7 +43,7 @@ std::string_view toolName();
 
 // Options that several commands have.
 CLI::Option* addForce(CLI::App& command, bool& force);
-// The text that names an item type; `itemType` is a std::string, or an optional one.
+// The text that names an item type; `itemType` is a std::string, an optional one, or a list.
 std::string itemTypeHelp(std::string_view ofWhat);
 CLI::Option* addItemType(CLI::App& command, auto& itemType, std::string_view ofWhat) {
   return command.add_option("--item-type", itemType, itemTypeHelp(ofWhat));

@@ -27,7 +27,7 @@ constexpr std::size_t kPointsAtOnce = 1 << 22;
 struct Options {
   std::string in;
   std::string out;
-  float land = 0;
+  std::optional<float> land;
   std::optional<std::string> itemType;
   std::optional<int> band;
   int subdataset = 0;  // 0 for none
@@ -149,6 +149,8 @@ Result<Target> define(const Options& options, const Raster& raster, const Raster
   const Result<const QunItem*> quantity = itemTypeOfText(
       options.itemType.value_or(std::to_string(raster.itemType().value_or(item::kBathymetry))));
   if (!quantity) return Failure{quantity.error()};
+  if ((*quantity)->code == item::kBathymetry && !options.land)
+    return Failure{"A bathymetry needs a land value: --land VALUE (points at or above it are land)"};
   const std::string_view baseUnit = qunBaseUnit((*quantity)->code)->text;
   if (const CVdUnitConverter converter(raster.unit(), baseUnit);
       !raster.unit().empty() &&
@@ -173,7 +175,7 @@ Result<Target> define(const Options& options, const Raster& raster, const Raster
       {static_cast<std::size_t>(chosen.noJ), isTurned ? 0 : target.east, layout.dx * chosen.every, "m"},
       {static_cast<std::size_t>(chosen.noK), isTurned ? 0 : target.north, layout.dy * chosen.every, "m"}};
   definition.items = {{std::string((*quantity)->name), (*quantity)->code, std::string(baseUnit)}};
-  definition.customBlocks = {{"V27_Misc", {0, 0, 0, options.land}}};
+  if (options.land) definition.customBlocks = {{"V27_Misc", {0, 0, 0, *options.land}}};
   if (map.IsLocal()) {
     if (isTurned) {
       console.note(fmt::format(
@@ -196,7 +198,7 @@ Result<std::size_t> copyValues(const Options& options, Raster& raster, const Ras
                                const Selection& chosen, TsbWriter& writer, const Console& console) {
   const auto columns = static_cast<std::size_t>(raster.columns());
   const int rowsAtOnce = static_cast<int>(std::max<std::size_t>(kPointsAtOnce / columns, 1));
-  const float missingAs = options.missingAs.value_or(options.land);
+  const std::optional<float> missingAs = options.missingAs ? options.missingAs : options.land;
   const std::optional<double> missing = raster.missingValue();
   const auto isMissing = [&missing](float value) {
     return !std::isfinite(value) || (missing && value == static_cast<float>(*missing));
@@ -223,7 +225,11 @@ Result<std::size_t> copyValues(const Options& options, Raster& raster, const Ras
       const float value = source[layout.column(chosen.firstJ + j * chosen.every)];
       const bool gone = isMissing(value);
       missingCount += gone ? 1 : 0;
-      row[static_cast<std::size_t>(j)] = gone ? missingAs : value;
+      if (gone && !missingAs) {
+        return Failure{
+            fmt::format("\"{}\" has missing values: say what stands for them with --nodata-as", options.in)};
+      }
+      row[static_cast<std::size_t>(j)] = gone ? *missingAs : value;
     }
     if (const Outcome written = writer.writeRows(1, 0, static_cast<std::size_t>(k), row); !written) {
       return Failure{written.error()};
@@ -281,13 +287,13 @@ int convertRaster(const Options& options, const Console& console) {
   const TsbGridAxis& y = target->definition.axes[1];
   const std::optional<TsbGeography>& place = target->definition.geography;
   console.out << fmt::format(
-      "{}: {} x {} points, {:.6g} x {:.6g} m apart, from {:.10g}, {:.10g}{}; land at {:g}\n", options.out,
-      x.points, y.points, x.spacing, y.spacing, target->east, target->north,
+      "{}: {} x {} points, {:.6g} x {:.6g} m apart, from {:.10g}, {:.10g}{}{}\n", options.out, x.points,
+      y.points, x.spacing, y.spacing, target->east, target->north,
       place && place->isTurned() ? fmt::format(", turned {:g} degrees clockwise", place->rotation) : "",
-      options.land);
+      options.land ? fmt::format("; land at {:g}", *options.land) : "");
   if (*missing > 0) {
     console.out << fmt::format("{} missing values written as {:g}\n", *missing,
-                               options.missingAs.value_or(options.land));
+                               options.missingAs ? *options.missingAs : *options.land);
   }
   return kClean;
 }
@@ -306,8 +312,8 @@ void addConvertRaster(CLI::App& convert, Action& action) {
       ->required();
   command
       .add_option("--land", options->land,
-                  "Points at or above this value are land (unit of the values, at least 0)")
-      ->required()
+                  "Points at or above this value are land (unit of the values, at least 0); a bathymetry "
+                  "needs it")
       ->check(finite(0));
   addItemType(command, options->itemType,
               "the values, which are in its base unit (default: as the file says, or else Bathymetry)");

@@ -25,7 +25,7 @@ constexpr double kEvenTolerance = 1e-3;
 struct Options {
   std::string in;
   std::string out;
-  std::string itemType;
+  std::vector<std::string> itemTypes;  // one for all columns, or one for each
   std::string start;
   std::string timeUnit = "s";
   int skipLines = 0;
@@ -140,9 +140,12 @@ TsbTimeAxis timeAxisOf(const Table& table, const Options& options, const DateTim
 int convertSeries(const Options& options, const Console& console) {
   if (const Outcome free = mayWrite(options.out, options.force, {&options.in, 1}); !free)
     return console.fail(free.error());
-  const Result<const QunItem*> found = itemTypeOfText(options.itemType);
-  if (!found) return console.fail(found.error());
-  const QunItem* quantity = *found;
+  std::vector<const QunItem*> quantities;
+  for (const std::string& text : options.itemTypes) {
+    const Result<const QunItem*> found = itemTypeOfText(text);
+    if (!found) return console.fail(found.error());
+    quantities.push_back(*found);
+  }
   const std::optional<DateTime> start = dateTimeOfText(options.start);
   if (!start)
     return console.fail(fmt::format("\"{}\" is no moment of the form YYYY-MM-DD hh:mm:ss", options.start));
@@ -151,6 +154,13 @@ int convertSeries(const Options& options, const Console& console) {
   }
   const Result<Table> table = readTable(options);
   if (!table) return console.fail(table.error());
+
+  if (quantities.size() > 1 && quantities.size() != table->columns.size()) {
+    return console.fail(
+        fmt::format("There are {} item types for {} columns of values: give one for all, or "
+                    "one for each",
+                    quantities.size(), table->columns.size()));
+  }
 
   TsbDefinition definition;
   definition.title = std::filesystem::path(options.in).stem().string();
@@ -163,8 +173,9 @@ int convertSeries(const Options& options, const Console& console) {
                                     options.in, table->times.front(), table->times.back(), options.timeUnit));
   }
   for (std::size_t i = 0; i < table->columns.size(); ++i) {
+    const QunItem* quantity = quantities.size() > 1 ? quantities[i] : quantities.front();
     std::string name = i < table->names.size() ? table->names[i] : std::string(quantity->name);
-    if (table->names.empty() && table->columns.size() > 1) name += fmt::format(" {}", i + 1);
+    if (table->names.empty() && table->columns.size() > quantities.size()) name += fmt::format(" {}", i + 1);
     definition.items.push_back(
         {std::move(name), quantity->code, std::string(qunBaseUnit(quantity->code)->text), true});
   }
@@ -199,7 +210,10 @@ void addConvertSeries(CLI::App& convert, Action& action) {
       .add_option("IN", options->in, "Lines of a time and values, between commas, semicolons, tabs or blanks")
       ->required();
   command.add_option("OUT", options->out, "The time series to write (*.tsb0)")->required();
-  addItemType(command, options->itemType, "the values, which are in its base unit")->required();
+  addItemType(command, options->itemTypes,
+              "the values, which are in its base unit; once for all columns, or once for each")
+      ->required()
+      ->allow_extra_args(false);
   command.add_option("--start", options->start, "The moment of time 0, \"YYYY-MM-DD hh:mm:ss\"")->required();
   command.add_option("--time-unit", options->timeUnit, "Unit of the times: s, min, h, d")
       ->capture_default_str();

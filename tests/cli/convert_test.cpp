@@ -410,6 +410,22 @@ TEST_F(ConvertRaster, ItemTypesByName) {
               HasSubstr("There is no item type \"\""));
 }
 
+TEST_F(ConvertRaster, OnlyABathymetryNeedsALandValue) {
+  const std::string whole = folder.write(
+      "n.asc", "ncols 2\nnrows 1\nxllcorner 0\nyllcorner 0\ncellsize 1\nNODATA_value -9\n32 40\n");
+  EXPECT_THAT(refused({whole, out}), HasSubstr("A bathymetry needs a land value"));
+  const std::string gaps = folder.write(
+      "g.asc", "ncols 2\nnrows 1\nxllcorner 0\nyllcorner 0\ncellsize 1\nNODATA_value -9\n32 -9\n");
+  EXPECT_THAT(refused({gaps, out, "--item-type", "100030"}), HasSubstr("--nodata-as"));
+  run = runTool({"convert", "raster", whole, out, "--item-type", "100030"});
+  ASSERT_EQ(run.status, 0) << run.err;
+  EXPECT_THAT(run.out, Not(HasSubstr("land at")));
+  EXPECT_TRUE(info()["custom_blocks"].empty());
+  EXPECT_EQ(runTool({"convert", "raster", gaps, out, "--force", "--item-type", "100030", "--nodata-as", "30"})
+                .status,
+            0);
+}
+
 TEST(ConvertTypes, ListsEveryItemType) {
   EXPECT_THAT(runTool({"convert", "types"}).out,
               HasSubstr("\n100030  Manning number                      m^⅓/s\n"));
@@ -448,6 +464,26 @@ TEST_F(ConvertSeries, DelimitersColumnsAndHeadings) {
     ASSERT_TRUE(TsbFile::open(out)->read(2, 1, std::span<double>(&second, 1)));
     EXPECT_EQ(second, 4);
   }
+}
+
+TEST_F(ConvertSeries, EachColumnMayHaveAnItemType) {
+  const std::string text = folder.write("q.txt", "t,Discharge,Speed\n0,100,0.5\n60,120,0.6\n");
+  const auto convertAs = [&](std::vector<std::string> types) {
+    std::vector<std::string> words{"convert", "series",  "--skip-lines",
+                                   "1",       "--start", "2020-01-01 00:00:00"};
+    for (std::string& type : types) words.insert(words.end(), {"--item-type", std::move(type)});
+    words.insert(words.end(), {text, out, "--force"});
+    return runTool(words);
+  };
+  ASSERT_EQ(convertAs({"100001", "100242"}).status, 0);
+  EXPECT_EQ(info()["items"][0]["name"], "Discharge");
+  EXPECT_EQ(info()["items"][0]["type"], 100001);
+  EXPECT_EQ(info()["items"][1]["type"], 100242);
+  ASSERT_EQ(convertAs({"100001"}).status, 0);
+  EXPECT_EQ(info()["items"][1]["type"], 100001);
+  const ProgramRun refusal = convertAs({"100001", "100001", "100001"});
+  EXPECT_EQ(refusal.status, 2);
+  EXPECT_THAT(refusal.err, HasSubstr("There are 3 item types for 2 columns of values"));
 }
 
 TEST_F(ConvertSeries, UnevenTimesAreKept) {
