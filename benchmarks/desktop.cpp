@@ -22,7 +22,7 @@ constexpr int kValidate = 46019;
 class Example {
  public:
   Example() {
-    run("make_terrain", {folder_.path()});
+    run("make_estuary", {folder_.path()});
     for (const char* name : {"estuary", "inlet"}) {
       run("v27setup", {"convert", "raster", QString(name) + ".asc", QString(name) + ".tsb2", "--land", "5",
                        "--crs", "UTM-32"});

@@ -32,7 +32,7 @@ class DesktopFixture : public QObject {
     QSettings::setDefaultFormat(QSettings::IniFormat);
     QSettings::setPath(QSettings::IniFormat, QSettings::UserScope, folder_->path());
     for (const char* home : {"XDG_DATA_HOME", "XDG_CONFIG_HOME"}) qputenv(home, folder_->path().toUtf8());
-    run("make_terrain", {folder_->path()});
+    run("make_estuary", {folder_->path()});
     for (const QString name : {"estuary", "inlet"})
       run("v27setup", {"convert", "raster", name + ".asc", name + ".tsb2", "--land", "5", "--crs", "UTM-32"});
   }
