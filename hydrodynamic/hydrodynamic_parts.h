@@ -5,6 +5,11 @@
 namespace gridbay {
 
 class CNhdBoundaryKvs;
+class CNhdEddyViscosityKvs;
+class CNhdResistanceKvs;
+class CNhdSurfaceElevationKvs;
+class CNhdWaveRadiationKvs;
+class CWindConditionsKvs;
 
 // The conditions and results of the flow calculation, as members of the root. None is ever null while the
 // root lives.
@@ -13,6 +18,11 @@ struct HydrodynamicParts {
   ~HydrodynamicParts();
 
   std::unique_ptr<CNhdBoundaryKvs> nhdBoundary;
+  std::unique_ptr<CWindConditionsKvs> windConditions;
+  std::unique_ptr<CNhdEddyViscosityKvs> nhdEddyViscosity;
+  std::unique_ptr<CNhdWaveRadiationKvs> nhdWaveRadiation;
+  std::unique_ptr<CNhdSurfaceElevationKvs> nhdSurfaceElevation;
+  std::unique_ptr<CNhdResistanceKvs> nhdResistance;
 };
 
 }  // namespace gridbay

@@ -4,6 +4,10 @@
 #include "basic/boundary.h"
 #include "basic/source_sink.h"
 #include "hydrodynamic/boundary.h"
+#include "hydrodynamic/eddy_viscosity.h"
+#include "hydrodynamic/resistance.h"
+#include "hydrodynamic/surface_elevation.h"
+#include "hydrodynamic/wave_radiation.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay {
@@ -29,7 +33,12 @@ const CKvsBase& leader(const G& root) {
   return *(root.*member);
 }
 
-constexpr std::array<Follower, 0> kOfAreas{};
+constexpr std::array<Follower, 4> kOfAreas{
+    resize<&G::nhdEddyViscosity>,
+    resize<&G::nhdWaveRadiation>,
+    resize<&G::nhdSurfaceElevation>,
+    resize<&G::nhdResistance>,
+};
 constexpr std::array<Follower, 1> kOfBoundaries{resize<&G::nhdBoundary>};
 constexpr std::array<Follower, 0> kOfSources{};
 

@@ -8,6 +8,7 @@
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
 #include "core/edition.h"
+#include "hydrodynamic/resistance.h"
 
 namespace gridbay {
 namespace {
@@ -208,6 +209,10 @@ void rule2HotStart(CNavigationView& tree, CGlobalKvs& model) {
   showAll(tree, model.bathymetry->hotStart == 0, {26, 43});
 }
 
+void rule6WaveInducedResistance(CNavigationView& tree, CGlobalKvs& model) {
+  tree.Show(142, model.nhdResistance->formulation == CNhdResistanceKvs::kWaveInduced);
+}
+
 void rule11MassBudget(CNavigationView& tree, CGlobalKvs& model) {
   showAll(tree, model.moduleSelection->HasMassBudget() && model.massBudget->GetCount() > 0, {21, 76, 119});
 }
@@ -217,8 +222,8 @@ void rule20Sliding(CNavigationView& tree, CGlobalKvs& model) {
 }
 
 // In this order. Nothing is remembered between runs.
-constexpr void (*kRules[])(CNavigationView&, CGlobalKvs&) = {rule1ModuleRoots, rule2HotStart,
-                                                             rule11MassBudget, rule20Sliding};
+constexpr void (*kRules[])(CNavigationView&, CGlobalKvs&) = {
+    rule1ModuleRoots, rule2HotStart, rule6WaveInducedResistance, rule11MassBudget, rule20Sliding};
 
 }  // namespace
 

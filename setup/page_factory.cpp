@@ -8,6 +8,11 @@
 #include "basic/simulation_period_page.h"
 #include "basic/source_sink_page.h"
 #include "hydrodynamic/boundary_page.h"
+#include "hydrodynamic/eddy_viscosity_page.h"
+#include "hydrodynamic/resistance_page.h"
+#include "hydrodynamic/surface_elevation_page.h"
+#include "hydrodynamic/wave_radiation_page.h"
+#include "hydrodynamic/wind_conditions_page.h"
 
 namespace gridbay {
 namespace {
@@ -31,6 +36,12 @@ constexpr Entry kPages[] = {
     {"CAreaDescriptionDlg", make<CAreaDescriptionDlg>},
     {"CMassBudgetDlg", make<CMassBudgetDlg>},
     {"CNhdBoundaryDlg", make<CNhdBoundaryDlg>},
+    {"CNhdSurfaceElevationDlg", make<CNhdSurfaceElevationDlg>},
+    {"CWindConditionsDlg", make<CWindConditionsDlg>},
+    {"CNhdEddyViscosityDlg", make<CNhdEddyViscosityDlg>},
+    {"CNhdResistanceDlg", make<CNhdResistanceDlg>},
+    {"CNhdResistanceWaveDlg", make<CNhdResistanceWaveDlg>},
+    {"CNhdWaveRadiationDlg", make<CNhdWaveRadiationDlg>},
 };
 
 }  // namespace

@@ -39,13 +39,32 @@ namespace item {
 inline constexpr int kUndefined = 999;
 inline constexpr int kWaterLevel = 100000;
 inline constexpr int kDischarge = 100001;
+inline constexpr int kWindVelocity = 100002;
+inline constexpr int kWindDirection = 100003;
+inline constexpr int kManningNumber = 100030;
+inline constexpr int kChezyNumber = 100032;
 inline constexpr int kSurfaceElevation = 100078;
 inline constexpr int kBathymetry = 100079;
 inline constexpr int kTimeStep = 100212;
 inline constexpr int kFlowFlux = 100080;
+inline constexpr int kWaveHeight = 100084;
+inline constexpr int kWavePeriod = 100085;
+inline constexpr int kMeanWaveDirection = 100095;
+inline constexpr int kSignificantWaveHeight = 100097;
+inline constexpr int kEddyViscosity = 100123;
+inline constexpr int kGrainDiameter = 100127;
+inline constexpr int kBarometricPressure = 100196;
+inline constexpr int kWindSpeed = 100274;
 inline constexpr int kFloodDepth = 100280;
+inline constexpr int kNumberOfSteps = 100370;
+inline constexpr int kMedianGrainDiameter = 100406;
+inline constexpr int kWaveDirection = 100407;
 inline constexpr int kFlowDirection = 100408;
+inline constexpr int kAirPressure = 100409;
 inline constexpr int kFlowRate = 100430;
+inline constexpr int kAtmosphericPressure = 100450;
+inline constexpr int kSedimentGrainDiameter = 100461;
+inline constexpr int kWaveHeightOverDepth = 110025;
 }  // namespace item
 
 // The catalogues, by rising code.

@@ -6,6 +6,7 @@
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
 #include "core/edition.h"
+#include "hydrodynamic/resistance.h"
 #include "tests/support/model.h"
 
 namespace gridbay {
@@ -69,6 +70,14 @@ TEST_F(NavigationTree, AnotherCodeLeavesTheRootsAndRunsTheOtherRules) {
   model.root.bathymetry->hotStart = 1;
   EXPECT_EQ(rootsWith(1), (Ids{1, 2, 4, 6}));
   EXPECT_FALSE(tree.IsVisible(26));
+}
+
+TEST_F(NavigationTree, WavesShowWhereTheyInduceTheResistance) {
+  for (const std::int32_t formulation : {0, 2, 1, 2, 3}) {
+    model.root.nhdResistance->formulation = formulation;
+    tree.OnUpdate(&model.root);
+    EXPECT_EQ(tree.IsVisible(142), formulation == 2) << formulation;
+  }
 }
 
 TEST_F(NavigationTree, AHotStartHidesAndShowsTwoPages) {
