@@ -14,6 +14,7 @@ enum class PageId : std::int32_t {
   hdBoundary = 29,
   massBudget = 34,
   moduleSelection = 35,
+  hdResult = 38,
   simulationPeriod = 39,
   sourceAndSink = 40,
 };

@@ -1,6 +1,7 @@
 #include "hydrodynamic/hydrodynamic_parts.h"
 
 #include "hydrodynamic/boundary.h"
+#include "hydrodynamic/result.h"
 
 namespace gridbay {
 

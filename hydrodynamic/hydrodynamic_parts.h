@@ -5,6 +5,7 @@
 namespace gridbay {
 
 class CNhdBoundaryKvs;
+class CNhdResultKvs;
 
 // The conditions and results of the flow calculation, as members of the root. None is ever null while the
 // root lives.
@@ -13,6 +14,7 @@ struct HydrodynamicParts {
   ~HydrodynamicParts();
 
   std::unique_ptr<CNhdBoundaryKvs> nhdBoundary;
+  std::unique_ptr<CNhdResultKvs> nhdResult;
 };
 
 }  // namespace gridbay

@@ -16,4 +16,7 @@ inline constexpr FileKind ratingCurveFile{"tsb0", "Rating curve (*.tsb0)|*.tsb0|
 inline constexpr FileKind flowDirectionFile{
     "tsb1", "Flow Direction (*.tsb1;*.tb1)|*.tsb1; *.tb1|All Files (*.*)|*.*||"};
 
+inline constexpr Text outputItems{"Output items\n"};
+inline constexpr Text generateHotStart{"Generate hot start"};
+
 }  // namespace gridbay::texts

@@ -13,4 +13,9 @@ inline constexpr Text tiltingPointOutside{"Tilting point is outside of boundary 
 inline constexpr Text boundaryRequest{"Boundary"};
 inline constexpr Text flowDirectionRequest{"Flow direction"};
 
+// Outputs.
+inline constexpr Text saturationLast{
+    "Saturation is the last item of the output \"%s\", and there is no infiltration: such a list can't be "
+    "saved. Without the item it can."};
+
 }  // namespace gridbay::texts

@@ -4,6 +4,7 @@
 #include "basic/boundary.h"
 #include "basic/source_sink.h"
 #include "hydrodynamic/boundary.h"
+#include "hydrodynamic/result.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay {
@@ -29,7 +30,7 @@ const CKvsBase& leader(const G& root) {
   return *(root.*member);
 }
 
-constexpr std::array<Follower, 0> kOfAreas{};
+constexpr std::array<Follower, 1> kOfAreas{resize<&G::nhdResult>};
 constexpr std::array<Follower, 1> kOfBoundaries{resize<&G::nhdBoundary>};
 constexpr std::array<Follower, 0> kOfSources{};
 
