@@ -16,6 +16,8 @@ enum class PageId : std::int32_t {
   moduleSelection = 35,
   simulationPeriod = 39,
   sourceAndSink = 40,
+  hdSourceAndSink = 41,
+  infiltration = 143,
 };
 
 }  // namespace gridbay

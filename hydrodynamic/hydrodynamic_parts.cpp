@@ -1,6 +1,8 @@
 #include "hydrodynamic/hydrodynamic_parts.h"
 
 #include "hydrodynamic/boundary.h"
+#include "hydrodynamic/infiltration.h"
+#include "hydrodynamic/source_sink.h"
 
 namespace gridbay {
 

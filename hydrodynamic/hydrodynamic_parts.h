@@ -5,6 +5,8 @@
 namespace gridbay {
 
 class CNhdBoundaryKvs;
+class CNhdInfiltrationKvs;
+class CNhdSourceSinkKvs;
 
 // The conditions and results of the flow calculation, as members of the root. None is ever null while the
 // root lives.
@@ -13,6 +15,8 @@ struct HydrodynamicParts {
   ~HydrodynamicParts();
 
   std::unique_ptr<CNhdBoundaryKvs> nhdBoundary;
+  std::unique_ptr<CNhdSourceSinkKvs> nhdSourceSink;
+  std::unique_ptr<CNhdInfiltrationKvs> nhdInfiltration;
 };
 
 }  // namespace gridbay

@@ -10,6 +10,8 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "hydrodynamic/boundary.h"
+#include "hydrodynamic/infiltration.h"
+#include "hydrodynamic/source_sink.h"
 
 namespace gridbay {
 namespace {
@@ -68,7 +70,8 @@ constexpr Condition kEcology = runs<module::kEcological>;
 constexpr MemberRow kMembers[] = {
     member<&G::moduleSelection>(), member<&G::bathymetry>(),  member<&G::simulationPeriod>(),
     member<&G::boundary>(),        member<&G::sourceSink>(),  member<&G::massBudget>(),
-    member<&G::areaDescription>(), member<&G::nhdBoundary>(),
+    member<&G::areaDescription>(), member<&G::nhdBoundary>(), member<&G::nhdSourceSink>(),
+    member<&G::nhdInfiltration>(),
 };
 
 constexpr void (*kStartingCounts[])(G&) = {
@@ -89,6 +92,8 @@ constexpr FileRow kSaving[] = {
     in("HYDRODYNAMIC_MODULE"),
     options(),
     child<&G::nhdBoundary>(),
+    child<&G::nhdSourceSink>(),
+    child<&G::nhdInfiltration>(),
     in("HYDRODYNAMIC_MODULE/STRUCTURE_MODULE"),
     in("HYDRODYNAMIC_MODULE/STRUCTURES"),
 
@@ -123,13 +128,14 @@ constexpr FileRow kLoading[] = {
     child<&G::boundary>(),         child<&G::sourceSink>(),      child<&G::areaDescription>(),
     child<&G::simulationPeriod>(), child<&G::massBudget>(),
 
-    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdBoundary>(),
+    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdBoundary>(),     child<&G::nhdSourceSink>(),
+    child<&G::nhdInfiltration>(),
 };
 
 constexpr CheckRow kChecking[] = {
     check<&G::bathymetry>(),  check<&G::areaDescription>(), check<&G::simulationPeriod>(),
     check<&G::boundary>(),    check<&G::sourceSink>(),      check<&G::massBudget>(),
-    check<&G::nhdBoundary>(),
+    check<&G::nhdBoundary>(), check<&G::nhdSourceSink>(),   check<&G::nhdInfiltration>(),
 };
 
 }  // namespace
