@@ -17,6 +17,8 @@ enum class PageId : std::int32_t {
   hdResult = 38,
   simulationPeriod = 39,
   sourceAndSink = 40,
+  hdSourceAndSink = 41,
+  infiltration = 143,
 };
 
 }  // namespace gridbay

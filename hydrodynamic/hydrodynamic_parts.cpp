@@ -1,7 +1,9 @@
 #include "hydrodynamic/hydrodynamic_parts.h"
 
 #include "hydrodynamic/boundary.h"
+#include "hydrodynamic/infiltration.h"
 #include "hydrodynamic/result.h"
+#include "hydrodynamic/source_sink.h"
 
 namespace gridbay {
 

@@ -5,6 +5,7 @@
 #include "basic/source_sink.h"
 #include "hydrodynamic/boundary.h"
 #include "hydrodynamic/result.h"
+#include "hydrodynamic/source_sink.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay {
@@ -32,7 +33,7 @@ const CKvsBase& leader(const G& root) {
 
 constexpr std::array<Follower, 1> kOfAreas{resize<&G::nhdResult>};
 constexpr std::array<Follower, 1> kOfBoundaries{resize<&G::nhdBoundary>};
-constexpr std::array<Follower, 0> kOfSources{};
+constexpr std::array<Follower, 1> kOfSources{resize<&G::nhdSourceSink>};
 
 constexpr LeaderRow kLeaders[] = {
     {leader<&G::bathymetry>, kOfAreas},

@@ -10,7 +10,9 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "hydrodynamic/boundary.h"
+#include "hydrodynamic/infiltration.h"
 #include "hydrodynamic/result.h"
+#include "hydrodynamic/source_sink.h"
 
 namespace gridbay {
 namespace {
@@ -69,7 +71,8 @@ constexpr Condition kEcology = runs<module::kEcological>;
 constexpr MemberRow kMembers[] = {
     member<&G::moduleSelection>(), member<&G::bathymetry>(),  member<&G::simulationPeriod>(),
     member<&G::boundary>(),        member<&G::sourceSink>(),  member<&G::massBudget>(),
-    member<&G::areaDescription>(), member<&G::nhdBoundary>(), member<&G::nhdResult>(),
+    member<&G::areaDescription>(), member<&G::nhdBoundary>(), member<&G::nhdSourceSink>(),
+    member<&G::nhdInfiltration>(), member<&G::nhdResult>(),
 };
 
 constexpr void (*kStartingCounts[])(G&) = {
@@ -90,6 +93,8 @@ constexpr FileRow kSaving[] = {
     in("HYDRODYNAMIC_MODULE"),
     options(),
     child<&G::nhdBoundary>(),
+    child<&G::nhdSourceSink>(),
+    child<&G::nhdInfiltration>(),
     in("HYDRODYNAMIC_MODULE/STRUCTURE_MODULE"),
     in("HYDRODYNAMIC_MODULE/STRUCTURES"),
     in("HYDRODYNAMIC_MODULE"),
@@ -126,14 +131,15 @@ constexpr FileRow kLoading[] = {
     child<&G::boundary>(),         child<&G::sourceSink>(),      child<&G::areaDescription>(),
     child<&G::simulationPeriod>(), child<&G::massBudget>(),
 
-    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdBoundary>(),     in("HYDRODYNAMIC_MODULE"),
-    child<&G::nhdResult>(),
+    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdBoundary>(),     child<&G::nhdSourceSink>(),
+    child<&G::nhdInfiltration>(),  in("HYDRODYNAMIC_MODULE"),    child<&G::nhdResult>(),
 };
 
 constexpr CheckRow kChecking[] = {
     check<&G::bathymetry>(),  check<&G::areaDescription>(), check<&G::simulationPeriod>(),
     check<&G::boundary>(),    check<&G::sourceSink>(),      check<&G::massBudget>(),
-    check<&G::nhdBoundary>(), check<&G::nhdResult>(),
+    check<&G::nhdBoundary>(), check<&G::nhdSourceSink>(),   check<&G::nhdInfiltration>(),
+    check<&G::nhdResult>(),
 };
 
 }  // namespace

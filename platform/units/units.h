@@ -39,13 +39,33 @@ namespace item {
 inline constexpr int kUndefined = 999;
 inline constexpr int kWaterLevel = 100000;
 inline constexpr int kDischarge = 100001;
+inline constexpr int kFlowVelocity = 100016;
+inline constexpr int kInfiltration = 100061;
+inline constexpr int kInfiltrationRate = 100062;
+inline constexpr int kPrecipitationRate = 100070;
 inline constexpr int kSurfaceElevation = 100078;
 inline constexpr int kBathymetry = 100079;
-inline constexpr int kTimeStep = 100212;
 inline constexpr int kFlowFlux = 100080;
+inline constexpr int kRainAndEvaporation = 100088;
+inline constexpr int kSoilPorosity = 100144;
+inline constexpr int kGroundElevation = 100180;
+inline constexpr int kTimeStep = 100212;
+inline constexpr int kPercentage = 100239;
+inline constexpr int kCurrentSpeed = 100242;
 inline constexpr int kFloodDepth = 100280;
+inline constexpr int kPorosityCoefficient = 100292;
+inline constexpr int kDepthBelowGround = 100366;
+inline constexpr int kNetInfiltrationRate = 100369;
+inline constexpr int kEffectivePorosity = 100375;
+inline constexpr int kVolumetricWaterContent = 100377;
+inline constexpr int kInfiltrationCapacity = 100379;
 inline constexpr int kFlowDirection = 100408;
 inline constexpr int kFlowRate = 100430;
+inline constexpr int kRainfallRate = 100431;
+inline constexpr int kEvaporationRate = 100432;
+inline constexpr int kPorosity = 100456;
+inline constexpr int kSaturation = 100516;
+inline constexpr int kLeakage = 110257;
 }  // namespace item
 
 // The catalogues, by rising code.
