@@ -13,7 +13,7 @@ namespace gridbay {
 // object.
 class CKvsBase {
  public:
-  // The parent owns the object and never changes; the root has none.
+  // The parent owns the object; the root has none.
   explicit CKvsBase(CKvsBase* parent) : parent_(parent) {}
   CKvsBase(const CKvsBase&) = delete;
   CKvsBase& operator=(const CKvsBase&) = delete;
@@ -56,6 +56,8 @@ class CKvsBase {
   void Tell(const std::string& text) { ShowMessage(text); }
 
  protected:
+  // Of a class whose copies stand where the object that was copied stands.
+  void TakeParent(const CKvsBase& other) { parent_ = other.parent_; }
   virtual void ShowMessage(const std::string& text);
 
  private:

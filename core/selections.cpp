@@ -60,13 +60,13 @@ void UTsbSelection::Save(KvsFile& file, const std::string& documentPath) const {
   putItems(file, items);
 }
 
-void UTsbSelection::Load(KvsSection section, const std::string& documentPath, int n) {
+void UTsbSelection::Load(KvsSection section, const std::string& documentPath, std::optional<int> n) {
   fileName.Load(section, documentPath, kFileName);
   const KvsKeyword numbers = kvsKeywordByNameNum(section, kItemNumbers, 1);
-  if (numbers == nullptr) {
-    SetNoItems(n);
-  } else {
-    items = itemsOf(numbers, n);
+  if (numbers != nullptr) {
+    items = itemsOf(numbers, n.value_or(kvsGetNoParams(numbers)));
+  } else if (n) {
+    SetNoItems(*n);
   }
 }
 

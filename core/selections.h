@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstdint>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -32,8 +33,9 @@ class UTsbSelection {
   void UpdateData(const UTsbSelection& other) { *this = other; }
   // Keywords "File_Name" and "Item_Numbers" in the section of the owning object.
   void Save(KvsFile& file, const std::string& documentPath) const;
-  // Reads both: at most `n` items where the file names some, else `n`.
-  void Load(KvsSection section, const std::string& documentPath, int n);
+  // Reads both: at most `n` items where the file names some, else `n`. Without `n` all that the file names,
+  // and where it names none they stay.
+  void Load(KvsSection section, const std::string& documentPath, std::optional<int> n = {});
   // One of the two keywords by its name; false for any other.
   bool Access(std::string_view name, PathAccess& access);
 

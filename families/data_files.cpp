@@ -9,6 +9,15 @@ void requestSimulationPeriod(CVdFileSelectorDlg& selector, CKvsBase& object) {
     basic->simulationPeriod->SetRequestPeriod(selector);
 }
 
+void requestMap(CVdFileSelectorDlg& selector, CKvsBase& object, int number, const Text& description,
+                std::vector<int> itemTypes) {
+  CVdRqTsbItem& request = selector.AddRequest();
+  request.SetSelectionDescr(description.format);
+  request.SetMultiQunType(std::move(itemTypes));
+  requestArea(request, object, number);
+  requestForEngine(selector);
+}
+
 void requestForEngine(CVdFileSelectorDlg& selector) {
   selector.EnablePlugin(0);
   selector.SetVane27Compliant();

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <string>
+#include <vector>
 
 #include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
@@ -28,6 +29,10 @@ void requestArea(auto& request, CKvsBase& object, int number) {
     RequestMatchesArea(*area, request);
   }
 }
+
+// The request for the map of area `number`: one item, of one of the quantities.
+void requestMap(CVdFileSelectorDlg& selector, CKvsBase& object, int number, const Text& description,
+                std::vector<int> itemTypes);
 
 // The last word of nearly all requests: no plug-ins, and a file that the engine takes as it is.
 void requestForEngine(CVdFileSelectorDlg& selector);

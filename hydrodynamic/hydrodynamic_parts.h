@@ -5,9 +5,14 @@
 namespace gridbay {
 
 class CNhdBoundaryKvs;
+class CNhdEddyViscosityKvs;
 class CNhdInfiltrationKvs;
+class CNhdResistanceKvs;
 class CNhdResultKvs;
 class CNhdSourceSinkKvs;
+class CNhdSurfaceElevationKvs;
+class CNhdWaveRadiationKvs;
+class CWindConditionsKvs;
 
 // The conditions and results of the flow calculation, as members of the root. None is ever null while the
 // root lives.
@@ -18,6 +23,11 @@ struct HydrodynamicParts {
   std::unique_ptr<CNhdBoundaryKvs> nhdBoundary;
   std::unique_ptr<CNhdSourceSinkKvs> nhdSourceSink;
   std::unique_ptr<CNhdInfiltrationKvs> nhdInfiltration;
+  std::unique_ptr<CWindConditionsKvs> windConditions;
+  std::unique_ptr<CNhdEddyViscosityKvs> nhdEddyViscosity;
+  std::unique_ptr<CNhdWaveRadiationKvs> nhdWaveRadiation;
+  std::unique_ptr<CNhdSurfaceElevationKvs> nhdSurfaceElevation;
+  std::unique_ptr<CNhdResistanceKvs> nhdResistance;
   std::unique_ptr<CNhdResultKvs> nhdResult;
 };
 

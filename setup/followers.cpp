@@ -4,8 +4,12 @@
 #include "basic/boundary.h"
 #include "basic/source_sink.h"
 #include "hydrodynamic/boundary.h"
+#include "hydrodynamic/eddy_viscosity.h"
+#include "hydrodynamic/resistance.h"
 #include "hydrodynamic/result.h"
 #include "hydrodynamic/source_sink.h"
+#include "hydrodynamic/surface_elevation.h"
+#include "hydrodynamic/wave_radiation.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay {
@@ -31,7 +35,10 @@ const CKvsBase& leader(const G& root) {
   return *(root.*member);
 }
 
-constexpr std::array<Follower, 1> kOfAreas{resize<&G::nhdResult>};
+constexpr std::array<Follower, 5> kOfAreas{
+    resize<&G::nhdEddyViscosity>, resize<&G::nhdWaveRadiation>, resize<&G::nhdSurfaceElevation>,
+    resize<&G::nhdResistance>,    resize<&G::nhdResult>,
+};
 constexpr std::array<Follower, 1> kOfBoundaries{resize<&G::nhdBoundary>};
 constexpr std::array<Follower, 1> kOfSources{resize<&G::nhdSourceSink>};
 

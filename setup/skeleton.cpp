@@ -10,9 +10,14 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "hydrodynamic/boundary.h"
+#include "hydrodynamic/eddy_viscosity.h"
 #include "hydrodynamic/infiltration.h"
+#include "hydrodynamic/resistance.h"
 #include "hydrodynamic/result.h"
 #include "hydrodynamic/source_sink.h"
+#include "hydrodynamic/surface_elevation.h"
+#include "hydrodynamic/wave_radiation.h"
+#include "hydrodynamic/wind_conditions.h"
 
 namespace gridbay {
 namespace {
@@ -69,10 +74,12 @@ constexpr Condition kExpandedMud = runs<module::kMudTransportExpanded>;
 constexpr Condition kEcology = runs<module::kEcological>;
 
 constexpr MemberRow kMembers[] = {
-    member<&G::moduleSelection>(), member<&G::bathymetry>(),  member<&G::simulationPeriod>(),
-    member<&G::boundary>(),        member<&G::sourceSink>(),  member<&G::massBudget>(),
-    member<&G::areaDescription>(), member<&G::nhdBoundary>(), member<&G::nhdSourceSink>(),
-    member<&G::nhdInfiltration>(), member<&G::nhdResult>(),
+    member<&G::moduleSelection>(),  member<&G::bathymetry>(),          member<&G::simulationPeriod>(),
+    member<&G::boundary>(),         member<&G::sourceSink>(),          member<&G::massBudget>(),
+    member<&G::areaDescription>(),  member<&G::nhdBoundary>(),         member<&G::nhdSourceSink>(),
+    member<&G::nhdInfiltration>(),  member<&G::windConditions>(),      member<&G::nhdEddyViscosity>(),
+    member<&G::nhdWaveRadiation>(), member<&G::nhdSurfaceElevation>(), member<&G::nhdResistance>(),
+    member<&G::nhdResult>(),
 };
 
 constexpr void (*kStartingCounts[])(G&) = {
@@ -95,6 +102,11 @@ constexpr FileRow kSaving[] = {
     child<&G::nhdBoundary>(),
     child<&G::nhdSourceSink>(),
     child<&G::nhdInfiltration>(),
+    child<&G::windConditions>(),
+    child<&G::nhdEddyViscosity>(),
+    child<&G::nhdWaveRadiation>(),
+    child<&G::nhdSurfaceElevation>(),
+    child<&G::nhdResistance>(),
     in("HYDRODYNAMIC_MODULE/STRUCTURE_MODULE"),
     in("HYDRODYNAMIC_MODULE/STRUCTURES"),
     in("HYDRODYNAMIC_MODULE"),
@@ -127,18 +139,24 @@ constexpr FileRow kSaving[] = {
 
 // The module selection comes first: what else is read depends on it.
 constexpr FileRow kLoading[] = {
-    in("NESTED_MODEL_GLOBALS"),    child<&G::moduleSelection>(), child<&G::bathymetry>(),
-    child<&G::boundary>(),         child<&G::sourceSink>(),      child<&G::areaDescription>(),
+    in("NESTED_MODEL_GLOBALS"),    child<&G::moduleSelection>(),     child<&G::bathymetry>(),
+    child<&G::boundary>(),         child<&G::sourceSink>(),          child<&G::areaDescription>(),
     child<&G::simulationPeriod>(), child<&G::massBudget>(),
 
-    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdBoundary>(),     child<&G::nhdSourceSink>(),
-    child<&G::nhdInfiltration>(),  in("HYDRODYNAMIC_MODULE"),    child<&G::nhdResult>(),
+    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdBoundary>(),         child<&G::nhdSourceSink>(),
+    child<&G::nhdInfiltration>(),  child<&G::windConditions>(),      child<&G::nhdEddyViscosity>(),
+    child<&G::nhdWaveRadiation>(), child<&G::nhdSurfaceElevation>(), child<&G::nhdResistance>(),
+    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdResult>(),
 };
 
 constexpr CheckRow kChecking[] = {
-    check<&G::bathymetry>(),  check<&G::areaDescription>(), check<&G::simulationPeriod>(),
-    check<&G::boundary>(),    check<&G::sourceSink>(),      check<&G::massBudget>(),
-    check<&G::nhdBoundary>(), check<&G::nhdSourceSink>(),   check<&G::nhdInfiltration>(),
+    check<&G::bathymetry>(),       check<&G::areaDescription>(),
+    check<&G::simulationPeriod>(), check<&G::boundary>(),
+    check<&G::sourceSink>(),       check<&G::massBudget>(),
+    check<&G::windConditions>(),   check<&G::nhdEddyViscosity>(),
+    check<&G::nhdWaveRadiation>(), check<&G::nhdSurfaceElevation>(),
+    check<&G::nhdResistance>(),    check<&G::nhdBoundary>(),
+    check<&G::nhdSourceSink>(),    check<&G::nhdInfiltration>(),
     check<&G::nhdResult>(),
 };
 
