@@ -96,7 +96,7 @@ int CPoints4Dlg::DoModal() {
   Form& form = dialog.form();
   const auto count = [this]() -> CGxPoints& { return grid_; };
   const auto range = [&form](std::string_view label, std::int32_t last) {
-    form.Shown(label, [last] { return fmt::format("0 - {}", last); });
+    form.Shown(label, [last] { return last < 0 ? "not known" : fmt::format("0 - {}", last); });
   };
   form.Count("Number of points", countOf(count), kMostPoints);
   range("X-Range", limits_.lastJ);

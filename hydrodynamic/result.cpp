@@ -28,7 +28,7 @@ constexpr auto typeRow() {
 }
 constexpr auto pointRows() {
   return keywords(writtenOnly("Number_Of_Points", [](const Output& output) { return output.PointCount(); }),
-                  numbers(kX, &Output::jPoints), numbers(kY, &Output::kPoints));
+                  numbers(kX, &Output::pointsJ), numbers(kY, &Output::pointsK));
 }
 constexpr auto rangeRows() {
   return keywords(subArea(kX, kY, &Output::part));
@@ -100,8 +100,8 @@ void Output::TypeRow::load(Output& output, KvsSection from, const std::string& d
   switch (extentOf(output.part)) {
     case Extent::point:
       output.type = kPoints;
-      output.jPoints = {static_cast<double>(output.part.x.first)};
-      output.kPoints = {static_cast<double>(output.part.y.first)};
+      output.pointsJ = {static_cast<double>(output.part.x.first)};
+      output.pointsK = {static_cast<double>(output.part.y.first)};
       break;
     case Extent::line:
       output.type = kLine;
@@ -152,7 +152,7 @@ bool Output::ItemNumbersRow::access(Output& output, std::string_view path, PathA
 }
 
 int Output::PointCount() const {
-  return static_cast<int>(std::min(jPoints.size(), kPoints.size()));
+  return static_cast<int>(std::min(pointsJ.size(), pointsK.size()));
 }
 
 // The walks go on behind an item that was removed, and so pass over the one that takes its place.
@@ -183,9 +183,9 @@ void Output::leaveOutItems() {
   }
 }
 
-void Output::Save(KvsFile& file, const std::string& documentPath) {
+void Output::Save(KvsFile& out, const std::string& documentPath) {
   leaveOutItems();
-  TableKvs::Save(file, documentPath);
+  TableKvs::Save(out, documentPath);
 }
 
 unsigned Output::Validate(ValidationList& messages, int) {
@@ -195,7 +195,7 @@ unsigned Output::Validate(ValidationList& messages, int) {
   if (type != kPoints) return faults + checkResultPart(messages, kPage, limits, part, steps, file);
   for (std::size_t point = 0; point < static_cast<std::size_t>(PointCount()); ++point) {
     for (const auto& [place, last] :
-         {std::pair(jPoints[point], limits.lastJ), std::pair(kPoints[point], limits.lastK)}) {
+         {std::pair(pointsJ[point], limits.lastJ), std::pair(pointsK[point], limits.lastK)}) {
       if (place < 0 || place > last)
         faults += report(messages, kPage, Severity::fault, texts::gridPointOutOfRange);
     }

@@ -27,8 +27,8 @@ class CNhdResultObjectKvs final : public TableKvs<CNhdResultObjectKvs> {
 
   std::int32_t type = kMap;
   USubArea part;
-  std::vector<double> jPoints{0};  // of type 0; as many as both lists have are points
-  std::vector<double> kPoints{0};
+  std::vector<double> pointsJ{0};  // of type 0; as many as both lists have are points
+  std::vector<double> pointsK{0};
   USubLine steps;
   std::vector<std::int32_t> items{1, 2, 3};
   std::string title;
@@ -42,7 +42,7 @@ class CNhdResultObjectKvs final : public TableKvs<CNhdResultObjectKvs> {
     void copy(CNhdResultObjectKvs& output, const CNhdResultObjectKvs& other) const;
     static constexpr auto members() {
       using Self = CNhdResultObjectKvs;
-      return std::tuple(&Self::type, &Self::part, &Self::jPoints, &Self::kPoints);
+      return std::tuple(&Self::type, &Self::part, &Self::pointsJ, &Self::pointsK);
     }
     bool access(CNhdResultObjectKvs& output, std::string_view path, PathAccess& access) const;
   };
@@ -70,7 +70,7 @@ class CNhdResultObjectKvs final : public TableKvs<CNhdResultObjectKvs> {
 
   // Leaves out of the items those that the engine can't write as the model is; throws std::invalid_argument
   // where the list can't be saved, and is then without the item that was in its way.
-  void Save(KvsFile& file, const std::string& documentPath) override;
+  void Save(KvsFile& out, const std::string& documentPath) override;
   unsigned Validate(ValidationList& messages, int deep) override;
 
   int PointCount() const;

@@ -93,8 +93,8 @@ void CResultGrid::LayOut() {
     return std::to_string(output(row)->type);
   };
   Shown("Area", 45, [](GridRow) { return std::to_string(Output::kAreaNumber); }).Static();
-  pointsOrRange("J", &Output::jPoints, &Output::kPoints, &USubArea::x);
-  pointsOrRange("K", &Output::kPoints, &Output::jPoints, &USubArea::y);
+  pointsOrRange("J", &Output::pointsJ, &Output::pointsK, &USubArea::x);
+  pointsOrRange("K", &Output::pointsK, &Output::pointsJ, &USubArea::y);
   Range("Time", 60, [output](GridRow row) { return &output(row)->steps; });
   Button("...", 20, [this, output](GridRow row) { choosePart(*output(row)); });
   ResultFile("Data File", 160, file);
@@ -135,10 +135,10 @@ void CResultGrid::choosePart(Output& output) {
     return;
   }
   if (!hasAreaOrTells(document(), limits)) return;
-  CPoints4Dlg dialog(document(), output.jPoints, output.kPoints, limits, output.steps);
+  CPoints4Dlg dialog(document(), output.pointsJ, output.pointsK, limits, output.steps);
   if (dialog.DoModal() != 1) return;
-  output.jPoints = dialog.j();
-  output.kPoints = dialog.k();
+  output.pointsJ = dialog.j();
+  output.pointsK = dialog.k();
   output.steps = dialog.steps();
   UpdateDoc();
 }
