@@ -64,18 +64,18 @@ TEST_F(InfoHydrodynamic, Constants) {
             "Source 3         (1,1)->(2,2)   7 m³/s at 1 m/s towards 270°\n"
             "Infiltration     none\n");
   const auto report = json(kConstants);
-  EXPECT_EQ(report["precipitation"].dump(),
-            R"({"given_as":"constant","rate":{"value":12.5,"unit":"mm/d"},"net":false,"on_dry_land":false})");
-  EXPECT_EQ(report["evaporation"].dump(), R"({"given_as":"constant","rate":{"value":0.1,"unit":"mm/d"}})");
+  EXPECT_EQ(
+      report["precipitation"].dump(),
+      R"_({"given_as":"constant","rate":{"value":12.5,"unit":"mm/d"},"net":false,"on_dry_land":false})_");
+  EXPECT_EQ(report["evaporation"].dump(), R"_({"given_as":"constant","rate":{"value":0.1,"unit":"mm/d"}})_");
   EXPECT_EQ(report["sources"][0].dump(),
-            R"({"number":1,"location":"(3,4)->","given_as":"constant",)"
-            R"("discharge":{"value":2.5,"unit":"m³/s"},"velocity":{"value":0.3,"unit":"m/s"},)"
-            R"("direction":{"value":45.0,"unit":"°"}})");
-  EXPECT_EQ(report["sources"][1].dump(),
-            R"({"number":2,"location":"->(5,6)","given_as":"constant",)"
-            R"("discharge":{"value":-1.0,"unit":"m³/s"}})");
+            R"_({"number":1,"location":"(3,4)->","given_as":"constant",)_"
+            R"_("discharge":{"value":2.5,"unit":"m³/s"},"velocity":{"value":0.3,"unit":"m/s"},)_"
+            R"_("direction":{"value":45.0,"unit":"°"}})_");
+  EXPECT_EQ(report["sources"][1].dump(), R"_({"number":2,"location":"->(5,6)","given_as":"constant",)_"
+                                         R"_("discharge":{"value":-1.0,"unit":"m³/s"}})_");
   EXPECT_EQ(report["sources"].size(), 3U);
-  EXPECT_EQ(report["infiltration"].dump(), R"({"type":"none"})");
+  EXPECT_EQ(report["infiltration"].dump(), R"_({"type":"none"})_");
 }
 
 TEST_F(InfoHydrodynamic, Files) {
@@ -90,21 +90,22 @@ TEST_F(InfoHydrodynamic, Files) {
       "by its level, initial volume by its water content\n");
   const auto report = json(kFiles);
   EXPECT_EQ(report["precipitation"].dump(),
-            R"({"given_as":"maps","file":"maps/rain.tsb2","items":[1],"net":false,"on_dry_land":true})");
+            R"_({"given_as":"maps","file":"maps/rain.tsb2","items":[1],"net":false,"on_dry_land":true})_");
   EXPECT_EQ(report["sources"][0].dump(),
-            R"({"number":1,"location":"(3,4)->","given_as":"time series","file":"q.tsb0","items":[4,2],)"
-            R"("item_names":["Gate","Jet"],"direction":{"value":10.0,"unit":"°"}})");
-  EXPECT_EQ(report["sources"][1]["item_names"].dump(), R"(["Intake"])");
-  EXPECT_EQ(report["infiltration"].dump(),
-            R"({"type":"constant rate with capacity","groundwater":"level","initial_volume":"water content",)"
-            R"("file":"soil.tsb2","items":[1,2,3,4,5]})");
+            R"_({"number":1,"location":"(3,4)->","given_as":"time series","file":"q.tsb0","items":[4,2],)_"
+            R"_("item_names":["Gate","Jet"],"direction":{"value":10.0,"unit":"°"}})_");
+  EXPECT_EQ(report["sources"][1]["item_names"].dump(), R"_(["Intake"])_");
+  EXPECT_EQ(
+      report["infiltration"].dump(),
+      R"_({"type":"constant rate with capacity","groundwater":"level","initial_volume":"water content",)_"
+      R"_("file":"soil.tsb2","items":[1,2,3,4,5]})_");
 }
 
 TEST_F(InfoHydrodynamic, NetPrecipitation) {
   const std::string module = "SOURCE_AND_SINK { Evaporation 3.0; NetPrecipitation #true; Precipitation ";
   EXPECT_THAT(told(module + "2.0 }"), HasSubstr("Rain             2 mm/d, less evaporation, on dry land too\n"
                                                 "Evaporation      in the rain already\n"));
-  EXPECT_EQ(json(module + "2.0 }")["evaporation"].dump(), R"({"given_as":"part of net precipitation"})");
+  EXPECT_EQ(json(module + "2.0 }")["evaporation"].dump(), R"_({"given_as":"part of net precipitation"})_");
   EXPECT_THAT(told(module + "0.0 }"), HasSubstr("Rain             none\nEvaporation      3 mm/d\n"));
 }
 
@@ -116,17 +117,18 @@ TEST_F(InfoHydrodynamic, ANetRateOfInfiltration) {
   EXPECT_THAT(told(module + "; InfiltrationFormat 3 }"),
               EndsWith("Infiltration     net rate, varying in time, maps in rate.tsb2, item 2\n"));
   EXPECT_EQ(json(module + " }")["infiltration"].dump(),
-            R"({"type":"net rate","varies_in_time":false,"file":"rate.tsb2","items":[2]})");
+            R"_({"type":"net rate","varies_in_time":false,"file":"rate.tsb2","items":[2]})_");
 }
 
 // The keyword of a constant has the name of the section with its file.
 TEST_F(InfoHydrodynamic, ConstantAndFileOfOneName) {
   const std::string setup = setupWith(kConstants);
   const std::string place = "HYDRODYNAMIC_MODULE/SOURCE_AND_SINK/";
-  EXPECT_EQ(runTool({"set", setup, place + "Evaporation=2.5", place + "Evaporation/File_Name=e.tsb0",
-                     place + "EvaporationType=0", place + "SOURCE_SINK_3/Item_Velocity=Jet"})
-                .status,
-            0);
+  const test::ProgramRun run =
+      runTool({"set", setup, place + "Evaporation=2.5", place + "Evaporation/File_Name=e.tsb0",
+               place + "EvaporationType=0", place + "SOURCE_SINK_3/Item_Velocity=Jet"});
+  EXPECT_EQ(run.status, 0);
+  EXPECT_EQ(run.err, "");
   EXPECT_EQ(runTool({"get", setup, place + "Evaporation"}).out, "2.5\n");
   EXPECT_EQ(runTool({"get", setup, place + "Evaporation/File_Name"}).out, "(file)\"e.tsb0\"\n");
   EXPECT_EQ(runTool({"get", setup, place + "EvaporationType"}).out, "0\n");

@@ -69,7 +69,8 @@ TEST_F(InfiltrationPage, ANetRate) {
 }
 
 TEST_F(InfiltrationPage, ACapacity) {
-  object().infiltrationFormat = 3;
+  choose("Infiltration type:", 1);
+  choose("Infiltration format:", 1);
   choose("Infiltration type:", 2);
   EXPECT_EQ(control("Infiltration format:", 2).index, 0);
   choose("Groundwater depth:", 1);

@@ -227,6 +227,14 @@ TEST_F(HdSourceSink, ValuesOfTheWrongKind) {
   EXPECT_EQ(entry(1).dataFormat, 0);
 }
 
+TEST_F(HdSourceSink, TheSectionsBesideKeywordsOfTheirNamesAreKnown) {
+  const std::string place = "HYDRODYNAMIC_MODULE/SOURCE_AND_SINK/";
+  for (const char* name : {"Evaporation", "Precipitation", "SOURCE_SINK_3"})
+    EXPECT_TRUE(model.root.KnowsSection(place + name)) << name;
+  for (const char* name : {"NetPrecipitation", "EvaporationType", "SOURCE_SINK_4"})
+    EXPECT_FALSE(model.root.KnowsSection(place + name)) << name;
+}
+
 TEST_F(HdSourceSink, FollowsTheCountOfLocations) {
   entry(1).constantMagnitude = 1;
   entry(3).constantMagnitude = 3;
