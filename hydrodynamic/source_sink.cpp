@@ -24,8 +24,9 @@ int CNhdSourceSinkObjectKvs::NoItems(int number) {
 
 void CNhdSourceSinkObjectKvs::RequestDataFile(CVdFileSelectorDlg& selector, int number) {
   const int noItems = NoItems(number);
-  dataFile.SetNoItems(noItems);
-  selector.SetSelectedItems(dataFile.items);
+  UTsbSelection wanted = dataFile;
+  wanted.SetNoItems(noItems);
+  selector.SetSelectedItems(wanted.items);
   selector.SetMinNoItems(noItems);
   CVdRqTsbItem& magnitude = selector.AddRequest();
   magnitude.SetDimensions(0);
@@ -45,6 +46,7 @@ unsigned CNhdSourceSinkObjectKvs::Validate(ValidationList& messages, int, int nu
   if (dataFormat != kFromFile) return 0;
   CVdFileSelectorDlg selector;
   RequestDataFile(selector, number);
+  dataFile.items = selector.GetSelectedItems();
   return checkDataFile(messages, PageId::hdSourceAndSink, selector, dataFile);
 }
 

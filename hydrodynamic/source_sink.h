@@ -38,12 +38,12 @@ class CNhdSourceSinkObjectKvs final : public TableKvs<CNhdSourceSinkObjectKvs> {
   }
 
   using TableKvs::Validate;
-  // Number from 1, as in the list of locations.
+  // Number from 1, as in the list of locations. The selection of a file takes its number of items.
   unsigned Validate(ValidationList& messages, int deep, int number);
 
   // The number of items that the file of location `number` must give: an isolated sink has no velocity.
   int NoItems(int number);
-  // What that file must be. The selection takes its number of items.
+  // What that file must be, and its items, as many as it must give.
   void RequestDataFile(CVdFileSelectorDlg& selector, int number);
 };
 

@@ -8,7 +8,9 @@
 #include "basic/simulation_period_page.h"
 #include "basic/source_sink_page.h"
 #include "hydrodynamic/boundary_page.h"
+#include "hydrodynamic/infiltration_page.h"
 #include "hydrodynamic/result_page.h"
+#include "hydrodynamic/source_sink_page.h"
 
 namespace gridbay {
 namespace {
@@ -32,6 +34,8 @@ constexpr Entry kPages[] = {
     {"CAreaDescriptionDlg", make<CAreaDescriptionDlg>},
     {"CMassBudgetDlg", make<CMassBudgetDlg>},
     {"CNhdBoundaryDlg", make<CNhdBoundaryDlg>},
+    {"CNhdSourceSinkDlg", make<CNhdSourceSinkDlg>},
+    {"CHDInfiltrationDlg", make<CHDInfiltrationDlg>},
     {"CResultDlg", make<CResultDlg>},
 };
 
