@@ -8,6 +8,7 @@
 #include "basic/bathymetry.h"
 #include "basic/bathymetry_requests.h"
 #include "basic/simulation_period.h"
+#include "core/name_bytes.h"
 #include "platform/tsb/tsb_operations.h"
 
 namespace gridbay {
@@ -62,7 +63,7 @@ bool readLandValue(const TsbHeader& header, float& landValue) {
     std::string name;
     std::span<const float> values;
     if (tsbGetCustomBlock(header, &block, &name, &values) != 0) return false;
-    if (!sameName(name, kMiscBlock)) continue;
+    if (!names::same(name, kMiscBlock)) continue;
     if (values.size() > kLandPlace) landValue = values[kLandPlace];
     return true;
   }

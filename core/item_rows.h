@@ -7,6 +7,7 @@
 #include "core/edition.h"
 #include "core/item_list.h"
 #include "core/keyword_table.h"
+#include "core/name_bytes.h"
 #include "core/string_table.h"
 
 // The rows of tables that hold lists: their counts, and the numbered sections of their items.
@@ -111,6 +112,7 @@ constexpr PinnedCountRow pinnedCount(std::string_view name, int fixed) {
 
 // The number in a name such as "AREA_12" of the format "AREA_%d"; nothing for any other name.
 inline std::optional<int> numberIn(std::string_view name, const Text& format) {
+  name = names::trimmed(name);
   const std::string_view prefix = format.format.substr(0, format.format.rfind('%'));
   if (name.size() <= prefix.size() || !sameName(name.substr(0, prefix.size()), prefix)) return std::nullopt;
   int number = 0;

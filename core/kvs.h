@@ -11,7 +11,7 @@
 
 // The parameter file as its users see it: a tree of targets, sections, keywords and parameters. Writing goes
 // through one cursor, reading through explicit handles. A null handle means that the thing isn't there. Names
-// match without regard to case, numbers count from 1.
+// match without regard to case and to blanks at their ends, numbers count from 1.
 
 namespace gridbay {
 

@@ -47,4 +47,16 @@ inline bool same(std::string_view a, std::string_view b) {
   return foldCase(loadUpTo8(a.data() + i, a.size() - i)) == foldCase(loadUpTo8(b.data() + i, b.size() - i));
 }
 
+// A name without the blanks at its end, of which no lookup takes notice.
+inline std::string_view trimmed(std::string_view name) {
+  while (!name.empty() && name.back() == ' ') name.remove_suffix(1);
+  return name;
+}
+
+// Whether a name that may end in blanks is the trimmed one.
+inline bool sameTrimmed(std::string_view name, std::string_view wanted) {
+  if (name.size() <= wanted.size()) return same(name, wanted);
+  return name.back() == ' ' && same(trimmed(name), wanted);
+}
+
 }  // namespace gridbay::names

@@ -9,16 +9,17 @@
 
 namespace gridbay {
 bool sameName(std::string_view a, std::string_view b) {
-  return names::same(a, b);
+  return names::same(names::trimmed(a), names::trimmed(b));
 }
 
 const Node* Node::find(std::string_view name, std::uint32_t occurrence, bool wantSection) const {
   if (occurrence == 0) return nullptr;
+  name = names::trimmed(name);
   // Below this many nodes a walk is as fast as an index.
   constexpr std::uint32_t kIndexFrom = 16;
   if (body_->index == nullptr && body_->sections + body_->keywords < kIndexFrom) {
     for (const Node* node = body_->first; node != nullptr; node = node->next_) {
-      if (node->isSection() == wantSection && names::same(node->name(), name) && --occurrence == 0)
+      if (node->isSection() == wantSection && names::sameTrimmed(node->name(), name) && --occurrence == 0)
         return node;
     }
     return nullptr;

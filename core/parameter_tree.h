@@ -111,8 +111,9 @@ class Node {
   const Node* first() const { return body_->first; }
   std::uint32_t sectionCount() const { return body_->sections; }
   std::uint32_t keywordCount() const { return body_->keywords; }
-  // The occurrence-th section or keyword of a name (counted from 1, case ignored), or null. The time does not
-  // depend on how many siblings there are, but for the first lookup in a section.
+  // The occurrence-th section or keyword of a name (counted from 1; case, and blanks at the
+  // end, ignored), or null. The time does not depend on how many siblings there are, but for the first lookup
+  // in a section.
   const Node* section(std::string_view name, std::uint32_t occurrence = 1) const;
   const Node* keyword(std::string_view name, std::uint32_t occurrence = 1) const;
 
@@ -189,7 +190,7 @@ class ParameterTree {
   std::vector<std::unique_ptr<SectionIndex>> indexes_;
 };
 
-// Whether two names are the same but for the case of the letters A to Z.
+// Whether two names are the same but for the case of the letters A to Z and blanks at their ends.
 bool sameName(std::string_view a, std::string_view b);
 
 // Whether two trees hold the same sections, keywords and values in the same order (names by letter).

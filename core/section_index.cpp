@@ -35,6 +35,10 @@ std::uint64_t hashName(std::string_view name) {
   return mix(state ^ names::foldCase(names::loadUpTo8(at, left)), kFactor + seed);
 }
 
+std::string_view keyOf(const Node& node) {
+  return names::trimmed(node.name());
+}
+
 bool isDigit(char c) {
   return c >= '0' && c <= '9';
 }
@@ -89,7 +93,7 @@ SectionIndex::SectionIndex(const Node& section) : section_(section) {
 void SectionIndex::add(const Node& node) {
   settled_ = false;
   NumberedName name;
-  if (!runsAllowed_ || !split(node.name(), name)) {
+  if (!runsAllowed_ || !split(keyOf(node), name)) {
     if (runsAllowed_) endRun();
     loose_.push_back(&node);
     return;
@@ -126,7 +130,7 @@ bool SectionIndex::runsMeet() const {
   }
   for (const Node* node : loose_) {
     NumberedName name;
-    if (runs_.empty() || !split(node->name(), name)) continue;
+    if (runs_.empty() || !split(keyOf(*node), name)) continue;
     for (const Run& run : runs_) {
       if (run.holds(name, node->isSection())) return true;
     }
@@ -157,8 +161,8 @@ void SectionIndex::settle() {
 // first.
 std::uint32_t SectionIndex::firstOfItsName(std::uint32_t place) {
   const Node& node = *loose_[place];
-  const std::uint64_t hash = hashName(node.name());
-  Slot& slot = slots_[slotOf(hash, node.name(), node.isSection())];
+  const std::uint64_t hash = hashName(keyOf(node));
+  Slot& slot = slots_[slotOf(hash, keyOf(node), node.isSection())];
   if (slot.place == 0) slot = {place + 1, static_cast<std::uint32_t>(hash >> 32)};
   return slot.place - 1;
 }
@@ -179,6 +183,7 @@ void SectionIndex::bringTogether(std::span<const std::uint32_t> firsts) {
 }
 
 const Node* SectionIndex::find(std::string_view name, std::uint32_t occurrence, bool wantSection) {
+  name = names::trimmed(name);
   if (!settled_) settle();
   NumberedName numbered;
   if (!runs_.empty() && split(name, numbered)) {
@@ -190,7 +195,7 @@ const Node* SectionIndex::find(std::string_view name, std::uint32_t occurrence, 
   const std::uint32_t first = slots_[slotOf(hashName(name), name, wantSection)].place;
   if (first == 0 || occurrence == 0 || occurrence > loose_.size() - (first - 1)) return nullptr;
   const Node* node = loose_[first - 1 + occurrence - 1];
-  return node->isSection() == wantSection && names::same(node->name(), name) ? node : nullptr;
+  return node->isSection() == wantSection && names::sameTrimmed(node->name(), name) ? node : nullptr;
 }
 
 std::size_t SectionIndex::slotOf(std::uint64_t hash, std::string_view name, bool wantSection) const {
@@ -200,7 +205,7 @@ std::size_t SectionIndex::slotOf(std::uint64_t hash, std::string_view name, bool
     if (slot.place == 0) return at;
     if (slot.hash != static_cast<std::uint32_t>(hash >> 32)) continue;
     const Node& node = *loose_[slot.place - 1];
-    if (node.isSection() == wantSection && names::same(node.name(), name)) return at;
+    if (node.isSection() == wantSection && names::sameTrimmed(node.name(), name)) return at;
   }
 }
 

@@ -19,7 +19,8 @@ class SectionIndex {
 
   // The section has got another node, its last.
   void add(const Node& node);
-  // The occurrence-th (from 1) section or keyword of a name, its case ignored; null when there is none.
+  // The occurrence-th (from 1) section or keyword of a name, its case and blanks at its end ignored; null
+  // when there is none.
   const Node* find(std::string_view name, std::uint32_t occurrence, bool wantSection);
 
  private:

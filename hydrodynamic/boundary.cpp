@@ -5,6 +5,7 @@
 
 #include "basic/basic_parts.h"
 #include "basic/boundary.h"
+#include "core/name_bytes.h"
 #include "families/data_files.h"
 #include "platform/files/paths.h"
 #include "platform/units/units.h"
@@ -46,7 +47,7 @@ bool isOnLine(std::int32_t point, const CBoundaryObjectKvs& line) {
 }
 
 bool isRatingCurve(const FileNameValue& file) {
-  return !file.empty() && sameName(std::filesystem::path(file.text()).extension().string(), ".tsb0") &&
+  return !file.empty() && names::same(std::filesystem::path(file.text()).extension().string(), ".tsb0") &&
          isReadableFile(file.absolute());
 }
 

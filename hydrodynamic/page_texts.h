@@ -16,6 +16,21 @@ inline constexpr FileKind ratingCurveFile{"tsb0", "Rating curve (*.tsb0)|*.tsb0|
 inline constexpr FileKind flowDirectionFile{
     "tsb1", "Flow Direction (*.tsb1;*.tb1)|*.tsb1; *.tb1|All Files (*.*)|*.*||"};
 
+inline constexpr FileKind surfaceElevationMap{
+    "tsb2", "Surface Elevation Map (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
+inline constexpr FileKind eddyViscosityMap{
+    "tsb2", "Eddy viscosity map (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
+inline constexpr FileKind resistanceMap{"tsb2",
+                                        "Resistance Map (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
+inline constexpr FileKind pierResistanceFile{
+    "tsb1", "Pier Resistance (*.tsb1;*.tb1)|*.tsb1; *.tb1|All Files (*.*)|*.*||"};
+inline constexpr FileKind grainDiameterMap{
+    "tsb2", "Grain Diameter Map (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
+inline constexpr FileKind waveMap{"tsb2", "Wave Field (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
+inline constexpr FileKind windMap{"tsb2", "Wind Map (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
+inline constexpr FileKind waveRadiationMap{
+    "tsb2", "Wave Radiation Map (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
+
 inline constexpr Text sourceRow{"%d: "};
 inline constexpr FileKind rainSeriesFile{"tsb0",
                                          "Time Series (*.tsb0;*.tb0)|*.tsb0; *.tb0|All Files (*.*)|*.*||"};

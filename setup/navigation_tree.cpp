@@ -9,6 +9,7 @@
 #include "basic/module_selection.h"
 #include "core/edition.h"
 #include "hydrodynamic/infiltration.h"
+#include "hydrodynamic/resistance.h"
 #include "hydrodynamic/source_sink.h"
 
 namespace gridbay {
@@ -218,6 +219,10 @@ void rule4Evaporation(CNavigationView& tree, CGlobalKvs& model) {
   showAll(tree, model.nhdSourceSink->HasEvaporation(), {15, 112});
 }
 
+void rule6WaveInducedResistance(CNavigationView& tree, CGlobalKvs& model) {
+  tree.Show(142, model.nhdResistance->formulation == CNhdResistanceKvs::kWaveInduced);
+}
+
 void rule9Infiltration(CNavigationView& tree, CGlobalKvs& model) {
   showAll(tree, model.nhdInfiltration->infiltrationType != CNhdInfiltrationKvs::kNone, {145, 146});
 }
@@ -237,8 +242,8 @@ void rule20Sliding(CNavigationView& tree, CGlobalKvs& model) {
 
 // In this order. Nothing is remembered between runs.
 constexpr void (*kRules[])(CNavigationView&, CGlobalKvs&) = {
-    rule1ModuleRoots,  rule2HotStart,    rule3Precipitation, rule4Evaporation,
-    rule9Infiltration, rule11MassBudget, rule20Sliding};
+    rule1ModuleRoots,           rule2HotStart,     rule3Precipitation, rule4Evaporation,
+    rule6WaveInducedResistance, rule9Infiltration, rule11MassBudget,   rule20Sliding};
 
 }  // namespace
 

@@ -8,9 +8,14 @@
 #include "basic/simulation_period_page.h"
 #include "basic/source_sink_page.h"
 #include "hydrodynamic/boundary_page.h"
+#include "hydrodynamic/eddy_viscosity_page.h"
 #include "hydrodynamic/infiltration_page.h"
+#include "hydrodynamic/resistance_page.h"
 #include "hydrodynamic/result_page.h"
 #include "hydrodynamic/source_sink_page.h"
+#include "hydrodynamic/surface_elevation_page.h"
+#include "hydrodynamic/wave_radiation_page.h"
+#include "hydrodynamic/wind_conditions_page.h"
 
 namespace gridbay {
 namespace {
@@ -34,6 +39,12 @@ constexpr Entry kPages[] = {
     {"CAreaDescriptionDlg", make<CAreaDescriptionDlg>},
     {"CMassBudgetDlg", make<CMassBudgetDlg>},
     {"CNhdBoundaryDlg", make<CNhdBoundaryDlg>},
+    {"CNhdSurfaceElevationDlg", make<CNhdSurfaceElevationDlg>},
+    {"CWindConditionsDlg", make<CWindConditionsDlg>},
+    {"CNhdEddyViscosityDlg", make<CNhdEddyViscosityDlg>},
+    {"CNhdResistanceDlg", make<CNhdResistanceDlg>},
+    {"CNhdResistanceWaveDlg", make<CNhdResistanceWaveDlg>},
+    {"CNhdWaveRadiationDlg", make<CNhdWaveRadiationDlg>},
     {"CNhdSourceSinkDlg", make<CNhdSourceSinkDlg>},
     {"CHDInfiltrationDlg", make<CHDInfiltrationDlg>},
     {"CResultDlg", make<CResultDlg>},

@@ -7,6 +7,7 @@
 #include <filesystem>
 #include <limits>
 
+#include "core/kdl_reader.h"
 #include "core/kdl_writer.h"
 #include "tests/support/temporary_folder.h"
 
@@ -97,6 +98,36 @@ TEST_F(KvsReading, FindsByNameWithoutRegardToCase) {
   EXPECT_EQ(kvsSectionByNameNum(target, "Integer", 1), nullptr);
   EXPECT_EQ(kvsKeywordByNameNum(target, "SECTION", 1), nullptr);
   EXPECT_EQ(kvsGetNoKeywords(target), 11);
+}
+
+TEST(Kvs, BlanksAtTheEndOfANameAreWrittenAndMakeNoDifference) {
+  for (const int others : {0, 30, 200}) {
+    const KvsHandle file = kvsCreate();
+    kvsAddTarget(*file, "T");
+    for (int i = 0; i < others; ++i) kvsPutParam(*file, "Other" + std::to_string(i * 3), i);
+    kvsPutParam(*file, "Kind ", 1);
+    kvsPutParam(*file, "kind", 2);
+    kvsAddSection(*file, "Section  ");
+    kvsEndSection(*file);
+    kvsPutParam(*file, " Kind", 3);
+    const std::string text = *file->text();
+    EXPECT_NE(text.find("    \"Kind \" 1\n    kind 2\n    \"Section  \" {}\n    \" Kind\" 3\n"), text.npos);
+    const ReadText read = readKdl(FileText(text));
+    for (const Node* target : {read.tree->root().section("T"), file->tree().root().section("T ")}) {
+      for (const char* name : {"Kind", "KIND ", "kind   "}) {
+        std::int32_t value = 0;
+        kvsGetParam(target, name, &value, 1, 1);
+        EXPECT_EQ(value, 1) << name << others;
+        kvsGetParam(target, name, &value, 2, 1);
+        EXPECT_EQ(value, 2) << name << others;
+        EXPECT_EQ(kvsKeywordByNameNum(target, name, 3), nullptr) << name << others;
+      }
+      EXPECT_NE(kvsSectionByNameNum(target, "SECTION", 1), nullptr);
+      EXPECT_EQ(kvsSectionByNameNum(target, "Section x", 1), nullptr);
+      EXPECT_EQ(kvsKeywordByNameNum(target, "Kin", 1), nullptr);
+      EXPECT_EQ(kvsGetInt(kvsParamByNum(kvsKeywordByNameNum(target, " Kind", 1), 1)), 3);
+    }
+  }
 }
 
 TEST_F(KvsReading, FillsVariablesOfTheirKind) {

@@ -83,6 +83,18 @@ TEST(SectionIndex, RepeatedNames) {
   expectAsAWalkFinds(text);
 }
 
+TEST(SectionIndex, BlanksAtTheEndsOfNames) {
+  expectAsAWalkFinds(run("\"POINT_", 1, 200, " \" {}\n"));
+  expectAsAWalkFinds(run("POINT_", 1, 200, " {}\n") + "\"POINT_7  \" {}\n\"POINT_8 \" 1\n\"\" 1\n\" \" 2\n");
+  expectAsAWalkFinds(run("Same", 1, 40, " 1\n") + run("\"same", 1, 40, " \" 1\n"));
+  const ReadText read = readKdl(FileText(run("\"P_", 1, 99, " \" 1\n") + "\"P_5\" 2\nTail 1\n\"tail \" 2\n"));
+  const Node& root = read.tree->root();
+  EXPECT_EQ(root.keyword("p_5")->name(), "P_5 ");
+  EXPECT_EQ(root.keyword("P_5  ", 2)->name(), "P_5");
+  EXPECT_EQ(root.keyword("tail ")->name(), "Tail");
+  EXPECT_EQ(root.keyword("tail", 2)->name(), "tail ");
+}
+
 TEST(SectionIndex, NamesAsChanceMakesThem) {
   std::mt19937 random(20261121);
   const auto any = [&random](int most) { return static_cast<int>(random() % static_cast<unsigned>(most)); };
@@ -93,6 +105,7 @@ TEST(SectionIndex, NamesAsChanceMakesThem) {
       std::string name(static_cast<std::size_t>(1 + any(10)), static_cast<char>('a' + any(2)));
       if (any(2) == 0) name += std::to_string(any(120));
       if (any(3) == 0) name = "N" + std::to_string(i);
+      if (any(8) == 0) name = '"' + name + " \"";
       text += name + (any(2) == 0 ? " {}\n" : " 1\n");
     }
     expectAsAWalkFinds(text);

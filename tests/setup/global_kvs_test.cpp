@@ -9,6 +9,12 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "core/edition.h"
+#include "hydrodynamic/boundary.h"
+#include "hydrodynamic/eddy_viscosity.h"
+#include "hydrodynamic/resistance.h"
+#include "hydrodynamic/surface_elevation.h"
+#include "hydrodynamic/wave_radiation.h"
+#include "hydrodynamic/wind_conditions.h"
 #include "setup/setup_file.h"
 #include "tests/support/model.h"
 #include "tests/support/temporary_folder.h"
@@ -93,8 +99,102 @@ std::string newModelText(const std::string& selection, const std::string& advect
          "            GroundwaterDepthType 1\n"
          "            InitialVolumeType 1\n"
          "        }\n"
+         "        WIND_CONDITIONS {\n"
+         "            Data_Format 0\n"
+         "            Constant_Wind_Direction 270.0\n"
+         "            Constant_Wind_Speed 10.0\n"
+         "            Neutral_Pressure 1013.0\n"
+         "            IncludeAirPressureCorrections #false\n"
+         "            File_Name (file)\"\"\n"
+         "            Item_Numbers\n"
+         "            Type_Of_Wind_Friction 0\n"
+         "            Constant_Friction 0.0026\n"
+         "            Linear_Friction_1 0.0016\n"
+         "            Linear_Friction_2 0.0026\n"
+         "            Linear_Speed_1 0.0\n"
+         "            Linear_Speed_2 24.0\n"
+         "        }\n"
+         "        EDDY_VISCOSITY {\n"
+         "            Data_Format 0\n"
+         "            Formulation 1\n"
+         "            AREA_1 {\n"
+         "                Constant_Value 0.0\n"
+         "                Smagorinsky_Format 0.5\n"
+         "                File_Name (file)\"\"\n"
+         "                Item_Numbers 1\n"
+         "            }\n"
+         "        }\n"
+         "        WAVE_RADIATION {\n"
+         "            AREA_1 {\n"
+         "                Included #false\n"
+         "                FILE_TIME_DESCR 0\n"
+         "                DATA_FILE {\n"
+         "                    FILE_NAME (file)\"\"\n"
+         "                }\n"
+         "            }\n"
+         "        }\n"
+         "        SURFACE_ELEVATION {\n"
+         "            AREA_1 {\n"
+         "                Type 1\n"
+         "                Constant_Value 0.0\n"
+         "                File_Name (file)\"\"\n"
+         "                Item_Numbers 1\n"
+         "            }\n"
+         "        }\n"
+         "        RESISTANCE {\n"
+         "            Formulation 0\n"
+         "            AREA_1 {\n"
+         "                Data_Format 1\n"
+         "                Constant_Value 32.0\n"
+         "                File_Name (file)\"\"\n"
+         "                Item_Numbers 1\n"
+         "                Include_Pier #false\n"
+         "                PIER {\n"
+         "                    File_Name (file)\"\"\n"
+         "                    Item_Numbers 1\n"
+         "                }\n"
+         "            }\n"
+         "            SEDIMENT_DATA {\n"
+         "                Grain_Format 0\n"
+         "                Constant_Grain_Size 0.2\n"
+         "                Relative_Density 2.65\n"
+         "                File_Name (file)\"\"\n"
+         "                Item_Numbers 1\n"
+         "            }\n"
+         "            Type_Of_Roughness 0\n"
+         "            Include_Wave_Height_Correction 1\n"
+         "            Wave_Height_Over_Depth_Limit 0.85\n"
+         "            Update_Frequency 1\n"
+         "        }\n"
+         "        WAVES {\n"
+         "            \"Type_Of_Wave_Height \" 0\n"
+         "            \"Type_Of_Wave_Period \" 0\n"
+         "            Wave_Format 3\n"
+         "            Constant_Wave_Height 1.0\n"
+         "            Constant_Wave_Period 3.0\n"
+         "            Constant_Wave_Direction 180.0\n"
+         "            File_Name (file)\"\"\n"
+         "            Item_Numbers 1 2 3\n"
+         "        }\n"
          "        STRUCTURE_MODULE {}\n"
          "        STRUCTURES {}\n"
+         "        OUTPUT_SPECIFICATION {\n"
+         "            Number_Of_Output_areas 0\n"
+         "            Generate_Hotstart #false\n"
+         "            HOTSTART_FILES {\n"
+         "                AREA_1 {\n"
+         "                    Title \"\"\n"
+         "                    File_Name (result)\"\"\n"
+         "                }\n"
+         "            }\n"
+         "            INUNDATION_STATISTICS {\n"
+         "                IncludeInundationStatistics #false\n"
+         "                InundationFileName (result)\"\"\n"
+         "                InundationFileStoreStep 0\n"
+         "                DurationAboveThreshold #false\n"
+         "                ThresholdHeight 0.0\n"
+         "            }\n"
+         "        }\n"
          "    }\n"
          "    ADVECTION_DISPERSION_MODULE {\n"
          "        OPTION_PARAMETERS {}\n" +
@@ -290,15 +390,40 @@ TEST(GlobalKvs, TheCheckRunsInItsOrder) {
             }));
 }
 
+TEST(GlobalKvs, TheCheckOfTheFlowRunsInItsOrder) {
+  Model model;
+  model.root.boundary->SetNoBoundaries(1);
+  model.root.nhdBoundary->at(1).dataFormat = CNhdBoundaryObjectKvs::kType0File;
+  model.root.nhdResistance->at(1).constantValue = -1;
+  model.root.nhdSurfaceElevation->at(1).type = 0;
+  model.root.nhdWaveRadiation->at(1).included = 1;
+  model.root.nhdEddyViscosity->dataFormat = CNhdEddyViscosityKvs::kConstant;
+  model.root.nhdEddyViscosity->at(1).constantValue = -1;
+  model.root.windConditions->constantSpeed = -1;
+  ValidationList messages;
+  model.root.Validate(messages, 1);
+  std::vector<PageId> pages;
+  for (const CMessage& message : messages) pages.push_back(message.page);
+  EXPECT_EQ(pages, (std::vector<PageId>{PageId::bathymetry, PageId::windConditions, PageId::eddyViscosity,
+                                        PageId::waveRadiation, PageId::surfaceElevation, PageId::resistance,
+                                        PageId::hdBoundary}));
+}
+
 TEST(GlobalKvs, ThePagesOfTheMessages) {
   EXPECT_EQ(static_cast<int>(PageId::floodAndDry), 26);
   EXPECT_EQ(static_cast<int>(PageId::bathymetry), 27);
   EXPECT_EQ(static_cast<int>(PageId::boundary), 28);
   EXPECT_EQ(static_cast<int>(PageId::hdBoundary), 29);
+  EXPECT_EQ(static_cast<int>(PageId::eddyViscosity), 32);
   EXPECT_EQ(static_cast<int>(PageId::massBudget), 34);
   EXPECT_EQ(static_cast<int>(PageId::moduleSelection), 35);
+  EXPECT_EQ(static_cast<int>(PageId::resistance), 37);
   EXPECT_EQ(static_cast<int>(PageId::simulationPeriod), 39);
   EXPECT_EQ(static_cast<int>(PageId::sourceAndSink), 40);
+  EXPECT_EQ(static_cast<int>(PageId::surfaceElevation), 43);
+  EXPECT_EQ(static_cast<int>(PageId::waveRadiation), 44);
+  EXPECT_EQ(static_cast<int>(PageId::windConditions), 46);
+  EXPECT_EQ(static_cast<int>(PageId::waves), 142);
 }
 
 TEST(SetupFile, KeepsTheSourceForLaterSaves) {

@@ -7,6 +7,7 @@
 #include "basic/module_selection.h"
 #include "core/edition.h"
 #include "hydrodynamic/infiltration.h"
+#include "hydrodynamic/resistance.h"
 #include "hydrodynamic/source_sink.h"
 #include "tests/support/model.h"
 
@@ -71,6 +72,14 @@ TEST_F(NavigationTree, AnotherCodeLeavesTheRootsAndRunsTheOtherRules) {
   model.root.bathymetry->hotStart = 1;
   EXPECT_EQ(rootsWith(1), (Ids{1, 2, 4, 6}));
   EXPECT_FALSE(tree.IsVisible(26));
+}
+
+TEST_F(NavigationTree, WavesShowWhereTheyInduceTheResistance) {
+  for (const std::int32_t formulation : {0, 2, 1, 2, 3}) {
+    model.root.nhdResistance->formulation = formulation;
+    tree.OnUpdate(&model.root);
+    EXPECT_EQ(tree.IsVisible(142), formulation == 2) << formulation;
+  }
 }
 
 TEST_F(NavigationTree, AHotStartHidesAndShowsTwoPages) {
