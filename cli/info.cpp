@@ -6,7 +6,6 @@
 #include <filesystem>
 #include <fstream>
 #include <limits>
-#include <nlohmann/json.hpp>
 
 #include "basic/area_description.h"
 #include "basic/bathymetry.h"
@@ -16,15 +15,14 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "cli/commands.h"
-#include "core/number_text.h"
+#include "cli/info_hydrodynamic.h"
+#include "cli/info_report.h"
 #include "platform/cartography/cartography.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/units/units.h"
 
 namespace gridbay::cli {
 namespace {
-
-using Json = nlohmann::ordered_json;
 
 struct Options {
   std::string file;
@@ -43,12 +41,6 @@ Json describeTime(const TsbTimeAxis& time) {
   axis["last"] = time.at(time.count - 1);
   if (time.isEquidistant()) axis["step"] = time.step;
   return axis;
-}
-
-// A number as the digits tell it that it has in its own width: 0.1 of 32 bits is 0.1.
-template <class Number>
-double plain(double value) {
-  return doubleOfText(NumberText(static_cast<Number>(value)).view()).value_or(value);
 }
 
 // Least and greatest value, missing values left out.
@@ -255,11 +247,12 @@ Json describeSetup(CGlobalKvs& model) {
   for (int number = 1; number <= model.sourceSink->GetCount(); ++number) {
     report["sources"].push_back(model.sourceSink->GetItem(number)->Text());
   }
+  report["hydrodynamics"] = describeHydrodynamics(model);
   return report;
 }
 
 void printSetup(const Json& report, const Console& console) {
-  const auto line = [&console](std::string_view label, const std::string& text) {
+  const Line line = [&console](std::string_view label, const std::string& text) {
     console.out << fmt::format("{:<16} {}\n", label, text);
   };
   line("Setup", fmt::format("module code {}{}", report["simulation_type"].get<int>(),
@@ -293,13 +286,11 @@ void printSetup(const Json& report, const Console& console) {
   for (std::size_t i = 0; i < report["boundaries"].size(); ++i) {
     line(fmt::format("Boundary {}", i + 1), report["boundaries"][i].get<std::string>());
   }
-  for (std::size_t i = 0; i < report["sources"].size(); ++i) {
-    line(fmt::format("Source {}", i + 1), report["sources"][i].get<std::string>());
-  }
   if (report["polygons"] != 0) line("Polygons", std::to_string(report["polygons"].get<int>()));
   line("Flood and dry",
        fmt::format("drying at {:g} m, flooding at {:g} m", report["drying_depth"].get<double>(),
                    report["flooding_depth"].get<double>()));
+  printHydrodynamics(report["hydrodynamics"], line);
 }
 
 int print(const Json& report, const Options& options, void (*readable)(const Json&, const Console&),

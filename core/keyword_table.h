@@ -57,7 +57,7 @@ bool accessRow(const Row& row, auto& object, std::string_view path, PathAccess& 
   if constexpr (requires { row.access(object, path, access); }) {
     return row.access(object, path, access);
   } else if constexpr (requires { row.name; }) {
-    if (!sameName(path, row.name)) return false;
+    if (access.onlySections || !sameName(path, row.name)) return false;
     if (access.what == PathAccess::What::write) row.save(object, *access.out, *access.documentPath);
     if (access.what != PathAccess::What::set) return true;
     if constexpr (requires { row.set(object, access.in, *access.documentPath); }) {

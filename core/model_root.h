@@ -6,6 +6,12 @@
 
 namespace gridbay {
 
+// What the module that runs beside hydrodynamics writes, as it is set up now.
+struct ModuleOutput {
+  double megabytes = 0;
+  int hotStartItems = 0;  // in the hot start file of an area
+};
+
 // What a part may ask of the root of its model beside its members, which each room declares for itself.
 class ModelRoot : public CKvsBase {
  public:
@@ -13,6 +19,8 @@ class ModelRoot : public CKvsBase {
 
   // Tells all lists that follow this one, in their order, what its counts are now; a list has one.
   virtual void TellFollowers(const CKvsBase& leader, std::span<const int> counts) = 0;
+
+  virtual ModuleOutput OutputOfModule() { return {}; }
 };
 
 }  // namespace gridbay

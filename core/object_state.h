@@ -40,6 +40,7 @@ struct PathAccess {
   KvsFile* out = nullptr;
   KvsSection in = nullptr;
   const std::string* documentPath = nullptr;
+  bool onlySections = false;  // a keyword is passed over: a section may have its name
 
   // What was found.
   bool isSection = false;

@@ -16,12 +16,15 @@ enum class PageId : std::int32_t {
   massBudget = 34,
   moduleSelection = 35,
   resistance = 37,
+  hdResult = 38,
   simulationPeriod = 39,
   sourceAndSink = 40,
+  hdSourceAndSink = 41,
   surfaceElevation = 43,
   waveRadiation = 44,
   windConditions = 46,
   waves = 142,
+  infiltration = 143,
 };
 
 }  // namespace gridbay

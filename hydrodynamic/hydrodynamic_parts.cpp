@@ -2,7 +2,10 @@
 
 #include "hydrodynamic/boundary.h"
 #include "hydrodynamic/eddy_viscosity.h"
+#include "hydrodynamic/infiltration.h"
 #include "hydrodynamic/resistance.h"
+#include "hydrodynamic/result.h"
+#include "hydrodynamic/source_sink.h"
 #include "hydrodynamic/surface_elevation.h"
 #include "hydrodynamic/wave_radiation.h"
 #include "hydrodynamic/wind_conditions.h"

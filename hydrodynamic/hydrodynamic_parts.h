@@ -6,7 +6,10 @@ namespace gridbay {
 
 class CNhdBoundaryKvs;
 class CNhdEddyViscosityKvs;
+class CNhdInfiltrationKvs;
 class CNhdResistanceKvs;
+class CNhdResultKvs;
+class CNhdSourceSinkKvs;
 class CNhdSurfaceElevationKvs;
 class CNhdWaveRadiationKvs;
 class CWindConditionsKvs;
@@ -18,11 +21,14 @@ struct HydrodynamicParts {
   ~HydrodynamicParts();
 
   std::unique_ptr<CNhdBoundaryKvs> nhdBoundary;
+  std::unique_ptr<CNhdSourceSinkKvs> nhdSourceSink;
+  std::unique_ptr<CNhdInfiltrationKvs> nhdInfiltration;
   std::unique_ptr<CWindConditionsKvs> windConditions;
   std::unique_ptr<CNhdEddyViscosityKvs> nhdEddyViscosity;
   std::unique_ptr<CNhdWaveRadiationKvs> nhdWaveRadiation;
   std::unique_ptr<CNhdSurfaceElevationKvs> nhdSurfaceElevation;
   std::unique_ptr<CNhdResistanceKvs> nhdResistance;
+  std::unique_ptr<CNhdResultKvs> nhdResult;
 };
 
 }  // namespace gridbay

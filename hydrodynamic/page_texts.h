@@ -31,4 +31,21 @@ inline constexpr FileKind windMap{"tsb2", "Wind Map (*.tsb2;*.tb2)|*.tsb2; *.tb2
 inline constexpr FileKind waveRadiationMap{
     "tsb2", "Wave Radiation Map (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
 
+inline constexpr Text sourceRow{"%d: "};
+inline constexpr FileKind rainSeriesFile{"tsb0",
+                                         "Time Series (*.tsb0;*.tb0)|*.tsb0; *.tb0|All Files (*.*)|*.*||"};
+inline constexpr FileKind evaporationMapFile{
+    "tsb2", "Evaporation Map Files (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
+inline constexpr FileKind precipitationMapFile{
+    "tsb2", "Precipitation Map Files (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
+// The extension is that of a map, though the file is a series.
+inline constexpr FileKind sourceSeriesFile{"tsb2",
+                                           "Time series (*.tsb0;*.tb0)|*.tsb0; *.tb0|All Files (*.*)|*.*||"};
+
+inline constexpr FileKind infiltrationFile{"tsb2",
+                                           "Files (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
+
+inline constexpr Text outputItems{"Output items\n"};
+inline constexpr Text generateHotStart{"Generate hot start"};
+
 }  // namespace gridbay::texts

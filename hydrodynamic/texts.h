@@ -13,6 +13,24 @@ inline constexpr Text tiltingPointOutside{"Tilting point is outside of boundary 
 inline constexpr Text boundaryRequest{"Boundary"};
 inline constexpr Text flowDirectionRequest{"Flow direction"};
 
+// Sources and sinks, rain and evaporation.
+inline constexpr Text hdSourceSectionMissing{
+    "Error in the KVS-FILE\nThe number of Hydrodynamic Source Sink sections does not correspond to the "
+    "number of Boundaries"};
+inline constexpr Text rainfallRequest{"Rainfall rate"};
+inline constexpr Text magnitudeRequest{"Magnitude"};
+inline constexpr Text velocityRequest{"Velocity"};
+
+// Infiltration.
+inline constexpr Text infiltrationFileNotValid{"File is not valid"};
+inline constexpr Text infiltrationRequest{"Infiltration"};
+inline constexpr Text porosityRequest{"Porosity"};
+inline constexpr Text depthBelowGroundRequest{"Depth Below Ground"};
+inline constexpr Text groundwaterElevationRequest{"Elevation"};
+inline constexpr Text leakageRequest{"Leakage"};
+inline constexpr Text percentageRequest{"Percentage"};
+inline constexpr Text waterContentRequest{"Volumetric Water Content"};
+
 // Surface elevation.
 inline constexpr Text surfaceElevationSectionMissing{
     "Error in the KVS-FILE\nThe number of Surface Elevation sections does not correspond to the number of "
@@ -62,5 +80,10 @@ inline constexpr Text windYRequest{"Wind Y-component"};
 // Wave radiation.
 inline constexpr Text waveRadiationCountDiffers{
     "Number of wave radiation objects does not correspond to number of subdomains"};
+
+// Outputs.
+inline constexpr Text saturationLast{
+    "Saturation is the last item of the output \"%s\", and there is no infiltration: such a list can't be "
+    "saved. Without the item it can."};
 
 }  // namespace gridbay::texts

@@ -277,8 +277,8 @@ Control& Form::addIndexed(ControlKind kind, std::string_view label, Choices choi
                               },
                               .set =
                                   [choices, set = std::move(value.set)](std::int32_t place) {
-                                    if (const std::optional<std::int32_t> chosen = choices.valueAt(place))
-                                      set(*chosen);
+                                    const std::optional<std::int32_t> chosen = choices.valueAt(place);
+                                    if (chosen && set) set(*chosen);
                                   }},
                              0);
   control.kind = kind;

@@ -26,7 +26,8 @@ CV27SetupResultSubsetDialog::CV27SetupResultSubsetDialog(const Range& range, std
                                                          std::int32_t lastK, std::int32_t lastStep)
     : range_(range), shown_(range), limits_{lastJ, lastK, lastStep} {
   for (std::size_t direction = 0; direction < kDirections.size(); ++direction) {
-    form_.Group(fmt::format("{} (0 to {})", kDirections[direction], limits_[direction]), [&] {
+    const std::string limit = limits_[direction] < 0 ? "" : fmt::format(" (0 to {})", limits_[direction]);
+    form_.Group(kDirections[direction] + limit, [&] {
       form_.DDX_Text("First:", shown_[3 * direction]);
       form_.DDX_Text("Last:", shown_[3 * direction + 1]).Beside();
       form_.DDX_Text("Interval:", shown_[3 * direction + 2]).Beside();
@@ -46,7 +47,8 @@ std::string CV27SetupResultSubsetDialog::fault() {
   for (std::size_t direction = 0; direction < kDirections.size(); ++direction) {
     const std::int32_t first = shown_[3 * direction];
     const std::int32_t last = shown_[3 * direction + 1];
-    if (first < 0 || first > last || last > limits_[direction]) {
+    const bool isKnown = limits_[direction] >= 0;
+    if (isKnown && (first < 0 || first > last || last > limits_[direction])) {
       return fmt::format("{}: {} to {} is not a part of 0 to {}", kDirections[direction], first, last,
                          limits_[direction]);
     }

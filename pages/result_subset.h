@@ -19,7 +19,8 @@ class CV27SetupResultSubsetDialog {
   static Range rangeOf(const USubArea& area, const USubLine& steps);
   static void copyBack(const Range& range, USubArea& area, USubLine& steps);
 
-  // The limits are the last J and K index of the first area, and the last time step.
+  // The limits are the last J and K index of the area, and the last time step; with one below 0, which
+  // is not known, any range will do.
   CV27SetupResultSubsetDialog(const Range& range, std::int32_t lastJ, std::int32_t lastK,
                               std::int32_t lastStep);
 

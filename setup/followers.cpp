@@ -6,6 +6,8 @@
 #include "hydrodynamic/boundary.h"
 #include "hydrodynamic/eddy_viscosity.h"
 #include "hydrodynamic/resistance.h"
+#include "hydrodynamic/result.h"
+#include "hydrodynamic/source_sink.h"
 #include "hydrodynamic/surface_elevation.h"
 #include "hydrodynamic/wave_radiation.h"
 #include "setup/global_kvs.h"
@@ -33,14 +35,12 @@ const CKvsBase& leader(const G& root) {
   return *(root.*member);
 }
 
-constexpr std::array<Follower, 4> kOfAreas{
-    resize<&G::nhdEddyViscosity>,
-    resize<&G::nhdWaveRadiation>,
-    resize<&G::nhdSurfaceElevation>,
-    resize<&G::nhdResistance>,
+constexpr std::array<Follower, 5> kOfAreas{
+    resize<&G::nhdEddyViscosity>, resize<&G::nhdWaveRadiation>, resize<&G::nhdSurfaceElevation>,
+    resize<&G::nhdResistance>,    resize<&G::nhdResult>,
 };
 constexpr std::array<Follower, 1> kOfBoundaries{resize<&G::nhdBoundary>};
-constexpr std::array<Follower, 0> kOfSources{};
+constexpr std::array<Follower, 1> kOfSources{resize<&G::nhdSourceSink>};
 
 constexpr LeaderRow kLeaders[] = {
     {leader<&G::bathymetry>, kOfAreas},

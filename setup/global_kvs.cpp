@@ -159,7 +159,7 @@ bool CGlobalKvs::KnowsSection(std::string_view path) {
     const std::optional<std::string_view> rest = behind(path, section);
     if (rest && (rest->empty() || behind(*rest, kOptionParameters))) return true;
   }
-  PathAccess access{PathAccess::What::look};
+  PathAccess access{.what = PathAccess::What::look, .onlySections = true};
   return AccessPath(path, access) && access.isSection;
 }
 

@@ -54,6 +54,8 @@ class CGlobalKvs final : public ModelRoot,
   bool KnowsSection(std::string_view path);
 
   void TellFollowers(const CKvsBase& leader, std::span<const int> counts) override;
+  // By the table of setup/module_outputs.cpp.
+  ModuleOutput OutputOfModule() override;
 
  protected:
   void ShowMessage(const std::string& text) override;

@@ -8,7 +8,9 @@
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
 #include "core/edition.h"
+#include "hydrodynamic/infiltration.h"
 #include "hydrodynamic/resistance.h"
+#include "hydrodynamic/source_sink.h"
 
 namespace gridbay {
 namespace {
@@ -209,8 +211,20 @@ void rule2HotStart(CNavigationView& tree, CGlobalKvs& model) {
   showAll(tree, model.bathymetry->hotStart == 0, {26, 43});
 }
 
+void rule3Precipitation(CNavigationView& tree, CGlobalKvs& model) {
+  showAll(tree, model.nhdSourceSink->HasPrecipitation(), {22, 113});
+}
+
+void rule4Evaporation(CNavigationView& tree, CGlobalKvs& model) {
+  showAll(tree, model.nhdSourceSink->HasEvaporation(), {15, 112});
+}
+
 void rule6WaveInducedResistance(CNavigationView& tree, CGlobalKvs& model) {
   tree.Show(142, model.nhdResistance->formulation == CNhdResistanceKvs::kWaveInduced);
+}
+
+void rule9Infiltration(CNavigationView& tree, CGlobalKvs& model) {
+  showAll(tree, model.nhdInfiltration->infiltrationType != CNhdInfiltrationKvs::kNone, {145, 146});
 }
 
 void rule11MassBudget(CNavigationView& tree, CGlobalKvs& model) {
@@ -223,7 +237,8 @@ void rule20Sliding(CNavigationView& tree, CGlobalKvs& model) {
 
 // In this order. Nothing is remembered between runs.
 constexpr void (*kRules[])(CNavigationView&, CGlobalKvs&) = {
-    rule1ModuleRoots, rule2HotStart, rule6WaveInducedResistance, rule11MassBudget, rule20Sliding};
+    rule1ModuleRoots,           rule2HotStart,     rule3Precipitation, rule4Evaporation,
+    rule6WaveInducedResistance, rule9Infiltration, rule11MassBudget,   rule20Sliding};
 
 }  // namespace
 

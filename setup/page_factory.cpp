@@ -9,7 +9,10 @@
 #include "basic/source_sink_page.h"
 #include "hydrodynamic/boundary_page.h"
 #include "hydrodynamic/eddy_viscosity_page.h"
+#include "hydrodynamic/infiltration_page.h"
 #include "hydrodynamic/resistance_page.h"
+#include "hydrodynamic/result_page.h"
+#include "hydrodynamic/source_sink_page.h"
 #include "hydrodynamic/surface_elevation_page.h"
 #include "hydrodynamic/wave_radiation_page.h"
 #include "hydrodynamic/wind_conditions_page.h"
@@ -42,6 +45,9 @@ constexpr Entry kPages[] = {
     {"CNhdResistanceDlg", make<CNhdResistanceDlg>},
     {"CNhdResistanceWaveDlg", make<CNhdResistanceWaveDlg>},
     {"CNhdWaveRadiationDlg", make<CNhdWaveRadiationDlg>},
+    {"CNhdSourceSinkDlg", make<CNhdSourceSinkDlg>},
+    {"CHDInfiltrationDlg", make<CHDInfiltrationDlg>},
+    {"CResultDlg", make<CResultDlg>},
 };
 
 }  // namespace

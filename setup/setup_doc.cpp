@@ -50,7 +50,7 @@ bool CV27SetupDoc::mayLeaveOut() {
 bool CV27SetupDoc::OnSaveDocument(const std::string& path) {
   if (!host().mayWriteOver(path) || !mayLeaveOut()) return false;
   history_.settle(root());
-  const Outcome saved = saveTo(path);
+  const Outcome saved = setup_.save(path);
   const bool changed = history_.record(root(), PageId::none, "Save", false, touched());
   if (saved) {
     SetPath(path);
@@ -63,15 +63,6 @@ bool CV27SetupDoc::OnSaveDocument(const std::string& path) {
   if (changed) UpdateAllViews(nullptr);
   if (saved && saved_) saved_();
   return bool(saved);
-}
-
-// Nothing reaches the disk before the whole text is there.
-Outcome CV27SetupDoc::saveTo(const std::string& path) {
-  try {
-    return setup_.save(path);
-  } catch (const std::exception& fault) {
-    return Failure{"The setup cannot be written: " + std::string(fault.what())};
-  }
 }
 
 unsigned CV27SetupDoc::ValidateData(ValidationList& messages) {

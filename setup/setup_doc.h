@@ -51,7 +51,6 @@ class CV27SetupDoc : public CVdDoc {
 
  private:
   bool mayLeaveOut();
-  Outcome saveTo(const std::string& path);
   void start(SetupFile setup, const std::string& path, bool modified);
 
   SetupFile setup_;

@@ -1,6 +1,7 @@
 #include "setup/setup_file.h"
 
 #include <array>
+#include <exception>
 #include <utility>
 
 #include "basic/module_selection.h"
@@ -80,10 +81,15 @@ KvsHandle SetupFile::tree(const std::string& path) {
   return file;
 }
 
+// Nothing reaches the disk before the whole text is there.
 Outcome SetupFile::save(const std::string& path) {
-  KvsHandle file = kvsCreate();
-  model_->Save(*file, path);
-  return write(*file, path);
+  try {
+    KvsHandle file = kvsCreate();
+    model_->Save(*file, path);
+    return write(*file, path);
+  } catch (const std::exception& fault) {
+    return Failure{"The setup cannot be written: " + std::string(fault.what())};
+  }
 }
 
 Outcome SetupFile::saveCopy(const std::string& copy, const std::string& path) {

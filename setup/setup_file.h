@@ -30,7 +30,8 @@ class SetupFile {
   const KvsFile& source() const { return *source_; }
   // What a save to the path would write.
   KvsHandle tree(const std::string& path);
-  // Writes the setup. What a save does to the model, as it leaves out what can't be written, stays.
+  // Writes the setup. What a save does to the model, as it leaves out what can't be written, stays. A model
+  // that can't be written leaves the file as it was.
   Outcome save(const std::string& path);
   // Writes what a save to the path would, to another file; the model stays as it is.
   Outcome saveCopy(const std::string& copy, const std::string& path);

@@ -11,7 +11,10 @@
 #include "basic/source_sink.h"
 #include "hydrodynamic/boundary.h"
 #include "hydrodynamic/eddy_viscosity.h"
+#include "hydrodynamic/infiltration.h"
 #include "hydrodynamic/resistance.h"
+#include "hydrodynamic/result.h"
+#include "hydrodynamic/source_sink.h"
 #include "hydrodynamic/surface_elevation.h"
 #include "hydrodynamic/wave_radiation.h"
 #include "hydrodynamic/wind_conditions.h"
@@ -71,11 +74,12 @@ constexpr Condition kExpandedMud = runs<module::kMudTransportExpanded>;
 constexpr Condition kEcology = runs<module::kEcological>;
 
 constexpr MemberRow kMembers[] = {
-    member<&G::moduleSelection>(),  member<&G::bathymetry>(),       member<&G::simulationPeriod>(),
-    member<&G::boundary>(),         member<&G::sourceSink>(),       member<&G::massBudget>(),
-    member<&G::areaDescription>(),  member<&G::nhdBoundary>(),      member<&G::windConditions>(),
-    member<&G::nhdEddyViscosity>(), member<&G::nhdWaveRadiation>(), member<&G::nhdSurfaceElevation>(),
-    member<&G::nhdResistance>(),
+    member<&G::moduleSelection>(),  member<&G::bathymetry>(),          member<&G::simulationPeriod>(),
+    member<&G::boundary>(),         member<&G::sourceSink>(),          member<&G::massBudget>(),
+    member<&G::areaDescription>(),  member<&G::nhdBoundary>(),         member<&G::nhdSourceSink>(),
+    member<&G::nhdInfiltration>(),  member<&G::windConditions>(),      member<&G::nhdEddyViscosity>(),
+    member<&G::nhdWaveRadiation>(), member<&G::nhdSurfaceElevation>(), member<&G::nhdResistance>(),
+    member<&G::nhdResult>(),
 };
 
 constexpr void (*kStartingCounts[])(G&) = {
@@ -96,6 +100,8 @@ constexpr FileRow kSaving[] = {
     in("HYDRODYNAMIC_MODULE"),
     options(),
     child<&G::nhdBoundary>(),
+    child<&G::nhdSourceSink>(),
+    child<&G::nhdInfiltration>(),
     child<&G::windConditions>(),
     child<&G::nhdEddyViscosity>(),
     child<&G::nhdWaveRadiation>(),
@@ -103,6 +109,8 @@ constexpr FileRow kSaving[] = {
     child<&G::nhdResistance>(),
     in("HYDRODYNAMIC_MODULE/STRUCTURE_MODULE"),
     in("HYDRODYNAMIC_MODULE/STRUCTURES"),
+    in("HYDRODYNAMIC_MODULE"),
+    child<&G::nhdResult>(),
 
     in("ADVECTION_DISPERSION_MODULE"),
     options(),
@@ -131,13 +139,14 @@ constexpr FileRow kSaving[] = {
 
 // The module selection comes first: what else is read depends on it.
 constexpr FileRow kLoading[] = {
-    in("NESTED_MODEL_GLOBALS"),    child<&G::moduleSelection>(),  child<&G::bathymetry>(),
-    child<&G::boundary>(),         child<&G::sourceSink>(),       child<&G::areaDescription>(),
+    in("NESTED_MODEL_GLOBALS"),    child<&G::moduleSelection>(),     child<&G::bathymetry>(),
+    child<&G::boundary>(),         child<&G::sourceSink>(),          child<&G::areaDescription>(),
     child<&G::simulationPeriod>(), child<&G::massBudget>(),
 
-    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdBoundary>(),      child<&G::windConditions>(),
-    child<&G::nhdEddyViscosity>(), child<&G::nhdWaveRadiation>(), child<&G::nhdSurfaceElevation>(),
-    child<&G::nhdResistance>(),
+    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdBoundary>(),         child<&G::nhdSourceSink>(),
+    child<&G::nhdInfiltration>(),  child<&G::windConditions>(),      child<&G::nhdEddyViscosity>(),
+    child<&G::nhdWaveRadiation>(), child<&G::nhdSurfaceElevation>(), child<&G::nhdResistance>(),
+    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdResult>(),
 };
 
 constexpr CheckRow kChecking[] = {
@@ -147,6 +156,8 @@ constexpr CheckRow kChecking[] = {
     check<&G::windConditions>(),   check<&G::nhdEddyViscosity>(),
     check<&G::nhdWaveRadiation>(), check<&G::nhdSurfaceElevation>(),
     check<&G::nhdResistance>(),    check<&G::nhdBoundary>(),
+    check<&G::nhdSourceSink>(),    check<&G::nhdInfiltration>(),
+    check<&G::nhdResult>(),
 };
 
 }  // namespace

@@ -460,7 +460,10 @@ TEST_F(Tool, InfoOfASetup) {
             "Boundary 1       (0,0) - (0,7)\n"
             "Boundary 2       (0,7) - (2,7)\n"
             "Boundary 3       (0,0) - (2,0)\n"
-            "Flood and dry    drying at 0.02 m, flooding at 0.05 m\n");
+            "Flood and dry    drying at 0.02 m, flooding at 0.05 m\n"
+            "Rain             none\n"
+            "Evaporation      none\n"
+            "Infiltration     none\n");
 }
 
 class RunEngine : public Tool {

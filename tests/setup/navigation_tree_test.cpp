@@ -6,7 +6,9 @@
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
 #include "core/edition.h"
+#include "hydrodynamic/infiltration.h"
 #include "hydrodynamic/resistance.h"
+#include "hydrodynamic/source_sink.h"
 #include "tests/support/model.h"
 
 namespace gridbay {
@@ -90,6 +92,50 @@ TEST_F(NavigationTree, AHotStartHidesAndShowsTwoPages) {
   tree.OnUpdate(&model.root);
   EXPECT_TRUE(tree.IsVisible(26));
   EXPECT_TRUE(tree.IsVisible(43));
+}
+
+TEST_F(NavigationTree, RainAndEvaporationHaveConcentrationsWhileTheyAreOn) {
+  CNhdSourceSinkKvs& flows = *model.root.nhdSourceSink;
+  // Rain of both modules, then evaporation of both.
+  const auto shown = [this] {
+    tree.OnUpdate(&model.root);
+    std::string all;
+    for (const std::int32_t id : {22, 113, 15, 112}) all += tree.IsShown(id) ? 'x' : '.';
+    return all;
+  };
+  EXPECT_EQ(shown(), "....");
+  flows.netPrecipitation = true;
+  EXPECT_EQ(shown(), "....");
+  flows.precipitation = 0.5F;
+  EXPECT_EQ(shown(), "xxxx");
+  flows.netPrecipitation = false;
+  EXPECT_EQ(shown(), "xx..");
+  flows.precipitation = -1;
+  EXPECT_EQ(shown(), "....");
+  flows.precipitationKind = CNhdSourceSinkKvs::kMap;
+  EXPECT_EQ(shown(), "xx..");
+  flows.precipitationKind = CNhdSourceSinkKvs::kConstant;
+  flows.evaporation = 1;
+  EXPECT_EQ(shown(), "..xx");
+  flows.evaporation = 0;
+  flows.evaporationKind = CNhdSourceSinkKvs::kTimeSeries;
+  EXPECT_EQ(shown(), "..xx");
+  rootsWith(2);
+  EXPECT_TRUE(tree.IsVisible(15));
+  EXPECT_FALSE(tree.IsVisible(112));
+}
+
+TEST_F(NavigationTree, InfiltrationHasConcentrationsWithAType) {
+  for (const std::int32_t type : {0, 1, 2, 0}) {
+    model.root.nhdInfiltration->infiltrationType = type;
+    tree.OnUpdate(&model.root);
+    EXPECT_EQ(tree.IsShown(145), type != 0);
+    EXPECT_EQ(tree.IsShown(146), type != 0);
+  }
+  model.root.nhdInfiltration->infiltrationType = 1;
+  rootsWith(9);
+  EXPECT_TRUE(tree.IsVisible(146));
+  EXPECT_FALSE(tree.IsVisible(145));
 }
 
 TEST_F(NavigationTree, MassBudgetPagesNeedModuleSchemeAndPolygon) {
