@@ -10,6 +10,8 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "hydrodynamic/boundary.h"
+#include "structures/culvert.h"
+#include "structures/weir.h"
 
 namespace gridbay {
 namespace {
@@ -68,7 +70,8 @@ constexpr Condition kEcology = runs<module::kEcological>;
 constexpr MemberRow kMembers[] = {
     member<&G::moduleSelection>(), member<&G::bathymetry>(),  member<&G::simulationPeriod>(),
     member<&G::boundary>(),        member<&G::sourceSink>(),  member<&G::massBudget>(),
-    member<&G::areaDescription>(), member<&G::nhdBoundary>(),
+    member<&G::areaDescription>(), member<&G::nhdBoundary>(), member<&G::nhdWeir>(),
+    member<&G::nhdCulvert>(),
 };
 
 constexpr void (*kStartingCounts[])(G&) = {
@@ -90,6 +93,8 @@ constexpr FileRow kSaving[] = {
     options(),
     child<&G::nhdBoundary>(),
     in("HYDRODYNAMIC_MODULE/STRUCTURE_MODULE"),
+    child<&G::nhdWeir>(),
+    child<&G::nhdCulvert>(),
     in("HYDRODYNAMIC_MODULE/STRUCTURES"),
 
     in("ADVECTION_DISPERSION_MODULE"),
@@ -119,11 +124,21 @@ constexpr FileRow kSaving[] = {
 
 // The module selection comes first: what else is read depends on it.
 constexpr FileRow kLoading[] = {
-    in("NESTED_MODEL_GLOBALS"),    child<&G::moduleSelection>(), child<&G::bathymetry>(),
-    child<&G::boundary>(),         child<&G::sourceSink>(),      child<&G::areaDescription>(),
-    child<&G::simulationPeriod>(), child<&G::massBudget>(),
+    in("NESTED_MODEL_GLOBALS"),
+    child<&G::moduleSelection>(),
+    child<&G::bathymetry>(),
+    child<&G::boundary>(),
+    child<&G::sourceSink>(),
+    child<&G::areaDescription>(),
+    child<&G::simulationPeriod>(),
+    child<&G::massBudget>(),
 
-    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdBoundary>(),
+    in("HYDRODYNAMIC_MODULE"),
+    child<&G::nhdBoundary>(),
+
+    in("HYDRODYNAMIC_MODULE/STRUCTURE_MODULE"),
+    child<&G::nhdWeir>(),
+    child<&G::nhdCulvert>(),
 };
 
 constexpr CheckRow kChecking[] = {
