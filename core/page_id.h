@@ -12,10 +12,12 @@ enum class PageId : std::int32_t {
   bathymetry = 27,
   boundary = 28,
   hdBoundary = 29,
+  culverts = 30,
   massBudget = 34,
   moduleSelection = 35,
   simulationPeriod = 39,
   sourceAndSink = 40,
+  weirs = 45,
 };
 
 }  // namespace gridbay

@@ -8,6 +8,8 @@
 #include "basic/simulation_period_page.h"
 #include "basic/source_sink_page.h"
 #include "hydrodynamic/boundary_page.h"
+#include "structures/culvert_page.h"
+#include "structures/weir_page.h"
 
 namespace gridbay {
 namespace {
@@ -31,6 +33,8 @@ constexpr Entry kPages[] = {
     {"CAreaDescriptionDlg", make<CAreaDescriptionDlg>},
     {"CMassBudgetDlg", make<CMassBudgetDlg>},
     {"CNhdBoundaryDlg", make<CNhdBoundaryDlg>},
+    {"CNHdWeirDlg", make<CNHdWeirDlg>},
+    {"CNHdCulvertDlg", make<CNHdCulvertDlg>},
 };
 
 }  // namespace
