@@ -180,6 +180,7 @@ TEST_F(WeirPage, EachParameterIsStored) {
 TEST_F(WeirPage, PointsAreEditedInADialog) {
   weir().x = {1, 2};
   weir().y = {3, 4};
+  document.RecordEdit(PageId::weirs, "before");
   host.fillForm = [](Form& form) {
     EXPECT_EQ(rowOf(*form.find("Points")->grid, 2), (Labels{"2.000000", "4.000000"}));
     form.find("Points")->grid->StoreStyleRowCol(1, 1, "9");
