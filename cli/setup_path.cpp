@@ -8,6 +8,7 @@
 #include "cli/nearest.h"
 #include "core/kdl_writer.h"
 #include "core/number_text.h"
+#include "core/object_state.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay::cli {
@@ -112,8 +113,10 @@ Result<const Node*> findPath(const KvsFile& file, std::string_view path) {
   while (at != nullptr && !rest.empty()) {
     const std::string_view part = rest.substr(0, rest.find('/'));
     const bool isLast = part.size() == rest.size();
-    const Node* keyword = isLast ? at->keyword(part) : nullptr;
-    at = keyword != nullptr ? keyword : at->section(part);
+    const auto [name, number] = occurrenceOf(part);
+    const auto occurrence = static_cast<std::uint32_t>(std::max(number, 0));
+    const Node* keyword = isLast ? at->keyword(name, occurrence) : nullptr;
+    at = keyword != nullptr ? keyword : at->section(name, occurrence);
     rest.remove_prefix(std::min(part.size() + 1, rest.size()));
   }
   if (at != nullptr) return at;

@@ -124,13 +124,30 @@ inline std::optional<int> numberIn(std::string_view name, const Text& format) {
 // What an item's Save and Load get beside the file: nothing.
 struct NoArgument {};
 
+// What all rows of items do with their list.
+template <class List>
+struct ListRow {
+  List list;
+
+  void copy(auto& object, const auto& other) const { list.of(object).CopyFrom(list.of(other)); }
+  bool same(const auto& a, const auto& b, StateScope scope) const {
+    return scope == StateScope::withoutItems || list.of(a).same(list.of(b));
+  }
+  void assign(auto& object, const auto& other, StateScope scope) const {
+    if (scope == StateScope::whole) list.of(object).assign(list.of(other));
+  }
+  void refresh(auto& object, const auto& other) const { list.of(object).refresh(list.of(other)); }
+  void visitLists(auto& object, auto& other, auto&& visit) const { visit(list.of(object), list.of(other)); }
+};
+
 // The row of the items: their numbered sections, and the text shown for a section that is missing; without
 // one it is passed over in silence. An argument goes to each item's Save and Load.
 template <class List, class Argument = NoArgument>
-struct ItemsRow {
+struct ItemsRow : ListRow<List> {
+  using ListRow<List>::list;
+
   Text sectionName;
   Text missing;
-  List list;
   [[no_unique_address]] Argument argument = {};
 
   void saveItem(auto& item, KvsFile& file, const std::string& documentPath) const {
@@ -164,16 +181,6 @@ struct ItemsRow {
       }
     }
   }
-  void copy(auto& object, const auto& other) const { list.of(object).CopyFrom(list.of(other)); }
-
-  bool same(const auto& a, const auto& b, StateScope scope) const {
-    return scope == StateScope::withoutItems || list.of(a).same(list.of(b));
-  }
-  void assign(auto& object, const auto& other, StateScope scope) const {
-    if (scope == StateScope::whole) list.of(object).assign(list.of(other));
-  }
-  void refresh(auto& object, const auto& other) const { list.of(object).refresh(list.of(other)); }
-  void visitLists(auto& object, auto& other, auto&& visit) const { visit(list.of(object), list.of(other)); }
   bool access(auto& object, std::string_view path, PathAccess& access) const {
     const PathStep step = stepOf(path);
     const std::optional<int> number = numberIn(step.first, sectionName);
@@ -190,19 +197,74 @@ struct ItemsRow {
   }
 };
 constexpr ItemsRow<OwnList> items(std::string_view sectionName, Text missing = {}) {
-  return {{sectionName}, missing, {}, {}};
+  return {{}, {sectionName}, missing, {}};
 }
 template <class Object, class Item>
 constexpr ItemsRow<ListMember<Object, Item>> items(std::string_view sectionName,
                                                    ItemList<Item> Object::*member, Text missing = {}) {
-  return {{sectionName}, missing, {member}, {}};
+  return {{{member}}, {sectionName}, missing, {}};
 }
 template <class Object, class Item, class Argument>
 constexpr ItemsRow<ListMember<Object, Item>, Argument> itemsWith(Argument argument,
                                                                  std::string_view sectionName,
                                                                  ItemList<Item> Object::*member,
                                                                  Text missing = {}) {
-  return {{sectionName}, missing, {member}, argument};
+  return {{{member}}, {sectionName}, missing, argument};
+}
+
+// The rows of a list whose sections all have one name and are told apart by their order: the count, and the
+// items. A load makes the list anew, and each item with what the file has of it: an item whose section is
+// missing has its defaults. For a list that no other one follows. An object may have
+//   void completeLoaded(Item&, KvsSection)   defaults of what the item's section, or null, lacks
+// A path has the number of the item in brackets: "weir_data[2]".
+template <class List>
+struct RepeatedItemsRow : ListRow<List> {
+  using ListRow<List>::list;
+
+  CountRow<List> count;
+  std::string_view sectionName;
+
+  void save(const auto& object, KvsFile& file, const std::string& documentPath) const {
+    count.save(object, file, documentPath);
+    auto& items = const_cast<std::remove_cvref_t<decltype(list.of(object))>&>(list.of(object));
+    for (int number = 1; number <= items.GetCount(); ++number)
+      saveItem(*items.GetItem(number), file, documentPath);
+  }
+  void load(auto& object, KvsSection from, const std::string& documentPath) const {
+    int stated = 0;
+    kvsGetParam(from, count.name, &stated, 1, 1);
+    auto& items = list.of(object);
+    items.SetCount(0);
+    items.SetCount(
+        believedCount(std::max(stated, 0), from, [&](const std::string& text) { object.Tell(text); }));
+    for (int number = 1; number <= items.GetCount(); ++number) {
+      auto& item = *items.GetItem(number);
+      const KvsSection section = kvsSectionByNameNum(from, sectionName, number);
+      if (section != nullptr) item.Load(section, documentPath);
+      if constexpr (requires { object.completeLoaded(item, section); }) object.completeLoaded(item, section);
+    }
+  }
+  bool access(auto& object, std::string_view path, PathAccess& access) const {
+    if (table_detail::accessRow(count, object, path, access)) return true;
+    const PathStep step = stepOf(path);
+    const NamedOccurrence named = occurrenceOf(step.first);
+    auto* item = sameName(named.name, sectionName) ? list.of(object).GetItem(named.number) : nullptr;
+    if (item == nullptr) return false;
+    if (!step.isLast()) return item->AccessPath(step.rest, access);
+    access.isSection = true;
+    if (access.what == PathAccess::What::write) saveItem(*item, *access.out, *access.documentPath);
+    return true;
+  }
+
+ private:
+  void saveItem(auto& item, KvsFile& file, const std::string& documentPath) const {
+    kvsAddSection(file, sectionName);
+    item.Save(file, documentPath);
+    kvsEndSection(file);
+  }
+};
+constexpr RepeatedItemsRow<OwnList> repeatedItems(std::string_view countName, std::string_view sectionName) {
+  return {{}, count(countName), sectionName};
 }
 
 }  // namespace gridbay

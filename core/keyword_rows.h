@@ -51,6 +51,32 @@ constexpr NumbersRow<Object, T> numbers(std::string_view name, std::vector<T> Ob
   return {{name, member}};
 }
 
+// Numbers of several members under one keyword, in order. Those that the keyword lacks stay as they are.
+template <class... Members>
+struct ValuesRow {
+  std::string_view name;
+  std::tuple<Members...> pointers;
+
+  void save(const auto& object, KvsFile& file, const std::string&) const {
+    kvsAddKeyword(file, name);
+    std::apply([&](const auto... member) { (addValue(file, object.*member), ...); }, pointers);
+  }
+  void load(auto& object, KvsSection from, const std::string&) const {
+    int number = 0;
+    std::apply([&](const auto... member) { (kvsGetParam(from, name, &(object.*member), 1, ++number), ...); },
+               pointers);
+  }
+  void copy(auto& object, const auto& other) const {
+    std::apply([&](const auto... member) { ((object.*member = other.*member), ...); }, pointers);
+  }
+  constexpr auto members() const { return pointers; }
+};
+
+template <class... Members>
+constexpr ValuesRow<Members...> values(std::string_view name, Members... members) {
+  return {name, {members...}};
+}
+
 // A whole number in the model that is true or false on file, where anything but 0 is true.
 template <class Object>
 struct FlagRow {

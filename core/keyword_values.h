@@ -45,6 +45,12 @@ inline void addValue(KvsFile& file, float value) {
 inline void addValue(KvsFile& file, double value) {
   kvsAddDouble(file, value);
 }
+// A fixed number of numbers.
+template <class T, std::size_t n>
+void putValue(KvsFile& file, std::string_view name, const std::array<T, n>& values, const std::string&) {
+  kvsAddKeyword(file, name);
+  for (const T value : values) addValue(file, value);
+}
 // A list of numbers, as many as there are.
 template <class T>
 void putValue(KvsFile& file, std::string_view name, const std::vector<T>& values, const std::string&) {
@@ -71,6 +77,11 @@ inline void getValue(KvsSection from, std::string_view name, UFileName& value,
 inline void getValue(KvsSection from, std::string_view name, UResultFileName& value,
                      const std::string& documentPath) {
   value.Load(from, documentPath, name);
+}
+// Numbers that the keyword lacks stay as they are.
+template <class T, std::size_t n>
+void getValue(KvsSection from, std::string_view name, std::array<T, n>& values, const std::string&) {
+  for (std::size_t i = 0; i < n; ++i) kvsGetParam(from, name, &values[i], 1, static_cast<int>(i) + 1);
 }
 inline void takeValue(KvsParam param, std::int32_t& value) {
   value = kvsGetInt(param);

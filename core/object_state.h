@@ -1,6 +1,8 @@
 #pragma once
 
+#include <array>
 #include <bit>
+#include <charconv>
 #include <cstddef>
 #include <memory>
 #include <string>
@@ -28,7 +30,7 @@ class StateChange {
 enum class StateScope { whole, withoutItems };
 
 // A look at, or a change of, what a path names in an object. Sections and keywords are between slashes, as on
-// file.
+// file; the n-th of several of one name is "name[n]".
 struct PathAccess {
   enum class What {
     write,  // writes the keyword or section under the cursor of `out`
@@ -61,6 +63,21 @@ inline PathStep stepOf(std::string_view path) {
   return {path.substr(0, slash), path.substr(slash + 1)};
 }
 
+// A step that names one of several sections or keywords of a name, as "weir_data[2]", counted from 1; the
+// name alone is the first of them. A number that is none is 0, which no occurrence has.
+struct NamedOccurrence {
+  std::string_view name;
+  int number = 1;
+};
+inline NamedOccurrence occurrenceOf(std::string_view step) {
+  const std::size_t bracket = step.rfind('[');
+  if (bracket == step.npos || !step.ends_with(']')) return {step, 1};
+  int number = 0;
+  const char* end = step.data() + step.size() - 1;
+  const auto [rest, error] = std::from_chars(step.data() + bracket + 1, end, number);
+  return {step.substr(0, bracket), error == std::errc() && rest == end ? number : 0};
+}
+
 // Whether two values are the same to the last bit, so that not-a-number is the same as itself.
 bool sameValue(const auto& a, const auto& b) {
   return a == b;
@@ -75,6 +92,13 @@ template <class T>
 bool sameValue(const std::vector<T>& a, const std::vector<T>& b) {
   if (a.size() != b.size()) return false;
   for (std::size_t i = 0; i < a.size(); ++i) {
+    if (!sameValue(a[i], b[i])) return false;
+  }
+  return true;
+}
+template <class T, std::size_t n>
+bool sameValue(const std::array<T, n>& a, const std::array<T, n>& b) {
+  for (std::size_t i = 0; i < n; ++i) {
     if (!sameValue(a[i], b[i])) return false;
   }
   return true;

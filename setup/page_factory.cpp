@@ -16,6 +16,8 @@
 #include "hydrodynamic/surface_elevation_page.h"
 #include "hydrodynamic/wave_radiation_page.h"
 #include "hydrodynamic/wind_conditions_page.h"
+#include "structures/culvert_page.h"
+#include "structures/weir_page.h"
 
 namespace gridbay {
 namespace {
@@ -48,6 +50,8 @@ constexpr Entry kPages[] = {
     {"CNhdSourceSinkDlg", make<CNhdSourceSinkDlg>},
     {"CHDInfiltrationDlg", make<CHDInfiltrationDlg>},
     {"CResultDlg", make<CResultDlg>},
+    {"CNHdWeirDlg", make<CNHdWeirDlg>},
+    {"CNHdCulvertDlg", make<CNHdCulvertDlg>},
 };
 
 }  // namespace

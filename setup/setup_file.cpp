@@ -2,6 +2,7 @@
 
 #include <array>
 #include <exception>
+#include <unordered_map>
 #include <utility>
 
 #include "basic/module_selection.h"
@@ -13,9 +14,12 @@ constexpr std::string_view kOptionParameters = "OPTION_PARAMETERS";
 
 void listUnknown(KvsSection source, CGlobalKvs& model, const std::string& path,
                  std::vector<std::string>& unknown) {
+  std::unordered_map<const Node*, int> repeats;  // of the first section of a name
   for (const Node* node = source->first(); node != nullptr; node = node->next()) {
     if (!node->isSection()) continue;
-    const std::string here = path + (path.empty() ? "" : "/") + std::string(node->name());
+    std::string here = path + (path.empty() ? "" : "/") + std::string(node->name());
+    if (const Node* first = source->section(node->name()); first != node)
+      here += "[" + std::to_string(++repeats[first] + 1) + "]";
     const bool isOptions = sameName(node->name(), kOptionParameters);
     if (!model.KnowsSection(here)) {
       if (!isOptions || node->first() != nullptr) unknown.push_back(here);

@@ -18,6 +18,8 @@
 #include "hydrodynamic/surface_elevation.h"
 #include "hydrodynamic/wave_radiation.h"
 #include "hydrodynamic/wind_conditions.h"
+#include "structures/culvert.h"
+#include "structures/weir.h"
 
 namespace gridbay {
 namespace {
@@ -79,7 +81,7 @@ constexpr MemberRow kMembers[] = {
     member<&G::areaDescription>(),  member<&G::nhdBoundary>(),         member<&G::nhdSourceSink>(),
     member<&G::nhdInfiltration>(),  member<&G::windConditions>(),      member<&G::nhdEddyViscosity>(),
     member<&G::nhdWaveRadiation>(), member<&G::nhdSurfaceElevation>(), member<&G::nhdResistance>(),
-    member<&G::nhdResult>(),
+    member<&G::nhdWeir>(),          member<&G::nhdCulvert>(),          member<&G::nhdResult>(),
 };
 
 constexpr void (*kStartingCounts[])(G&) = {
@@ -108,6 +110,8 @@ constexpr FileRow kSaving[] = {
     child<&G::nhdSurfaceElevation>(),
     child<&G::nhdResistance>(),
     in("HYDRODYNAMIC_MODULE/STRUCTURE_MODULE"),
+    child<&G::nhdWeir>(),
+    child<&G::nhdCulvert>(),
     in("HYDRODYNAMIC_MODULE/STRUCTURES"),
     in("HYDRODYNAMIC_MODULE"),
     child<&G::nhdResult>(),
@@ -139,14 +143,31 @@ constexpr FileRow kSaving[] = {
 
 // The module selection comes first: what else is read depends on it.
 constexpr FileRow kLoading[] = {
-    in("NESTED_MODEL_GLOBALS"),    child<&G::moduleSelection>(),     child<&G::bathymetry>(),
-    child<&G::boundary>(),         child<&G::sourceSink>(),          child<&G::areaDescription>(),
-    child<&G::simulationPeriod>(), child<&G::massBudget>(),
+    in("NESTED_MODEL_GLOBALS"),
+    child<&G::moduleSelection>(),
+    child<&G::bathymetry>(),
+    child<&G::boundary>(),
+    child<&G::sourceSink>(),
+    child<&G::areaDescription>(),
+    child<&G::simulationPeriod>(),
+    child<&G::massBudget>(),
 
-    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdBoundary>(),         child<&G::nhdSourceSink>(),
-    child<&G::nhdInfiltration>(),  child<&G::windConditions>(),      child<&G::nhdEddyViscosity>(),
-    child<&G::nhdWaveRadiation>(), child<&G::nhdSurfaceElevation>(), child<&G::nhdResistance>(),
-    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdResult>(),
+    in("HYDRODYNAMIC_MODULE"),
+    child<&G::nhdBoundary>(),
+    child<&G::nhdSourceSink>(),
+    child<&G::nhdInfiltration>(),
+    child<&G::windConditions>(),
+    child<&G::nhdEddyViscosity>(),
+    child<&G::nhdWaveRadiation>(),
+    child<&G::nhdSurfaceElevation>(),
+    child<&G::nhdResistance>(),
+
+    in("HYDRODYNAMIC_MODULE/STRUCTURE_MODULE"),
+    child<&G::nhdWeir>(),
+    child<&G::nhdCulvert>(),
+
+    in("HYDRODYNAMIC_MODULE"),
+    child<&G::nhdResult>(),
 };
 
 constexpr CheckRow kChecking[] = {

@@ -1,5 +1,8 @@
 #include "structures/structures_parts.h"
 
+#include "structures/culvert.h"
+#include "structures/weir.h"
+
 namespace gridbay {
 
 StructureParts::StructureParts() = default;

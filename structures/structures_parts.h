@@ -4,10 +4,16 @@
 
 namespace gridbay {
 
+class CNhdWeirKvs;
+class CNhdCulvertKvs;
+
 // Weirs, culverts and dikes, as members of the root. None is ever null while the root lives.
 struct StructureParts {
   StructureParts();
   ~StructureParts();
+
+  std::unique_ptr<CNhdWeirKvs> nhdWeir;
+  std::unique_ptr<CNhdCulvertKvs> nhdCulvert;
 };
 
 }  // namespace gridbay

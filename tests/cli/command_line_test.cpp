@@ -248,6 +248,28 @@ TEST_F(Tool, SettingsLeaveTheOptionsOfASectionAtTheTopAlone) {
       "7\n");
 }
 
+TEST_F(Tool, OneOfSeveralSectionsOfANameIsReachedByItsNumber) {
+  makeSetup();
+  const std::string weirs = "HYDRODYNAMIC_MODULE/STRUCTURE_MODULE/WEIR/";
+  const ProgramRun run =
+      runTool({"set", setup, weirs + "number_of_weirs=3", weirs + "weir_data[2]/delhs=0.25",
+               weirs + "WEIR_DATA[3]/Location=Old mill", weirs + "weir_data[2]/x=1.5,2.5",
+               weirs + "weir_data[2]/y=3.5,4.5", weirs + "weir_data[3]/Attributes=2,1"});
+  EXPECT_EQ(run.status, 0) << run.err;
+  EXPECT_EQ(get(weirs + "weir_data[1]/delhs"), "0.01\n");
+  EXPECT_EQ(get(weirs + "weir_data/delhs"), "0.01\n");  // the first
+  EXPECT_EQ(get(weirs + "weir_data[2]/delhs"), "0.25\n");
+  EXPECT_EQ(get(weirs + "weir_data[2]/number_of_points"), "2\n");
+  EXPECT_EQ(get(weirs + "weir_data[3]/Location"), "Old mill\n");
+  EXPECT_EQ(get(weirs + "weir_data[3]/Attributes"), "2 1\n");
+  EXPECT_THAT(get(weirs + "weir_data[3]"), HasSubstr("Location \"\" -1e-155 \"Old mill\" \"TopoID\"\n"));
+  for (const char* none : {"weir_data[4]/delhs", "weir_data[0]/delhs", "weir_data[x]/delhs", "weir_data[2"})
+    EXPECT_NE(runTool({"get", setup, weirs + none}).status, 0) << none;
+  const std::string before = textOf(setup);
+  EXPECT_NE(runTool({"set", setup, weirs + "weir_data[4]/delhs=1.0"}).status, 0);
+  EXPECT_EQ(textOf(setup), before);
+}
+
 TEST_F(Tool, ANewCountIsASetting) {
   makeSetup();
   const ProgramRun run = runTool({"set", setup, "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/Number_Of_Sources=2",

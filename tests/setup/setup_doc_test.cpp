@@ -77,6 +77,18 @@ TEST_F(SetupDoc, WhatASaveWouldLeaveOutIsAskedAbout) {
   EXPECT_EQ(host.questions.size(), 2U);  // nothing is left to lose
 }
 
+TEST_F(SetupDoc, SectionsOfANameBeyondThoseThatAreReadAreAskedAbout) {
+  const std::string path =
+      folder.write("s.v27",
+                   "VANE27_NESTED_MODEL { HYDRODYNAMIC_MODULE { STRUCTURE_MODULE { WEIR { number_of_weirs 2\n"
+                   " weir_data { delhs 1.0 }; WEIR_DATA { delhs 2.0 }; weir_data { delhs 3.0 } } } } }");
+  ASSERT_TRUE(document.OnOpenDocument(path));
+  host.answer = false;
+  EXPECT_FALSE(document.OnSaveDocument(path));
+  EXPECT_THAT(host.questions.at(0),
+              HasSubstr(":\n\nHYDRODYNAMIC_MODULE/STRUCTURE_MODULE/WEIR/weir_data[3]\n\nSave"));
+}
+
 TEST_F(SetupDoc, ViewsAreToldOfChangesButForTheirOwn) {
   int first = 0;
   int second = 0;

@@ -262,7 +262,7 @@ class DesktopTest : public DesktopFixture {
 
   void helpForEachPage() {
     DocumentTab* tab = window_->currentDocument();
-    for (const int page : {26, 27, 28, 29, 34, 35, 39, 40}) {
+    for (const int page : {26, 27, 28, 29, 30, 34, 35, 39, 40, 45}) {
       QVERIFY(tab->goToPage(page));
       QTest::keyClick(window_.get(), Qt::Key_F1);
       QVERIFY(window_->help().isVisible());
