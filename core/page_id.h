@@ -12,6 +12,7 @@ enum class PageId : std::int32_t {
   bathymetry = 27,
   boundary = 28,
   hdBoundary = 29,
+  dikes = 31,
   massBudget = 34,
   moduleSelection = 35,
   simulationPeriod = 39,

@@ -8,6 +8,7 @@
 #include "basic/simulation_period_page.h"
 #include "basic/source_sink_page.h"
 #include "hydrodynamic/boundary_page.h"
+#include "structures/dike_page.h"
 
 namespace gridbay {
 namespace {
@@ -31,6 +32,7 @@ constexpr Entry kPages[] = {
     {"CAreaDescriptionDlg", make<CAreaDescriptionDlg>},
     {"CMassBudgetDlg", make<CMassBudgetDlg>},
     {"CNhdBoundaryDlg", make<CNhdBoundaryDlg>},
+    {"CNHdDikeDlg", make<CNHdDikeDlg>},
 };
 
 }  // namespace

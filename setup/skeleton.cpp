@@ -10,6 +10,7 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "hydrodynamic/boundary.h"
+#include "structures/dike.h"
 
 namespace gridbay {
 namespace {
@@ -68,7 +69,7 @@ constexpr Condition kEcology = runs<module::kEcological>;
 constexpr MemberRow kMembers[] = {
     member<&G::moduleSelection>(), member<&G::bathymetry>(),  member<&G::simulationPeriod>(),
     member<&G::boundary>(),        member<&G::sourceSink>(),  member<&G::massBudget>(),
-    member<&G::areaDescription>(), member<&G::nhdBoundary>(),
+    member<&G::areaDescription>(), member<&G::nhdBoundary>(), member<&G::nhdDike>(),
 };
 
 constexpr void (*kStartingCounts[])(G&) = {
@@ -91,6 +92,7 @@ constexpr FileRow kSaving[] = {
     child<&G::nhdBoundary>(),
     in("HYDRODYNAMIC_MODULE/STRUCTURE_MODULE"),
     in("HYDRODYNAMIC_MODULE/STRUCTURES"),
+    child<&G::nhdDike>(),
 
     in("ADVECTION_DISPERSION_MODULE"),
     options(),
@@ -123,13 +125,14 @@ constexpr FileRow kLoading[] = {
     child<&G::boundary>(),         child<&G::sourceSink>(),      child<&G::areaDescription>(),
     child<&G::simulationPeriod>(), child<&G::massBudget>(),
 
-    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdBoundary>(),
+    in("HYDRODYNAMIC_MODULE"),     child<&G::nhdBoundary>(),     in("HYDRODYNAMIC_MODULE/STRUCTURES"),
+    child<&G::nhdDike>(),
 };
 
 constexpr CheckRow kChecking[] = {
     check<&G::bathymetry>(),  check<&G::areaDescription>(), check<&G::simulationPeriod>(),
     check<&G::boundary>(),    check<&G::sourceSink>(),      check<&G::massBudget>(),
-    check<&G::nhdBoundary>(),
+    check<&G::nhdBoundary>(), check<&G::nhdDike>(),
 };
 
 }  // namespace

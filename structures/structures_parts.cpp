@@ -1,5 +1,7 @@
 #include "structures/structures_parts.h"
 
+#include "structures/dike.h"
+
 namespace gridbay {
 
 StructureParts::StructureParts() = default;

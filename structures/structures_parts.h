@@ -4,10 +4,14 @@
 
 namespace gridbay {
 
+class CNhdDikeKvs;
+
 // Weirs, culverts and dikes, as members of the root. None is ever null while the root lives.
 struct StructureParts {
   StructureParts();
   ~StructureParts();
+
+  std::unique_ptr<CNhdDikeKvs> nhdDike;
 };
 
 }  // namespace gridbay

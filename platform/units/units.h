@@ -39,13 +39,18 @@ namespace item {
 inline constexpr int kUndefined = 999;
 inline constexpr int kWaterLevel = 100000;
 inline constexpr int kDischarge = 100001;
+inline constexpr int kChezyNumber = 100032;
+inline constexpr int kElevation = 100069;
 inline constexpr int kSurfaceElevation = 100078;
 inline constexpr int kBathymetry = 100079;
-inline constexpr int kTimeStep = 100212;
 inline constexpr int kFlowFlux = 100080;
+inline constexpr int kCoordinate = 100183;
+inline constexpr int kTimeStep = 100212;
 inline constexpr int kFloodDepth = 100280;
 inline constexpr int kFlowDirection = 100408;
 inline constexpr int kFlowRate = 100430;
+inline constexpr int kLevelDifference = 100442;
+inline constexpr int kCrestLevel = 110033;
 }  // namespace item
 
 // The catalogues, by rising code.

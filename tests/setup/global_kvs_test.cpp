@@ -73,7 +73,11 @@ std::string newModelText(const std::string& selection, const std::string& advect
          "        OPTION_PARAMETERS {}\n"
          "        OPEN_BOUNDARY {}\n"
          "        STRUCTURE_MODULE {}\n"
-         "        STRUCTURES {}\n"
+         "        STRUCTURES {\n"
+         "            DIKES {\n"
+         "                number_of_dikes 0\n"
+         "            }\n"
+         "        }\n"
          "    }\n"
          "    ADVECTION_DISPERSION_MODULE {\n"
          "        OPTION_PARAMETERS {}\n" +
@@ -274,6 +278,7 @@ TEST(GlobalKvs, ThePagesOfTheMessages) {
   EXPECT_EQ(static_cast<int>(PageId::bathymetry), 27);
   EXPECT_EQ(static_cast<int>(PageId::boundary), 28);
   EXPECT_EQ(static_cast<int>(PageId::hdBoundary), 29);
+  EXPECT_EQ(static_cast<int>(PageId::dikes), 31);
   EXPECT_EQ(static_cast<int>(PageId::massBudget), 34);
   EXPECT_EQ(static_cast<int>(PageId::moduleSelection), 35);
   EXPECT_EQ(static_cast<int>(PageId::simulationPeriod), 39);

@@ -1,0 +1,19 @@
+#pragma once
+
+#include "core/string_table.h"
+#include "pages/file_choice.h"
+
+namespace gridbay::texts {
+
+// Dikes.
+inline constexpr Text itemOfFile{"Item: %s"};
+inline constexpr Text fileNotFound{"File '%s' not found"};
+inline constexpr FileKind crestLevelFile{"tsb1", "Tsb1 Files (*.tsb1)|*.tsb1|"};
+
+// Points from a file.
+inline constexpr Text xyzTitle{"Select XYZ Import File"};
+inline constexpr FileKind xyzFile{"xyz", "Xyz files (*.xyz) |*.xyz|All Files (*.*) |*.*||"};
+inline constexpr Text xyzImport{"Importing points"};
+inline constexpr Text illegalXyz{"Illegal XYZ file format."};
+
+}  // namespace gridbay::texts

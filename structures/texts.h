@@ -1,0 +1,11 @@
+#pragma once
+
+#include "core/string_table.h"
+
+namespace gridbay::texts {
+
+// Dikes.
+inline constexpr Text dikeName{"Dike %d"};
+inline constexpr Text crestLevelRequest{"Crest level"};
+
+}  // namespace gridbay::texts
