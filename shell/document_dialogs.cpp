@@ -129,9 +129,11 @@ bool DocumentTab::chooseFileWithForm(const FileQuestion& question, Form& panel, 
 // The user can do nothing meanwhile but stop the work, and sees so once it has taken a moment.
 void DocumentTab::doLongWork(std::string_view title, const std::function<void(const Progress&)>& work) {
   constexpr int kParts = 1000;
+  constexpr int kMoment = 500;  // milliseconds
   QProgressDialog dialog(QString::fromUtf8(title.data(), static_cast<qsizetype>(title.size())), tr("Cancel"),
                          0, kParts, this);
   dialog.setWindowModality(Qt::ApplicationModal);
+  dialog.setMinimumDuration(kMoment);
   dialog.setAutoClose(false);
   dialog.setAutoReset(false);
   dialog.setValue(0);
