@@ -5,6 +5,7 @@
 #include <memory>
 #include <stdexcept>
 #include <string>
+#include <utility>
 
 #include "core/kvs_base.h"
 
@@ -18,7 +19,8 @@ class ListChange {
 };
 
 // Owned items of one class, in the order of file and screen; an item's number is its place, from 1. An item
-// stays where it is in memory until it is removed.
+// stays where it is in memory until it is removed. One that holds much shares it with its copies, and says by
+// `bytesBeside(const Item* other)` how much it holds that the other one, or null, does not share.
 template <class Item>
 class ItemList {
  public:
@@ -53,6 +55,8 @@ class ItemList {
       if (initialise_ != nullptr) initialise_(*owner_, items_.back(), GetCount());
     }
   }
+  // Another item at the end, with none of the defaults that depend on its number: a load fills it.
+  Item& AppendPlain() { return items_.emplace_back(owner_); }
   // A default item before all others, which move on by one; and the first one's end.
   Item& InsertHead() {
     items_.emplace_front(owner_);
@@ -108,6 +112,7 @@ class ItemList {
     auto change = std::make_unique<Change>(head);
     for (std::size_t i = head; i < twinSize - tail; ++i) keep(change->before, twin.items_[i]);
     for (std::size_t i = head; i < size - tail; ++i) keep(change->after, items_[i]);
+    change->weigh();
     twin.apply(*change, true);
     return change;
   }
@@ -135,13 +140,21 @@ class ItemList {
  private:
   struct Change final : ListChange {
     explicit Change(std::size_t first) : head(first) {}
-    std::size_t bytes() const override {
-      return sizeof(*this) + (before.size() + after.size()) * sizeof(Item);
+    std::size_t bytes() const override { return weight; }
+    void weigh() {
+      weight = sizeof(*this) + (before.size() + after.size()) * sizeof(Item);
+      if constexpr (requires(const Item& item) { item.bytesBeside(&item); }) {
+        for (const auto& [held, other] : {std::pair(&before, &after), std::pair(&after, &before)}) {
+          for (std::size_t i = 0; i < held->size(); ++i)
+            weight += (*held)[i].bytesBeside(i < other->size() ? &(*other)[i] : nullptr);
+        }
+      }
     }
 
     std::size_t head;  // items before the first that differs
     std::deque<Item> before;
     std::deque<Item> after;
+    std::size_t weight = 0;
   };
 
   static bool sameItem(const Item& a, const Item& b) { return a.Item::SameState(b); }

@@ -267,4 +267,32 @@ constexpr RepeatedItemsRow<OwnList> repeatedItems(std::string_view countName, st
   return {{}, count(countName), sectionName};
 }
 
+// The rows of a list whose count is on file for others alone: the items of a load are found by their
+// sections, from 1 until a number has none. They have no defaults that depend on their numbers.
+template <class List>
+struct FoundCountRow : CountRow<List> {
+  void load(auto&, KvsSection, const std::string&) const {}
+};
+constexpr FoundCountRow<OwnList> foundCount(std::string_view name) {
+  return {{name, {}}};
+}
+
+template <class List>
+struct FoundItemsRow : ItemsRow<List> {
+  void load(auto& object, KvsSection section, const std::string& documentPath) const {
+    auto& items = this->list.of(object);
+    items.SetCount(0);
+    NumberedText name(this->sectionName);
+    for (int number = 1;; ++number) {
+      const KvsSection itemSection = kvsSectionByNameNum(section, name.of(number), 1);
+      if (itemSection == nullptr) break;
+      items.AppendPlain().Load(itemSection, documentPath);
+    }
+    this->list.setCount(object, items.GetCount());  // for those who follow
+  }
+};
+constexpr FoundItemsRow<OwnList> foundItems(std::string_view sectionName) {
+  return {{{}, {sectionName}, {}, {}}};
+}
+
 }  // namespace gridbay

@@ -13,6 +13,7 @@ enum class PageId : std::int32_t {
   boundary = 28,
   hdBoundary = 29,
   culverts = 30,
+  dikes = 31,
   eddyViscosity = 32,
   massBudget = 34,
   moduleSelection = 35,

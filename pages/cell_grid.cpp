@@ -39,9 +39,8 @@ Column& CellGrid::Button(std::string_view face, int width, std::function<void(Gr
 }
 
 // A text that still shows the number keeps all of its digits.
-Column& CellGrid::addNumber(std::string_view header, int width,
-                            std::function<std::optional<double>(GridRow)> get,
-                            std::function<bool(GridRow, double)> set, ByRow<int> quantity) {
+Column& CellGrid::Number(std::string_view header, int width, RealGetter get, RealSetter set,
+                         ByRow<int> quantity) {
   const auto style = [this, quantity](GridRow row) {
     return CVdEditStyle(document().units()).SetQunUnitBaseGroup(quantity(row));
   };

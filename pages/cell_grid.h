@@ -157,12 +157,11 @@ class CellGrid : public CV27SetupGridWnd {
   template <class Access>
   Column& Number(std::string_view header, int width, Access value, ByRow<int> quantity = 0) {
     using Real = ValueOf<Access>;
-    return addNumber(
-        header, width,
-        [value](GridRow row) -> std::optional<double> {
+    return Number(
+        header, width, RealGetter([value](GridRow row) -> std::optional<double> {
           const Real* held = pointerTo(value(row));
           return held == nullptr ? std::nullopt : std::optional(double{*held});
-        },
+        }),
         [value](GridRow row, double typed) {
           if (!(std::abs(typed) <= std::numeric_limits<Real>::max())) return false;
           *pointerTo(value(row)) = static_cast<Real>(typed);
@@ -175,6 +174,10 @@ class CellGrid : public CV27SetupGridWnd {
                  ByRow<int> quantity = 0) {
     return Number(header, width, through(object, member), std::move(quantity));
   }
+  // The same for a number that is worked out, in the base unit; false for one that is not taken.
+  using RealGetter = std::function<std::optional<double>(GridRow)>;
+  using RealSetter = std::function<bool(GridRow, double)>;
+  Column& Number(std::string_view header, int width, RealGetter get, RealSetter set, ByRow<int> quantity = 0);
 
   // An integer, "%d", read from the front of the text; read plainly, a text that is none is 0.
   template <class Access>
@@ -293,8 +296,6 @@ class CellGrid : public CV27SetupGridWnd {
     };
   }
 
-  Column& addNumber(std::string_view header, int width, std::function<std::optional<double>(GridRow)> get,
-                    std::function<bool(GridRow, double)> set, ByRow<int> quantity);
   Column& addInteger(std::string_view header, int width, Getter get, Setter set, bool plainly);
   Column& addText(std::string_view header, int width, std::function<std::string*(GridRow)> text);
   Column& addCheck(std::string_view header, int width, Getter get, Setter set);

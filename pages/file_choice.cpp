@@ -46,7 +46,7 @@ bool FileChoice::canView(GridRow row) const {
 }
 
 void FileChoice::view(GridRow row, CVdDoc& document) const {
-  if (canView(row)) document.host().openFile(document.getAbsoluteFilepath(file(row).name->absolute()));
+  if (canView(row)) document.host().openFile(document.getAbsoluteFilepath(file(row).name->absolute()), 0);
 }
 
 }  // namespace gridbay

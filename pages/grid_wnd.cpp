@@ -29,10 +29,10 @@ int CV27SetupGridWnd::StoreStyleRowCol(int row, int col, std::string_view text) 
   Stored stored = Stored::refused;
   const bool done = document().Attempt([&] {
     stored = storeCell(row, col, std::string(trimmed(text)));
-    if (stored != Stored::refused) UpdateDoc();
+    if (stored == Stored::taken || stored == Stored::partly) UpdateDoc();
   });
   host_->SetEditName({});
-  return done && stored == Stored::taken ? 1 : 0;
+  return done && (stored == Stored::taken || stored == Stored::same) ? 1 : 0;
 }
 
 void CV27SetupGridWnd::OnClickedButtonRowCol(int row, int col) {

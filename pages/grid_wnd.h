@@ -1,5 +1,6 @@
 #pragma once
 
+#include <optional>
 #include <set>
 #include <string>
 #include <string_view>
@@ -16,9 +17,9 @@ enum class CellKind { plain, button, dropDown, checkBox, resultFile, mapProjecti
 enum class CellAlign { left, right };
 // Keys that mean something to a cell.
 enum class GridKey { browse /* Ctrl+D */, other };
-// What has become of a text: the model has it; it is none, and the model is as it was; it is none, and yet a
-// part of it is in the model.
-enum class Stored { taken, refused, partly };
+// What has become of a text: the model has it; it is what the model had before; it is none, and the model is
+// as it was; it is none, and yet a part of it is in the model.
+enum class Stored { taken, same, refused, partly };
 
 // One cell as it is painted: its value and look, taken from the model each time.
 struct CellStyle {
@@ -75,6 +76,8 @@ class CV27SetupGridWnd {
   void SetEnabled(bool enabled) { enabled_ = enabled; }
   // The current cell has come to another row; 0 for none.
   virtual void OnCurrentRow(int) {}
+  // The row that the grid itself has as the current one, 0 for none; nothing where that is no concern of it.
+  virtual std::optional<int> CurrentRow() { return std::nullopt; }
 
   // Fills the cell's style; 1 when there is such a cell.
   virtual int GetStyleRowCol(int row, int col, CellStyle& style);

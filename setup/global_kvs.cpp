@@ -155,7 +155,7 @@ bool CGlobalKvs::KnowsSection(std::string_view path) {
       isOut = !holds(row.condition, *this);
     }
     if (row.what != FileRow::What::options || isOut) continue;
-    const std::string_view section = sectionsOf(place).back();
+    const std::string_view section = place.substr(place.rfind('/') + 1);
     const std::optional<std::string_view> rest = behind(path, section);
     if (rest && (rest->empty() || behind(*rest, kOptionParameters))) return true;
   }

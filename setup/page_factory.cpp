@@ -17,6 +17,7 @@
 #include "hydrodynamic/wave_radiation_page.h"
 #include "hydrodynamic/wind_conditions_page.h"
 #include "structures/culvert_page.h"
+#include "structures/dike_page.h"
 #include "structures/weir_page.h"
 
 namespace gridbay {
@@ -52,6 +53,7 @@ constexpr Entry kPages[] = {
     {"CResultDlg", make<CResultDlg>},
     {"CNHdWeirDlg", make<CNHdWeirDlg>},
     {"CNHdCulvertDlg", make<CNHdCulvertDlg>},
+    {"CNHdDikeDlg", make<CNHdDikeDlg>},
 };
 
 }  // namespace

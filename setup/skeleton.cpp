@@ -19,6 +19,7 @@
 #include "hydrodynamic/wave_radiation.h"
 #include "hydrodynamic/wind_conditions.h"
 #include "structures/culvert.h"
+#include "structures/dike.h"
 #include "structures/weir.h"
 
 namespace gridbay {
@@ -81,7 +82,8 @@ constexpr MemberRow kMembers[] = {
     member<&G::areaDescription>(),  member<&G::nhdBoundary>(),         member<&G::nhdSourceSink>(),
     member<&G::nhdInfiltration>(),  member<&G::windConditions>(),      member<&G::nhdEddyViscosity>(),
     member<&G::nhdWaveRadiation>(), member<&G::nhdSurfaceElevation>(), member<&G::nhdResistance>(),
-    member<&G::nhdWeir>(),          member<&G::nhdCulvert>(),          member<&G::nhdResult>(),
+    member<&G::nhdWeir>(),          member<&G::nhdCulvert>(),          member<&G::nhdDike>(),
+    member<&G::nhdResult>(),
 };
 
 constexpr void (*kStartingCounts[])(G&) = {
@@ -113,6 +115,7 @@ constexpr FileRow kSaving[] = {
     child<&G::nhdWeir>(),
     child<&G::nhdCulvert>(),
     in("HYDRODYNAMIC_MODULE/STRUCTURES"),
+    child<&G::nhdDike>(),
     in("HYDRODYNAMIC_MODULE"),
     child<&G::nhdResult>(),
 
@@ -166,6 +169,9 @@ constexpr FileRow kLoading[] = {
     child<&G::nhdWeir>(),
     child<&G::nhdCulvert>(),
 
+    in("HYDRODYNAMIC_MODULE/STRUCTURES"),
+    child<&G::nhdDike>(),
+
     in("HYDRODYNAMIC_MODULE"),
     child<&G::nhdResult>(),
 };
@@ -178,7 +184,7 @@ constexpr CheckRow kChecking[] = {
     check<&G::nhdWaveRadiation>(), check<&G::nhdSurfaceElevation>(),
     check<&G::nhdResistance>(),    check<&G::nhdBoundary>(),
     check<&G::nhdSourceSink>(),    check<&G::nhdInfiltration>(),
-    check<&G::nhdResult>(),
+    check<&G::nhdDike>(),          check<&G::nhdResult>(),
 };
 
 }  // namespace

@@ -4,8 +4,12 @@
 #include <QDialog>
 #include <QDialogButtonBox>
 #include <QFileDialog>
+#include <QFileInfo>
+#include <QGridLayout>
 #include <QInputDialog>
 #include <QMessageBox>
+#include <QProgressDialog>
+#include <QSettings>
 #include <QVBoxLayout>
 #include <algorithm>
 #include <iterator>
@@ -15,6 +19,8 @@
 
 namespace gridbay::shell {
 namespace {
+
+constexpr const char* kLastFileGroup = "files/";
 
 // "Grids (*.tsb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||" as the toolkit writes it.
 QString toolkitFilter(std::string_view filter) {
@@ -93,6 +99,48 @@ bool DocumentTab::chooseSaveFile(std::string_view filter, std::string_view exten
   if (dialog.exec() != QDialog::Accepted) return false;
   *name = dialog.selectedFiles().value(0).toStdString();
   return true;
+}
+
+// The toolkit's own dialog: into that of a desktop no controls can be put.
+bool DocumentTab::chooseFileWithForm(const FileQuestion& question, Form& panel, std::string* name) {
+  const auto text = [](std::string_view utf8) {
+    return QString::fromUtf8(utf8.data(), static_cast<qsizetype>(utf8.size()));
+  };
+  const QString key = kLastFileGroup + text(question.purpose);
+  const QString last = QSettings().value(key).toString();
+  QFileDialog dialog(this, text(question.title), QFileInfo(last).path(), toolkitFilter(question.filter));
+  dialog.setOption(QFileDialog::DontUseNativeDialog);
+  dialog.setFileMode(QFileDialog::ExistingFile);
+  dialog.setDefaultSuffix(text(question.extension));
+  if (QFileInfo::exists(last)) dialog.selectFile(last);
+  auto* pane = new PagePane(&dialog);
+  pane->showForm({}, panel);
+  pane->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Maximum);
+  if (auto* layout = qobject_cast<QGridLayout*>(dialog.layout()))
+    layout->addWidget(pane, layout->rowCount(), 0, 1, layout->columnCount());
+  if (dialog.exec() != QDialog::Accepted) return false;
+  pane->commit();
+  const QString chosen = dialog.selectedFiles().value(0);
+  QSettings().setValue(key, chosen);
+  *name = chosen.toStdString();
+  return true;
+}
+
+// The user can do nothing meanwhile but stop the work, and sees so once it has taken a moment.
+void DocumentTab::doLongWork(std::string_view title, const std::function<void(const Progress&)>& work) {
+  constexpr int kParts = 1000;
+  constexpr int kMoment = 500;  // milliseconds
+  QProgressDialog dialog(QString::fromUtf8(title.data(), static_cast<qsizetype>(title.size())), tr("Cancel"),
+                         0, kParts, this);
+  dialog.setWindowModality(Qt::ApplicationModal);
+  dialog.setMinimumDuration(kMoment);
+  dialog.setAutoClose(false);
+  dialog.setAutoReset(false);
+  dialog.setValue(0);
+  work([&dialog](double done) {
+    dialog.setValue(static_cast<int>(done * kParts));
+    return !dialog.wasCanceled();
+  });
 }
 
 // Picks the file, and an item for each request where the file has more than one; a file that does not meet

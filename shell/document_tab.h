@@ -19,7 +19,7 @@ namespace gridbay::shell {
 // What a document asks of the window that it is shown in.
 struct WindowServices {
   std::function<void(const EngineStart&)> startEngine;
-  std::function<void(const std::string&)> openFile;
+  std::function<void(const std::string& path, int item)> openFile;
 };
 
 // "1 fault"
@@ -93,7 +93,9 @@ class DocumentTab final : public QSplitter, public SetupHost {
   bool chooseFile(std::string_view filter, std::string_view extension, std::string* name) override;
   bool chooseSaveFile(std::string_view filter, std::string_view extension, std::string* name) override;
   bool editForm(std::string_view title, Form& form, const std::function<std::string()>& fault) override;
-  void openFile(const std::string& path) override { services_.openFile(path); }
+  bool chooseFileWithForm(const FileQuestion& question, Form& panel, std::string* name) override;
+  void doLongWork(std::string_view title, const std::function<void(const Progress&)>& work) override;
+  void openFile(const std::string& path, int item) override { services_.openFile(path, item); }
   void showMessages(const ValidationList& messages, unsigned faults) override;
   bool mayWriteOver(const std::string& path) override;
   void startEngine(const EngineStart& start) override { services_.startEngine(start); }

@@ -10,6 +10,7 @@
 #include <QToolTip>
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 #include "shell/cell_editors.h"
 #include "shell/shades.h"
@@ -87,12 +88,28 @@ void GridView::layOutGrid() {
   QStringList headers;
   for (int column = 0; column < model_->columnCount(); ++column)
     headers << model_->headerData(column, Qt::Horizontal, Qt::DisplayRole).toString();
-  if (headers != shownHeaders_ || (shownRows_ == 0 && model_->rowCount() > 0)) measureColumns();
+  bool isOther = headers != shownHeaders_;
+  for (int column = 0; column < headers.size() && !isOther; ++column)
+    isOther = isColumnHidden(column) == model_->grid().OnTrackColWidth(column + 1);
+  if (isOther || (shownRows_ == 0 && model_->rowCount() > 0)) measureColumns();
   layOutRows();
   fitSize();
+  followCurrentRow();
   const bool isEnabled = model_->grid().IsEnabled();
   const Qt::FocusPolicy policy = isEnabled ? Qt::StrongFocus : Qt::NoFocus;
   if (focusPolicy() != policy) setFocusPolicy(policy);
+}
+
+// Where the grid has another row as the current one, that is it, and nobody is told of it.
+void GridView::followCurrentRow() {
+  const std::optional<int> row = model_->grid().CurrentRow();
+  if (!row || *row == currentRow_ || *row > model_->rowCount()) return;
+  currentRow_ = *row;
+  const int column = std::max(currentIndex().column(), 0);
+  const bool outer = std::exchange(movingByKeys_, true);  // opens no editor
+  selectionModel()->setCurrentIndex(*row == 0 ? QModelIndex() : model_->index(*row - 1, column),
+                                    QItemSelectionModel::ClearAndSelect);
+  movingByKeys_ = outer;
 }
 
 // The width that a column wants: what it is told, and no less than its header's longest word and what stands

@@ -60,6 +60,7 @@ class GridView final : public QTableView {
   };
 
   void layOutGrid();
+  void followCurrentRow();
   void measureColumns();
   int measured(int column) const;
   bool isTextColumn(int column) const;

@@ -97,8 +97,9 @@ void MainWindow::tell(const QString& text) {
 }
 
 DocumentTab* MainWindow::newDocument(std::size_t library) {
-  WindowServices services{[this](const EngineStart& start) { startEngine(start); },
-                          [this](const std::string& path) { openFile(QString::fromStdString(path)); }};
+  WindowServices services{
+      [this](const EngineStart& start) { startEngine(start); },
+      [this](const std::string& path, int item) { openFile(QString::fromStdString(path), item); }};
   auto* tab =
       new DocumentTab([this, library](SetupHost& host) { return libraries_[library]->newDocument(host); },
                       std::move(services), this);
@@ -177,9 +178,10 @@ DataWindow* MainWindow::openData(const QString& path) {
   return window;
 }
 
-void MainWindow::openFile(const QString& path) {
+void MainWindow::openFile(const QString& path, int item) {
   if (DataWindow::isDataFile(path)) {
-    openData(path);
+    DataWindow* window = openData(path);
+    if (window != nullptr && item > 0) window->showItem(item);
   } else if (!QFileInfo::exists(path)) {
     tell(tr("There is no file %1.").arg(path));
   } else if (!QDesktopServices::openUrl(QUrl::fromLocalFile(path))) {

@@ -38,7 +38,7 @@ class MainWindow final : public QMainWindow {
   // Opens a data file in a window of its own; null when it can't be read, which is then said.
   DataWindow* openData(const QString& path);
   // A setup or a data file, by its extension; any other file by the program that the desktop has for it.
-  void openFile(const QString& path);
+  void openFile(const QString& path, int item = 0);
   bool saveDocument(const QString& path = {});
   // Offers the edits that a run which ended suddenly has left behind.
   void offerRecovery();

@@ -1,6 +1,7 @@
 #include "structures/structures_parts.h"
 
 #include "structures/culvert.h"
+#include "structures/dike.h"
 #include "structures/weir.h"
 
 namespace gridbay {

@@ -6,6 +6,7 @@ namespace gridbay {
 
 class CNhdWeirKvs;
 class CNhdCulvertKvs;
+class CNhdDikeKvs;
 
 // Weirs, culverts and dikes, as members of the root. None is ever null while the root lives.
 struct StructureParts {
@@ -14,6 +15,7 @@ struct StructureParts {
 
   std::unique_ptr<CNhdWeirKvs> nhdWeir;
   std::unique_ptr<CNhdCulvertKvs> nhdCulvert;
+  std::unique_ptr<CNhdDikeKvs> nhdDike;
 };
 
 }  // namespace gridbay

@@ -5,5 +5,8 @@
 namespace gridbay::texts {
 
 inline constexpr Text weirName{"Weir %d"};
+// Dikes.
+inline constexpr Text dikeName{"Dike %d"};
+inline constexpr Text crestLevelRequest{"Crest level"};
 
 }  // namespace gridbay::texts

@@ -46,6 +46,7 @@ inline constexpr int kManningNumber = 100030;
 inline constexpr int kChezyNumber = 100032;
 inline constexpr int kInfiltration = 100061;
 inline constexpr int kInfiltrationRate = 100062;
+inline constexpr int kElevation = 100069;
 inline constexpr int kPrecipitationRate = 100070;
 inline constexpr int kSurfaceElevation = 100078;
 inline constexpr int kBathymetry = 100079;
@@ -81,11 +82,13 @@ inline constexpr int kAirPressure = 100409;
 inline constexpr int kFlowRate = 100430;
 inline constexpr int kRainfallRate = 100431;
 inline constexpr int kEvaporationRate = 100432;
+inline constexpr int kLevelDifference = 100442;
 inline constexpr int kAtmosphericPressure = 100450;
 inline constexpr int kPorosity = 100456;
 inline constexpr int kSedimentGrainDiameter = 100461;
 inline constexpr int kSaturation = 100516;
 inline constexpr int kWaveHeightOverDepth = 110025;
+inline constexpr int kCrestLevel = 110033;
 inline constexpr int kLeakage = 110257;
 }  // namespace item
 

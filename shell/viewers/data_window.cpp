@@ -119,6 +119,13 @@ void DataWindow::showValues() {
   static_cast<SeriesPlot*>(plot_)->setItems(chosen);
 }
 
+void DataWindow::showItem(int item) {
+  if (item < 1 || item > static_cast<int>(file_.definition().items.size())) return;
+  if (items_ != nullptr) return items_->setCurrentIndex(item - 1);
+  for (int i = 0; i < curves_->count(); ++i)
+    curves_->item(i)->setCheckState(i == item - 1 ? Qt::Checked : Qt::Unchecked);
+}
+
 bool DataWindow::exportPng(const QString& path) {
   if (plot_->savePng(path, 0, 0, 2)) return true;
   showFailure(tr("The picture %1 could not be written.").arg(path));

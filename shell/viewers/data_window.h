@@ -24,6 +24,8 @@ class DataWindow final : public QMainWindow {
   QComboBox* items() { return items_; }
   QSlider* steps() { return steps_; }
   QListWidget* curves() { return curves_; }
+  // Shows an item, from 1, and no other; one that is not there changes nothing.
+  void showItem(int item);
   // Writes the picture; false when it can't be written, which is then said.
   bool exportPng(const QString& path);
 

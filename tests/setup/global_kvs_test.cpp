@@ -189,7 +189,11 @@ std::string newModelText(const std::string& selection, const std::string& advect
          "                number_of_Culverts 0\n"
          "            }\n"
          "        }\n"
-         "        STRUCTURES {}\n"
+         "        STRUCTURES {\n"
+         "            DIKES {\n"
+         "                number_of_dikes 0\n"
+         "            }\n"
+         "        }\n"
          "        OUTPUT_SPECIFICATION {\n"
          "            Number_Of_Output_areas 0\n"
          "            Generate_Hotstart #false\n"
@@ -426,6 +430,7 @@ TEST(GlobalKvs, ThePagesOfTheMessages) {
   EXPECT_EQ(static_cast<int>(PageId::bathymetry), 27);
   EXPECT_EQ(static_cast<int>(PageId::boundary), 28);
   EXPECT_EQ(static_cast<int>(PageId::hdBoundary), 29);
+  EXPECT_EQ(static_cast<int>(PageId::dikes), 31);
   EXPECT_EQ(static_cast<int>(PageId::eddyViscosity), 32);
   EXPECT_EQ(static_cast<int>(PageId::massBudget), 34);
   EXPECT_EQ(static_cast<int>(PageId::moduleSelection), 35);

@@ -6,6 +6,7 @@
 #include <QClipboard>
 #include <QComboBox>
 #include <QDialogButtonBox>
+#include <QElapsedTimer>
 #include <QFile>
 #include <QFileDialog>
 #include <QInputDialog>
@@ -13,6 +14,7 @@
 #include <QMessageBox>
 #include <QMimeData>
 #include <QProcess>
+#include <QProgressDialog>
 #include <QPushButton>
 #include <QRadioButton>
 #include <QSettings>
@@ -95,6 +97,28 @@ class DesktopTest : public DesktopFixture {
       if (auto* box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget()))
         box->button(button)->click();
     });
+  }
+
+  // Chooses the file in the next dialog, and the n-th unit of its last list; returns the name that it showed.
+  void importPoints(const QString& name, int unit, QString* shown = nullptr) {
+    QTimer::singleShot(0, qApp, [=, this] {
+      auto* files = qobject_cast<QFileDialog*>(QApplication::activeModalWidget());
+      QVERIFY(files != nullptr);
+      QCOMPARE(files->windowTitle(), QString("Select XYZ Import File"));
+      const auto lists = files->findChild<PagePane*>()->findChildren<QComboBox*>();
+      QCOMPARE(lists.size(), 2);
+      QVERIFY(lists[1]->isVisible());
+      lists[1]->setCurrentIndex(unit);
+      emit lists[1]->activated(unit);
+      auto* edit = files->findChild<QLineEdit*>();
+      if (shown != nullptr) *shown = edit->text();
+      edit->setText(file(name));
+      files->findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Open)->click();
+    });
+    auto* button =
+        qobject_cast<QAbstractButton*>(window_->currentDocument()->pane().widgetOf("Import from file..."));
+    QVERIFY(button != nullptr && button->isEnabled());
+    button->click();
   }
 
  private slots:
@@ -397,6 +421,87 @@ class DesktopTest : public DesktopFixture {
     const QString saved = textOf(file("s.v27"));
     QVERIFY2(saved.contains("(file)\"levels.tsb0\""), qPrintable(saved));
     QVERIFY2(saved.contains("Item_Numbers 3"), qPrintable(saved));
+  }
+
+  void dikesAndTheirPoints() {
+    PagePane& pane = window_->currentDocument()->pane();
+    QVERIFY(window_->currentDocument()->goToPage(31));
+    QLineEdit* count = edit("Number of dikes");
+    count->setText("3");
+    emit count->editingFinished();
+    const auto grids = pane.findChildren<GridView*>();
+    QCOMPARE(grids.size(), 2);
+    GridView& dikes = *grids[0];
+    GridView& points = *grids[1];
+    QCOMPARE(dikes.cells().rowCount(), 3);
+    QVERIFY(points.isColumnHidden(2));
+    dikes.setCurrentIndex(dikes.cells().index(1, 0));
+    QVERIFY(edit("Number of points")->isEnabled());
+    QVERIFY(dikes.cells().setData(dikes.cells().index(1, 5), "In space", Qt::EditRole));
+    QVERIFY(!points.isColumnHidden(2));
+
+    write("line.xyz", "480000 6100000 1000\n480010 6100010 2000 end\n");
+    constexpr int kMillimetre = 3;
+    importPoints("line.xyz", kMillimetre);
+    QCOMPARE(points.cells().rowCount(), 2);
+    QCOMPARE(points.cells().index(1, 2).data().toString(), QString("2.000000"));
+    QCOMPARE(edit("Number of points")->text(), QString("2"));
+    QString last;
+    importPoints("line.xyz", 0, &last);
+    QCOMPARE(last, QString("line.xyz"));
+    QCOMPARE(points.cells().rowCount(), 4);
+    QCOMPARE(points.cells().index(3, 2).data().toString(), QString("2000.000000"));
+    window_->currentDocument()->undo();
+    QCOMPARE(points.cells().rowCount(), 2);
+
+    count->setText("2");
+    emit count->editingFinished();
+    QVERIFY(!dikes.currentIndex().isValid());
+    QVERIFY(!edit("Number of points")->isEnabled());
+    QVERIFY(points.isColumnHidden(2));
+    QCOMPARE(points.cells().rowCount(), 0);
+    dikes.setCurrentIndex(dikes.cells().index(1, 0));
+    QCOMPARE(points.cells().rowCount(), 2);
+  }
+
+  void longWorkIsShownAndStopped() {
+    bool isStopped = false;
+    QTimer poll;
+    connect(&poll, &QTimer::timeout, qApp, [] {
+      auto* dialog = qobject_cast<QProgressDialog*>(QApplication::activeModalWidget());
+      if (dialog == nullptr) return;
+      QCOMPARE(dialog->labelText(), QString("Importing points"));
+      QCOMPARE(dialog->value(), 250);
+      dialog->findChild<QPushButton*>()->click();
+    });
+    poll.start(5);
+    window_->currentDocument()->doLongWork("Importing points", [&isStopped](const Progress& progress) {
+      QElapsedTimer time;
+      constexpr int kLimit = 20'000;
+      for (time.start(); !isStopped && time.elapsed() < kLimit;) isStopped = !progress(0.25);
+    });
+    QVERIFY(isStopped);
+    bool isDone = false;
+    window_->currentDocument()->doLongWork(
+        "Importing points", [&isDone](const Progress& progress) { isDone = progress(0.5) && progress(1); });
+    QVERIFY(isDone);
+    QVERIFY(QApplication::activeModalWidget() == nullptr);
+  }
+
+  void aViewerShowsTheItemThatIsAskedFor() {
+    TsbDefinition levels;
+    levels.time.count = 2;
+    levels.items = {{"north", item::kWaterLevel, "m"}, {"south", item::kWaterLevel, "m"}};
+    Result<TsbWriter> writer = TsbWriter::create(file("levels.tsb0").toStdString(), levels);
+    QVERIFY(writer && writer->commit());
+    window_->openFile(file("levels.tsb0"), 2);
+    auto* data = window_->findChild<DataWindow*>();
+    QVERIFY(data != nullptr);
+    QCOMPARE(data->curves()->item(0)->checkState(), Qt::Unchecked);
+    QCOMPARE(data->curves()->item(1)->checkState(), Qt::Checked);
+    data->showItem(3);
+    QCOMPARE(data->curves()->item(1)->checkState(), Qt::Checked);
+    QVERIFY(data->close());
   }
 
   void dataThatCannotBeShownIsNamed() {

@@ -188,6 +188,51 @@ class GridViewTest : public QObject {
     QCOMPARE(grid.currentRows.back(), 0);
   }
 
+  void theGridMaySayWhichRowIsCurrent() {
+    class Grid final : public FreeGrid {
+     public:
+      using FreeGrid::FreeGrid;
+      std::optional<int> CurrentRow() override { return current; }
+      void OnCurrentRow(int row) override { current = row; }
+      int current = 0;
+    };
+    Grid grid({{"A", 60, {.value = "1"}}}, 3);
+    const auto shown = show(grid);
+    click(2, 1);
+    QCOMPARE(grid.current, 2);
+    QVERIFY(editor() != nullptr);
+    grid.current = 0;
+    view_->cells().refresh();
+    QVERIFY(!view_->currentIndex().isValid());
+    QVERIFY(editor() == nullptr);
+    QCOMPARE(grid.current, 0);
+    click(2, 1);
+    QCOMPARE(grid.current, 2);
+    grid.current = 3;
+    view_->cells().refresh();
+    QCOMPARE(view_->currentIndex(), at(3, 1));
+    QCOMPARE(grid.current, 3);
+  }
+
+  void aColumnComesAndGoes() {
+    class Grid final : public FreeGrid {
+     public:
+      using FreeGrid::FreeGrid;
+      int GetColWidth(int col) override { return col == 2 ? width : FreeGrid::GetColWidth(col); }
+      int width = 0;
+    };
+    Grid grid({{"A", 60, {.value = "1"}}, {"B", 60, {.value = "2"}}}, 3);
+    const auto shown = show(grid);
+    QVERIFY(view_->isColumnHidden(1));
+    grid.width = 60;
+    view_->cells().refresh();
+    QVERIFY(!view_->isColumnHidden(1));
+    QVERIFY(view_->columnWidth(1) > 0);
+    grid.width = 0;
+    view_->cells().refresh();
+    QVERIFY(view_->isColumnHidden(1));
+  }
+
   void aRefreshLeavesCursorSelectionAndScroll() {
     FreeGrid grid({{"A", 60, {.value = "1", .readOnly = true}}, {"B", 60, {.value = "2"}}}, 100);
     const auto shown = show(grid, {400, 300});

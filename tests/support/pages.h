@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <functional>
+#include <map>
 #include <memory>
 #include <string>
 #include <vector>
@@ -44,7 +45,26 @@ class TestHost : public SetupHost {
     formFault = fault();
     return formFault.empty();
   }
-  void openFile(const std::string& path) override { opened.push_back(path); }
+  bool chooseFileWithForm(const FileQuestion& question, Form& panel, std::string* name) override {
+    titles.emplace_back(question.title);
+    filters.emplace_back(question.filter);
+    extensions.emplace_back(question.extension);
+    std::string& last = lastFiles[std::string(question.purpose)];
+    if (!chosenFile || (fillForm && !fillForm(panel))) return false;
+    *name = last = *chosenFile;
+    return true;
+  }
+  void doLongWork(std::string_view title, const std::function<void(const Progress&)>& work) override {
+    titles.emplace_back(title);
+    work([this](double done) {
+      progress.push_back(done);
+      return done < stopAt;
+    });
+  }
+  void openFile(const std::string& path, int item) override {
+    opened.push_back(path);
+    openedItems.push_back(item);
+  }
   void showMessages(const ValidationList& messages, unsigned faults) override {
     shown = messages;
     shownFaults = faults;
@@ -58,6 +78,10 @@ class TestHost : public SetupHost {
   std::vector<std::string> extensions;  // asked for by save dialogs
   std::vector<std::string> titles;
   std::vector<std::string> opened;
+  std::vector<int> openedItems;
+  std::map<std::string, std::string> lastFiles;  // by what they were chosen for
+  std::vector<double> progress;                  // of long work
+  double stopAt = 2;                             // how far it gets; all is done at 1
   ValidationList shown;
   unsigned shownFaults = 0;
   std::vector<EngineStart> starts;
