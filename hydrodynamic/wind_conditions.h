@@ -33,6 +33,13 @@ class CWindConditionsKvs final : public TableKvs<CWindConditionsKvs> {
   float speed2 = 24.0F;
   std::int32_t airPressureCorrection = 0;
 
+  // Set by its path it brings the items of the file, as it does on the page.
+  struct DataFormatRow : Keyword<CWindConditionsKvs, std::int32_t> {
+    void set(CWindConditionsKvs& wind, KvsSection from, const std::string& documentPath) const {
+      load(wind, from, documentPath);
+      wind.SetDataFormat(wind.dataFormat);
+    }
+  };
   // The wind file has as many items as the data format asks for; one that is not in use is kept as it is.
   struct WindFileRow {
     void save(const CWindConditionsKvs& wind, KvsFile& file, const std::string& documentPath) const {
@@ -50,16 +57,16 @@ class CWindConditionsKvs final : public TableKvs<CWindConditionsKvs> {
 
   static constexpr auto table() {
     using Self = CWindConditionsKvs;
-    return section("WIND_CONDITIONS", pinned(keyword("Data_Format", &Self::dataFormat), std::int32_t{kNone}),
-                   keyword("Constant_Wind_Direction", &Self::constantDirection),
-                   keyword("Constant_Wind_Speed", &Self::constantSpeed),
-                   keyword("Neutral_Pressure", &Self::neutralPressure),
-                   flag("IncludeAirPressureCorrections", &Self::airPressureCorrection), WindFileRow{},
-                   keyword("Type_Of_Wind_Friction", &Self::frictionType),
-                   keyword("Constant_Friction", &Self::constantFriction),
-                   keyword("Linear_Friction_1", &Self::friction1),
-                   keyword("Linear_Friction_2", &Self::friction2), keyword("Linear_Speed_1", &Self::speed1),
-                   keyword("Linear_Speed_2", &Self::speed2));
+    return section(
+        "WIND_CONDITIONS", pinned(DataFormatRow{{"Data_Format", &Self::dataFormat}}, std::int32_t{kNone}),
+        keyword("Constant_Wind_Direction", &Self::constantDirection),
+        keyword("Constant_Wind_Speed", &Self::constantSpeed),
+        keyword("Neutral_Pressure", &Self::neutralPressure),
+        flag("IncludeAirPressureCorrections", &Self::airPressureCorrection), WindFileRow{},
+        keyword("Type_Of_Wind_Friction", &Self::frictionType),
+        keyword("Constant_Friction", &Self::constantFriction), keyword("Linear_Friction_1", &Self::friction1),
+        keyword("Linear_Friction_2", &Self::friction2), keyword("Linear_Speed_1", &Self::speed1),
+        keyword("Linear_Speed_2", &Self::speed2));
   }
 
   // What the wind file must be; nothing for a data format without one.

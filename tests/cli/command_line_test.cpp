@@ -214,6 +214,18 @@ TEST_F(Tool, SetsEveryKindOfValue) {
   EXPECT_EQ(get(globals + "BATHYMETRY_SELECTION/Projection"), "UTM-32\n");
 }
 
+TEST_F(Tool, APathNeedsNoBlankAtTheEndOfAKeyword) {
+  makeSetup();
+  const std::string waves = "HYDRODYNAMIC_MODULE/WAVES/";
+  EXPECT_EQ(get(waves + "Type_Of_Wave_Height"), "0\n");
+  const ProgramRun run =
+      runTool({"set", setup, waves + "Type_Of_Wave_Height=1", waves + "type_of_wave_period =1"});
+  ASSERT_EQ(run.status, 0) << run.err;
+  EXPECT_EQ(get(waves + "Type_Of_Wave_Height "), "1\n");
+  EXPECT_EQ(get(waves + "Type_Of_Wave_Period"), "1\n");
+  EXPECT_THAT(textOf(setup), HasSubstr("\"Type_Of_Wave_Height \" 1\n"));
+}
+
 TEST_F(Tool, AHundredSettingsAreOneLoadAndOneSave) {
   makeSetup();
   std::vector<std::string> words{"set", setup, "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/Number_Of_Sources=100"};

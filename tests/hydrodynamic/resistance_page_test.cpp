@@ -76,6 +76,20 @@ TEST_F(ResistancePage, TheConstantStaysAsItIsTyped) {
   EXPECT_EQ(style(2, 2).toolTip, "Chezy number [m^½/s]");
 }
 
+TEST_F(ResistancePage, EditsAreTakenBack) {
+  store(2, 2, "40");
+  store(1, 6, "1");
+  choose("Resistance type:", 1);
+  document.Undo();
+  EXPECT_EQ(list().formulation, 0);
+  document.Undo();
+  EXPECT_FALSE(list().at(1).includePier);
+  document.Undo();
+  EXPECT_EQ(list().at(2).constantValue, 32.0F);
+  document.Redo();
+  EXPECT_EQ(list().at(2).constantValue, 40.0F);
+}
+
 TEST_F(ResistancePage, FilesAreChosen) {
   store(1, 1, "Data file");
   store(1, 6, "1");

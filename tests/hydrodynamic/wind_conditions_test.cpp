@@ -107,6 +107,16 @@ TEST_F(WindConditions, TheFileHasTheItemsOfItsFormat) {
   EXPECT_EQ(wind().windFile.items.size(), 3U);
 }
 
+TEST_F(WindConditions, AFormatThatIsSetByItsPathBringsTheItems) {
+  const std::string documentPath = "/case/setup.v27";
+  const KvsHandle given = test::fileOf("Data_Format 3");
+  PathAccess set{.what = PathAccess::What::set, .in = &given->tree().root(), .documentPath = &documentPath};
+  EXPECT_TRUE(wind().AccessPath("WIND_CONDITIONS/Data_Format", set));
+  EXPECT_EQ(set.isPinned, theEdition.wetlandSweepKit);
+  EXPECT_EQ(wind().dataFormat, theEdition.wetlandSweepKit ? 0 : 3);
+  if (!theEdition.wetlandSweepKit) EXPECT_EQ(wind().windFile.items, (Items{1, 2, 3}));
+}
+
 TEST_F(WindConditions, ANegativeSpeedIsToldWhateverTheFormat) {
   wind().constantSpeed = -1;
   for (const int deep : {0, 1}) {
