@@ -4,9 +4,11 @@
 #include <unistd.h>
 
 #include <QApplication>
+#include <QFile>
 #include <QProcess>
 #include <QScrollBar>
 #include <QTemporaryDir>
+#include <QTextStream>
 
 #include "platform/tsb/tsb_writer.h"
 #include "platform/units/units.h"
@@ -58,9 +60,9 @@ std::vector<std::unique_ptr<EditorLibrary>> libraries() {
 
 class Window {
  public:
-  Window() : window_(libraries()) {
+  explicit Window(const QString& setup = example().setup()) : window_(libraries()) {
     window_.show();
-    window_.openDocument(example().setup());
+    window_.openDocument(setup);
     QApplication::processEvents();
   }
   DocumentTab& tab() { return *window_.currentDocument(); }
@@ -120,6 +122,64 @@ void scrollGrid(benchmark::State& state) {
   }
 }
 
+// The page of 1,000 dikes, the first of them, which is selected, with 100,000 points.
+class DikePage {
+ public:
+  DikePage() : window_(makeSetup()) {
+    window_.tab().goToPage(31);
+    const QList<GridView*> grids = window_.tab().pane().findChildren<GridView*>();
+    grids[0]->setCurrentIndex(grids[0]->cells().index(0, 0));
+    points_ = grids[1];
+    QApplication::processEvents();
+    if (points_->cells().rowCount() != kPoints) qFatal("the points are not shown");
+  }
+  GridView& points() { return *points_; }
+
+ private:
+  static constexpr int kDikes = 1000;
+  static constexpr int kPoints = 100'000;
+
+  QString makeSetup() {
+    const QString path = folder_.filePath("dikes.v27");
+    QFile file(path);
+    if (!file.open(QFile::WriteOnly)) qFatal("the setup cannot be written");
+    QTextStream text(&file);
+    text << "VANE27_NESTED_MODEL {\nHYDRODYNAMIC_MODULE {\nSTRUCTURES {\nDIKES {\n";
+    for (int dike = 1; dike <= kDikes; ++dike) {
+      text << "DIKE_" << dike << " {\n";
+      for (int n = 1; dike == 1 && n <= kPoints; ++n)
+        text << "POINT_" << n << " {\nx " << n << ".25\ny " << n << ".5\n}\n";
+      text << "}\n";
+    }
+    text << "}\n}\n}\n}\n";
+    return path;
+  }
+
+  QTemporaryDir folder_;
+  Window window_;
+  GridView* points_ = nullptr;
+};
+
+void scrollPoints(benchmark::State& state) {
+  DikePage page;
+  QScrollBar* bar = page.points().verticalScrollBar();
+  for (auto _ : state) {
+    bar->setValue((bar->value() + 7919) % bar->maximum());
+    page.points().viewport()->repaint();
+  }
+}
+
+void editPoint(benchmark::State& state) {
+  DikePage page;
+  GridModel& cells = page.points().cells();
+  int value = 0;
+  for (auto _ : state) {
+    if (!cells.setData(cells.index(50'000, 0), QString::number(++value), Qt::EditRole))
+      state.SkipWithError("the edit was not taken");
+    QApplication::processEvents();
+  }
+}
+
 // A map of 10,000 x 10,000 points, from the file to the painted window.
 void openBigMap(benchmark::State& state) {
   constexpr std::size_t kPoints = 10000;
@@ -151,6 +211,8 @@ BENCHMARK(pageSwitch)->Unit(benchmark::kMillisecond);
 BENCHMARK(validate)->Unit(benchmark::kMillisecond);
 BENCHMARK(treeRules)->Unit(benchmark::kMicrosecond);
 BENCHMARK(scrollGrid)->Unit(benchmark::kMillisecond);
+BENCHMARK(scrollPoints)->Unit(benchmark::kMillisecond);
+BENCHMARK(editPoint)->Unit(benchmark::kMillisecond);
 
 }  // namespace
 }  // namespace gridbay::shell

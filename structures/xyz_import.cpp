@@ -17,8 +17,7 @@ bool isWhite(char c) {
 }
 
 bool isHexadecimal(std::string_view text) {
-  if (text.size() < 2 || text[0] != '0' || (text[1] | 0x20) != 'x') return false;
-  return true;
+  return text.size() >= 2 && text[0] == '0' && (text[1] | 0x20) == 'x';
 }
 
 // A hexadecimal number behind its "0x"; what is too large is infinite, what is too small is 0.

@@ -209,7 +209,6 @@ TEST_F(XyzImport, CanBeStopped) {
 // A gigabyte in which there is no line end, on disk only as its size: next to nothing of it is in memory.
 TEST_F(XyzImport, AHugeFileWithNoLinesTakesNoMemory) {
   const auto peak = [] {
-    std::ifstream("/proc/self/status");
     std::ifstream status("/proc/self/status");
     for (std::string word; status >> word;) {
       long kilobytes = 0;
