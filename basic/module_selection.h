@@ -38,11 +38,14 @@ class CModuleSelectionKvs final : public TableKvs<CModuleSelectionKvs> {
 
   void Load(KvsSection section, const std::string& documentPath) override;
 
+  // Whether the scheme can keep account of the masses in polygons.
+  bool schemeHasMassBudget() const { return adScheme == 1 || adScheme == -1; }
+
   // Whether the module is one of transport, with a scheme that has mass budgets.
   bool HasMassBudget() const {
     return (simulationType == module::kAdvectionDispersion ||
             simulationType == module::kMudTransportExpanded || simulationType == module::kEcological) &&
-           (adScheme == 1 || adScheme == -1);
+           schemeHasMassBudget();
   }
 
  private:

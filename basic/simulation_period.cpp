@@ -22,7 +22,7 @@ std::int32_t saturated(std::int64_t number) {
 
 void CSimulationPeriodKvs::StepsRow::save(const CSimulationPeriodKvs& period, KvsFile& file,
                                           const std::string&) const {
-  kvsPutParam(file, name, saturated(std::int64_t{period.noPointsInTime} - 1));
+  kvsPutParam(file, name, period.LastTimeStep());
 }
 
 void CSimulationPeriodKvs::StepsRow::load(CSimulationPeriodKvs& period, KvsSection from,
@@ -43,6 +43,10 @@ unsigned CSimulationPeriodKvs::Validate(ValidationList& messages, int) {
   if (warmUpPeriod < 0) faults += fault(texts::negativeWarmUp);
   if (warmUpPeriod > noPointsInTime && hotStart) faults += fault(texts::warmUpTooLong);
   return faults;
+}
+
+std::int32_t CSimulationPeriodKvs::LastTimeStep() const {
+  return saturated(std::int64_t{noPointsInTime} - 1);
 }
 
 DateTime CSimulationPeriodKvs::End() const {

@@ -40,6 +40,8 @@ class CSimulationPeriodKvs final : public TableKvs<CSimulationPeriodKvs> {
 
   unsigned Validate(ValidationList& messages, int deep) override;
 
+  // The number of the last time step; the first is 0.
+  std::int32_t LastTimeStep() const;
   // The moment of the last time step.
   DateTime End() const;
   // Requires of a data file that it covers the simulation.

@@ -33,6 +33,24 @@ class Example {
   }
   QString setup() const { return folder_.filePath("s.v27"); }
 
+  // A setup of advection-dispersion with 16 components in 9 areas, and deposition on.
+  QString manyComponents() const {
+    std::string text =
+        "VANE27_NESTED_MODEL {\nNESTED_MODEL_GLOBALS {\nMODULE_SELECTION { Simulation_Type 2 }\n"
+        "BATHYMETRY_SELECTION {\nNo_Of_Areas 9\n";
+    for (int area = 1; area <= 9; ++area) text += "AREA_" + std::to_string(area) + " {}\n";
+    text += "}\n}\nADVECTION_DISPERSION_MODULE {\nCOMPONENT_SPECIFICATIONS {\nNo_Of_Components 16\n";
+    for (int component = 1; component <= 16; ++component)
+      text += "COMPONENT_" + std::to_string(component) + " {}\n";
+    text +=
+        "}\nDEPOSITION_CONCENTRATIONS { IncludeSurfaceDeposition #true; IncludeSoilDeposition #true "
+        "}\n}\n}\n";
+    QFile file(folder_.filePath("components.v27"));
+    if (!file.open(QIODevice::WriteOnly) || file.write(text.data(), static_cast<qint64>(text.size())) < 0)
+      qFatal("the setup cannot be written");
+    return file.fileName();
+  }
+
  private:
   void run(const QString& program, const QStringList& arguments) {
     QProcess process;
@@ -92,6 +110,24 @@ void pageSwitch(benchmark::State& state) {
     window.tab().goToPage(pages[next++ % std::size(pages)]);
     QApplication::processEvents();
   }
+}
+
+// Two grids with a band for each component and a row for each area.
+void pageOfManyComponents(benchmark::State& state) {
+  constexpr int kDeposition = 13;
+  constexpr int kFloodAndDry = 26;
+  Window window(example().manyComponents());
+  for (auto _ : state) {
+    state.PauseTiming();
+    window.tab().goToPage(kFloodAndDry);
+    QApplication::processEvents();
+    state.ResumeTiming();
+    window.tab().goToPage(kDeposition);
+    QApplication::processEvents();
+  }
+  const auto* view = window.tab().pane().findChild<GridView*>();
+  if (view == nullptr || view->model()->rowCount() != 160)
+    state.SkipWithError("the page is not the one meant");
 }
 
 void validate(benchmark::State& state) {
@@ -208,6 +244,7 @@ void openBigMap(benchmark::State& state) {
 BENCHMARK(openBigMap)->Unit(benchmark::kMillisecond);
 BENCHMARK(firstWindow)->Unit(benchmark::kMillisecond)->UseRealTime();
 BENCHMARK(pageSwitch)->Unit(benchmark::kMillisecond);
+BENCHMARK(pageOfManyComponents)->Unit(benchmark::kMillisecond);
 BENCHMARK(validate)->Unit(benchmark::kMillisecond);
 BENCHMARK(treeRules)->Unit(benchmark::kMicrosecond);
 BENCHMARK(scrollGrid)->Unit(benchmark::kMillisecond);

@@ -10,6 +10,7 @@
 #include <fstream>
 #include <string>
 
+#include "benchmarks/no_host.h"
 #include "core/kdl_reader.h"
 #include "pages/grid_wnd.h"
 #include "setup/page_factory.h"
@@ -207,22 +208,6 @@ void longDikeEditWithHistory(benchmark::State& state) {
   }
 }
 BENCHMARK(longDikeEditWithHistory)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond);
-
-class NoHost final : public SetupHost {
- public:
-  void show(const std::string&) override {}
-  bool choose(CVdFileSelectorDlg&) override { return false; }
-  bool askYesNo(const std::string&) override { return false; }
-  bool chooseFile(std::string_view, std::string_view, std::string*) override { return false; }
-  bool chooseSaveFile(std::string_view, std::string_view, std::string*) override { return false; }
-  bool chooseFileWithForm(const FileQuestion&, Form&, std::string*) override { return false; }
-  void doLongWork(std::string_view, const std::function<void(const Progress&)>&) override {}
-  bool editForm(std::string_view, Form&, const std::function<std::string()>&) override { return false; }
-  void openFile(const std::string&, int) override {}
-  void showMessages(const ValidationList&, unsigned) override {}
-  void startEngine(const EngineStart&) override {}
-  bool isShiftHeld() override { return false; }
-};
 
 // The page of 1,000 dikes, the first of them with 100,000 points and selected.
 class DikePage {

@@ -5,6 +5,7 @@
 
 #include <filesystem>
 
+#include "benchmarks/no_host.h"
 #include "core/kdl_reader.h"
 #include "pages/form_view.h"
 #include "pages/grid_wnd.h"
@@ -84,20 +85,6 @@ void validateStructures(benchmark::State& state) {
   }
 }
 
-class SilentHost final : public SetupHost {
- public:
-  void show(const std::string&) override {}
-  bool askYesNo(const std::string&) override { return false; }
-  bool choose(CVdFileSelectorDlg&) override { return false; }
-  bool chooseFile(std::string_view, std::string_view, std::string*) override { return false; }
-  bool chooseSaveFile(std::string_view, std::string_view, std::string*) override { return false; }
-  bool editForm(std::string_view, Form&, const std::function<std::string()>&) override { return false; }
-  void openFile(const std::string&) override {}
-  void showMessages(const ValidationList&, unsigned) override {}
-  void startEngine(const EngineStart&) override {}
-  bool isShiftHeld() override { return false; }
-};
-
 class OpenPage {
  public:
   explicit OpenPage(std::string_view pageClass) {
@@ -113,7 +100,7 @@ class OpenPage {
   std::span<CV27SetupGridWnd* const> grids() const { return grids_; }
 
  private:
-  SilentHost host_;
+  NoHost host_;
   CV27SetupDoc document_{host_};
   std::unique_ptr<CV27SetupFormView> page_;
   std::vector<CV27SetupGridWnd*> grids_;

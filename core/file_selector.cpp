@@ -216,6 +216,7 @@ std::string CVdFileSelectorDlg::timeFault(const TsbTimeAxis& time) const {
 // A relative axis counts from the start of the simulation; one that is not of time has no period.
 std::string CVdFileSelectorDlg::periodFault(const TsbTimeAxis& time) const {
   if (!periodStart_ || !periodEnd_ || !periodStart_->valid() || !periodEnd_->valid()) return {};
+  if (oneStepAllowed_ && time.count == 1) return {};
   const CVdUnitConverter toDays(time.unit, "d");
   if (!toDays.IsValid() && !time.isCalendar()) return {};
   if (!toDays.IsValid()) return fmt::format("The unit \"{}\" of the time axis is no unit of time", time.unit);

@@ -98,6 +98,8 @@ class CVdFileSelectorDlg {
   void SetTimeAxisType(int type) { timeAxisType_ = type; }
   void SetTimeAxisQunUnitEquivalentWith(int unitCode) { timeAxisUnit_ = unitCode; }
   void SetRequestPeriod(const DateTime& start, const DateTime& end);
+  // A file with one time step, which holds throughout, need not cover that period.
+  void AllowOneTimeStep() { oneStepAllowed_ = true; }
   // The file must be one that the engine takes as it is: lengths in metres, values in base units.
   void SetVane27Compliant() { compliant_ = true; }
   void EnablePlugin(int flag) { pluginEnabled_ = flag != 0; }
@@ -147,6 +149,7 @@ class CVdFileSelectorDlg {
   std::optional<int> timeAxisUnit_;
   std::optional<DateTime> periodStart_;
   std::optional<DateTime> periodEnd_;
+  bool oneStepAllowed_ = false;
   bool compliant_ = false;
   bool pluginEnabled_ = true;
   FileChooser* chooser_ = nullptr;

@@ -107,7 +107,7 @@ constexpr FlagRow<Object> flag(std::string_view name, std::int32_t Object::*memb
 template <class Object>
 struct SelectionRow {
   UTsbSelection Object::*member;
-  int noItems;
+  std::optional<int> noItems;
 
   void save(const Object& object, KvsFile& file, const std::string& documentPath) const {
     (object.*member).Save(file, documentPath);
@@ -128,6 +128,12 @@ constexpr SelectionRow<Object> selection(UTsbSelection Object::*member, int noIt
   return {member, noItems};
 }
 
+// It takes as many items as the file gives.
+template <class Object>
+constexpr SelectionRow<Object> selection(UTsbSelection Object::*member) {
+  return {member, std::nullopt};
+}
+
 // First, last and interval along X and along Y, three numbers for each.
 template <class Object>
 struct SubAreaRow {
@@ -135,19 +141,13 @@ struct SubAreaRow {
   std::string_view yName;
   USubArea Object::*member;
 
-  static void put(KvsFile& file, std::string_view name, const USubLine& line) {
-    kvsPutListParam(file, name, "iii", line.first, line.last, line.interval);
+  void save(const Object& object, KvsFile& file, const std::string& documentPath) const {
+    putValue(file, xName, (object.*member).x, documentPath);
+    putValue(file, yName, (object.*member).y, documentPath);
   }
-  static void get(KvsSection from, std::string_view name, USubLine& line) {
-    kvsGetListParam(from, name, 1, "iii", &line.first, &line.last, &line.interval);
-  }
-  void save(const Object& object, KvsFile& file, const std::string&) const {
-    put(file, xName, (object.*member).x);
-    put(file, yName, (object.*member).y);
-  }
-  void load(Object& object, KvsSection from, const std::string&) const {
-    get(from, xName, (object.*member).x);
-    get(from, yName, (object.*member).y);
+  void load(Object& object, KvsSection from, const std::string& documentPath) const {
+    getValue(from, xName, (object.*member).x, documentPath);
+    getValue(from, yName, (object.*member).y, documentPath);
   }
   void copy(Object& object, const Object& other) const { (object.*member).UpdateData(other.*member); }
   constexpr auto members() const { return std::tuple(member); }
@@ -155,8 +155,10 @@ struct SubAreaRow {
     const bool isX = sameName(path, xName);
     if (!isX && !sameName(path, yName)) return false;
     USubLine& line = isX ? (object.*member).x : (object.*member).y;
-    if (access.what == PathAccess::What::write) put(*access.out, isX ? xName : yName, line);
-    if (access.what == PathAccess::What::set) get(access.in, isX ? xName : yName, line);
+    if (access.what == PathAccess::What::write)
+      putValue(*access.out, isX ? xName : yName, line, *access.documentPath);
+    if (access.what == PathAccess::What::set)
+      getValue(access.in, isX ? xName : yName, line, *access.documentPath);
     return true;
   }
 };

@@ -9,6 +9,7 @@
 #include "core/file_name.h"
 #include "core/grid_point.h"
 #include "core/kvs.h"
+#include "core/selections.h"
 
 // How the types of members stand on file, as the values of one keyword.
 
@@ -22,6 +23,10 @@ inline void putValue(KvsFile& file, std::string_view name, const std::string& va
 }
 inline void putValue(KvsFile& file, std::string_view name, const GridPoint& value, const std::string&) {
   kvsPutListParam(file, name, "ii", value.j, value.k);
+}
+// A range is first, last and interval.
+inline void putValue(KvsFile& file, std::string_view name, const USubLine& value, const std::string&) {
+  kvsPutListParam(file, name, "iii", value.first, value.last, value.interval);
 }
 inline void putValue(KvsFile& file, std::string_view name, const DateTime& value, const std::string&) {
   const auto [year, month, day, hour, minute, second] =
@@ -63,6 +68,9 @@ inline void getValue(KvsSection from, std::string_view name, auto& value, const 
 }
 inline void getValue(KvsSection from, std::string_view name, GridPoint& value, const std::string&) {
   kvsGetListParam(from, name, 1, "ii", &value.j, &value.k);
+}
+inline void getValue(KvsSection from, std::string_view name, USubLine& value, const std::string&) {
+  kvsGetListParam(from, name, 1, "iii", &value.first, &value.last, &value.interval);
 }
 inline void getValue(KvsSection from, std::string_view name, DateTime& value, const std::string&) {
   if (kvsKeywordByNameNum(from, name, 1) == nullptr) return;

@@ -8,6 +8,23 @@ namespace gridbay {
 // the tree's rules and the messages.
 enum class PageId : std::int32_t {
   none = 0,
+  adBoundary = 9,
+  adBoxSummation = 10,
+  adComponent = 11,
+  adDecaySpecification = 12,
+  adDepositionConcentration = 13,
+  adDispersionCoef = 14,
+  adEvaporation = 15,
+  adFeedback = 16,
+  adHeatDissipation = 17,
+  adHeatExchange = 18,
+  adInitialConcentration = 19,
+  adLineDischarge = 20,
+  adMassBudget = 21,
+  adPrecipitation = 22,
+  adResult = 23,
+  adSourceSink = 24,
+  adStartingConditions = 25,
   floodAndDry = 26,
   bathymetry = 27,
   boundary = 28,
@@ -28,6 +45,7 @@ enum class PageId : std::int32_t {
   windConditions = 46,
   waves = 142,
   infiltration = 143,
+  adInfiltration = 145,
 };
 
 }  // namespace gridbay

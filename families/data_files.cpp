@@ -1,8 +1,16 @@
 #include "families/data_files.h"
 
+#include <algorithm>
+#include <cstdlib>
+
 #include "basic/simulation_period.h"
 
 namespace gridbay {
+namespace {
+
+constexpr int kNotAlongAnAxis = -1;
+
+}  // namespace
 
 void requestSimulationPeriod(CVdFileSelectorDlg& selector, CKvsBase& object) {
   if (auto* basic = object.parts<BasicParts>(); basic != nullptr)
@@ -16,6 +24,39 @@ void requestMap(CVdFileSelectorDlg& selector, CKvsBase& object, int number, cons
   request.SetMultiQunType(std::move(itemTypes));
   requestArea(request, object, number);
   requestForEngine(selector);
+}
+
+void requestVaryingMap(CVdFileSelectorDlg& selector, CKvsBase& object, int number, const Text& description,
+                       int itemType) {
+  CVdRqTsbItem& request = selector.AddRequest();
+  request.SetSelectionDescr(description.format);
+  request.SetQunType(itemType);
+  requestArea(request, object, number);
+  requestSimulationPeriod(selector, object);
+  selector.AllowOneTimeStep();
+  requestForEngine(selector);
+}
+
+void requestTimeSeries(CVdFileSelectorDlg& selector, CKvsBase& object, const Text& description,
+                       int itemType) {
+  CVdRqTsbItem& request = selector.AddRequest();
+  request.SetSelectionDescr(description.format);
+  request.SetQunType(itemType);
+  request.SetDimensions(0);
+  requestSimulationPeriod(selector, object);
+  requestForEngine(selector);
+}
+
+int pointsAlong(const CBoundaryObjectKvs& boundary) {
+  if (boundary.first.j == boundary.last.j) return boundary.last.k - boundary.first.k + 1;
+  return boundary.first.k == boundary.last.k ? boundary.last.j - boundary.first.j + 1 : kNotAlongAnAxis;
+}
+
+int pointsByExtent(const CBoundaryObjectKvs& boundary) {
+  if (boundary.first.j != boundary.last.j && boundary.first.k != boundary.last.k) return kNotAlongAnAxis;
+  return std::max(std::abs(boundary.last.j - boundary.first.j),
+                  std::abs(boundary.last.k - boundary.first.k)) +
+         1;
 }
 
 void requestForEngine(CVdFileSelectorDlg& selector) {

@@ -5,6 +5,7 @@
 
 #include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
+#include "basic/boundary.h"
 #include "core/file_selector.h"
 #include "core/kvs_base.h"
 #include "core/message.h"
@@ -33,6 +34,29 @@ void requestArea(auto& request, CKvsBase& object, int number) {
 // The request for the map of area `number`: one item, of one of the quantities.
 void requestMap(CVdFileSelectorDlg& selector, CKvsBase& object, int number, const Text& description,
                 std::vector<int> itemTypes);
+// The request for the map of area `number`: one item, of one quantity. A map that varies covers the
+// simulation, one of a single time step holds throughout.
+void requestVaryingMap(CVdFileSelectorDlg& selector, CKvsBase& object, int number, const Text& description,
+                       int itemType);
+// Requires of a file that it is a time series of one quantity, and covers the simulation.
+void requestTimeSeries(CVdFileSelectorDlg& selector, CKvsBase& object, const Text& description, int itemType);
+
+// Points on a boundary, both ends counted: last minus first and one, or by the greater extent of the two;
+// -1 for a diagonal.
+int pointsAlong(const CBoundaryObjectKvs& boundary);
+int pointsByExtent(const CBoundaryObjectKvs& boundary);
+
+// Requires of a profile that it lies along a boundary, which may be null, with so many points. The request is
+// a CVdRqTsbItem or a CVdFileSelectorDlg.
+void requestAlongBoundary(auto& request, CBoundaryObjectKvs* boundary,
+                          int (*points)(const CBoundaryObjectKvs&)) {
+  constexpr int kNone = -1;
+  request.SetDimensions(1);
+  request.SetNoPoints(1, boundary == nullptr ? kNone : points(*boundary));
+  // 0 stands for a grid that has not been read: then any spacing may be right.
+  const float spacing = boundary == nullptr ? kNone : boundary->CellSpacing();
+  if (spacing != 0) request.SetInterval(1, spacing);
+}
 
 // The last word of nearly all requests: no plug-ins, and a file that the engine takes as it is.
 void requestForEngine(CVdFileSelectorDlg& selector);

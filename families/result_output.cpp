@@ -63,7 +63,7 @@ unsigned checkResultPart(ValidationList& messages, PageId page, const ResultLimi
   for (const USubLine& line : {part.x, part.y}) check(line.first > line.last, texts::firstPointBehindLast);
   check(steps.first < 0, texts::firstTimeStepNegative);
   check(steps.interval < 1, texts::timeStepIntervalTooSmall);
-  check(steps.first > steps.last, texts::firstTimeStepBehindLast);
+  check(steps.first > steps.last, texts::firstTimeStepAfterLast);
   check(steps.last > limits.lastStep, texts::lastTimeStepOutOfRange);
   check(!fitsExtent(file.text(), extentOf(part)), texts::wrongDimensionOfFile);
   return faults;

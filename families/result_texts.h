@@ -1,6 +1,7 @@
 #pragma once
 
 #include "core/string_table.h"
+#include "families/texts.h"
 #include "pages/file_choice.h"
 
 namespace gridbay::texts {
@@ -11,10 +12,7 @@ inline constexpr Text associatedAreaMissing{"Assostiated area is does not exist"
 inline constexpr Text gridPointOutOfRange{"Grid point out of range"};
 inline constexpr Text intervalTooSmall{"Intervals must be greater or equal to 1"};
 inline constexpr Text firstPointBehindLast{"The first point is greater than the last"};
-inline constexpr Text firstTimeStepNegative{"First time step can not be negative"};
 inline constexpr Text timeStepIntervalTooSmall{"Time step interval must be greater or equal to 1"};
-inline constexpr Text firstTimeStepBehindLast{"The first time step is greater than the last"};
-inline constexpr Text lastTimeStepOutOfRange{"Last timestep out of range"};
 inline constexpr Text wrongDimensionOfFile{"Wrong dimension of output file"};
 
 // Pages of outputs.

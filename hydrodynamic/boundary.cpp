@@ -18,7 +18,6 @@ constexpr std::int32_t kFabTransfer = 2;
 constexpr std::int32_t kFabDefault = 12;
 constexpr int kTransferDataType = 1;
 constexpr int kRatingCurveAxis = 2;
-constexpr int kNotAlongAnAxis = -1;
 
 // The quantities that a data file may have.
 std::vector<int> itemTypes(std::int32_t formulation, std::int32_t dataFormat) {
@@ -27,12 +26,6 @@ std::vector<int> itemTypes(std::int32_t formulation, std::int32_t dataFormat) {
     return {item::kWaterLevel, item::kSurfaceElevation};
   if (dataFormat == CNhdBoundaryObjectKvs::kType1File) return {item::kFlowFlux};
   return {item::kDischarge, item::kFlowRate};
-}
-
-// Points on a boundary, both ends counted; -1 for a diagonal.
-int pointsAlong(const CBoundaryObjectKvs& line) {
-  if (line.first.j == line.last.j) return line.last.k - line.first.k + 1;
-  return line.first.k == line.last.k ? line.last.j - line.first.j + 1 : kNotAlongAnAxis;
 }
 
 bool isWithin(std::int32_t value, std::int32_t end, std::int32_t otherEnd) {
@@ -107,19 +100,9 @@ int CNhdBoundaryObjectKvs::dataQuantity() const {
   return dataFormat == kRatingCurve ? item::kUndefined : item::kFlowFlux;
 }
 
-const CBoundaryObjectKvs* CNhdBoundaryObjectKvs::boundary(int number) {
+CBoundaryObjectKvs* CNhdBoundaryObjectKvs::boundary(int number) {
   auto* basic = parts<BasicParts>();
   return basic == nullptr ? nullptr : basic->boundary->GetItem(number);
-}
-
-void CNhdBoundaryObjectKvs::requestAlongBoundary(CVdRqTsbItem& request, int number) {
-  auto* basic = parts<BasicParts>();
-  CBoundaryObjectKvs* line = basic == nullptr ? nullptr : basic->boundary->GetItem(number);
-  request.SetDimensions(1);
-  request.SetNoPoints(1, line == nullptr ? kNotAlongAnAxis : pointsAlong(*line));
-  // 0 stands for a grid that has not been read: then any spacing may be right.
-  const float spacing = line == nullptr ? kNotAlongAnAxis : line->CellSpacing();
-  if (spacing != 0) request.SetInterval(1, spacing);
 }
 
 void CNhdBoundaryObjectKvs::finishRequest(CVdFileSelectorDlg& selector) {
@@ -139,10 +122,10 @@ void CNhdBoundaryObjectKvs::RequestDataFile(CVdFileSelectorDlg& selector, int nu
       request.SetDimensions(0);
       break;
     case kType1File:
-      requestAlongBoundary(request, number);
+      requestAlongBoundary(request, boundary(number), pointsAlong);
       break;
     case kTransferFile:
-      requestAlongBoundary(request, number);
+      requestAlongBoundary(request, boundary(number), pointsAlong);
       selector.SetDataType(kTransferDataType);
       break;
     default:
@@ -158,7 +141,7 @@ void CNhdBoundaryObjectKvs::RequestDirectionFile(CVdFileSelectorDlg& selector, i
   CVdRqTsbItem& request = selector.AddRequest();
   request.SetSelectionDescr(texts::flowDirectionRequest.format);
   request.SetQunType(item::kFlowDirection, 0);
-  requestAlongBoundary(request, number);
+  requestAlongBoundary(request, boundary(number), pointsAlong);
   finishRequest(selector);
 }
 

@@ -89,8 +89,7 @@ class CNhdBoundaryObjectKvs final : public TableKvs<CNhdBoundaryObjectKvs> {
   void RequestDirectionFile(CVdFileSelectorDlg& selector, int number);
 
  private:
-  const CBoundaryObjectKvs* boundary(int number);
-  void requestAlongBoundary(CVdRqTsbItem& request, int number);
+  CBoundaryObjectKvs* boundary(int number);
   void finishRequest(CVdFileSelectorDlg& selector);
 };
 

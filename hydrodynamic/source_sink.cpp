@@ -1,20 +1,11 @@
 #include "hydrodynamic/source_sink.h"
 
-#include <algorithm>
-#include <array>
-
 #include "basic/basic_parts.h"
 #include "basic/source_sink.h"
 #include "families/data_files.h"
 #include "platform/units/units.h"
 
 namespace gridbay {
-namespace {
-
-// The kinds by their numbers on file.
-constexpr std::array<std::int32_t, 3> kKindsOnFile{-1, 0, 2};
-
-}  // namespace
 
 int CNhdSourceSinkObjectKvs::NoItems(int number) {
   auto* basic = parts<BasicParts>();
@@ -48,20 +39,6 @@ unsigned CNhdSourceSinkObjectKvs::Validate(ValidationList& messages, int, int nu
   RequestDataFile(selector, number);
   dataFile.items = selector.GetSelectedItems();
   return checkDataFile(messages, PageId::hdSourceAndSink, selector, dataFile);
-}
-
-void CNhdSourceSinkKvs::KindRow::save(const CNhdSourceSinkKvs& object, KvsFile& file,
-                                      const std::string&) const {
-  const auto kind = static_cast<std::size_t>(object.*member);
-  if (kind < kKindsOnFile.size()) kvsPutParam(file, name, kKindsOnFile[kind]);
-}
-
-void CNhdSourceSinkKvs::KindRow::load(CNhdSourceSinkKvs& object, KvsSection from, const std::string&) const {
-  if (kvsKeywordByNameNum(from, name, 1) == nullptr) return;
-  std::int32_t onFile = 0;
-  kvsGetParam(from, name, &onFile, 1, 1);
-  const auto found = std::ranges::find(kKindsOnFile, onFile);
-  if (found != kKindsOnFile.end()) object.*member = static_cast<std::int32_t>(found - kKindsOnFile.begin());
 }
 
 void CNhdSourceSinkKvs::requestKind(CVdFileSelectorDlg& selector, CVdRqTsbItem& request, std::int32_t kind) {

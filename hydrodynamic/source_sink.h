@@ -6,6 +6,7 @@
 #include "core/file_selector.h"
 #include "core/list_kvs.h"
 #include "core/selections.h"
+#include "families/kind_row.h"
 #include "hydrodynamic/texts.h"
 
 namespace gridbay {
@@ -64,28 +65,14 @@ class CNhdSourceSinkKvs final : public ListKvs<CNhdSourceSinkKvs, CNhdSourceSink
   bool netPrecipitation = false;  // the precipitation has the evaporation in it already
   bool rainOnDryLand = true;
 
-  // A constant is -1 on file, a time series 0 and a map 2. Another kind is not written, and another number
-  // not taken.
-  struct KindRow {
-    std::string_view name;
-    std::int32_t CNhdSourceSinkKvs::*member;
-
-    void save(const CNhdSourceSinkKvs& object, KvsFile& file, const std::string& documentPath) const;
-    void load(CNhdSourceSinkKvs& object, KvsSection from, const std::string& documentPath) const;
-    void copy(CNhdSourceSinkKvs& object, const CNhdSourceSinkKvs& other) const {
-      object.*member = other.*member;
-    }
-    constexpr auto members() const { return std::tuple(member); }
-  };
-
   // The sections of the two files have the names of the constants before them.
   static constexpr auto table() {
     using Self = CNhdSourceSinkKvs;
-    return section("SOURCE_AND_SINK", notCopied(KindRow{"EvaporationType", &Self::evaporationKind}),
+    return section("SOURCE_AND_SINK", notCopied(kindRow("EvaporationType", &Self::evaporationKind)),
                    keyword("Evaporation", &Self::evaporation),
                    notCopied(section("Evaporation", selection(&Self::evaporationFile, 1))),
                    notCopied(keyword("NetPrecipitation", &Self::netPrecipitation)),
-                   notCopied(KindRow{"PrecipitationType", &Self::precipitationKind}),
+                   notCopied(kindRow("PrecipitationType", &Self::precipitationKind)),
                    keyword("Precipitation", &Self::precipitation),
                    notCopied(section("Precipitation", selection(&Self::precipitationFile, 1))),
                    items("SOURCE_SINK_%d", texts::hdSourceSectionMissing),

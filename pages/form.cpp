@@ -294,6 +294,23 @@ Control& Form::List(std::string_view label, Choices choices, Binding<std::int32_
   return addIndexed(ControlKind::dropDown, label, std::move(choices), std::move(value));
 }
 
+Control& Form::List(std::string_view label, std::function<Choices()> choices, Binding<std::int32_t> value) {
+  std::int32_t& place = own<std::int32_t>();
+  Control& control = add(ControlKind::dropDown, label, &place);
+  control.load = [&control, &place, choices, get = std::move(value.get)] {
+    const std::optional<std::int32_t> held = get();
+    const Choices offered = held ? choices() : Choices();
+    control.absent = !held;
+    control.choices = offered.texts();
+    place = offered.placeOf(held.value_or(0));
+  };
+  control.save = [&control, &place, choices, set = std::move(value.set)] {
+    const std::optional<std::int32_t> chosen = control.absent ? std::nullopt : choices().valueAt(place);
+    if (chosen) set(*chosen);
+  };
+  return control;
+}
+
 Control& Form::TextList(std::string_view label, std::function<std::vector<std::string>()> choices,
                         Binding<std::string> value) {
   std::int32_t& place = own<std::int32_t>();

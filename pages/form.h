@@ -173,6 +173,8 @@ class Form {
                  std::int32_t off = 0);
   Control& Radio(std::string_view label, Choices choices, Binding<std::int32_t> value);
   Control& List(std::string_view label, Choices choices, Binding<std::int32_t> value);
+  // A list whose choices follow the model.
+  Control& List(std::string_view label, std::function<Choices()> choices, Binding<std::int32_t> value);
   // A list of texts that follows the model; what is stored is the text.
   Control& TextList(std::string_view label, std::function<std::vector<std::string>()> choices,
                     Binding<std::string> value);

@@ -1,5 +1,6 @@
 #include <array>
 
+#include "advection_dispersion/result.h"
 #include "basic/module_selection.h"
 #include "setup/global_kvs.h"
 
@@ -12,7 +13,14 @@ struct OutputRow {
   ModuleOutput (*output)(CGlobalKvs& root);
 };
 
-constexpr std::array<OutputRow, 0> kOutputs{};
+template <auto results>
+ModuleOutput outputOf(CGlobalKvs& root) {
+  return {(root.*results)->OutputSizeMB(), (root.*results)->hotStartItems()};
+}
+
+constexpr std::array kOutputs{
+    OutputRow{module::kAdvectionDispersion, outputOf<&CGlobalKvs::nadResult>},
+};
 
 }  // namespace
 

@@ -4,6 +4,8 @@
 #include <array>
 #include <initializer_list>
 
+#include "advection_dispersion/component.h"
+#include "advection_dispersion/starting_conditions.h"
 #include "basic/bathymetry.h"
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
@@ -219,12 +221,29 @@ void rule4Evaporation(CNavigationView& tree, CGlobalKvs& model) {
   showAll(tree, model.nhdSourceSink->HasEvaporation(), {15, 112});
 }
 
+// Only hides: the page comes back with the tree.
+void rule5AdHotStart(CNavigationView& tree, CGlobalKvs& model) {
+  if (model.nadStartingConditions->hotStart) tree.Show(19, false);
+}
+
 void rule6WaveInducedResistance(CNavigationView& tree, CGlobalKvs& model) {
   tree.Show(142, model.nhdResistance->formulation == CNhdResistanceKvs::kWaveInduced);
 }
 
+void rule7Decay(CNavigationView& tree, CGlobalKvs& model) {
+  tree.Show(12, model.nadComponent->CountOfType(CNadComponentObjectKvs::kDecaying) > 0);
+}
+
+void rule8HeatDissipation(CNavigationView& tree, CGlobalKvs& model) {
+  tree.Show(17, model.nadComponent->CountOfType(CNadComponentObjectKvs::kHeatDissipating) > 0);
+}
+
 void rule9Infiltration(CNavigationView& tree, CGlobalKvs& model) {
   showAll(tree, model.nhdInfiltration->infiltrationType != CNhdInfiltrationKvs::kNone, {145, 146});
+}
+
+void rule10HeatExchange(CNavigationView& tree, CGlobalKvs& model) {
+  tree.Show(18, model.nadComponent->CountOfType(CNadComponentObjectKvs::kHeatExchange) == 1);
 }
 
 void rule11MassBudget(CNavigationView& tree, CGlobalKvs& model) {
@@ -237,8 +256,19 @@ void rule20Sliding(CNavigationView& tree, CGlobalKvs& model) {
 
 // In this order. Nothing is remembered between runs.
 constexpr void (*kRules[])(CNavigationView&, CGlobalKvs&) = {
-    rule1ModuleRoots,           rule2HotStart,     rule3Precipitation, rule4Evaporation,
-    rule6WaveInducedResistance, rule9Infiltration, rule11MassBudget,   rule20Sliding};
+    rule1ModuleRoots,            //
+    rule2HotStart,               //
+    rule3Precipitation,          //
+    rule4Evaporation,            //
+    rule5AdHotStart,             //
+    rule6WaveInducedResistance,  //
+    rule7Decay,                  //
+    rule8HeatDissipation,        //
+    rule9Infiltration,           //
+    rule10HeatExchange,          //
+    rule11MassBudget,            //
+    rule20Sliding,               //
+};
 
 }  // namespace
 

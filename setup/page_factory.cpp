@@ -1,5 +1,23 @@
 #include "setup/page_factory.h"
 
+#include "advection_dispersion/boundary_page.h"
+#include "advection_dispersion/box_summation_page.h"
+#include "advection_dispersion/component_page.h"
+#include "advection_dispersion/decay_specification_page.h"
+#include "advection_dispersion/deposition_concentration_page.h"
+#include "advection_dispersion/dispersion_coef_page.h"
+#include "advection_dispersion/evaporation_page.h"
+#include "advection_dispersion/feedback_page.h"
+#include "advection_dispersion/heat_dissipation_page.h"
+#include "advection_dispersion/heat_exchange_page.h"
+#include "advection_dispersion/infiltration_page.h"
+#include "advection_dispersion/initial_concentration_page.h"
+#include "advection_dispersion/line_discharge_page.h"
+#include "advection_dispersion/mass_budget_page.h"
+#include "advection_dispersion/precipitation_page.h"
+#include "advection_dispersion/result_page.h"
+#include "advection_dispersion/source_sink_page.h"
+#include "advection_dispersion/starting_conditions_page.h"
 #include "basic/area_description_page.h"
 #include "basic/bathymetry_page.h"
 #include "basic/boundary_page.h"
@@ -54,6 +72,24 @@ constexpr Entry kPages[] = {
     {"CNHdWeirDlg", make<CNHdWeirDlg>},
     {"CNHdCulvertDlg", make<CNHdCulvertDlg>},
     {"CNHdDikeDlg", make<CNHdDikeDlg>},
+    {"CNadComponentDlg", make<CNadComponentDlg>},
+    {"CNadStartingConditionsDlg", make<CNadStartingConditionsDlg>},
+    {"CNadInitialConcentrationDlg", make<CNadInitialConcentrationDlg>},
+    {"CNadDispersionCoefDlg", make<CNadDispersionCoefDlg>},
+    {"CNadDecaySpecificationDlg", make<CNadDecaySpecificationDlg>},
+    {"CNadHeatDissipationDlg", make<CNadHeatDissipationDlg>},
+    {"CNadBoundaryDlg", make<CNadBoundaryDlg>},
+    {"CNadSourceSinkDlg", make<CNadSourceSinkDlg>},
+    {"CNadDepositionConcentrationDlg", make<CNadDepositionConcentrationDlg>},
+    {"CNadHeatExchangeDlg", make<CNadHeatExchangeDlg>},
+    {"CNadPrecipitationDlg", make<CNadPrecipitationDlg>},
+    {"CNadEvaporationDlg", make<CNadEvaporationDlg>},
+    {"CNadInfiltrationDlg", make<CNadInfiltrationDlg>},
+    {"CNadFeedbackDlg", make<CNadFeedbackDlg>},
+    {"CNadLineDischargeDlg", make<CNadLineDischargeDlg>},
+    {"CNadBoxSummationDlg", make<CNadBoxSummationDlg>},
+    {"CNadMassBudgetDlg", make<CNadMassBudgetDlg>},
+    {"CNadResultDlg", make<CNadResultDlg>},
 };
 
 }  // namespace

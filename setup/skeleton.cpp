@@ -2,6 +2,24 @@
 
 #include <memory>
 
+#include "advection_dispersion/boundary.h"
+#include "advection_dispersion/box_summation.h"
+#include "advection_dispersion/component.h"
+#include "advection_dispersion/decay_specification.h"
+#include "advection_dispersion/deposition_concentration.h"
+#include "advection_dispersion/dispersion_coef.h"
+#include "advection_dispersion/evaporation.h"
+#include "advection_dispersion/feedback.h"
+#include "advection_dispersion/heat_dissipation.h"
+#include "advection_dispersion/heat_exchange.h"
+#include "advection_dispersion/infiltration.h"
+#include "advection_dispersion/initial_concentration.h"
+#include "advection_dispersion/line_discharge.h"
+#include "advection_dispersion/mass_budget.h"
+#include "advection_dispersion/precipitation.h"
+#include "advection_dispersion/result.h"
+#include "advection_dispersion/source_sink.h"
+#include "advection_dispersion/starting_conditions.h"
 #include "basic/area_description.h"
 #include "basic/bathymetry.h"
 #include "basic/boundary.h"
@@ -72,22 +90,58 @@ bool runs(const G& root) {
 }
 
 constexpr Condition kAd = runs<module::kAdvectionDispersion>;
+bool runsAdMassBudget(const G& root) {
+  return kAd(root) && root.moduleSelection->schemeHasMassBudget();
+}
 constexpr Condition kMud = runs<module::kMudTransport>;
 constexpr Condition kExpandedMud = runs<module::kMudTransportExpanded>;
 constexpr Condition kEcology = runs<module::kEcological>;
 
 constexpr MemberRow kMembers[] = {
-    member<&G::moduleSelection>(),  member<&G::bathymetry>(),          member<&G::simulationPeriod>(),
-    member<&G::boundary>(),         member<&G::sourceSink>(),          member<&G::massBudget>(),
-    member<&G::areaDescription>(),  member<&G::nhdBoundary>(),         member<&G::nhdSourceSink>(),
-    member<&G::nhdInfiltration>(),  member<&G::windConditions>(),      member<&G::nhdEddyViscosity>(),
-    member<&G::nhdWaveRadiation>(), member<&G::nhdSurfaceElevation>(), member<&G::nhdResistance>(),
-    member<&G::nhdWeir>(),          member<&G::nhdCulvert>(),          member<&G::nhdDike>(),
+    member<&G::moduleSelection>(),
+    member<&G::bathymetry>(),
+    member<&G::simulationPeriod>(),
+    member<&G::boundary>(),
+    member<&G::sourceSink>(),
+    member<&G::massBudget>(),
+    member<&G::areaDescription>(),
+
+    member<&G::nhdBoundary>(),
+    member<&G::nhdSourceSink>(),
+    member<&G::nhdInfiltration>(),
+    member<&G::windConditions>(),
+    member<&G::nhdEddyViscosity>(),
+    member<&G::nhdWaveRadiation>(),
+    member<&G::nhdSurfaceElevation>(),
+    member<&G::nhdResistance>(),
+    member<&G::nhdWeir>(),
+    member<&G::nhdCulvert>(),
+    member<&G::nhdDike>(),
     member<&G::nhdResult>(),
+
+    member<&G::nadComponent>(),
+    member<&G::nadStartingConditions>(),
+    member<&G::nadInitialConcentration>(),
+    member<&G::nadDispersionCoef>(),
+    member<&G::nadDecaySpecification>(),
+    member<&G::nadHeatDissipation>(),
+    member<&G::nadBoundary>(),
+    member<&G::nadSourceSink>(),
+    member<&G::nadDepositionConcentration>(),
+    member<&G::nadHeatExchange>(),
+    member<&G::nadPrecipitation>(),
+    member<&G::nadEvaporation>(),
+    member<&G::nadInfiltration>(),
+    member<&G::nadFeedback>(),
+    member<&G::nadLineDischarge>(),
+    member<&G::nadBoxSummation>(),
+    member<&G::nadMassBudget>(),
+    member<&G::nadResult>(),
 };
 
 constexpr void (*kStartingCounts[])(G&) = {
     [](G& root) { root.bathymetry->SetNoAreas(1); },
+    [](G& root) { root.nadComponent->SetCount(1); },
 };
 
 constexpr FileRow kSaving[] = {
@@ -123,6 +177,25 @@ constexpr FileRow kSaving[] = {
     options(),
     in("ADVECTION_DISPERSION_MODULE/Cohesive_Sediment_Conditions", kAd),
     zeroKeyword("No_of_Sediment_Fractions"),
+    in("ADVECTION_DISPERSION_MODULE", kAd),
+    child<&G::nadStartingConditions>(),
+    child<&G::nadComponent>(),
+    child<&G::nadInitialConcentration>(),
+    child<&G::nadDispersionCoef>(),
+    child<&G::nadDecaySpecification>(),
+    child<&G::nadHeatDissipation>(),
+    child<&G::nadBoundary>(),
+    child<&G::nadSourceSink>(),
+    child<&G::nadDepositionConcentration>(),
+    child<&G::nadHeatExchange>(),
+    child<&G::nadPrecipitation>(),
+    child<&G::nadEvaporation>(),
+    child<&G::nadInfiltration>(),
+    child<&G::nadFeedback>(),
+    child<&G::nadLineDischarge>(),
+    child<&G::nadBoxSummation>(),
+    child<&G::nadMassBudget>(),
+    child<&G::nadResult>(),
 
     in("MUD_TRANSPORT_MODULE"),
     options(),
@@ -174,17 +247,64 @@ constexpr FileRow kLoading[] = {
 
     in("HYDRODYNAMIC_MODULE"),
     child<&G::nhdResult>(),
+
+    in("ADVECTION_DISPERSION_MODULE", kAd),
+    child<&G::nadStartingConditions>(),
+    child<&G::nadComponent>(),
+    child<&G::nadInitialConcentration>(),
+    child<&G::nadDispersionCoef>(),
+    child<&G::nadDecaySpecification>(),
+    child<&G::nadHeatDissipation>(),
+    child<&G::nadBoundary>(),
+    child<&G::nadSourceSink>(),
+    child<&G::nadDepositionConcentration>(),
+    child<&G::nadHeatExchange>(),
+    child<&G::nadPrecipitation>(),
+    child<&G::nadEvaporation>(),
+    child<&G::nadInfiltration>(),
+    child<&G::nadFeedback>(),
+    child<&G::nadLineDischarge>(),
+    child<&G::nadBoxSummation>(),
+    child<&G::nadMassBudget>(),
+    child<&G::nadResult>(),
 };
 
 constexpr CheckRow kChecking[] = {
-    check<&G::bathymetry>(),       check<&G::areaDescription>(),
-    check<&G::simulationPeriod>(), check<&G::boundary>(),
-    check<&G::sourceSink>(),       check<&G::massBudget>(),
-    check<&G::windConditions>(),   check<&G::nhdEddyViscosity>(),
-    check<&G::nhdWaveRadiation>(), check<&G::nhdSurfaceElevation>(),
-    check<&G::nhdResistance>(),    check<&G::nhdBoundary>(),
-    check<&G::nhdSourceSink>(),    check<&G::nhdInfiltration>(),
-    check<&G::nhdDike>(),          check<&G::nhdResult>(),
+    check<&G::bathymetry>(),
+    check<&G::areaDescription>(),
+    check<&G::simulationPeriod>(),
+    check<&G::boundary>(),
+    check<&G::sourceSink>(),
+    check<&G::massBudget>(),
+    check<&G::windConditions>(),
+    check<&G::nhdEddyViscosity>(),
+    check<&G::nhdWaveRadiation>(),
+    check<&G::nhdSurfaceElevation>(),
+    check<&G::nhdResistance>(),
+    check<&G::nhdBoundary>(),
+    check<&G::nhdSourceSink>(),
+    check<&G::nhdInfiltration>(),
+    check<&G::nhdDike>(),
+    check<&G::nhdResult>(),
+
+    check<&G::nadStartingConditions>(kAd),
+    check<&G::nadComponent>(kAd),
+    check<&G::nadInitialConcentration>(kAd),
+    check<&G::nadDispersionCoef>(kAd),
+    check<&G::nadDecaySpecification>(kAd),
+    check<&G::nadHeatDissipation>(kAd),
+    check<&G::nadBoundary>(kAd),
+    check<&G::nadSourceSink>(kAd),
+    check<&G::nadDepositionConcentration>(kAd),
+    check<&G::nadHeatExchange>(kAd),
+    check<&G::nadPrecipitation>(kAd),
+    check<&G::nadEvaporation>(kAd),
+    check<&G::nadInfiltration>(kAd),
+    check<&G::nadFeedback>(kAd),
+    check<&G::nadLineDischarge>(kAd),
+    check<&G::nadBoxSummation>(kAd),
+    check<&G::nadMassBudget>(runsAdMassBudget),
+    check<&G::nadResult>(kAd),
 };
 
 }  // namespace

@@ -19,6 +19,8 @@ using Items = std::vector<std::int32_t>;
 
 class ResultPage : public test::ShapeTest {
  protected:
+  using PageTest::grid;
+  using ShapeTest::grid;
   enum Column { kType = 1, kArea, kJ, kK, kTime, kPart, kFile, kBrowse, kTitle, kItems, kView };
 
   ResultPage() {
@@ -82,7 +84,7 @@ TEST_F(ResultPage, SizesFollowEachEdit) {
   EXPECT_EQ(text("Size of HD output"), "0.14 MB");
   EXPECT_EQ(text("Size of total output"), "0.14 MB");
   store(1, kTime, "0-1000,1");
-  EXPECT_EQ(text("Size of HD output"), "1.37 MB");
+  EXPECT_EQ(text("Size of HD output"), "1.38 MB");
   spin("Number of Output Areas", -1);
   EXPECT_EQ(text("Size of HD output"), "0.00 MB");
 }

@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include "advection_dispersion/component.h"
+#include "advection_dispersion/starting_conditions.h"
 #include "basic/bathymetry.h"
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
@@ -136,6 +138,41 @@ TEST_F(NavigationTree, InfiltrationHasConcentrationsWithAType) {
   rootsWith(9);
   EXPECT_TRUE(tree.IsVisible(146));
   EXPECT_FALSE(tree.IsVisible(145));
+}
+
+TEST_F(NavigationTree, AHotStartOfTheTransportHidesItsInitialConcentrationsForGood) {
+  rootsWith(2);
+  EXPECT_TRUE(tree.IsVisible(19));
+  model.root.nadStartingConditions->hotStart = true;
+  tree.OnUpdate(&model.root);
+  EXPECT_FALSE(tree.IsVisible(19));
+  model.root.nadStartingConditions->hotStart = false;
+  tree.OnUpdate(&model.root);
+  EXPECT_FALSE(tree.IsVisible(19));
+  tree.OnInitialUpdate(&model.root);
+  EXPECT_TRUE(tree.IsVisible(19));
+}
+
+TEST_F(NavigationTree, PagesForTheTypesOfComponents) {
+  CNadComponentKvs& components = *model.root.nadComponent;
+  components.SetCount(3);
+  // Decay, heat dissipation and heat exchange, as "x.x".
+  const auto shown = [&](int first, int second) {
+    components.at(2).type = first;
+    components.at(3).type = second;
+    rootsWith(2);
+    std::string all;
+    for (const int id : {12, 17, 18}) all += tree.IsVisible(id) ? 'x' : '.';
+    return all;
+  };
+  EXPECT_EQ(shown(0, 0), "...");
+  EXPECT_EQ(shown(1, 0), "x..");
+  EXPECT_EQ(shown(1, 1), "x..");
+  EXPECT_EQ(shown(2, 0), ".x.");
+  EXPECT_EQ(shown(-2, 0), "..x");
+  EXPECT_EQ(shown(-2, -2), "...");  // just one may be
+  EXPECT_EQ(shown(1, 2), "xx.");
+  EXPECT_EQ(shown(3, -1), "...");
 }
 
 TEST_F(NavigationTree, MassBudgetPagesNeedModuleSchemeAndPolygon) {

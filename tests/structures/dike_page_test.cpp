@@ -17,6 +17,7 @@ class DikePage : public test::ShapeTest {
  protected:
   DikePage() {
     list().SetCount(3);
+    keep();
     PageTest::open("CNHdDikeDlg");
   }
   CNhdDikeKvs& list() { return *root().nhdDike; }
@@ -27,9 +28,12 @@ class DikePage : public test::ShapeTest {
   bool isOn(std::string_view label) { return control(label).enabled; }
   void select(int row, double specification = 1) {
     dike(row).crestLevelSpecification = specification;
+    keep();
     dikes().OnCurrentRow(row);
     page->SetData();
   }
+  // What the test has done in the model is no part of the next edit.
+  void keep() { document.RecordEdit(PageId::none, "Test"); }
 
   test::TemporaryFolder folder;
 };
@@ -363,6 +367,7 @@ class DikeImport : public DikePage {
 
 TEST_F(DikeImport, PointsAreAppended) {
   dike(2).SetNoPoints(1);
+  keep();
   import("1 2 3\n4 5 6 gate\n");
   ASSERT_EQ(dike(2).points.size(), 3U);
   EXPECT_EQ(dike(2).points[2].z, 6);
@@ -393,7 +398,7 @@ TEST_F(DikeImport, ValuesAreInTheUnitsThatWereChosen) {
 
 TEST_F(DikeImport, AnIllegalFileChangesNothing) {
   dike(2).SetNoPoints(1);
-  document.RecordEdit(PageId::none, "Points");
+  keep();
   import("1 2 3\n4\n");
   EXPECT_EQ(host.texts, Labels{"Illegal XYZ file format."});
   EXPECT_EQ(dike(2).points.size(), 1U);

@@ -127,7 +127,6 @@ TEST_F(XyzImport, NumbersAreThoseOfScanf) {
         EXPECT_TRUE(std::isnan(value)) << text;
       } else {
         EXPECT_EQ(value, expected) << text;
-        EXPECT_EQ(std::signbit(value), std::signbit(expected)) << text;
       }
     }
   }

@@ -1,0 +1,61 @@
+#pragma once
+
+#include <string>
+
+#include "pages/cell_grid.h"
+
+namespace gridbay {
+
+// The values of all entries by area: a title row for each entry, and below it a row for each area. `Entry` is
+// an AreaValuesKvs.
+template <class Entry>
+class AreaValuesGrid : public BandedGrid {
+ public:
+  RowLook GetRowLook(int row) override {
+    constexpr double kTitleHeight = 1.5;
+    RowLook look = BandedGrid::GetRowLook(row);
+    if (rowAt(row).sub == 0) look.height = kTitleHeight;
+    return look;
+  }
+
+ protected:
+  virtual int EntryCount() = 0;
+  virtual Entry* EntryAt(int number) = 0;
+  // The item code of the entry's values.
+  virtual int Quantity(int number) = 0;
+  // What a value is given as, the constant first; and the kind of the file for any other.
+  virtual Choices Formats() = 0;
+  virtual FileKind KindOfFile(std::int32_t format) = 0;
+
+  int BandSize(int item) override {
+    const Entry* entry = EntryAt(item);
+    return entry == nullptr ? 0 : entry->GetCount();
+  }
+  std::string CornerHeader() override { return "Area"; }
+  int RowHeaderWidth() override { return 50; }
+
+ private:
+  void LayOut() override {
+    Rows([this] { return EntryCount(); });
+    const auto value = [this](GridRow row) {
+      Entry* entry = EntryAt(row.item);
+      return entry == nullptr ? nullptr : entry->GetItem(row.sub);
+    };
+    using AreaValue = std::remove_pointer_t<decltype(value(GridRow{}))>;
+    const auto isFile = [value, formats = Formats()](GridRow row) {
+      const AreaValue* held = value(row);
+      return held != nullptr && formats.placeOf(held->format) > 0;
+    };
+    const auto kind = [this, value](GridRow row) { return KindOfFile(value(row)->format); };
+    const auto request = [value](CVdFileSelectorDlg& selector, GridRow row) {
+      value(row)->RequestDataFile(selector, row.item, row.sub);
+    };
+    List("Type", 100, value, &AreaValue::format, Formats());
+    Number("Value", 60, value, &AreaValue::value, [this](GridRow row) {
+      return Quantity(row.item);
+    }).EnabledIf([value](GridRow row) { return value(row)->format == AreaValue::kConstant; });
+    File({.file = fileOf(value, &AreaValue::file, kind, request), .enabled = isFile});
+  }
+};
+
+}  // namespace gridbay

@@ -1,0 +1,119 @@
+#pragma once
+
+#include <cstdint>
+#include <string>
+#include <tuple>
+#include <vector>
+
+#include "core/list_kvs.h"
+
+// What a module carries with the water: components, fractions or state variables. The templates of this room
+// call each of them an entry, number them from 1, and know the module as a class of static functions, where
+// `object` is any part of the model:
+//
+//   struct Entries {
+//     using Value = float;                                           of a constant
+//     using File = UFileName;                                        of a data file
+//     static int count(CKvsBase& object);
+//     static std::string name(CKvsBase& object, int entry);          at the head of its row or column
+//     static int quantity(CKvsBase& object, int entry);              the item code of its concentration
+//     static int sourceQuantity(CKvsBase& object, int entry, int source);   of what a source brings, from 1
+//     static void requestItems(CVdFileSelectorDlg& selector, CKvsBase& object);    what a file must have
+//     static void requestSourceItems(CVdFileSelectorDlg& selector, CKvsBase& object, int source);
+//   };
+
+namespace gridbay {
+
+// Concentrations as a constant for each entry, or from a data file with an item for each. `Self` may have
+//   Value newConstant(int entry)          in place of 0
+//   int numberOnFile(int entry) const     where the numbers on file have another order than the entries
+template <class Self, class Module>
+class EntryConstantsKvs : public TableKvs<Self> {
+ public:
+  using TableKvs<Self>::TableKvs;
+  using Carried = Module;
+  using Value = typename Module::Value;
+
+  std::int32_t format = 0;
+  std::vector<Value> constants;  // base units
+  typename Module::File file;
+
+  // Constants come and go at the tail. A negative count does nothing.
+  void SetNoConstants(int n) {
+    if (n < 0) return;
+    auto entry = static_cast<int>(constants.size());
+    constants.resize(static_cast<std::size_t>(n));
+    if constexpr (requires(Self & self) { self.newConstant(1); }) {
+      while (entry < n) {
+        const Value value = static_cast<Self&>(*this).newConstant(entry + 1);
+        constants[static_cast<std::size_t>(entry++)] = value;
+      }
+    }
+  }
+  // The constant of an entry, or null for one that has none.
+  Value* Constant(int entry) {
+    const bool isThere = entry >= 1 && entry <= static_cast<int>(constants.size());
+    return isThere ? &constants[static_cast<std::size_t>(entry) - 1] : nullptr;
+  }
+
+  // A numbered keyword for each constant. Numbers that are missing keep their value; further ones are not
+  // read.
+  struct ConstantsRow {
+    static constexpr Text kName{"Constant_Value_%d"};
+
+    static int entryOf(const Self& object, int number) {
+      if constexpr (requires { object.numberOnFile(1); }) {
+        for (int entry = 1; entry <= static_cast<int>(object.constants.size()); ++entry) {
+          if (object.numberOnFile(entry) == number) return entry;
+        }
+      }
+      return number;
+    }
+    void save(const Self& object, KvsFile& file, const std::string&) const {
+      NumberedText name(kName);
+      for (int number = 1; number <= static_cast<int>(object.constants.size()); ++number) {
+        kvsPutParam(file, name.of(number), *const_cast<Self&>(object).Constant(entryOf(object, number)));
+      }
+    }
+    void load(Self& object, KvsSection from, const std::string&) const {
+      NumberedText name(kName);
+      for (int number = 1; number <= static_cast<int>(object.constants.size()); ++number)
+        kvsGetParam(from, name.of(number), object.Constant(entryOf(object, number)), 1, 1);
+    }
+    void copy(Self& object, const Self& other) const { object.constants = other.constants; }
+    static constexpr auto members() { return std::tuple(&EntryConstantsKvs::constants); }
+    bool access(Self& object, std::string_view path, PathAccess& access) const {
+      const std::optional<int> number = numberIn(path, kName);
+      Value* constant = number ? object.Constant(entryOf(object, *number)) : nullptr;
+      if (constant == nullptr) return false;
+      if (access.what == PathAccess::What::write) kvsPutParam(*access.out, path, *constant);
+      if (access.what == PathAccess::What::set) kvsGetParam(access.in, path, constant, 1, 1);
+      return true;
+    }
+  };
+
+  static constexpr auto table() {
+    return keywords(keyword("Data_Format", &EntryConstantsKvs::format), ConstantsRow{},
+                    keyword("FILE_NAME", &EntryConstantsKvs::file));
+  }
+};
+
+// The concentrations at each place of a list: what the places are called on file, and the text for one whose
+// section is missing, are `Self::kPlaceSection` and `Self::kPlaceMissing`, in the section `Self::kSection`.
+template <class Self, class Item>
+class EntryConstantsListKvs : public ListKvs<Self, Item> {
+ public:
+  using ListKvs<Self, Item>::ListKvs;
+
+  static constexpr auto table() {
+    return section(Self::kSection, items(Self::kPlaceSection, Self::kPlaceMissing));
+  }
+  void initialise(Item& item, int) { item.SetNoConstants(Item::Carried::count(*this)); }
+
+  // The module has n entries now.
+  void SetNoConstants(int n) {
+    for (int number = 1; number <= this->GetCount(); ++number) this->GetItem(number)->SetNoConstants(n);
+  }
+};
+
+}  // namespace gridbay
