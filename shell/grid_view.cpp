@@ -107,8 +107,11 @@ void GridView::followCurrentRow() {
   currentRow_ = *row;
   const int column = std::max(currentIndex().column(), 0);
   const bool outer = std::exchange(movingByKeys_, true);  // opens no editor
-  selectionModel()->setCurrentIndex(*row == 0 ? QModelIndex() : model_->index(*row - 1, column),
-                                    QItemSelectionModel::ClearAndSelect);
+  if (*row == 0) {
+    selectionModel()->clear();
+  } else {
+    selectionModel()->setCurrentIndex(model_->index(*row - 1, column), QItemSelectionModel::ClearAndSelect);
+  }
   movingByKeys_ = outer;
 }
 

@@ -110,7 +110,7 @@ TEST_F(AdResultPage, HotStartFiles) {
   choose("Generate Hot Start", 1);
   EXPECT_TRUE(results.generateHotStart);
   EXPECT_EQ(usableOf(hotStarts(), 1), "xxx.");
-  EXPECT_THAT(labels(), ::testing::Contains("Generate hot start (size of output: 0.08 MB)"));
+  EXPECT_THAT(labels(), ::testing::Contains("Generate hot start (size of output: 0.09 MB)"));
   EXPECT_EQ(hotStarts().StoreStyleRowCol(1, 1, "h.tsb2"), 1);
   EXPECT_EQ(results.hotStarts.at(1).file.text(), "h.tsb2");
   EXPECT_EQ(hotStarts().StoreStyleRowCol(1, 3, "begin"), 1);

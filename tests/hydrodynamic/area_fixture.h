@@ -37,7 +37,8 @@ class AreaTest : public ::testing::Test {
   // The texts of an object's check, which all lead to one page and are ordinary faults.
   std::vector<std::string> faultsOf(CKvsBase& object, PageId page, int deep = 1) {
     ValidationList messages;
-    EXPECT_EQ(object.Validate(messages, deep), messages.size());
+    const unsigned faults = object.Validate(messages, deep);
+    EXPECT_EQ(faults, messages.size());
     for (const CMessage& message : messages) {
       EXPECT_EQ(message.page, page) << message.text;
       EXPECT_EQ(message.severity, Severity::fault) << message.text;

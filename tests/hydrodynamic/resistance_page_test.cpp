@@ -14,6 +14,7 @@ class ResistancePage : public test::ShapeTest {
  protected:
   ResistancePage() {
     root().bathymetry->SetNoAreas(2);
+    document.RecordEdit(PageId::resistance, "before");
     PageTest::open("CNhdResistanceDlg");
   }
   CNhdResistanceKvs& list() { return *root().nhdResistance; }

@@ -50,7 +50,8 @@ class HdResult : public ::testing::Test {
   }
   Texts faults() {
     ValidationList messages;
-    EXPECT_EQ(results().Validate(messages, 1), messages.size());
+    const unsigned count = results().Validate(messages, 1);
+    EXPECT_EQ(count, messages.size());
     for (const CMessage& message : messages) {
       EXPECT_EQ(message.page, PageId::hdResult);
       EXPECT_EQ(message.severity, Severity::fault);
