@@ -138,7 +138,12 @@ void DocumentTab::doLongWork(std::string_view title, const std::function<void(co
   dialog.setAutoReset(false);
   dialog.setValue(0);
   work([&dialog](double done) {
-    dialog.setValue(static_cast<int>(done * kParts));
+    const int value = static_cast<int>(done * kParts);
+    if (value != dialog.value()) {
+      dialog.setValue(value);
+    } else {
+      QCoreApplication::processEvents();
+    }
     return !dialog.wasCanceled();
   });
 }

@@ -121,6 +121,7 @@ void GridModel::refresh() {
   isRefreshing_ = false;
   if (shownRows_ > 0 && shownColumns_ > 0)
     emit dataChanged(index(0, 0), index(shownRows_ - 1, shownColumns_ - 1));
+  emit refreshed();
 }
 
 void GridModel::showCounts(int rows, int columns) {

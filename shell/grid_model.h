@@ -36,6 +36,8 @@ class GridModel final : public QAbstractTableModel {
  signals:
   // A cell has changed the model.
   void edited();
+  // The grid is shown anew, though it may have no cells.
+  void refreshed();
 
  private:
   CV27SetupGridWnd& grid_;

@@ -63,7 +63,7 @@ GridView::GridView(CV27SetupGridWnd& grid, QWidget* parent)
   measureColumns();
   layOutRows();
   fitSize();
-  connect(model_, &GridModel::dataChanged, this, [this] { layOutGrid(); });
+  connect(model_, &GridModel::refreshed, this, [this] { layOutGrid(); });
   connect(model_, &GridModel::rowsInserted, this, [this] { layOutGrid(); });
   connect(model_, &GridModel::rowsRemoved, this, [this] { layOutGrid(); });
   connect(model_, &GridModel::columnsInserted, this, [this] { layOutGrid(); });
@@ -415,8 +415,11 @@ void GridView::currentChanged(const QModelIndex& current, const QModelIndex& pre
   emit edited();
 }
 
-// To come here by Tab makes a cell the current one, and opens none.
+// To come here by Tab makes a cell the current one, and opens none. The focus that a closed editor gives back
+// makes none current where the grid has none.
 void GridView::focusInEvent(QFocusEvent* event) {
+  if (event->reason() == Qt::OtherFocusReason && model_->grid().CurrentRow() == 0)
+    return QAbstractScrollArea::focusInEvent(event);
   movingByKeys_ = true;
   QTableView::focusInEvent(event);
   movingByKeys_ = false;

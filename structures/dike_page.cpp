@@ -109,7 +109,11 @@ void CNHdDikeDlg::DoDataExchange(Form& form) {
                                ? std::optional(static_cast<std::int32_t>(dikes_.selected()->points.size()))
                                : std::nullopt;
                   },
-              .set = [this](std::int32_t count) { dikes_.selected()->SetNoPoints(count); }},
+              .set =
+                  [this](std::int32_t count) {
+                    // Fewer dikes leave none selected, in the same store.
+                    if (Dike* dike = dikes_.selected()) dike->SetNoPoints(count);
+                  }},
              kMostPoints)
       .EnabledIf(isSelected);
   form.Button("Import from file...", [this] { importPoints(); }).Beside().EnabledIf(isSelected);

@@ -218,6 +218,16 @@ TEST_F(DikePage, AnotherCountOfDikesSelectsNone) {
   EXPECT_EQ(dikes().GetRowCount(), 0);
 }
 
+// The whole page is stored on an edit of the count, that of points too.
+TEST_F(DikePage, FewerDikesLeaveThePointsOfTheOthers) {
+  select(2);
+  edit("Number of points", "4");
+  edit("Number of dikes", "2");
+  EXPECT_EQ(dikes().CurrentRow(), 0);
+  EXPECT_EQ(dike(2).points.size(), 4U);
+  EXPECT_TRUE(dike(1).points.empty());
+}
+
 TEST_F(DikePage, ADikeThatIsGoneIsNotSelected) {
   select(3);
   list().SetCount(2);
