@@ -86,7 +86,7 @@ bool writeGrids(const std::string& folder, const std::string& suffix, Surface su
          writeGrid(folder + "/inlet" + suffix, 36 * 90, 33 * 90, 94, 76, 30, surface);
 }
 
-// A table of values every ten minutes of the day that the example runs in, its times in hours.
+// A table of values every ten minutes of the day that the example runs in, its times in minutes.
 template <class Values>
 bool writeTable(const std::string& path, const char* heading, const Values& values) {
   constexpr int kStepsPerHour = 6;
@@ -95,7 +95,7 @@ bool writeTable(const std::string& path, const char* heading, const Values& valu
   file << heading << '\n';
   for (int i = 0; i <= kHours * kStepsPerHour; ++i) {
     const double hours = static_cast<double>(i) / kStepsPerHour;
-    file << fmt::format("{:.4f},{}\n", hours, values(hours));
+    file << fmt::format("{},{}\n", i * 60 / kStepsPerHour, values(hours));
   }
   return closed(file, path);
 }
@@ -128,8 +128,8 @@ int main(int argc, char** argv) {
   const std::string folder = argv[1];
   const bool made = writeGrids(folder, ".asc", [](double z) { return z; }) &&
                     writeGrids(folder, "_roughness.asc", manning) &&
-                    writeTable(folder + "/tide.csv", "hours,Tide", tide) &&
-                    writeTable(folder + "/river.csv", "hours,River discharge", river) &&
-                    writeTable(folder + "/rain.csv", "hours,Rain", rain);
+                    writeTable(folder + "/tide.csv", "minutes,Tide", tide) &&
+                    writeTable(folder + "/river.csv", "minutes,River discharge", river) &&
+                    writeTable(folder + "/rain.csv", "minutes,Rain", rain);
   return made ? 0 : 2;
 }

@@ -497,7 +497,15 @@ TEST_F(Tool, InfoOfASetup) {
             "Flood and dry    drying at 0.02 m, flooding at 0.05 m\n"
             "Rain             none\n"
             "Evaporation      none\n"
-            "Infiltration     none\n");
+            "Infiltration     none\n"
+            "At boundary 1    level, 0 m\n"
+            "At boundary 2    level, 0 m\n"
+            "At boundary 3    level, 0 m\n"
+            "Initial level    0 m in area 1\n"
+            "Wind             none\n"
+            "Eddy viscosity   none\n"
+            "Resistance       Manning number, 32 m^⅓/s in area 1\n"
+            "Hot start        not written\n");
 }
 
 class RunEngine : public Tool {

@@ -4,6 +4,7 @@
 
 #include <nlohmann/json.hpp>
 
+#include "core/edition.h"
 #include "tests/support/programs.h"
 #include "tests/support/temporary_folder.h"
 
@@ -26,11 +27,11 @@ class InfoHydrodynamic : public ::testing::Test {
                         " HYDRODYNAMIC_MODULE { " +
                             module + " } }");
   }
-  // The lines of the flow calculation.
+  // The lines of the water that comes and goes.
   std::string told(const std::string& module) {
     const std::string text = runTool({"info", setupWith(module)}).out;
     const std::size_t start = text.find("Rain  ");
-    return start == text.npos ? text : text.substr(start);
+    return start == text.npos ? text : text.substr(start, text.find("Initial level") - start);
   }
   nlohmann::ordered_json json(const std::string& module) {
     return nlohmann::ordered_json::parse(runTool({"info", setupWith(module), "--json"}).out)["hydrodynamics"];
@@ -149,6 +150,87 @@ TEST_F(InfoHydrodynamic, KeywordsOfInfiltrationFollowItsType) {
   EXPECT_EQ(runTool({"set", setup, place + "InfiltrationType=2"}).status, 0);
   EXPECT_EQ(runTool({"get", setup, place + "InfiltrationFormat"}).out, "2\n");
   EXPECT_EQ(runTool({"get", setup, place + "Item_Numbers"}).out, "1 2 3 4 5\n");
+}
+
+class InfoConditions : public InfoHydrodynamic {
+ protected:
+  // The lines behind those of the water, of a module with one boundary.
+  std::string conditions(const std::string& module) {
+    const std::string setup = folder.write(
+        "c.v27",
+        "VANE27_NESTED_MODEL { NESTED_MODEL_GLOBALS { OPEN_BOUNDARY { Number_Of_Boundaries 1 } }\n"
+        " HYDRODYNAMIC_MODULE { " +
+            module + " } }");
+    report = nlohmann::ordered_json::parse(runTool({"info", setup, "--json"}).out)["hydrodynamics"];
+    const std::string text = runTool({"info", setup}).out;
+    const std::size_t start = text.find("At boundary 1");
+    return start == text.npos ? text : text.substr(start);
+  }
+  nlohmann::ordered_json report;
+};
+
+TEST_F(InfoConditions, Defaults) {
+  EXPECT_EQ(conditions(""),
+            "At boundary 1    level, 0 m\n"
+            "Initial level    0 m in area 1\n"
+            "Wind             none\n"
+            "Eddy viscosity   none\n"
+            "Resistance       Manning number, 32 m^⅓/s in area 1\n"
+            "Hot start        not written\n");
+  EXPECT_EQ(report["wind"].dump(), R"_({"given_as":"none"})_");
+  EXPECT_TRUE(report["dikes"].empty());
+  EXPECT_EQ(report["hot_start"]["written"], false);
+}
+
+TEST_F(InfoConditions, FilesStructuresAndOutputs) {
+  const std::string text = conditions(
+      "OPEN_BOUNDARY { BOUNDARY_1 { Formulation 2; Data_Format 3; File_Name (file)\"q.tsb0\"; Item_Numbers 2 "
+      "} }\n"
+      "SURFACE_ELEVATION { AREA_1 { Type 2; File_Name (file)\"l.tsb2\"; Item_Numbers 1 } }\n"
+      "RESISTANCE { Formulation 1; AREA_1 { Data_Format 2; File_Name (file)\"r.tsb2\"; Item_Numbers 1 } }\n"
+      "STRUCTURE_MODULE { WEIR { number_of_weirs 6\n weir_data { Location \"\" -1e-155 \"Mill\" \"TopoID\"\n"
+      " number_of_points 2; x 1.0 2.0; y 3.0 4.0 } }; CULVERTS { number_of_Culverts 1; Culvert_data {\n"
+      " Location \"\" -1e-155 \"Pipe\" \"TopoID\" } } }\n"
+      "STRUCTURES { DIKES { DIKE_1 { name \"North\"; POINT_1 { x 1.0 } } } }\n"
+      "OUTPUT_SPECIFICATION { Number_Of_Output_areas 2\n"
+      " OUTPUT_AREA_1 { Type 2; X_Range_And_Interval 0 10 2; Y_Range_And_Interval 0 5 1; First_Time_Step 0\n"
+      "  Last_Time_Step 100; Time_Step_interval 10; Output_item 1; ITEM_NUMBERS 4; Title \"Maps\"\n"
+      "  File_Name (result)\"m.tsb2\" }\n"
+      " OUTPUT_AREA_2 { Type 0; X_Range_And_Interval 1.0 2.0; Y_Range_And_Interval 3.0 4.0\n"
+      "  Last_Time_Step 100; File_Name (result)\"p.tsb0\" }\n"
+      " Generate_Hotstart #true; HOTSTART_FILES { AREA_1 { File_Name (result)\"h.tsb2\" } } }");
+  EXPECT_EQ(
+      text,
+      "At boundary 1    flux from q.tsb0, item 2\n"
+      "Initial level    map l.tsb2, item 1 in area 1\n"
+      "Wind             none\n"
+      "Eddy viscosity   none\n"
+      "Resistance       Chezy number, map r.tsb2, item 1 in area 1\n"
+      "Dikes            1: North of 1 point\n"
+      "Weirs            6: Mill of 2 points, Weir 2 of 0 points, Weir 3 of 0 points, Weir 4 of 0 points, "
+      "Weir 5 of 0 points, ...\n"
+      "Culverts         1: Pipe of 0 points\n"
+      "Output 1         J 0 to 10 by 2, K 0 to 5 by 1, time steps 0 to 100 by 10, 1 item, to m.tsb2 "
+      "(Maps)\n"
+      "Output 2         2 points, time steps 0 to 100 by 1, 3 items, to p.tsb0\n"
+      "Hot start        written to h.tsb2\n");
+  EXPECT_EQ(report["outputs"][0]["j"].dump(), "[0,10,2]");
+  EXPECT_EQ(report["outputs"][1]["points"], 2);
+  EXPECT_EQ(report["weirs"].size(), 6U);
+  EXPECT_EQ(report["resistance"]["areas"][0]["file"], "r.tsb2");
+}
+
+TEST_F(InfoConditions, WindAndViscosityOfTheFlowModel) {
+  const std::string text = conditions(
+      "OPEN_BOUNDARY { BOUNDARY_1 { Data_Format 2; SINUSOIDAL_BOUNDARY { Reference_Level 0.5; Range 2.0\n"
+      " Period 44714.0 } } }\n"
+      "WIND_CONDITIONS { Data_Format 1; Constant_Wind_Speed 12.0; Constant_Wind_Direction 270.0 }\n"
+      "EDDY_VISCOSITY { Data_Format 3 }");
+  EXPECT_THAT(text, HasSubstr("At boundary 1    level, a sine of range 2 m about 0.5 m, period 44714 s\n"));
+  const bool isPinned = theEdition.wetlandSweepKit;
+  EXPECT_THAT(text, HasSubstr(isPinned ? "Wind             none\n" : "Wind             12 m/s from 270°\n"));
+  EXPECT_THAT(text, HasSubstr(isPinned ? "Eddy viscosity   none\n"
+                                       : "Eddy viscosity   Smagorinsky formula, 0.5 in area 1\n"));
 }
 
 }  // namespace

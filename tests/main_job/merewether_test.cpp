@@ -56,6 +56,47 @@ TEST_F(Merewether, BoundariesAndProjection) {
   EXPECT_THAT(gdal.out, HasSubstr("GDA94 / MGA zone 56"));
 }
 
+// A street flood: rain on the catchment, rough land, what runs off the border, and maps of what is flooded.
+TEST_F(Merewether, RainOnTheCatchment) {
+  const std::string grid = convert("terrain.tsb2", {});
+  const std::string start = "2007-06-08 12:00:00";
+  const std::string table =
+      folder.write("rain.csv", "minutes,Rain\n0,0\n30,90\n60,120\n90,40\n120,0\n180,0\n");
+  test::ProgramRun run =
+      runTool({"convert", "series", table, folder.file("rain.tsb0"), "--item-type", "Rainfall rate",
+               "--start", start, "--time-unit", "min", "--skip-lines", "1"});
+  ASSERT_EQ(run.status, 0) << run.err;
+  ASSERT_EQ(
+      runTool({"new", setup, "--area", grid, "--start", start, "--step", "0.5", "--steps", "21600"}).status,
+      0);
+  const std::string hd = "HYDRODYNAMIC_MODULE/";
+  const std::string output = hd + "OUTPUT_SPECIFICATION/";
+  run = runTool(
+      {"set", setup, "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.002",
+       "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Flooding_Depth=0.003", hd + "SOURCE_AND_SINK/PrecipitationType=0",
+       hd + "SOURCE_AND_SINK/Precipitation/File_Name=rain.tsb0", hd + "RESISTANCE/AREA_1/Constant_Value=25",
+       output + "Number_Of_Output_areas=1", output + "OUTPUT_AREA_1/File_Name=flood.tsb2",
+       output + "OUTPUT_AREA_1/X_Range_And_Interval=0,320,1",
+       output + "OUTPUT_AREA_1/Y_Range_And_Interval=0,415,1", output + "OUTPUT_AREA_1/Last_Time_Step=21600",
+       output + "OUTPUT_AREA_1/Time_Step_interval=600",
+       output + "INUNDATION_STATISTICS/IncludeInundationStatistics=#true",
+       output + "INUNDATION_STATISTICS/InundationFileName=deepest.tsb2"});
+  ASSERT_EQ(run.status, 0) << run.err;
+  run = runTool({"validate", setup});
+  EXPECT_EQ(run.out, "0 faults\n");
+  const std::string report = runTool({"info", setup}).out;
+  EXPECT_THAT(report, HasSubstr("Rain             time series in rain.tsb0, item 1, on dry land too\n"));
+  EXPECT_THAT(report, HasSubstr("Resistance       Manning number, 25 m^⅓/s in area 1\n"));
+  EXPECT_THAT(report, HasSubstr("time steps 0 to 21600 by 600, 3 items, to flood.tsb2\n"));
+
+  // Rain that ends before the simulation does is refused.
+  ASSERT_EQ(
+      runTool({"set", setup, "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD/Number_Of_Timesteps=30000"}).status, 0);
+  run = runTool({"validate", setup});
+  EXPECT_EQ(run.status, 1);
+  EXPECT_THAT(run.out, HasSubstr("page 41, severity 1: Data file  \" rain.tsb0\"  is not valid"));
+}
+
 TEST_F(Merewether, AMovedFolderStillWorks) {
   std::filesystem::create_directories(folder.path() / "a" / "grids");
   const std::string grid = convert("a/grids/terrain ü.tsb2", {});
