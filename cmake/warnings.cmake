@@ -3,6 +3,10 @@ if(CMAKE_CXX_COMPILER_ID STREQUAL "GNU")
   # GCC 12 takes the concatenation of strings for an overlapping copy, or for one without end or outside of all memory.
   add_compile_options(-Wno-restrict -Wno-stringop-overflow -Wno-array-bounds)
 endif()
+if(CMAKE_CXX_COMPILER_ID MATCHES "Clang")
+  # Clang takes a parameter of a row, which is a class in a class, for one that hides a member of the outer.
+  add_compile_options(-Wno-shadow)
+endif()
 if(GRIDBAY_WERROR)
   add_compile_options(-Werror)
 endif()

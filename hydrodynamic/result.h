@@ -21,7 +21,7 @@ class CNhdResultObjectKvs final : public TableKvs<CNhdResultObjectKvs> {
   static constexpr std::int32_t kAreaNumber = 1;  // all outputs are of the outermost area
 
   // What can be written beside what every flow model has.
-  enum Item : std::int32_t { kManningNumber = 14, kSaturation = 15, kInfiltratedVolume = 16 };
+  enum ItemNumber : std::int32_t { kManningNumber = 14, kSaturation = 15, kInfiltratedVolume = 16 };
 
   using TableKvs::TableKvs;
 
