@@ -1,6 +1,7 @@
 #include "advection_dispersion/advection_dispersion_parts.h"
 
 #include "advection_dispersion/boundary.h"
+#include "advection_dispersion/box_summation.h"
 #include "advection_dispersion/component.h"
 #include "advection_dispersion/decay_specification.h"
 #include "advection_dispersion/deposition_concentration.h"
@@ -11,13 +12,11 @@
 #include "advection_dispersion/heat_exchange.h"
 #include "advection_dispersion/infiltration.h"
 #include "advection_dispersion/initial_concentration.h"
-#include "advection_dispersion/precipitation.h"
-#include "advection_dispersion/source_sink.h"
-#include "advection_dispersion/box_summation.h"
-#include "advection_dispersion/component.h"
 #include "advection_dispersion/line_discharge.h"
 #include "advection_dispersion/mass_budget.h"
+#include "advection_dispersion/precipitation.h"
 #include "advection_dispersion/result.h"
+#include "advection_dispersion/source_sink.h"
 #include "advection_dispersion/starting_conditions.h"
 
 namespace gridbay {
