@@ -66,7 +66,7 @@ class CNhdDikeObjectKvs final : public TableKvs<CNhdDikeObjectKvs> {
                             keyword("item_number", &Self::itemNumber)));
   }
 
-  // The specification with no fraction; 0 for what is none of the three.
+  // How the crest level varies, with no fraction; 0 for what is none of the three.
   std::int32_t crest() const;
   void SetNoPoints(int count);
   // What the crest level file must be.
