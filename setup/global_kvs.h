@@ -7,7 +7,10 @@
 #include "advection_dispersion/advection_dispersion_parts.h"
 #include "basic/basic_parts.h"
 #include "core/model_root.h"
+#include "ecology/ecology_parts.h"
 #include "hydrodynamic/hydrodynamic_parts.h"
+#include "mud_transport/mud_transport_parts.h"
+#include "mud_transport_expanded/mud_transport_expanded_parts.h"
 #include "structures/structures_parts.h"
 
 namespace gridbay {
@@ -19,7 +22,10 @@ class CGlobalKvs final : public ModelRoot,
                          public BasicParts,
                          public HydrodynamicParts,
                          public StructureParts,
-                         public AdvectionDispersionParts {
+                         public AdvectionDispersionParts,
+                         public MudTransportParts,
+                         public MudTransportExpandedParts,
+                         public EcologyParts {
  public:
   static constexpr std::string_view kTarget = "VANE27_NESTED_MODEL";
 

@@ -1,5 +1,7 @@
 #include "setup/skeleton.h"
 
+#include <algorithm>
+#include <array>
 #include <memory>
 
 #include "advection_dispersion/boundary.h"
@@ -27,6 +29,7 @@
 #include "basic/module_selection.h"
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
+#include "ecology/pending.h"
 #include "hydrodynamic/boundary.h"
 #include "hydrodynamic/eddy_viscosity.h"
 #include "hydrodynamic/infiltration.h"
@@ -36,6 +39,8 @@
 #include "hydrodynamic/surface_elevation.h"
 #include "hydrodynamic/wave_radiation.h"
 #include "hydrodynamic/wind_conditions.h"
+#include "mud_transport/pending.h"
+#include "mud_transport_expanded/pending.h"
 #include "structures/culvert.h"
 #include "structures/dike.h"
 #include "structures/weir.h"
@@ -97,6 +102,51 @@ constexpr Condition kMud = runs<module::kMudTransport>;
 constexpr Condition kExpandedMud = runs<module::kMudTransportExpanded>;
 constexpr Condition kEcology = runs<module::kEcological>;
 
+// The two tasks of mud transport, and what erodes its layers.
+bool runsFractions(const G& root) {
+  return kMud(root) && root.nmtTaskSelection->multiFraction != 0;
+}
+bool runsLayers(const G& root) {
+  return kMud(root) && root.nmtTaskSelection->multiFraction == 0;
+}
+bool erodesByFactor(const G& root) {
+  return runsLayers(root) && root.nmtMlErosionCharacteristics->useConstantErosionCoefficient != 0;
+}
+bool erodesByTwoFactors(const G& root) {
+  return runsLayers(root) && root.nmtMlErosionCharacteristics->useConstantErosionCoefficient == 0;
+}
+
+// The expanded module's waves, by where they come from.
+bool runsWaves(const G& root) {
+  return kExpandedMud(root) && root.nmtExpForcings->includeWaves != 0;
+}
+template <std::int32_t type>
+bool runsWavesOf(const G& root) {
+  return runsWaves(root) && root.nmtExpWaves->typeOfWaveVariation == type;
+}
+bool runsExpandedMassBudget(const G& root) {
+  return kExpandedMud(root) && root.massBudget->GetCount() > 0;
+}
+
+// Orders that have parts in common are joined of these.
+template <class Row, std::size_t... lengths>
+constexpr auto joined(const std::array<Row, lengths>&... parts) {
+  std::array<Row, (lengths + ...)> all{};
+  std::size_t at = 0;
+  ((std::ranges::copy(parts, all.begin() + static_cast<std::ptrdiff_t>(at)), at += lengths), ...);
+  return all;
+}
+
+// The children of an order of files as one of checks.
+template <std::size_t length>
+constexpr auto checks(const std::array<FileRow, length>& rows, Condition condition) {
+  std::array<CheckRow, length> all{};
+  std::ranges::transform(rows, all.begin(), [condition](const FileRow& row) {
+    return CheckRow{row.object, condition};
+  });
+  return all;
+}
+
 constexpr MemberRow kMembers[] = {
     member<&G::moduleSelection>(),
     member<&G::bathymetry>(),
@@ -137,34 +187,102 @@ constexpr MemberRow kMembers[] = {
     member<&G::nadBoxSummation>(),
     member<&G::nadMassBudget>(),
     member<&G::nadResult>(),
+
+    member<&G::nmtStartingConditions>(),
+    member<&G::nmtTaskSelection>(),
+    member<&G::nmtInitialConcentration>(),
+    member<&G::nmtDispersionCoef>(),
+    member<&G::nmtSettlingAndDesposition>(),
+    member<&G::nmtMlSettlingAndDeposition>(),
+    member<&G::nmtBoundary>(),
+    member<&G::nmtSourceSink>(),
+    member<&G::nmtMfErosionCharacteristics>(),
+    member<&G::nmtMlErosionCharacteristics>(),
+    member<&G::nmtErosionLayer>(),
+    member<&G::nmtErosionForEachLayerCritical>(),
+    member<&G::nmtErosionForEachLayerFactor>(),
+    member<&G::nmtErosionForEachLayerFactor1>(),
+    member<&G::nmtErosionForEachLayerFactor2>(),
+    member<&G::nmtErosionForEachLayerPower>(),
+    member<&G::nmtErosionForEachLayerDensity>(),
+    member<&G::nmtSliding>(),
+    member<&G::nmtTransitionBetweenLayers>(),
+    member<&G::nmtConsolidation>(),
+    member<&G::nmtBedRoughness>(),
+    member<&G::nmtWaveData>(),
+    member<&G::nmtLineDischarge>(),
+    member<&G::nmtBoxSummation>(),
+    member<&G::nmtResult>(),
+
+    member<&G::nmtExpStartingConditions>(),
+    member<&G::nmtExpTaskSelection>(),
+    member<&G::nmtExpInitialConditions>(),
+    member<&G::nmtExpDispersionCoef>(),
+    member<&G::nmtExpBoundary>(),
+    member<&G::nmtExpForcings>(),
+    member<&G::nmtExpWaves>(),
+    member<&G::nmtExpTsvWaves>(),
+    member<&G::nmtExpConstantWaves>(),
+    member<&G::nmtExpWaveDatabase>(),
+    member<&G::nmtExpDredgings>(),
+    member<&G::nmtExpSources>(),
+    member<&G::nmtExpWaterColParameters>(),
+    member<&G::nmtExpSandFractions>(),
+    member<&G::nmtExpSettlings>(),
+    member<&G::nmtExpDeposition>(),
+    member<&G::nmtExpSettlingPar>(),
+    member<&G::nmtExpErosionLayer>(),
+    member<&G::nmtExpPowerOfErosion>(),
+    member<&G::nmtExpErosionCoefficient>(),
+    member<&G::nmtExpCriticalShearStress>(),
+    member<&G::nmtExpBedDensity>(),
+    member<&G::nmtExpSliding>(),
+    member<&G::nmtExpConstFrictionCoef>(),
+    member<&G::nmtExpMorphology>(),
+    member<&G::nmtExpVarFrictionCoef>(),
+    member<&G::nmtExpBedRoughness>(),
+    member<&G::nmtExpTransition>(),
+    member<&G::nmtExpMassBudget>(),
+    member<&G::nmtExpLineDischarge>(),
+    member<&G::nmtExpResult>(),
+
+    member<&G::wqsModelDefinition>(),
+    member<&G::wqsStartingConditions>(),
+    member<&G::wqsInitialConditions>(),
+    member<&G::wqsAdBoundary>(),
+    member<&G::wqsAdDispersion>(),
+    member<&G::wqsAdSourceSink>(),
+    member<&G::wqsAdPrecipitation>(),
+    member<&G::wqsAdEvaporation>(),
+    member<&G::wqsAdInfiltration>(),
+    member<&G::wqsAdDeposition>(),
+    member<&G::wqsConstants>(),
+    member<&G::wqsForcings>(),
+    member<&G::wqsMassBudget>(),
+    member<&G::wqsResults>(),
 };
 
 constexpr void (*kStartingCounts[])(G&) = {
     [](G& root) { root.bathymetry->SetNoAreas(1); },
     [](G& root) { root.nadComponent->SetCount(1); },
+    [](G& root) { root.nmtTaskSelection->SetFractions(3); },
+    [](G& root) { root.nmtExpTaskSelection->SetCounts(1, 1, false); },
 };
 
-constexpr FileRow kSaving[] = {
-    in("NESTED_MODEL_GLOBALS"),
-    options(),
-    child<&G::moduleSelection>(),
-    child<&G::bathymetry>(),
-    child<&G::boundary>(),
-    child<&G::sourceSink>(),
-    child<&G::areaDescription>(),
-    child<&G::simulationPeriod>(),
+// What is saved, loaded and, where nothing else is told, checked in one order.
+constexpr std::array kGlobals{
+    child<&G::moduleSelection>(), child<&G::bathymetry>(),      child<&G::boundary>(),
+    child<&G::sourceSink>(),      child<&G::areaDescription>(), child<&G::simulationPeriod>(),
     child<&G::massBudget>(),
+};
 
-    in("HYDRODYNAMIC_MODULE"),
-    options(),
-    child<&G::nhdBoundary>(),
-    child<&G::nhdSourceSink>(),
-    child<&G::nhdInfiltration>(),
-    child<&G::windConditions>(),
-    child<&G::nhdEddyViscosity>(),
-    child<&G::nhdWaveRadiation>(),
-    child<&G::nhdSurfaceElevation>(),
-    child<&G::nhdResistance>(),
+constexpr std::array kFlow{
+    child<&G::nhdBoundary>(),         child<&G::nhdSourceSink>(),    child<&G::nhdInfiltration>(),
+    child<&G::windConditions>(),      child<&G::nhdEddyViscosity>(), child<&G::nhdWaveRadiation>(),
+    child<&G::nhdSurfaceElevation>(), child<&G::nhdResistance>(),
+};
+
+constexpr std::array kStructures{
     in("HYDRODYNAMIC_MODULE/STRUCTURE_MODULE"),
     child<&G::nhdWeir>(),
     child<&G::nhdCulvert>(),
@@ -172,12 +290,9 @@ constexpr FileRow kSaving[] = {
     child<&G::nhdDike>(),
     in("HYDRODYNAMIC_MODULE"),
     child<&G::nhdResult>(),
+};
 
-    in("ADVECTION_DISPERSION_MODULE"),
-    options(),
-    in("ADVECTION_DISPERSION_MODULE/Cohesive_Sediment_Conditions", kAd),
-    zeroKeyword("No_of_Sediment_Fractions"),
-    in("ADVECTION_DISPERSION_MODULE", kAd),
+constexpr std::array kTransport{
     child<&G::nadStartingConditions>(),
     child<&G::nadComponent>(),
     child<&G::nadInitialConcentration>(),
@@ -194,118 +309,235 @@ constexpr FileRow kSaving[] = {
     child<&G::nadFeedback>(),
     child<&G::nadLineDischarge>(),
     child<&G::nadBoxSummation>(),
+};
+
+constexpr std::array kTransportResults{
     child<&G::nadMassBudget>(),
     child<&G::nadResult>(),
-
-    in("MUD_TRANSPORT_MODULE"),
-    options(),
-    in("MUD_TRANSPORT_MODULE/MT_PARAMETERS", kMud),
-
-    in("MUD_TRANSPORT_EXPANDED_MODULE"),
-    options(),
-    in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/WAVE_DATA", kExpandedMud),
-    in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/DREDGING", kExpandedMud),
-    in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters/FALL_VELOCITY_PARAMETERS", kExpandedMud),
-    in("MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/EROSION_COEFFICIENTS", kExpandedMud),
-    in("MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/SLIDING", kExpandedMud),
-    // Saved in here, but looked for at the top of the source: so its options come through only from there.
-    in("MUD_TRANSPORT_EXPANDED_MODULE/XENOBIOTIC_MODULE", kExpandedMud),
-    options(),
-
-    in("BIO_RIG_MODULE"),
-    options(),
-    in("BIO_RIG_MODULE/AD_TRANSPORT_PARAMETERS", kEcology),
 };
+
+constexpr std::array kMudWater{
+    child<&G::nmtStartingConditions>(), child<&G::nmtTaskSelection>(), child<&G::nmtInitialConcentration>(),
+    child<&G::nmtDispersionCoef>(),     child<&G::nmtBoundary>(),      child<&G::nmtSourceSink>(),
+};
+
+constexpr std::array kMudParameters{
+    in("MUD_TRANSPORT_MODULE/MT_PARAMETERS", runsFractions),
+    child<&G::nmtSettlingAndDesposition>(),
+    child<&G::nmtMfErosionCharacteristics>(),
+    in("MUD_TRANSPORT_MODULE/MT_PARAMETERS", runsLayers),
+    child<&G::nmtMlSettlingAndDeposition>(),
+    child<&G::nmtMlErosionCharacteristics>(),
+    in("MUD_TRANSPORT_MODULE/MT_PARAMETERS/EROSION_CHARACTERISTICS_FOR_EACH_LAYER", runsLayers),
+    child<&G::nmtErosionLayer>(),
+    child<&G::nmtErosionForEachLayerCritical>(),
+    child<&G::nmtErosionForEachLayerFactor>(erodesByFactor),
+    child<&G::nmtErosionForEachLayerFactor1>(erodesByTwoFactors),
+    child<&G::nmtErosionForEachLayerFactor2>(erodesByTwoFactors),
+    child<&G::nmtErosionForEachLayerPower>(),
+    child<&G::nmtErosionForEachLayerDensity>(),
+    in("MUD_TRANSPORT_MODULE/FORCING_FUNCTIONS", runsLayers),
+};
+
+constexpr std::array kMudBed{
+    in("MUD_TRANSPORT_MODULE", runsLayers),  child<&G::nmtSliding>(),
+    child<&G::nmtTransitionBetweenLayers>(), child<&G::nmtConsolidation>(),
+    in("MUD_TRANSPORT_MODULE", kMud),
+};
+
+constexpr std::array kExpandedWater{
+    child<&G::nmtExpStartingConditions>(),
+    child<&G::nmtExpTaskSelection>(),
+    child<&G::nmtExpInitialConditions>(),
+    child<&G::nmtExpDispersionCoef>(),
+    child<&G::nmtExpSources>(),
+    child<&G::nmtExpBoundary>(),
+};
+
+constexpr std::array kExpandedErosion{
+    in("MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/EROSION_COEFFICIENTS", kExpandedMud),
+    child<&G::nmtExpErosionLayer>(),
+    child<&G::nmtExpPowerOfErosion>(),
+    child<&G::nmtExpErosionCoefficient>(),
+    in("MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS", kExpandedMud),
+    child<&G::nmtExpCriticalShearStress>(),
+    child<&G::nmtExpBedDensity>(),
+    in("MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/SLIDING", kExpandedMud),
+};
+
+constexpr std::array kExpandedBed{
+    in("MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS", kExpandedMud),
+    child<&G::nmtExpMorphology>(),
+    child<&G::nmtExpBedRoughness>(),
+    child<&G::nmtExpTransition>(),
+    in("MUD_TRANSPORT_EXPANDED_MODULE", kExpandedMud),
+    child<&G::nmtExpMassBudget>(),
+    child<&G::nmtExpLineDischarge>(),
+    child<&G::nmtExpResult>(),
+};
+
+constexpr std::array kEcologyDefinition{
+    child<&G::wqsModelDefinition>(),
+    child<&G::wqsStartingConditions>(),
+    child<&G::wqsInitialConditions>(),
+};
+
+constexpr std::array kEcologyTransport{
+    child<&G::wqsAdBoundary>(),      child<&G::wqsAdDispersion>(),  child<&G::wqsAdSourceSink>(),
+    child<&G::wqsAdPrecipitation>(), child<&G::wqsAdEvaporation>(), child<&G::wqsAdInfiltration>(),
+    child<&G::wqsAdDeposition>(),
+};
+
+constexpr std::array kEcologyProcesses{
+    child<&G::wqsConstants>(),
+    child<&G::wqsForcings>(),
+    child<&G::wqsMassBudget>(),
+    child<&G::wqsResults>(),
+};
+
+constexpr auto kEcologyOrder =
+    joined(kEcologyDefinition, std::array{in("BIO_RIG_MODULE/AD_TRANSPORT_PARAMETERS", kEcology)},
+           kEcologyTransport, std::array{in("BIO_RIG_MODULE", kEcology)}, kEcologyProcesses);
+
+constexpr auto kSaving = joined(
+    std::array{in("NESTED_MODEL_GLOBALS"), options()}, kGlobals,  //
+    std::array{in("HYDRODYNAMIC_MODULE"), options()}, kFlow, kStructures,
+    std::array{in("ADVECTION_DISPERSION_MODULE"), options(),
+               in("ADVECTION_DISPERSION_MODULE/Cohesive_Sediment_Conditions", kAd),
+               zeroKeyword("No_of_Sediment_Fractions"), in("ADVECTION_DISPERSION_MODULE", kAd)},
+    kTransport, kTransportResults,
+    std::array{in("MUD_TRANSPORT_MODULE"), options(), in("MUD_TRANSPORT_MODULE", kMud)}, kMudWater,
+    kMudParameters, std::array{child<&G::nmtWaveData>(), child<&G::nmtBedRoughness>()}, kMudBed,
+    std::array{child<&G::nmtLineDischarge>(), child<&G::nmtBoxSummation>(), child<&G::nmtResult>()},
+    std::array{in("MUD_TRANSPORT_EXPANDED_MODULE"), options(),
+               in("MUD_TRANSPORT_EXPANDED_MODULE", kExpandedMud)},
+    kExpandedWater,
+    std::array{
+        in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/WAVE_DATA", kExpandedMud),
+        child<&G::nmtExpWaves>(), child<&G::nmtExpTsvWaves>(), child<&G::nmtExpConstantWaves>(),
+        child<&G::nmtExpWaveDatabase>(), in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS", kExpandedMud),
+        child<&G::nmtExpForcings>(),
+        in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/DREDGING", kExpandedMud),
+        child<&G::nmtExpDredgings>(),
+        in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters", kExpandedMud),
+        child<&G::nmtExpWaterColParameters>(),
+        in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters/FALL_VELOCITY_PARAMETERS", kExpandedMud),
+        child<&G::nmtExpSettlings>(), child<&G::nmtExpSettlingPar>(),
+        in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters", kExpandedMud),
+        child<&G::nmtExpDeposition>(), child<&G::nmtExpSandFractions>()},
+    kExpandedErosion,
+    std::array{child<&G::nmtExpSliding>(), child<&G::nmtExpVarFrictionCoef>(),
+               child<&G::nmtExpConstFrictionCoef>()},
+    kExpandedBed,
+    // Saved in here, but looked for at the top of the source: so its options come through only from there.
+    std::array{in("MUD_TRANSPORT_EXPANDED_MODULE/XENOBIOTIC_MODULE", kExpandedMud), options(),
+               in("BIO_RIG_MODULE"), options(), in("BIO_RIG_MODULE", kEcology)},
+    kEcologyOrder);
 
 // The module selection comes first: what else is read depends on it.
-constexpr FileRow kLoading[] = {
-    in("NESTED_MODEL_GLOBALS"),
-    child<&G::moduleSelection>(),
-    child<&G::bathymetry>(),
-    child<&G::boundary>(),
-    child<&G::sourceSink>(),
-    child<&G::areaDescription>(),
-    child<&G::simulationPeriod>(),
-    child<&G::massBudget>(),
+constexpr auto kLoading = joined(
+    std::array{in("NESTED_MODEL_GLOBALS")}, kGlobals,  //
+    std::array{in("HYDRODYNAMIC_MODULE")}, kFlow, kStructures,
+    std::array{in("ADVECTION_DISPERSION_MODULE", kAd)}, kTransport, kTransportResults,
+    std::array{in("MUD_TRANSPORT_MODULE", kMud)}, kMudWater, kMudParameters,
+    std::array{child<&G::nmtBedRoughness>(), child<&G::nmtWaveData>()}, kMudBed,
+    std::array{child<&G::nmtBoxSummation>(), child<&G::nmtLineDischarge>(), child<&G::nmtResult>()},
+    std::array{in("MUD_TRANSPORT_EXPANDED_MODULE", kExpandedMud)}, kExpandedWater,
+    // The forcings are looked for among the waves, where they do not stand.
+    std::array{
+        in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/WAVE_DATA", kExpandedMud),
+        child<&G::nmtExpWaves>(), child<&G::nmtExpTsvWaves>(), child<&G::nmtExpConstantWaves>(),
+        child<&G::nmtExpWaveDatabase>(), child<&G::nmtExpForcings>(),
+        in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/DREDGING", kExpandedMud),
+        child<&G::nmtExpDredgings>(),
+        in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters", kExpandedMud),
+        child<&G::nmtExpWaterColParameters>(),
+        in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters/FALL_VELOCITY_PARAMETERS", kExpandedMud),
+        child<&G::nmtExpSettlings>(), child<&G::nmtExpSettlingPar>(),
+        in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters", kExpandedMud),
+        child<&G::nmtExpSandFractions>(), child<&G::nmtExpDeposition>()},
+    kExpandedErosion,
+    std::array{child<&G::nmtExpVarFrictionCoef>(), child<&G::nmtExpSliding>(),
+               child<&G::nmtExpConstFrictionCoef>()},
+    kExpandedBed, std::array{in("BIO_RIG_MODULE", kEcology)}, kEcologyOrder);
 
-    in("HYDRODYNAMIC_MODULE"),
-    child<&G::nhdBoundary>(),
-    child<&G::nhdSourceSink>(),
-    child<&G::nhdInfiltration>(),
-    child<&G::windConditions>(),
-    child<&G::nhdEddyViscosity>(),
-    child<&G::nhdWaveRadiation>(),
-    child<&G::nhdSurfaceElevation>(),
-    child<&G::nhdResistance>(),
+constexpr auto kChecking = joined(
+    std::array{
+        check<&G::bathymetry>(),
+        check<&G::areaDescription>(),
+        check<&G::simulationPeriod>(),
+        check<&G::boundary>(),
+        check<&G::sourceSink>(),
+        check<&G::massBudget>(),
+        check<&G::windConditions>(),
+        check<&G::nhdEddyViscosity>(),
+        check<&G::nhdWaveRadiation>(),
+        check<&G::nhdSurfaceElevation>(),
+        check<&G::nhdResistance>(),
+        check<&G::nhdBoundary>(),
+        check<&G::nhdSourceSink>(),
+        check<&G::nhdInfiltration>(),
+        check<&G::nhdDike>(),
+        check<&G::nhdResult>(),
+    },
+    checks(kTransport, kAd),
+    std::array{check<&G::nadMassBudget>(runsAdMassBudget), check<&G::nadResult>(kAd)},
+    checks(kMudWater, kMud),
+    std::array{
+        check<&G::nmtSettlingAndDesposition>(runsFractions),
+        check<&G::nmtMfErosionCharacteristics>(runsFractions),
+        check<&G::nmtMlSettlingAndDeposition>(runsLayers),
+        check<&G::nmtMlErosionCharacteristics>(runsLayers),
+        check<&G::nmtErosionLayer>(runsLayers),
+        check<&G::nmtErosionForEachLayerCritical>(runsLayers),
+        check<&G::nmtErosionForEachLayerFactor>(runsLayers),
+        check<&G::nmtErosionForEachLayerFactor1>(runsLayers),
+        check<&G::nmtErosionForEachLayerFactor2>(runsLayers),
+        check<&G::nmtErosionForEachLayerPower>(runsLayers),
+        check<&G::nmtErosionForEachLayerDensity>(runsLayers),
+        check<&G::nmtSliding>(runsLayers),
+        check<&G::nmtTransitionBetweenLayers>(runsLayers),
+        check<&G::nmtConsolidation>(runsLayers),
+        check<&G::nmtBedRoughness>(runsLayers),
+        check<&G::nmtWaveData>(kMud),
+        check<&G::nmtLineDischarge>(kMud),
+        check<&G::nmtBoxSummation>(kMud),
+        check<&G::nmtResult>(kMud),
 
-    in("HYDRODYNAMIC_MODULE/STRUCTURE_MODULE"),
-    child<&G::nhdWeir>(),
-    child<&G::nhdCulvert>(),
-
-    in("HYDRODYNAMIC_MODULE/STRUCTURES"),
-    child<&G::nhdDike>(),
-
-    in("HYDRODYNAMIC_MODULE"),
-    child<&G::nhdResult>(),
-
-    in("ADVECTION_DISPERSION_MODULE", kAd),
-    child<&G::nadStartingConditions>(),
-    child<&G::nadComponent>(),
-    child<&G::nadInitialConcentration>(),
-    child<&G::nadDispersionCoef>(),
-    child<&G::nadDecaySpecification>(),
-    child<&G::nadHeatDissipation>(),
-    child<&G::nadBoundary>(),
-    child<&G::nadSourceSink>(),
-    child<&G::nadDepositionConcentration>(),
-    child<&G::nadHeatExchange>(),
-    child<&G::nadPrecipitation>(),
-    child<&G::nadEvaporation>(),
-    child<&G::nadInfiltration>(),
-    child<&G::nadFeedback>(),
-    child<&G::nadLineDischarge>(),
-    child<&G::nadBoxSummation>(),
-    child<&G::nadMassBudget>(),
-    child<&G::nadResult>(),
-};
-
-constexpr CheckRow kChecking[] = {
-    check<&G::bathymetry>(),
-    check<&G::areaDescription>(),
-    check<&G::simulationPeriod>(),
-    check<&G::boundary>(),
-    check<&G::sourceSink>(),
-    check<&G::massBudget>(),
-    check<&G::windConditions>(),
-    check<&G::nhdEddyViscosity>(),
-    check<&G::nhdWaveRadiation>(),
-    check<&G::nhdSurfaceElevation>(),
-    check<&G::nhdResistance>(),
-    check<&G::nhdBoundary>(),
-    check<&G::nhdSourceSink>(),
-    check<&G::nhdInfiltration>(),
-    check<&G::nhdDike>(),
-    check<&G::nhdResult>(),
-
-    check<&G::nadStartingConditions>(kAd),
-    check<&G::nadComponent>(kAd),
-    check<&G::nadInitialConcentration>(kAd),
-    check<&G::nadDispersionCoef>(kAd),
-    check<&G::nadDecaySpecification>(kAd),
-    check<&G::nadHeatDissipation>(kAd),
-    check<&G::nadBoundary>(kAd),
-    check<&G::nadSourceSink>(kAd),
-    check<&G::nadDepositionConcentration>(kAd),
-    check<&G::nadHeatExchange>(kAd),
-    check<&G::nadPrecipitation>(kAd),
-    check<&G::nadEvaporation>(kAd),
-    check<&G::nadInfiltration>(kAd),
-    check<&G::nadFeedback>(kAd),
-    check<&G::nadLineDischarge>(kAd),
-    check<&G::nadBoxSummation>(kAd),
-    check<&G::nadMassBudget>(runsAdMassBudget),
-    check<&G::nadResult>(kAd),
-};
+        check<&G::nmtExpStartingConditions>(kExpandedMud),
+        check<&G::nmtExpTaskSelection>(kExpandedMud),
+        check<&G::nmtExpInitialConditions>(kExpandedMud),
+        check<&G::nmtExpDispersionCoef>(kExpandedMud),
+        check<&G::nmtExpBoundary>(kExpandedMud),
+        check<&G::nmtExpForcings>(kExpandedMud),
+        check<&G::nmtExpWaves>(runsWaves),
+        check<&G::nmtExpConstantWaves>(runsWavesOf<1>),
+        check<&G::nmtExpTsvWaves>(runsWavesOf<2>),
+        check<&G::nmtExpWaveDatabase>(runsWavesOf<3>),
+        check<&G::nmtExpDredgings>(kExpandedMud),
+        check<&G::nmtExpSources>(kExpandedMud),
+        check<&G::nmtExpWaterColParameters>(kExpandedMud),
+        check<&G::nmtExpSandFractions>(kExpandedMud),
+        check<&G::nmtExpSettlings>(kExpandedMud),
+        check<&G::nmtExpDeposition>(kExpandedMud),
+        check<&G::nmtExpSettlingPar>(kExpandedMud),
+        check<&G::nmtExpErosionLayer>(kExpandedMud),
+        check<&G::nmtExpPowerOfErosion>(kExpandedMud),
+        check<&G::nmtExpErosionCoefficient>(kExpandedMud),
+        check<&G::nmtExpCriticalShearStress>(kExpandedMud),
+        check<&G::nmtExpBedDensity>(kExpandedMud),
+        check<&G::nmtExpSliding>(kExpandedMud),
+        check<&G::nmtExpConstFrictionCoef>(kExpandedMud),
+        check<&G::nmtExpMorphology>(kExpandedMud),
+        check<&G::nmtExpVarFrictionCoef>(kExpandedMud),
+        check<&G::nmtExpBedRoughness>(kExpandedMud),
+        check<&G::nmtExpTransition>(kExpandedMud),
+        check<&G::nmtExpMassBudget>(runsExpandedMassBudget),
+        check<&G::nmtExpLineDischarge>(kExpandedMud),
+        check<&G::nmtExpResult>(kExpandedMud),
+    },
+    checks(kEcologyDefinition, kEcology), checks(kEcologyTransport, kEcology),
+    checks(kEcologyProcesses, kEcology));
 
 }  // namespace
 

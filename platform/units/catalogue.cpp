@@ -37,6 +37,7 @@ constexpr QunUnit kUnits[] = {
     {1702, "km/h", "kilometre per hour", "km h-1"},
     {1703, "mph", "mile per hour", "mi h-1"},
     {1704, "kn", "knot", "knot"},
+    {1705, "mm/s", "millimetre per second", "mm s-1"},
     {1800, "m³/s", "cubic metre per second", "m3 s-1"},
     {1801, "ft³/s", "cubic foot per second", "ft3 s-1"},
     {1802, "l/s", "litre per second", "l s-1"},
@@ -53,6 +54,8 @@ constexpr QunUnit kUnits[] = {
     {2002, "kPa", "kilopascal", "kPa"},
     {2003, "inHg", "inch of mercury", "inHg"},
     {2004, "psi", "pound-force per square inch", "psi"},
+    {2010, "N/m²", "newton per square metre", "N m-2"},
+    {2011, "lbf/ft²", "pound-force per square foot", "lbf ft-2"},
     {2100, "m^½/s", "Chezy number", "1"},
     {2101, "ft^½/s", "Chezy number in feet", "0.55208694967369 1"},
     {2110, "m^⅓/s", "Manning number", "1"},
@@ -67,6 +70,7 @@ constexpr QunUnit kUnits[] = {
     {2400, "g/m²/d", "gram per square metre and day", "g m-2 d-1"},
     {2401, "kg/m²/s", "kilogram per square metre and second", "kg m-2 s-1"},
     {2402, "lb/ft²/d", "pound per square foot and day", "lb ft-2 d-1"},
+    {2403, "g/m²/s", "gram per square metre and second", "g m-2 s-1"},
     {2500, "kg/s", "kilogram per second", "kg s-1"},
     {2501, "t/h", "tonne per hour", "t h-1"},
     {2502, "lb/s", "pound per second", "lb s-1"},
@@ -96,6 +100,13 @@ constexpr std::array kConcentration{2200, 2201, 2202, 2203};
 constexpr std::array kSediment{2201, 2200, 2202, 2203};
 constexpr std::array kDecay{2300, 2301, 2302};
 constexpr std::array kDeposition{2400, 2401, 2402};
+constexpr std::array kFall{1700, 1705, 1701};
+constexpr std::array kShearStress{2010, 2001, 2011};
+constexpr std::array kErosion{2401, 2403, 2402};
+constexpr std::array kErosionInGrams{2403, 2401, 2402};
+constexpr std::array kDensity{2201, 2202, 2203};
+constexpr std::array kDensityInGrams{2202, 2201, 2203};
+constexpr std::array kRoughness{1000, 1003, 1010};
 constexpr std::array kMassRate{2500, 2501, 2502};
 
 constexpr QunItem kItems[] = {
@@ -165,6 +176,13 @@ constexpr QunItem kItems[] = {
     {110025, "Wave height over depth", kRatio, 1100},
     {110033, "Crest level", kLength, 1010},
     {110257, "Leakage", kRainPerHour, 1903},
+    {130001, "Shear stress", kShearStress, 2011},
+    {130002, "Settling velocity", kFall, 1701},
+    {130003, "Erosion rate", kErosion, 2402},
+    {130004, "Erosion rate in grams", kErosionInGrams, 2402},
+    {130005, "Density of bed", kDensity, 2203},
+    {130006, "Density of bed in grams", kDensityInGrams, 2203},
+    {130007, "Roughness height", kRoughness, 1010},
 };
 
 template <class Entry>

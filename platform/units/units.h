@@ -71,6 +71,7 @@ inline constexpr int kConcentration = 100201;
 inline constexpr int kTimeStep = 100212;
 inline constexpr int kPercentage = 100239;
 inline constexpr int kCurrentSpeed = 100242;
+inline constexpr int kLayerThickness = 100272;
 inline constexpr int kWindSpeed = 100274;
 inline constexpr int kFloodDepth = 100280;
 inline constexpr int kPorosityCoefficient = 100292;
@@ -80,6 +81,7 @@ inline constexpr int kNumberOfSteps = 100370;
 inline constexpr int kEffectivePorosity = 100375;
 inline constexpr int kVolumetricWaterContent = 100377;
 inline constexpr int kInfiltrationCapacity = 100379;
+inline constexpr int kSuspendedSediment = 100403;
 inline constexpr int kMedianGrainDiameter = 100406;
 inline constexpr int kWaveDirection = 100407;
 inline constexpr int kFlowDirection = 100408;
@@ -93,10 +95,20 @@ inline constexpr int kLevelDifference = 100442;
 inline constexpr int kAtmosphericPressure = 100450;
 inline constexpr int kPorosity = 100456;
 inline constexpr int kSedimentGrainDiameter = 100461;
+inline constexpr int kDredgedMassRate = 100504;
+inline constexpr int kDredgingSpill = 100505;
 inline constexpr int kSaturation = 100516;
 inline constexpr int kWaveHeightOverDepth = 110025;
 inline constexpr int kCrestLevel = 110033;
 inline constexpr int kLeakage = 110257;
+// Of the sediment in the water and on the bed. Where mud transport counts in grams, its quantity does.
+inline constexpr int kShearStress = 130001;
+inline constexpr int kSettlingVelocity = 130002;
+inline constexpr int kErosionRate = 130003;
+inline constexpr int kErosionRateInGrams = 130004;
+inline constexpr int kBedDensity = 130005;
+inline constexpr int kBedDensityInGrams = 130006;
+inline constexpr int kRoughnessHeight = 130007;
 }  // namespace item
 
 // The catalogues, by rising code.
