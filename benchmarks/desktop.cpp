@@ -144,14 +144,14 @@ void treeRules(benchmark::State& state) {
 void scrollGrid(benchmark::State& state) {
   Window window;
   window.tab().goToPage(40);
-  auto* edit =
-      qobject_cast<QLineEdit*>(window.tab().pane().widgetOf("Number of source sink pairs")->focusProxy());
-  edit->setText("1000");
+  auto* edit = qobject_cast<QLineEdit*>(window.tab().pane().widgetOf("Number of source sink pairs"));
+  if (edit == nullptr) return state.SkipWithError("the count is not there");
+  edit->setText("256");
   emit edit->editingFinished();
   auto* view = window.tab().pane().findChild<GridView*>();
   QScrollBar* bar = view->verticalScrollBar();
   QApplication::processEvents();
-  if (bar->maximum() < 900) state.SkipWithError("the grid has no rows");
+  if (bar->maximum() < 200) state.SkipWithError("the grid has no rows");
   for (auto _ : state) {
     bar->setValue((bar->value() + 7) % bar->maximum());
     view->viewport()->repaint();

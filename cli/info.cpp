@@ -15,8 +15,9 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "cli/commands.h"
-#include "cli/info_hydrodynamic.h"
+#include "cli/info_modules.h"
 #include "cli/info_report.h"
+#include "cli/info_topics.h"
 #include "platform/cartography/cartography.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/units/units.h"
@@ -248,6 +249,8 @@ Json describeSetup(CGlobalKvs& model) {
     report["sources"].push_back(model.sourceSink->GetItem(number)->Text());
   }
   report["hydrodynamics"] = describeHydrodynamics(model);
+  if (Json module = describeModule(model); !module.empty())
+    report[topicsOf(model.moduleSelection->simulationType).key] = std::move(module);
   return report;
 }
 
@@ -255,7 +258,8 @@ void printSetup(const Json& report, const Console& console) {
   const Line line = [&console](std::string_view label, const std::string& text) {
     console.out << fmt::format("{:<16} {}\n", label, text);
   };
-  line("Setup", fmt::format("module code {}{}", report["simulation_type"].get<int>(),
+  line("Setup", fmt::format("module code {} ({}){}", report["simulation_type"].get<int>(),
+                            topicsOf(report["simulation_type"].get<int>()).words,
                             report["hot_start"].get<bool>() ? ", hot start" : ""));
   line("Period", fmt::format("{} to {}, {} steps of {:g} s", report["start"].get<std::string>(),
                              report["end"].get<std::string>(), report["steps"].get<std::int64_t>(),
@@ -291,6 +295,12 @@ void printSetup(const Json& report, const Console& console) {
        fmt::format("drying at {:g} m, flooding at {:g} m", report["drying_depth"].get<double>(),
                    report["flooding_depth"].get<double>()));
   printHydrodynamics(report["hydrodynamics"], line);
+  const auto moduleCode = report["simulation_type"].get<std::int32_t>();
+  const ModuleTopics& module = topicsOf(moduleCode);
+  if (report.contains(module.key)) {
+    console.out << '\n';
+    printModule(moduleCode, report[module.key], line);
+  }
 }
 
 int print(const Json& report, const Options& options, void (*readable)(const Json&, const Console&),

@@ -24,6 +24,18 @@ std::span<const Topic> conditionTopics();
 // Dikes, weirs, culverts, and what the calculation writes.
 std::span<const Topic> structureTopics();
 
+// What is dissolved in the water.
+std::span<const Topic> advectionDispersionTopics();
+
+// The module that runs beside the flow calculation; one without topics has no name.
+struct ModuleTopics {
+  std::int32_t code = 0;
+  const char* key = "";
+  std::string_view words = "hydrodynamics alone";
+  std::span<const Topic> (*topics)() = nullptr;
+};
+const ModuleTopics& topicsOf(std::int32_t moduleCode);
+
 // A value in the base unit of its quantity.
 Json quantity(double value, int itemCode);
 std::string wordsOfQuantity(const Json& value);

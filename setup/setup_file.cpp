@@ -114,6 +114,11 @@ std::vector<std::string> SetupFile::unknownSections() {
     return isOfOtherModule(std::string_view(name).substr(0, name.find('/')),
                            model_->moduleSelection->simulationType);
   });
+  if (unknown.empty()) return unknown;
+  // What a fresh load still holds has been taken out since, as the last items of a list that was shortened.
+  CGlobalKvs loaded;
+  loaded.Load(&source_->tree().root(), {});
+  std::erase_if(unknown, [&loaded](const std::string& name) { return loaded.KnowsSection(name); });
   return unknown;
 }
 

@@ -37,8 +37,8 @@ class SetupFile {
   Outcome saveCopy(const std::string& copy, const std::string& path);
   // Another file in the place of the one that was read: what a save passes on comes from it.
   void replaceSource(KvsHandle source);
-  // Sections of the file, as paths, that this model holds nothing of and a save leaves out. What belongs to a
-  // module that is not selected is left out on purpose and is not among them.
+  // Sections of the file, as paths, that no load takes anything of and a save leaves out. What belongs to a
+  // module that is not selected is left out on purpose and is not among them, nor is what an edit took out.
   std::vector<std::string> unknownSections();
 
  private:

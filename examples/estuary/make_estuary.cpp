@@ -1,7 +1,8 @@
 // Makes what the shipped example starts from: an estuary behind a barrier with a tidal inlet, fed by a river,
 // with an island in its basin. The same surface is sampled twice: every 90 m for the whole, and every 30 m
 // around the inlet, so that the points of the two grids coincide. Beside the terrain there are the roughness
-// of both grids, the tide, the river in flood and the rain that causes it.
+// of both grids, the tide, the river in flood, the rain that causes it,
+// and what the sea carries.
 
 #include <fmt/format.h>
 
@@ -118,6 +119,11 @@ std::string rain(double hours) {
   return fmt::format("{:.2f}", 24 * bell(hours - 5, 1.6));
 }
 
+// Salt in the sea (mg/l), which the river in flood dilutes, and the effluent that comes back with the tide.
+std::string sea(double hours) {
+  return fmt::format("{:.0f},{:.3f}", 32000 - 2500 * bell(hours - 14, 4), 0.2 * bell(hours - 16, 3));
+}
+
 }  // namespace
 
 int main(int argc, char** argv) {
@@ -130,6 +136,7 @@ int main(int argc, char** argv) {
                     writeGrids(folder, "_roughness.asc", manning) &&
                     writeTable(folder + "/tide.csv", "minutes,Tide", tide) &&
                     writeTable(folder + "/river.csv", "minutes,River discharge", river) &&
-                    writeTable(folder + "/rain.csv", "minutes,Rain", rain);
+                    writeTable(folder + "/rain.csv", "minutes,Rain", rain) &&
+                    writeTable(folder + "/sea.csv", "minutes,Salt,Effluent", sea);
   return made ? 0 : 2;
 }

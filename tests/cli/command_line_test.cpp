@@ -330,6 +330,18 @@ TEST_F(Tool, OptionsOfTheEngineComeThrough) {
             "Speed 4\nDeep {\n    X \"y\"\n}\n");
 }
 
+// What an edit takes out is wanted out; what no load took in is not.
+TEST_F(Tool, TheEndOfAListThatIsShortenedGoesInSilence) {
+  folder.write("s.v27",
+               "VANE27_NESTED_MODEL { NESTED_MODEL_GLOBALS { SOURCE_AND_SINK { Number_Of_Sources 3\n"
+               " SOURCE_SINK_1 { Type 0 }\n SOURCE_SINK_3 { Type 0 }\n SOURCE_SINK_5 { Type 0 } } } }");
+  const ProgramRun run =
+      runTool({"set", folder.file("s.v27"), "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/Number_Of_Sources=1"});
+  EXPECT_EQ(run.status, 0);
+  EXPECT_THAT(run.err, Not(HasSubstr("SOURCE_SINK_3")));
+  EXPECT_THAT(run.err, HasSubstr("NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/SOURCE_SINK_5"));
+}
+
 TEST_F(Tool, SectionsThatAreNotKnownAreNamedBeforeTheyGo) {
   folder.write("s.v27", "VANE27_NESTED_MODEL { HYDRODYNAMIC_MODULE { FUTURE { A 1 } } }");
   const ProgramRun run =
@@ -486,7 +498,7 @@ TEST_F(Tool, InfoOfASetup) {
   const ProgramRun run = runTool({"info", setup});
   EXPECT_EQ(run.status, 0);
   EXPECT_EQ(run.out,
-            "Setup            module code 0\n"
+            "Setup            module code 0 (hydrodynamics alone)\n"
             "Period           1990-01-01 12:00:00 to 1990-01-01 12:50:00, 100 steps of 30 s\n"
             "Projection       Local Coordinates\n"
             "Area 1           grid.tsb2, 10 x 8 points, 30 x 30 m apart, land at 10 m\n"

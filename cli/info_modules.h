@@ -10,4 +10,8 @@ Json describeHydrodynamics(CGlobalKvs& model);
 // The same for a reader, from what was described.
 void printHydrodynamics(const Json& report, const Line& line);
 
+// Likewise of the module that runs beside it.
+Json describeModule(CGlobalKvs& model);
+void printModule(std::int32_t moduleCode, const Json& report, const Line& line);
+
 }  // namespace gridbay::cli

@@ -1,8 +1,11 @@
-#include "cli/info_hydrodynamic.h"
+#include "cli/info_modules.h"
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>
 
+#include <algorithm>
+
+#include "basic/module_selection.h"
 #include "cli/info_topics.h"
 #include "platform/units/units.h"
 
@@ -25,6 +28,30 @@ std::string wordsOfFile(const Json& from) {
   const auto file = from["file"].get<std::string>();
   return fmt::format("{}, item{} {}", file.empty() ? "a file that is not named" : file,
                      items.size() == 1 ? "" : "s", fmt::join(items, ", "));
+}
+
+const ModuleTopics& topicsOf(std::int32_t moduleCode) {
+  static constexpr ModuleTopics kNone;
+  static constexpr ModuleTopics kModules[] = {
+      {module::kAdvectionDispersion, "advection_dispersion", "hydrodynamics and advection-dispersion",
+       advectionDispersionTopics},
+  };
+  const auto* found = std::ranges::find(kModules, moduleCode, &ModuleTopics::code);
+  return found == std::end(kModules) ? kNone : *found;
+}
+
+Json describeModule(CGlobalKvs& model) {
+  Json report = Json::object();
+  const ModuleTopics& module = topicsOf(model.moduleSelection->simulationType);
+  if (module.topics == nullptr) return report;
+  for (const Topic& topic : module.topics()) report[topic.key] = topic.describe(model);
+  return report;
+}
+
+void printModule(std::int32_t moduleCode, const Json& report, const Line& line) {
+  const ModuleTopics& module = topicsOf(moduleCode);
+  if (module.topics == nullptr) return;
+  for (const Topic& topic : module.topics()) topic.print(report[topic.key], line);
 }
 
 Json describeHydrodynamics(CGlobalKvs& model) {
