@@ -18,10 +18,18 @@
 #include "advection_dispersion/result.h"
 #include "advection_dispersion/source_sink.h"
 #include "advection_dispersion/starting_conditions.h"
+#include "core/model_root.h"
 
 namespace gridbay {
 
 AdvectionDispersionParts::AdvectionDispersionParts() = default;
 AdvectionDispersionParts::~AdvectionDispersionParts() = default;
+
+void AdvectionDispersionParts::create(CKvsBase& root) {
+  makeMembers(root, nadComponent, nadStartingConditions, nadInitialConcentration, nadDispersionCoef,
+              nadDecaySpecification, nadHeatDissipation, nadBoundary, nadSourceSink,
+              nadDepositionConcentration, nadHeatExchange, nadPrecipitation, nadEvaporation, nadInfiltration,
+              nadFeedback, nadLineDischarge, nadBoxSummation, nadMassBudget, nadResult);
+}
 
 }  // namespace gridbay

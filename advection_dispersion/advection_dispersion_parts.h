@@ -4,6 +4,7 @@
 
 namespace gridbay {
 
+class CKvsBase;
 class CNadBoundaryKvs;
 class CNadComponentKvs;
 class CNadDecaySpecificationKvs;
@@ -27,6 +28,8 @@ class CNadResultKvs;
 struct AdvectionDispersionParts {
   AdvectionDispersionParts();
   ~AdvectionDispersionParts();
+  // Makes them all. Their defaults may ask the whole model, which must stand but for its members.
+  void create(CKvsBase& root);
 
   std::unique_ptr<CNadComponentKvs> nadComponent;
   std::unique_ptr<CNadStartingConditionsKvs> nadStartingConditions;

@@ -7,10 +7,16 @@
 #include "basic/module_selection.h"
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
+#include "core/model_root.h"
 
 namespace gridbay {
 
 BasicParts::BasicParts() = default;
 BasicParts::~BasicParts() = default;
+
+void BasicParts::create(CKvsBase& root) {
+  makeMembers(root, moduleSelection, bathymetry, simulationPeriod, boundary, sourceSink, massBudget,
+              areaDescription);
+}
 
 }  // namespace gridbay

@@ -4,6 +4,7 @@
 
 namespace gridbay {
 
+class CKvsBase;
 class CModuleSelectionKvs;
 class CBathymetryKvs;
 class CSimulationPeriodKvs;
@@ -16,6 +17,8 @@ class CAreaDescriptionKvs;
 struct BasicParts {
   BasicParts();
   ~BasicParts();
+  // Makes them all. Their defaults may ask the whole model, which must stand but for its members.
+  void create(CKvsBase& root);
 
   std::unique_ptr<CModuleSelectionKvs> moduleSelection;
   std::unique_ptr<CBathymetryKvs> bathymetry;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <memory>
 #include <span>
 
 #include "core/kvs_base.h"
@@ -22,5 +23,12 @@ class ModelRoot : public CKvsBase {
 
   virtual ModuleOutput OutputOfModule() { return {}; }
 };
+
+// Makes what a room has in the root. To be called in one place for each: all code of the objects follows from
+// it.
+template <class... Members>
+void makeMembers(CKvsBase& root, std::unique_ptr<Members>&... members) {
+  ((members = std::make_unique<Members>(&root)), ...);
+}
 
 }  // namespace gridbay

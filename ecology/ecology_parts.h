@@ -4,6 +4,7 @@
 
 namespace gridbay {
 
+class CKvsBase;
 class CWQSADBoundaryKvs;
 class CWQSADDepositionKvs;
 class CWQSADDispersionKvs;
@@ -24,6 +25,8 @@ class CWQSStartingConditionsKvs;
 struct EcologyParts {
   EcologyParts();
   ~EcologyParts();
+  // Makes them all. Their defaults may ask the whole model, which must stand but for its members.
+  void create(CKvsBase& root);
 
   std::unique_ptr<CWQSModelDefinitionKvs> wqsModelDefinition;
   std::unique_ptr<CWQSStartingConditionsKvs> wqsStartingConditions;

@@ -1,5 +1,6 @@
 #include "hydrodynamic/hydrodynamic_parts.h"
 
+#include "core/model_root.h"
 #include "hydrodynamic/boundary.h"
 #include "hydrodynamic/eddy_viscosity.h"
 #include "hydrodynamic/infiltration.h"
@@ -14,5 +15,10 @@ namespace gridbay {
 
 HydrodynamicParts::HydrodynamicParts() = default;
 HydrodynamicParts::~HydrodynamicParts() = default;
+
+void HydrodynamicParts::create(CKvsBase& root) {
+  makeMembers(root, nhdBoundary, nhdSourceSink, nhdInfiltration, windConditions, nhdEddyViscosity,
+              nhdWaveRadiation, nhdSurfaceElevation, nhdResistance, nhdResult);
+}
 
 }  // namespace gridbay

@@ -4,6 +4,7 @@
 
 namespace gridbay {
 
+class CKvsBase;
 class CNhdBoundaryKvs;
 class CNhdEddyViscosityKvs;
 class CNhdInfiltrationKvs;
@@ -19,6 +20,8 @@ class CWindConditionsKvs;
 struct HydrodynamicParts {
   HydrodynamicParts();
   ~HydrodynamicParts();
+  // Makes them all. Their defaults may ask the whole model, which must stand but for its members.
+  void create(CKvsBase& root);
 
   std::unique_ptr<CNhdBoundaryKvs> nhdBoundary;
   std::unique_ptr<CNhdSourceSinkKvs> nhdSourceSink;

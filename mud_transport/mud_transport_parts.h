@@ -4,6 +4,7 @@
 
 namespace gridbay {
 
+class CKvsBase;
 class CNmtBedRoughnessKvs;
 class CNmtBoundaryKvs;
 class CNmtBoxSummationKvs;
@@ -35,6 +36,8 @@ class CNmtWaveDataKvs;
 struct MudTransportParts {
   MudTransportParts();
   ~MudTransportParts();
+  // Makes them all. Their defaults may ask the whole model, which must stand but for its members.
+  void create(CKvsBase& root);
 
   std::unique_ptr<CNmtStartingConditionsKvs> nmtStartingConditions;
   std::unique_ptr<CNmtTaskSelectionKvs> nmtTaskSelection;

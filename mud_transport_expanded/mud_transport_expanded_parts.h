@@ -4,6 +4,7 @@
 
 namespace gridbay {
 
+class CKvsBase;
 class CNmtExpBedDensityKvs;
 class CNmtExpBedRoughnessKvs;
 class CNmtExpBoundaryKvs;
@@ -41,6 +42,8 @@ class CNmtExpWavesKvs;
 struct MudTransportExpandedParts {
   MudTransportExpandedParts();
   ~MudTransportExpandedParts();
+  // Makes them all. Their defaults may ask the whole model, which must stand but for its members.
+  void create(CKvsBase& root);
 
   std::unique_ptr<CNmtExpStartingConditionsKvs> nmtExpStartingConditions;
   std::unique_ptr<CNmtExpTaskSelectionKvs> nmtExpTaskSelection;

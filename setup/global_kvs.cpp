@@ -59,13 +59,16 @@ void passOptionsThrough(std::string_view name, KvsSection sourceTarget, KvsFile&
   kvsEndSection(file);
 }
 
+template <class... Rooms>
+void createAll(CGlobalKvs& root) {
+  (root.Rooms::create(root), ...);
+}
+
 }  // namespace
 
 CGlobalKvs::CGlobalKvs(MessageHost* host) : ModelRoot(nullptr), host_(host) {
-  for (const MemberRow& row : members()) {
-    row.create(*this);
-    if (row.setUp != nullptr) row.setUp(*this);
-  }
+  createAll<BasicParts, HydrodynamicParts, StructureParts, AdvectionDispersionParts, MudTransportParts,
+            MudTransportExpandedParts, EcologyParts>(*this);
   // Counts reach their followers through the root, and so come when all members are there.
   for (const auto setCount : startingCounts()) setCount(*this);
 }
@@ -118,14 +121,14 @@ void CGlobalKvs::Load(KvsSection file, const std::string& documentPath) {
 
 void CGlobalKvs::AssignState(const CKvsBase& other) {
   auto& model = const_cast<CGlobalKvs&>(static_cast<const CGlobalKvs&>(other));
-  for (const MemberRow& row : members()) row.object(*this).AssignState(row.object(model));
+  for (const MemberRow member : members()) member(*this).AssignState(member(model));
 }
 
 bool CGlobalKvs::SameState(const CKvsBase& other) const {
   auto& self = const_cast<CGlobalKvs&>(*this);
   auto& model = const_cast<CGlobalKvs&>(static_cast<const CGlobalKvs&>(other));
-  return std::ranges::all_of(
-      members(), [&](const MemberRow& row) { return row.object(self).SameState(row.object(model)); });
+  return std::ranges::all_of(members(),
+                             [&](const MemberRow member) { return member(self).SameState(member(model)); });
 }
 
 bool CGlobalKvs::AccessPath(std::string_view path, PathAccess& access) {
@@ -165,7 +168,7 @@ bool CGlobalKvs::KnowsSection(std::string_view path) {
 
 std::vector<CKvsBase*> CGlobalKvs::children() {
   std::vector<CKvsBase*> children;
-  for (const MemberRow& row : members()) children.push_back(&row.object(*this));
+  for (const MemberRow member : members()) children.push_back(&member(*this));
   return children;
 }
 

@@ -18,12 +18,8 @@ inline bool holds(Condition condition, const CGlobalKvs& model) {
   return condition == nullptr || condition(model);
 }
 
-// A member: how it is made, and what must happen to it right after, where anything must.
-struct MemberRow {
-  void (*create)(CGlobalKvs&);
-  CKvsBase& (*object)(CGlobalKvs&);
-  void (*setUp)(CGlobalKvs&) = nullptr;
-};
+// A member of the root.
+using MemberRow = CKvsBase& (*)(CGlobalKvs&);
 
 // A row of the orders of saving and loading. A place is the path of the sections that the root opens around
 // what follows it.

@@ -1,5 +1,6 @@
 #include "structures/structures_parts.h"
 
+#include "core/model_root.h"
 #include "structures/culvert.h"
 #include "structures/dike.h"
 #include "structures/weir.h"
@@ -8,5 +9,9 @@ namespace gridbay {
 
 StructureParts::StructureParts() = default;
 StructureParts::~StructureParts() = default;
+
+void StructureParts::create(CKvsBase& root) {
+  makeMembers(root, nhdWeir, nhdCulvert, nhdDike);
+}
 
 }  // namespace gridbay

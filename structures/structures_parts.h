@@ -4,6 +4,7 @@
 
 namespace gridbay {
 
+class CKvsBase;
 class CNhdWeirKvs;
 class CNhdCulvertKvs;
 class CNhdDikeKvs;
@@ -12,6 +13,8 @@ class CNhdDikeKvs;
 struct StructureParts {
   StructureParts();
   ~StructureParts();
+  // Makes them all. Their defaults may ask the whole model, which must stand but for its members.
+  void create(CKvsBase& root);
 
   std::unique_ptr<CNhdWeirKvs> nhdWeir;
   std::unique_ptr<CNhdCulvertKvs> nhdCulvert;
