@@ -7,6 +7,7 @@
 #include "advection_dispersion/page_texts.h"
 #include "advection_dispersion/transported.h"
 #include "families/deposition_page.h"
+#include "families/transport_page_texts.h"
 #include "platform/units/units.h"
 
 namespace gridbay {

@@ -1,8 +1,8 @@
 #include "advection_dispersion/initial_concentration_page.h"
 
 #include "advection_dispersion/advection_dispersion_parts.h"
-#include "advection_dispersion/page_texts.h"
 #include "advection_dispersion/transported.h"
+#include "families/transport_page_texts.h"
 
 namespace gridbay {
 

@@ -5,9 +5,6 @@
 
 namespace gridbay::texts {
 
-inline constexpr Text componentBand{"Component :   %s"};
-inline constexpr FileKind initialConditionFile{
-    "tsb2", "Initial Condition Map (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
 inline constexpr FileKind decayFile{"tsb0",
                                     "Decay Time Series (*.tsb0;*.tb0)|*.tsb0; *.tb0|All Files (*.*)|*.*||"};
 inline constexpr FileKind heatDissipationFile{

@@ -26,6 +26,8 @@ class AreaValuesGrid : public BandedGrid {
   // What a value is given as, the constant first; and the kind of the file for any other.
   virtual Choices Formats() = 0;
   virtual FileKind KindOfFile(std::int32_t format) = 0;
+  // The row whose format and constant hold in this one.
+  virtual GridRow FormatRow(GridRow row) { return row; }
 
   int BandSize(int item) override {
     const Entry* entry = EntryAt(item);
@@ -42,18 +44,19 @@ class AreaValuesGrid : public BandedGrid {
       return entry == nullptr ? nullptr : entry->GetItem(row.sub);
     };
     using AreaValue = std::remove_pointer_t<decltype(value(GridRow{}))>;
-    const auto isFile = [value, formats = Formats()](GridRow row) {
-      const AreaValue* held = value(row);
+    const auto given = [this, value](GridRow row) { return value(FormatRow(row)); };
+    const auto isFile = [given, formats = Formats()](GridRow row) {
+      const AreaValue* held = given(row);
       return held != nullptr && formats.placeOf(held->format) > 0;
     };
-    const auto kind = [this, value](GridRow row) { return KindOfFile(value(row)->format); };
+    const auto kind = [this, given](GridRow row) { return KindOfFile(given(row)->format); };
     const auto request = [value](CVdFileSelectorDlg& selector, GridRow row) {
       value(row)->RequestDataFile(selector, row.item, row.sub);
     };
-    List("Type", 100, value, &AreaValue::format, Formats());
-    Number("Value", 60, value, &AreaValue::value, [this](GridRow row) {
+    List("Type", 100, given, &AreaValue::format, Formats());
+    Number("Value", 60, given, &AreaValue::value, [this](GridRow row) {
       return Quantity(row.item);
-    }).EnabledIf([value](GridRow row) { return value(row)->format == AreaValue::kConstant; });
+    }).EnabledIf([given](GridRow row) { return given(row)->format == AreaValue::kConstant; });
     File({.file = fileOf(value, &AreaValue::file, kind, request), .enabled = isFile});
   }
 };

@@ -50,6 +50,17 @@ class EntryConstantsKvs : public TableKvs<Self> {
       }
     }
   }
+  // Another constant before all others, and the first one's end.
+  void InsertHeadConstant() {
+    Value value{};
+    if constexpr (requires(Self & self) { self.newConstant(1); }) {
+      value = static_cast<Self&>(*this).newConstant(1);
+    }
+    constants.insert(constants.begin(), value);
+  }
+  void RemoveHeadConstant() {
+    if (!constants.empty()) constants.erase(constants.begin());
+  }
   // The constant of an entry, or null for one that has none.
   Value* Constant(int entry) {
     const bool isThere = entry >= 1 && entry <= static_cast<int>(constants.size());
@@ -110,9 +121,16 @@ class EntryConstantsListKvs : public ListKvs<Self, Item> {
   }
   void initialise(Item& item, int) { item.SetNoConstants(Item::Carried::count(*this)); }
 
-  // The module has n entries now.
+  // The module has n entries now. A negative number does nothing.
   void SetNoConstants(int n) {
     for (int number = 1; number <= this->GetCount(); ++number) this->GetItem(number)->SetNoConstants(n);
+  }
+  // The module has another entry before all others now, or its first one no more.
+  void InsertHeadConstant() {
+    for (int number = 1; number <= this->GetCount(); ++number) this->GetItem(number)->InsertHeadConstant();
+  }
+  void RemoveHeadConstant() {
+    for (int number = 1; number <= this->GetCount(); ++number) this->GetItem(number)->RemoveHeadConstant();
   }
 };
 

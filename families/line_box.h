@@ -118,10 +118,11 @@ class LineOrBoxKvs : public ListKvs<LineOrBoxKvs<Module>, LineOrBoxObjectKvs<Mod
     return faults + List::Validate(messages, deep);
   }
 
-  // A flag for each of the module's entries; new ones are chosen.
+  // A flag for each of the module's entries; new ones are chosen. A negative count does nothing.
   void SetEntryCount(int entries) {
+    if (entries < 0) return;
     for (int number = 1; number <= GetCount(); ++number)
-      this->GetItem(number)->entries.resize(static_cast<std::size_t>(std::max(entries, 0)), 1);
+      this->GetItem(number)->entries.resize(static_cast<std::size_t>(entries), 1);
   }
 
   const LineOrBoxKind& kind() const override { return Module::kKind; }

@@ -18,6 +18,11 @@ inline constexpr FileKind surfaceMapFile{"tsb2",
 inline constexpr FileKind dispersionFile{
     "tsb2", "Dispersion Coefficient Map (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
 
+inline constexpr FileKind initialConditionFile{
+    "tsb2", "Initial Condition Map (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
+
+// The title of what is given of an entry in each area.
+inline constexpr Text componentBand{"Component :   %s"};
 // A place of a list, with what it is called.
 inline constexpr Text placeHeader{"%d: %s"};
 inline constexpr Text boundaryHeader{"Boundary %d"};

@@ -25,6 +25,22 @@
 #include "hydrodynamic/source_sink.h"
 #include "hydrodynamic/surface_elevation.h"
 #include "hydrodynamic/wave_radiation.h"
+#include "mud_transport/bed_roughness.h"
+#include "mud_transport/boundary.h"
+#include "mud_transport/box_summation.h"
+#include "mud_transport/dispersion_coef.h"
+#include "mud_transport/erosion_characteristics.h"
+#include "mud_transport/erosion_for_each_layer.h"
+#include "mud_transport/initial_concentration.h"
+#include "mud_transport/line_discharge.h"
+#include "mud_transport/ml_settling_and_deposition.h"
+#include "mud_transport/result.h"
+#include "mud_transport/settling_and_desposition.h"
+#include "mud_transport/sliding.h"
+#include "mud_transport/source_sink.h"
+#include "mud_transport/starting_conditions.h"
+#include "mud_transport/task_selection.h"
+#include "mud_transport/transition_between_layers.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay {
@@ -46,9 +62,24 @@ void resizeAreas(G& root, std::span<const int> counts) {
 }
 
 // One with a constant for each of what a module carries with the water, or with such in each item.
-template <auto member>
+template <auto member, std::size_t which = 0>
 void resizeConstants(G& root, std::span<const int> counts) {
-  (root.*member)->SetNoConstants(counts.front());
+  (root.*member)->SetNoConstants(counts[which]);
+}
+
+// What a task of mud transport is told of: an item comes in before all others, or the first one goes.
+template <auto member>
+void changeHead(G& root, std::span<const int> counts) {
+  auto& items = (root.*member)->itemList();
+  if (counts[CNmtTaskSelectionKvs::kHead] > 0) items.InsertHead();
+  if (counts[CNmtTaskSelectionKvs::kHead] < 0) items.RemoveHead();
+}
+
+// The same for the first constant of each item.
+template <auto member>
+void changeHeadConstant(G& root, std::span<const int> counts) {
+  if (counts[CNmtTaskSelectionKvs::kHead] > 0) (root.*member)->InsertHeadConstant();
+  if (counts[CNmtTaskSelectionKvs::kHead] < 0) (root.*member)->RemoveHeadConstant();
 }
 
 // The same for the flags of each line or box.
@@ -79,14 +110,31 @@ constexpr std::array kOfAreas{
     resizeAreas<&G::nadDepositionConcentration>,
     resizeAreas<&G::nadDispersionCoef>,
     resize<&G::nadResult>,
+    resize<&G::nmtStartingConditions>,
+    resizeAreas<&G::nmtInitialConcentration>,
+    resizeAreas<&G::nmtDispersionCoef>,
+    resizeAreas<&G::nmtSettlingAndDesposition>,
+    resizeAreas<&G::nmtMlSettlingAndDeposition>,
+    resizeAreas<&G::nmtErosionForEachLayerCritical>,
+    resizeAreas<&G::nmtErosionForEachLayerFactor>,
+    resizeAreas<&G::nmtErosionForEachLayerFactor1>,
+    resizeAreas<&G::nmtErosionForEachLayerFactor2>,
+    resizeAreas<&G::nmtErosionForEachLayerPower>,
+    resizeAreas<&G::nmtErosionForEachLayerDensity>,
+    resizeAreas<&G::nmtSliding>,
+    resizeAreas<&G::nmtTransitionBetweenLayers>,
+    resize<&G::nmtBedRoughness>,
+    resize<&G::nmtResult>,
 };
 constexpr std::array kOfBoundaries{
     resize<&G::nhdBoundary>,
     resize<&G::nadBoundary>,
+    resize<&G::nmtBoundary>,
 };
 constexpr std::array kOfSources{
     resize<&G::nhdSourceSink>,
     resize<&G::nadSourceSink>,
+    resize<&G::nmtSourceSink>,
 };
 constexpr std::array kOfComponents{
     resize<&G::nadInitialConcentration>,    resize<&G::nadDecaySpecification>,
@@ -97,11 +145,33 @@ constexpr std::array kOfComponents{
     resizeEntries<&G::nadBoxSummation>,
 };
 
+// A count that is below 0 leaves them as they are: so each task has followers of its own, and salinity too.
+using Task = CNmtTaskSelectionKvs;
+constexpr std::array kOfMudTask{
+    resize<&G::nmtInitialConcentration, Task::kEntries>,
+    changeHead<&G::nmtInitialConcentration>,
+    resizeConstants<&G::nmtSourceSink, Task::kOfFractions>,
+    resize<&G::nmtSettlingAndDesposition, Task::kTransported>,
+    changeHead<&G::nmtSettlingAndDesposition>,
+    resizeConstants<&G::nmtBoundary, Task::kTransported>,
+    changeHeadConstant<&G::nmtBoundary>,
+    resizeEntries<&G::nmtLineDischarge, Task::kOfFractions>,
+    resizeEntries<&G::nmtBoxSummation, Task::kOfFractions>,
+    resize<&G::nmtErosionForEachLayerCritical, Task::kLayers>,
+    resize<&G::nmtErosionForEachLayerFactor, Task::kLayers>,
+    resize<&G::nmtErosionForEachLayerFactor1, Task::kLayers>,
+    resize<&G::nmtErosionForEachLayerFactor2, Task::kLayers>,
+    resize<&G::nmtErosionForEachLayerPower, Task::kLayers>,
+    resize<&G::nmtErosionForEachLayerDensity, Task::kLayers>,
+    resize<&G::nmtSliding, Task::kLayers>,
+    resize<&G::nmtTransitionBetweenLayers, Task::kLayers>,
+    resize<&G::nmtErosionLayer, Task::kLayers>,
+};
+
 constexpr LeaderRow kLeaders[] = {
-    {leader<&G::bathymetry>, kOfAreas},
-    {leader<&G::boundary>, kOfBoundaries},
-    {leader<&G::sourceSink>, kOfSources},
-    {leader<&G::nadComponent>, kOfComponents},
+    {leader<&G::bathymetry>, kOfAreas},         {leader<&G::boundary>, kOfBoundaries},
+    {leader<&G::sourceSink>, kOfSources},       {leader<&G::nadComponent>, kOfComponents},
+    {leader<&G::nmtTaskSelection>, kOfMudTask},
 };
 
 }  // namespace

@@ -2,6 +2,7 @@
 
 #include "advection_dispersion/result.h"
 #include "basic/module_selection.h"
+#include "mud_transport/result.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay {
@@ -20,6 +21,7 @@ ModuleOutput outputOf(CGlobalKvs& root) {
 
 constexpr std::array kOutputs{
     OutputRow{module::kAdvectionDispersion, outputOf<&CGlobalKvs::nadResult>},
+    OutputRow{module::kMudTransport, outputOf<&CGlobalKvs::nmtResult>},
 };
 
 }  // namespace

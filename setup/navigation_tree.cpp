@@ -13,6 +13,10 @@
 #include "hydrodynamic/infiltration.h"
 #include "hydrodynamic/resistance.h"
 #include "hydrodynamic/source_sink.h"
+#include "mud_transport/erosion_characteristics.h"
+#include "mud_transport/sliding.h"
+#include "mud_transport/starting_conditions.h"
+#include "mud_transport/task_selection.h"
 
 namespace gridbay {
 namespace {
@@ -250,6 +254,28 @@ void rule11MassBudget(CNavigationView& tree, CGlobalKvs& model) {
   showAll(tree, model.moduleSelection->HasMassBudget() && model.massBudget->GetCount() > 0, {21, 76, 119});
 }
 
+void rule12MudHotStart(CNavigationView& tree, CGlobalKvs& model) {
+  showAll(tree, !model.nmtStartingConditions->hotStart, {93, 105});
+}
+
+void rule13MudTask(CNavigationView& tree, CGlobalKvs& model) {
+  const bool isMultiFraction = model.nmtTaskSelection->multiFraction;
+  showAll(tree, isMultiFraction, {96, 95});
+  showAll(tree, !isMultiFraction, {98, 97, 59, 102, 106, 50, 47, 108});
+}
+
+void rule14ErosionCoefficients(CNavigationView& tree, CGlobalKvs& model) {
+  const bool byFactor = model.nmtMlErosionCharacteristics->useConstantErosionCoefficient != 0;
+  tree.Show(55, byFactor);
+  showAll(tree, !byFactor, {56, 57});
+}
+
+void rule15Sliding(CNavigationView& tree, CGlobalKvs& model) {
+  const CNmtSlidingKvs& sliding = *model.nmtSliding;
+  tree.Show(51, sliding.includeSliding != 0);
+  tree.Show(107, sliding.includeSliding != 0 && sliding.includeVariableSlidingCoefficient != 0);
+}
+
 void rule20Sliding(CNavigationView& tree, CGlobalKvs& model) {
   tree.Show(83, model.bathymetry->GetCount() < 2);
 }
@@ -267,6 +293,10 @@ constexpr void (*kRules[])(CNavigationView&, CGlobalKvs&) = {
     rule9Infiltration,           //
     rule10HeatExchange,          //
     rule11MassBudget,            //
+    rule12MudHotStart,           //
+    rule13MudTask,               //
+    rule14ErosionCoefficients,   //
+    rule15Sliding,               //
     rule20Sliding,               //
 };
 

@@ -34,6 +34,24 @@
 #include "hydrodynamic/surface_elevation_page.h"
 #include "hydrodynamic/wave_radiation_page.h"
 #include "hydrodynamic/wind_conditions_page.h"
+#include "mud_transport/bed_roughness_page.h"
+#include "mud_transport/boundary_page.h"
+#include "mud_transport/box_summation_page.h"
+#include "mud_transport/consolidation_page.h"
+#include "mud_transport/dispersion_coef_page.h"
+#include "mud_transport/erosion_characteristics_page.h"
+#include "mud_transport/erosion_for_each_layer_page.h"
+#include "mud_transport/initial_concentration_page.h"
+#include "mud_transport/line_discharge_page.h"
+#include "mud_transport/ml_settling_and_deposition_page.h"
+#include "mud_transport/result_page.h"
+#include "mud_transport/settling_and_desposition_page.h"
+#include "mud_transport/sliding_page.h"
+#include "mud_transport/source_sink_page.h"
+#include "mud_transport/starting_conditions_page.h"
+#include "mud_transport/task_selection_page.h"
+#include "mud_transport/transition_between_layers_page.h"
+#include "mud_transport/wave_data_page.h"
 #include "structures/culvert_page.h"
 #include "structures/dike_page.h"
 #include "structures/weir_page.h"
@@ -90,6 +108,35 @@ constexpr Entry kPages[] = {
     {"CNadBoxSummationDlg", make<CNadBoxSummationDlg>},
     {"CNadMassBudgetDlg", make<CNadMassBudgetDlg>},
     {"CNadResultDlg", make<CNadResultDlg>},
+    {"CNmtTaskSelectionDlg", make<CNmtTaskSelectionDlg>},
+    {"CNmtStartingConditionsDlg", make<CNmtStartingConditionsDlg>},
+    {"CNmtInitialConcentrationDlg", make<CNmtInitialConcentrationDlg>},
+    {"CNmtDispersionCoefDlg", make<CNmtDispersionCoefDlg>},
+    {"CNmtBoundaryDlg", make<CNmtBoundaryDlg>},
+    {"CNmtSourceSinkDlg", make<CNmtSourceSinkDlg>},
+    {"CNmtLineDischargeDlg", make<CNmtLineDischargeDlg>},
+    {"CNmtBoxSummationDlg", make<CNmtBoxSummationDlg>},
+    {"CNmtResultDlg", make<CNmtResultDlg>},
+    {"CNmtMfSettlingAndDepositionDlg", make<CNmtMfSettlingAndDepositionDlg>},
+    {"CNmtSettlingAndDespositionErosionDlg", make<CNmtSettlingAndDespositionErosionDlg>},
+    {"CNmtSettlingAndDespositionBedCompositionDlg", make<CNmtSettlingAndDespositionBedCompositionDlg>},
+    {"CNmtMlSettlingAndDepositionDlg", make<CNmtMlSettlingAndDepositionDlg>},
+    {"CNmtMfErosionCharacteristicsDlg", make<CNmtMfErosionCharacteristicsDlg>},
+    {"CNmtMlErosionCharacteristicsDlg", make<CNmtMlErosionCharacteristicsDlg>},
+    {"CNmtErosionLayerDlg", make<CNmtErosionLayerDlg>},
+    {"CNmtErosionForEachLayerCriticalDlg", make<CNmtErosionForEachLayerCriticalDlg>},
+    {"CNmtErosionForEachLayerFactorDlg", make<CNmtErosionForEachLayerFactorDlg>},
+    {"CNmtErosionForEachLayerFactor1Dlg", make<CNmtErosionForEachLayerFactor1Dlg>},
+    {"CNmtErosionForEachLayerFactor2Dlg", make<CNmtErosionForEachLayerFactor2Dlg>},
+    {"CNmtErosionForEachLayerDensityDlg", make<CNmtErosionForEachLayerDensityDlg>},
+    {"CNmtErosionForEachLayerPowerDlg", make<CNmtErosionForEachLayerPowerDlg>},
+    {"CNmtSlidingDlg", make<CNmtSlidingDlg>},
+    {"CNmtConstantSlidingDlg", make<CNmtConstantSlidingDlg>},
+    {"CNmtVariableSlidingDlg", make<CNmtVariableSlidingDlg>},
+    {"CNmtTransitionBetweenLayersDlg", make<CNmtTransitionBetweenLayersDlg>},
+    {"CNmtConsolidationDlg", make<CNmtConsolidationDlg>},
+    {"CNmtBedRoughnessDlg", make<CNmtBedRoughnessDlg>},
+    {"CNmtWaveDataDlg", make<CNmtWaveDataDlg>},
 };
 
 }  // namespace

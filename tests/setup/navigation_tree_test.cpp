@@ -11,6 +11,10 @@
 #include "hydrodynamic/infiltration.h"
 #include "hydrodynamic/resistance.h"
 #include "hydrodynamic/source_sink.h"
+#include "mud_transport/erosion_characteristics.h"
+#include "mud_transport/sliding.h"
+#include "mud_transport/starting_conditions.h"
+#include "mud_transport/task_selection.h"
 #include "tests/support/model.h"
 
 namespace gridbay {
@@ -193,6 +197,36 @@ TEST_F(NavigationTree, MassBudgetPagesNeedModuleSchemeAndPolygon) {
   EXPECT_FALSE(tree.IsShown(21));
 }
 
+TEST_F(NavigationTree, TheErosionOfLayersByOneFactorOrTwo) {
+  const auto shown = [this] {
+    tree.OnUpdate(&model.root);
+    std::string all;
+    for (const std::int32_t id : {55, 56, 57}) all += tree.IsShown(id) ? 'x' : '.';
+    return all;
+  };
+  EXPECT_EQ(shown(), "x..");
+  model.root.nmtMlErosionCharacteristics->useConstantErosionCoefficient = 0;
+  EXPECT_EQ(shown(), ".xx");
+  model.root.nmtMlErosionCharacteristics->useConstantErosionCoefficient = 1;
+  EXPECT_EQ(shown(), "x..");
+}
+
+TEST_F(NavigationTree, FrictionOfSlidingLayers) {
+  CNmtSlidingKvs& sliding = *model.root.nmtSliding;
+  const auto shown = [&](std::int32_t included, std::int32_t variable) {
+    sliding.includeSliding = included;
+    sliding.includeVariableSlidingCoefficient = variable;
+    tree.OnUpdate(&model.root);
+    std::string all;
+    for (const std::int32_t id : {51, 107}) all += tree.IsShown(id) ? 'x' : '.';
+    return all;
+  };
+  EXPECT_EQ(shown(0, 0), "..");
+  EXPECT_EQ(shown(0, 1), "..");
+  EXPECT_EQ(shown(1, 0), "x.");
+  EXPECT_EQ(shown(1, 1), "xx");
+}
+
 TEST_F(NavigationTree, ExpandedSlidingIsForOneArea) {
   rootsWith(8);
   EXPECT_TRUE(tree.IsVisible(83));
@@ -221,6 +255,31 @@ TEST_F(NavigationTree, WithoutADocumentNothingHappens) {
   tree.Show(27, false);
   tree.OnUpdate(nullptr);
   EXPECT_FALSE(tree.IsShown(27));
+}
+
+TEST_F(NavigationTree, AHotStartOfMudHidesWhatItsFileTells) {
+  for (const bool isHot : {true, false}) {
+    model.root.nmtStartingConditions->hotStart = isHot;
+    rootsWith(3);
+    EXPECT_EQ(tree.IsVisible(93), !isHot);
+    EXPECT_EQ(tree.IsVisible(105), !isHot);
+    EXPECT_TRUE(tree.IsVisible(104));
+  }
+}
+
+TEST_F(NavigationTree, TheTaskOfMudHasItsPages) {
+  for (const bool isMultiFraction : {true, false, true}) {
+    if (isMultiFraction) {
+      model.root.nmtTaskSelection->SetFractions(2);
+    } else {
+      model.root.nmtTaskSelection->SetLayers(2);
+    }
+    rootsWith(3);
+    for (const std::int32_t id : {96, 95, 101, 100}) EXPECT_EQ(tree.IsVisible(id), isMultiFraction) << id;
+    for (const std::int32_t id : {98, 97, 59, 102, 106, 50, 47, 108, 53})
+      EXPECT_EQ(tree.IsVisible(id), !isMultiFraction) << id;
+    EXPECT_TRUE(tree.IsVisible(48));
+  }
 }
 
 }  // namespace
