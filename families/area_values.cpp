@@ -7,4 +7,10 @@ int areaCount(CKvsBase& object) {
   return basic == nullptr ? 0 : basic->bathymetry->GetCount();
 }
 
+void requestAnyMap(CVdFileSelectorDlg& selector, CKvsBase& object, int number, const Text& description) {
+  requestMap(selector, object, number, description, {});
+  requestSimulationPeriod(selector, object);
+  selector.AllowOneTimeStep();
+}
+
 }  // namespace gridbay

@@ -18,7 +18,7 @@ unsigned checkMassFile(ValidationList& messages, CKvsBase& object, PageId page, 
   };
   check(item.polygon < 1 || item.polygon > polygons, texts::invalidPolygon);
   check(!isInTime, texts::timeRangeOutOfRange);
-  check(chosenCount(item.entries) == 0, texts::noItemSelected);
+  check(chosenCount(item.entries) + chosenCount(item.variables) == 0, texts::noItemSelected);
   check(item.file.empty(), texts::noOutputFile);
   return faults;
 }

@@ -23,6 +23,7 @@ struct MassFile {
   UResultFileName file;
   std::string title;
   EntryFlags entries{1};  // of the module; those without a flag are not chosen
+  EntryFlags variables;   // of the polygon as a whole, in a module that has such
 };
 
 // All mass files of a module, as a page sees them.
@@ -36,6 +37,8 @@ class MassFileList {
   virtual MassFile* GetMassFile(int number) = 0;
   // The module's entries by their names.
   virtual std::vector<std::string> entryNames() = 0;
+  // The further variables that a file can have.
+  virtual std::vector<std::string> variableNames() { return {}; }
 
  protected:
   ~MassFileList() = default;
@@ -49,6 +52,8 @@ unsigned checkMassFile(ValidationList& messages, CKvsBase& object, PageId page, 
 //   static constexpr auto entryRows()   the rows of the entries, as countThenNumbers(..., &MassFile::entries)
 //   using Item                          what an item holds: MassFile, or what derives from it
 //   static std::vector<std::string> entryNames(CKvsBase& object)
+// and where it has further variables
+//   static std::vector<std::string> variableNames()
 template <class Module>
 class MassFileKvs final : public TableKvs<MassFileKvs<Module>>, public Module::Item {
   using Self = MassFileKvs;
@@ -88,6 +93,13 @@ class MassFilesKvs : public ListKvs<MassFilesKvs<Module>, MassFileKvs<Module>>, 
   void SetCount(int count) override { List::SetCount(count); }
   MassFile* GetMassFile(int number) override { return this->GetItem(number); }
   std::vector<std::string> entryNames() override { return Module::entryNames(*this); }
+  std::vector<std::string> variableNames() override {
+    if constexpr (requires { Module::variableNames(); }) {
+      return Module::variableNames();
+    } else {
+      return {};
+    }
+  }
 };
 
 }  // namespace gridbay

@@ -1,3 +1,4 @@
+#include <algorithm>
 #include <array>
 
 #include "advection_dispersion/boundary.h"
@@ -41,6 +42,25 @@
 #include "mud_transport/starting_conditions.h"
 #include "mud_transport/task_selection.h"
 #include "mud_transport/transition_between_layers.h"
+#include "mud_transport_expanded/bed_density.h"
+#include "mud_transport_expanded/bed_roughness.h"
+#include "mud_transport_expanded/boundary.h"
+#include "mud_transport_expanded/const_friction_coef.h"
+#include "mud_transport_expanded/critical_shear_stress.h"
+#include "mud_transport_expanded/deposition.h"
+#include "mud_transport_expanded/dispersion_coef.h"
+#include "mud_transport_expanded/erosion_coefficient.h"
+#include "mud_transport_expanded/erosion_layer.h"
+#include "mud_transport_expanded/initial_conditions.h"
+#include "mud_transport_expanded/power_of_erosion.h"
+#include "mud_transport_expanded/result.h"
+#include "mud_transport_expanded/sand_fractions.h"
+#include "mud_transport_expanded/settling_par.h"
+#include "mud_transport_expanded/sources.h"
+#include "mud_transport_expanded/starting_conditions.h"
+#include "mud_transport_expanded/task_selection.h"
+#include "mud_transport_expanded/transition.h"
+#include "mud_transport_expanded/var_friction_coef.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay {
@@ -125,16 +145,31 @@ constexpr std::array kOfAreas{
     resizeAreas<&G::nmtTransitionBetweenLayers>,
     resize<&G::nmtBedRoughness>,
     resize<&G::nmtResult>,
+    resize<&G::nmtExpStartingConditions>,
+    resizeAreas<&G::nmtExpInitialConditions>,
+    resizeAreas<&G::nmtExpDispersionCoef>,
+    resizeAreas<&G::nmtExpDeposition>,
+    resizeAreas<&G::nmtExpSettlingPar>,
+    resizeAreas<&G::nmtExpErosionCoefficient>,
+    resizeAreas<&G::nmtExpCriticalShearStress>,
+    resizeAreas<&G::nmtExpBedDensity>,
+    resizeAreas<&G::nmtExpConstFrictionCoef>,
+    resize<&G::nmtExpVarFrictionCoef>,
+    resize<&G::nmtExpBedRoughness>,
+    resizeAreas<&G::nmtExpTransition>,
+    resize<&G::nmtExpResult>,
 };
 constexpr std::array kOfBoundaries{
     resize<&G::nhdBoundary>,
     resize<&G::nadBoundary>,
     resize<&G::nmtBoundary>,
+    resize<&G::nmtExpBoundary>,
 };
 constexpr std::array kOfSources{
     resize<&G::nhdSourceSink>,
     resize<&G::nadSourceSink>,
     resize<&G::nmtSourceSink>,
+    resize<&G::nmtExpSources>,
 };
 constexpr std::array kOfComponents{
     resize<&G::nadInitialConcentration>,    resize<&G::nadDecaySpecification>,
@@ -168,10 +203,38 @@ constexpr std::array kOfMudTask{
     resize<&G::nmtErosionLayer, Task::kLayers>,
 };
 
+// The counts of expanded mud transport.
+constexpr std::size_t kLayers = 0;
+constexpr std::size_t kFractions = 1;
+constexpr std::size_t kCarried = 2;  // the fractions, and salinity where it is included
+constexpr std::array<Follower, 14> kOfExpandedMud{
+    [](G& root, std::span<const int> counts) {
+      root.nmtExpInitialConditions->SetCounts(counts[kCarried], counts[kLayers], counts[kFractions]);
+    },
+    resizeConstants<&G::nmtExpBoundary, kCarried>,
+    resizeConstants<&G::nmtExpSources, kCarried>,
+    resize<&G::nmtExpSandFractions, kFractions>,
+    resize<&G::nmtExpDeposition, kFractions>,
+    resize<&G::nmtExpSettlingPar, kFractions>,
+    resize<&G::nmtExpErosionLayer, kLayers>,
+    resize<&G::nmtExpPowerOfErosion, kLayers>,
+    resize<&G::nmtExpErosionCoefficient, kLayers>,
+    resize<&G::nmtExpCriticalShearStress, kLayers>,
+    resize<&G::nmtExpBedDensity, kLayers>,
+    resize<&G::nmtExpConstFrictionCoef, kLayers>,
+    // Between two layers each: a count that is negative leaves none.
+    [](G& root, std::span<const int> counts) {
+      root.nmtExpTransition->SetCount(std::max(counts[kLayers] - 1, 0));
+    },
+    [](G& root, std::span<const int> counts) {
+      root.nmtExpResult->SetItemCounts(counts[kLayers], counts[kFractions]);
+    },
+};
+
 constexpr LeaderRow kLeaders[] = {
     {leader<&G::bathymetry>, kOfAreas},         {leader<&G::boundary>, kOfBoundaries},
     {leader<&G::sourceSink>, kOfSources},       {leader<&G::nadComponent>, kOfComponents},
-    {leader<&G::nmtTaskSelection>, kOfMudTask},
+    {leader<&G::nmtTaskSelection>, kOfMudTask}, {leader<&G::nmtExpTaskSelection>, kOfExpandedMud},
 };
 
 }  // namespace

@@ -3,6 +3,7 @@
 #include "advection_dispersion/result.h"
 #include "basic/module_selection.h"
 #include "mud_transport/result.h"
+#include "mud_transport_expanded/result.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay {
@@ -22,6 +23,7 @@ ModuleOutput outputOf(CGlobalKvs& root) {
 constexpr std::array kOutputs{
     OutputRow{module::kAdvectionDispersion, outputOf<&CGlobalKvs::nadResult>},
     OutputRow{module::kMudTransport, outputOf<&CGlobalKvs::nmtResult>},
+    OutputRow{module::kMudTransportExpanded, outputOf<&CGlobalKvs::nmtExpResult>},
 };
 
 }  // namespace

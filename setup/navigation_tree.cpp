@@ -17,6 +17,12 @@
 #include "mud_transport/sliding.h"
 #include "mud_transport/starting_conditions.h"
 #include "mud_transport/task_selection.h"
+#include "mud_transport_expanded/forcings.h"
+#include "mud_transport_expanded/sand_fractions.h"
+#include "mud_transport_expanded/sliding.h"
+#include "mud_transport_expanded/starting_conditions.h"
+#include "mud_transport_expanded/task_selection.h"
+#include "mud_transport_expanded/waves.h"
 
 namespace gridbay {
 namespace {
@@ -191,7 +197,7 @@ void showAll(CNavigationView& tree, bool shown, std::initializer_list<std::int32
   for (const std::int32_t id : ids) tree.Show(id, shown);
 }
 
-// The root item of a module beside those that every model has, and the one that an option of it adds.
+// The root item of a module beside those that every model has.
 struct ModuleRoots {
   std::int32_t code;
   std::int32_t ownRoot;  // 0 for hydrodynamics alone
@@ -202,15 +208,15 @@ constexpr ModuleRoots kModuleRoots[] = {
     {module::kMudTransport, 6}, {module::kMudTransportExpanded, 5}, {module::kEcological, 7},
 };
 
-// The rules by their numbers. Root 8 is an option of expanded mud transport, off until a model can turn it
-// on.
+// The rules by their numbers.
 
 void rule1ModuleRoots(CNavigationView& tree, CGlobalKvs& model) {
   const auto* found =
       std::ranges::find(kModuleRoots, model.moduleSelection->simulationType, &ModuleRoots::code);
   if (found == std::end(kModuleRoots)) return;
   showAll(tree, true, {2, 4});
-  for (const std::int32_t root : {3, 6, 5, 8, 7}) tree.Show(root, root == found->ownRoot);
+  for (const std::int32_t root : {3, 6, 5, 7}) tree.Show(root, root == found->ownRoot);
+  tree.Show(8, found->code == module::kMudTransportExpanded && model.nmtExpTaskSelection->includeXenobiotics);
 }
 
 void rule2HotStart(CNavigationView& tree, CGlobalKvs& model) {
@@ -276,8 +282,39 @@ void rule15Sliding(CNavigationView& tree, CGlobalKvs& model) {
   tree.Show(107, sliding.includeSliding != 0 && sliding.includeVariableSlidingCoefficient != 0);
 }
 
+// Only hides, as rule 5.
+void rule16ExpandedMudHotStart(CNavigationView& tree, CGlobalKvs& model) {
+  if (model.nmtExpStartingConditions->hotStart) showAll(tree, false, {86, 74});
+}
+
+void rule17Waves(CNavigationView& tree, CGlobalKvs& model) {
+  using Waves = CNmtExpWavesKvs;
+  const bool hasWaves = model.nmtExpForcings->includeWaves == 1;
+  const std::int32_t type = hasWaves ? model.nmtExpWaves->typeOfWaveVariation : 0;
+  tree.Show(92, hasWaves);
+  tree.Show(64, type == Waves::kConstant);
+  tree.Show(88, type == Waves::kVarying);
+  tree.Show(91, type == Waves::kDatabase);
+}
+
+void rule18Dredging(CNavigationView& tree, CGlobalKvs& model) {
+  tree.Show(70, model.nmtExpForcings->includeDredging == 1);
+}
+
+void rule19SandFractions(CNavigationView& tree, CGlobalKvs& model) {
+  tree.Show(80, model.nmtExpSandFractions->hasSand());
+}
+
 void rule20Sliding(CNavigationView& tree, CGlobalKvs& model) {
   tree.Show(83, model.bathymetry->GetCount() < 2);
+}
+
+void rule21SlidingCoefficients(CNavigationView& tree, CGlobalKvs& model) {
+  const CNmtExpSlidingKvs& sliding = *model.nmtExpSliding;
+  const bool isOn = sliding.includeSliding == 1;
+  const bool varies = sliding.includeVariableCoefficient != 0;
+  tree.Show(89, isOn && varies);
+  tree.Show(65, isOn && (!varies || model.nmtExpTaskSelection->layers >= 2));
 }
 
 // In this order. Nothing is remembered between runs.
@@ -297,7 +334,12 @@ constexpr void (*kRules[])(CNavigationView&, CGlobalKvs&) = {
     rule13MudTask,               //
     rule14ErosionCoefficients,   //
     rule15Sliding,               //
+    rule16ExpandedMudHotStart,   //
+    rule17Waves,                 //
+    rule18Dredging,              //
+    rule19SandFractions,         //
     rule20Sliding,               //
+    rule21SlidingCoefficients,   //
 };
 
 }  // namespace

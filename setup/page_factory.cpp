@@ -52,6 +52,35 @@
 #include "mud_transport/task_selection_page.h"
 #include "mud_transport/transition_between_layers_page.h"
 #include "mud_transport/wave_data_page.h"
+#include "mud_transport_expanded/bed_density_page.h"
+#include "mud_transport_expanded/bed_roughness_page.h"
+#include "mud_transport_expanded/boundary_page.h"
+#include "mud_transport_expanded/const_friction_coef_page.h"
+#include "mud_transport_expanded/critical_shear_stress_page.h"
+#include "mud_transport_expanded/deposition_page.h"
+#include "mud_transport_expanded/dispersion_coef_page.h"
+#include "mud_transport_expanded/dredgings_page.h"
+#include "mud_transport_expanded/erosion_coefficient_page.h"
+#include "mud_transport_expanded/erosion_layer_page.h"
+#include "mud_transport_expanded/forcings_page.h"
+#include "mud_transport_expanded/initial_conditions_page.h"
+#include "mud_transport_expanded/line_discharge_page.h"
+#include "mud_transport_expanded/mass_budget_page.h"
+#include "mud_transport_expanded/morphology_page.h"
+#include "mud_transport_expanded/power_of_erosion_page.h"
+#include "mud_transport_expanded/result_page.h"
+#include "mud_transport_expanded/sand_fractions_page.h"
+#include "mud_transport_expanded/settling_par_page.h"
+#include "mud_transport_expanded/settlings_page.h"
+#include "mud_transport_expanded/sliding_page.h"
+#include "mud_transport_expanded/sources_page.h"
+#include "mud_transport_expanded/starting_conditions_page.h"
+#include "mud_transport_expanded/task_selection_page.h"
+#include "mud_transport_expanded/transition_page.h"
+#include "mud_transport_expanded/var_friction_coef_page.h"
+#include "mud_transport_expanded/water_col_parameters_page.h"
+#include "mud_transport_expanded/wave_database_page.h"
+#include "mud_transport_expanded/waves_page.h"
 #include "structures/culvert_page.h"
 #include "structures/dike_page.h"
 #include "structures/weir_page.h"
@@ -137,6 +166,37 @@ constexpr Entry kPages[] = {
     {"CNmtConsolidationDlg", make<CNmtConsolidationDlg>},
     {"CNmtBedRoughnessDlg", make<CNmtBedRoughnessDlg>},
     {"CNmtWaveDataDlg", make<CNmtWaveDataDlg>},
+    {"CNmtExpBedDensityDlg", make<CNmtExpBedDensityDlg>},
+    {"CNmtExpBedRoughnessDlg", make<CNmtExpBedRoughnessDlg>},
+    {"CNmtExpConstFrictionCoefDlg", make<CNmtExpConstFrictionCoefDlg>},
+    {"CNmtExpCriticalShearStressDlg", make<CNmtExpCriticalShearStressDlg>},
+    {"CNmtExpDepositionDlg", make<CNmtExpDepositionDlg>},
+    {"CNmtExpDredgingsDlg", make<CNmtExpDredgingsDlg>},
+    {"CNmtExpErosionCoefficientDlg", make<CNmtExpErosionCoefficientDlg>},
+    {"CNmtExpErosionLayer", make<CNmtExpErosionLayer>},
+    {"CNmtExpMorphologyDlg", make<CNmtExpMorphologyDlg>},
+    {"CNmtExpPowerOfErosionDlg", make<CNmtExpPowerOfErosionDlg>},
+    {"CNmtExpSandFractionsDlg", make<CNmtExpSandFractionsDlg>},
+    {"CNmtExpSettlingParDlg", make<CNmtExpSettlingParDlg>},
+    {"CNmtExpSettlingsDlg", make<CNmtExpSettlingsDlg>},
+    {"CNmtExpSlidingDlg", make<CNmtExpSlidingDlg>},
+    {"CNmtExpTransitionDlg", make<CNmtExpTransitionDlg>},
+    {"CNmtExpVarFrictionCoefDlg", make<CNmtExpVarFrictionCoefDlg>},
+    {"CNmtExpWaterColParametersDlg", make<CNmtExpWaterColParametersDlg>},
+    {"CNmtExpStartingConditionsDlg", make<CNmtExpStartingConditionsDlg>},
+    {"CNmtExpTaskSelectionDlg", make<CNmtExpTaskSelectionDlg>},
+    {"CNmtExpInitialConditionsDlg", make<CNmtExpInitialConditionsDlg>},
+    {"CNmtExpDispersionCoefDlg", make<CNmtExpDispersionCoefDlg>},
+    {"CNmtExpBoundaryDlg", make<CNmtExpBoundaryDlg>},
+    {"CNmtExpSourcesDlg", make<CNmtExpSourcesDlg>},
+    {"CNmtExpForcingsDlg", make<CNmtExpForcingsDlg>},
+    {"CNmtExpWavesDlg", make<CNmtExpWavesDlg>},
+    {"CNmtExpTSVWaves", make<CNmtExpTSVWaves>},
+    {"CNmtExpConstantWavesDlg", make<CNmtExpConstantWavesDlg>},
+    {"CNmtExpWaveDatabaseDlg", make<CNmtExpWaveDatabaseDlg>},
+    {"CNmtExpMassBudgetDlg", make<CNmtExpMassBudgetDlg>},
+    {"CNmtExpLineDischargeDlg", make<CNmtExpLineDischargeDlg>},
+    {"CNmtExpResultDlg", make<CNmtExpResultDlg>},
 };
 
 }  // namespace

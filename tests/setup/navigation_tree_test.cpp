@@ -15,6 +15,12 @@
 #include "mud_transport/sliding.h"
 #include "mud_transport/starting_conditions.h"
 #include "mud_transport/task_selection.h"
+#include "mud_transport_expanded/forcings.h"
+#include "mud_transport_expanded/sand_fractions.h"
+#include "mud_transport_expanded/sliding.h"
+#include "mud_transport_expanded/starting_conditions.h"
+#include "mud_transport_expanded/task_selection.h"
+#include "mud_transport_expanded/waves.h"
 #include "tests/support/model.h"
 
 namespace gridbay {
@@ -237,6 +243,85 @@ TEST_F(NavigationTree, ExpandedSlidingIsForOneArea) {
   model.root.bathymetry->SetNoAreas(1);
   tree.OnUpdate(&model.root);
   EXPECT_TRUE(tree.IsVisible(83));
+}
+
+TEST_F(NavigationTree, XenobioticsAreAnOptionOfExpandedMudTransport) {
+  model.root.nmtExpTaskSelection->includeXenobiotics = true;
+  EXPECT_EQ(rootsWith(8), (Ids{1, 2, 4, 5, 8}));
+  EXPECT_EQ(rootsWith(3), (Ids{1, 2, 4, 6}));
+  EXPECT_EQ(rootsWith(8), (Ids{1, 2, 4, 5, 8}));
+  model.root.nmtExpTaskSelection->includeXenobiotics = false;
+  EXPECT_EQ(rootsWith(8), (Ids{1, 2, 4, 5}));
+}
+
+TEST_F(NavigationTree, AHotStartOfExpandedMudTransportHidesTwoPagesForGood) {
+  rootsWith(8);
+  EXPECT_TRUE(tree.IsVisible(86) && tree.IsVisible(74));
+  model.root.nmtExpStartingConditions->hotStart = true;
+  tree.OnUpdate(&model.root);
+  EXPECT_FALSE(tree.IsVisible(86) || tree.IsVisible(74));
+  model.root.nmtExpStartingConditions->hotStart = false;
+  tree.OnUpdate(&model.root);
+  EXPECT_FALSE(tree.IsVisible(86) || tree.IsVisible(74));
+  tree.OnInitialUpdate(&model.root);
+  EXPECT_TRUE(tree.IsVisible(86) && tree.IsVisible(74));
+}
+
+TEST_F(NavigationTree, ExpandedWavesShowThePageOfTheirType) {
+  rootsWith(8);
+  const auto shown = [this](int included, int type) {
+    model.root.nmtExpForcings->includeWaves = included;
+    model.root.nmtExpWaves->typeOfWaveVariation = type;
+    tree.OnUpdate(&model.root);
+    std::string all;
+    for (const std::int32_t id : {92, 64, 88, 91}) all += tree.IsShown(id) ? 'x' : '.';
+    return all;
+  };
+  EXPECT_EQ(shown(0, 1), "....");
+  EXPECT_EQ(shown(1, 1), "xx..");
+  EXPECT_EQ(shown(1, 2), "x.x.");
+  EXPECT_EQ(shown(1, 3), "x..x");
+  EXPECT_EQ(shown(1, 4), "x...");
+  EXPECT_EQ(shown(2, 3), "....");
+}
+
+TEST_F(NavigationTree, ExpandedDredgingWhereItIsIncluded) {
+  rootsWith(8);
+  EXPECT_FALSE(tree.IsVisible(70));
+  model.root.nmtExpForcings->includeDredging = 1;
+  tree.OnUpdate(&model.root);
+  EXPECT_TRUE(tree.IsVisible(70));
+}
+
+TEST_F(NavigationTree, ExpandedSandFractionsWhereThereAreSome) {
+  rootsWith(8);
+  EXPECT_FALSE(tree.IsVisible(80));
+  model.root.nmtExpSandFractions->sandFractionDescription = 1;
+  tree.OnUpdate(&model.root);
+  EXPECT_TRUE(tree.IsVisible(80));
+  model.root.nmtExpSandFractions->sandFractionDescription = 2;
+  tree.OnUpdate(&model.root);
+  EXPECT_FALSE(tree.IsVisible(80));
+}
+
+TEST_F(NavigationTree, ExpandedSlidingHasThePagesOfItsCoefficients) {
+  rootsWith(8);
+  const auto shown = [this](int sliding, int variable, int layers) {
+    model.root.nmtExpSliding->includeSliding = sliding;
+    model.root.nmtExpSliding->includeVariableCoefficient = variable;
+    model.root.nmtExpTaskSelection->SetCounts(layers, 1, false);
+    tree.OnUpdate(&model.root);
+    return std::string(tree.IsVisible(65) ? "constant " : "") + (tree.IsVisible(89) ? "variable" : "");
+  };
+  EXPECT_EQ(shown(0, 0, 2), "");
+  EXPECT_EQ(shown(0, 1, 2), "");
+  EXPECT_EQ(shown(2, 1, 2), "");
+  EXPECT_EQ(shown(1, 0, 1), "constant ");
+  EXPECT_EQ(shown(1, 0, 2), "constant ");
+  EXPECT_EQ(shown(1, 1, 1), "variable");
+  EXPECT_EQ(shown(1, 2, 2), "constant variable");
+  model.root.bathymetry->SetNoAreas(2);  // their parent is gone
+  EXPECT_EQ(shown(1, 1, 2), "");
 }
 
 TEST_F(NavigationTree, AHiddenParentHidesItsChildrenAndKeepsTheirFlags) {
