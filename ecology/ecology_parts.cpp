@@ -1,7 +1,20 @@
 #include "ecology/ecology_parts.h"
 
 #include "core/model_root.h"
-#include "ecology/pending.h"
+#include "ecology/boundary.h"
+#include "ecology/constants.h"
+#include "ecology/deposition.h"
+#include "ecology/dispersion.h"
+#include "ecology/evaporation.h"
+#include "ecology/forcings.h"
+#include "ecology/infiltration.h"
+#include "ecology/initial_conditions.h"
+#include "ecology/mass_budget.h"
+#include "ecology/model_definition.h"
+#include "ecology/precipitation.h"
+#include "ecology/results.h"
+#include "ecology/source_sink.h"
+#include "ecology/starting_conditions.h"
 
 namespace gridbay {
 

@@ -68,11 +68,11 @@ class AreaValuesKvs : public ListKvs<Self, Item> {
 
   static constexpr auto table() { return keywords(items("AREA_%d")); }
 
-  // Number of the entry, from 1.
-  unsigned Validate(ValidationList& messages, int deep, int entry) {
+  // Number of the entry, from 1. What is given further goes to each item's check.
+  unsigned Validate(ValidationList& messages, int deep, int entry, const auto&... further) {
     unsigned faults = 0;
     for (int area = 1; deep != 0 && area <= this->GetCount(); ++area)
-      faults += this->GetItem(area)->Validate(messages, deep, entry, area);
+      faults += this->GetItem(area)->Validate(messages, deep, entry, area, further...);
     return faults;
   }
 };

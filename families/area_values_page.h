@@ -23,6 +23,11 @@ class AreaValuesGrid : public BandedGrid {
   virtual Entry* EntryAt(int number) = 0;
   // The item code of the entry's values.
   virtual int Quantity(int number) = 0;
+  // The tool tip of a value; empty for that of its quantity.
+  virtual std::string ValueTip(int) { return {}; }
+  // Whether there is a column with the unit of the values, and what it says.
+  virtual bool HasUnits() { return false; }
+  virtual std::string UnitOf(int) { return {}; }
   // What a value is given as, the constant first; and the kind of the file for any other.
   virtual Choices Formats() = 0;
   virtual FileKind KindOfFile(std::int32_t format) = 0;
@@ -32,6 +37,12 @@ class AreaValuesGrid : public BandedGrid {
   int BandSize(int item) override {
     const Entry* entry = EntryAt(item);
     return entry == nullptr ? 0 : entry->GetCount();
+  }
+  // All have a value for each area, so that a row is found at once in a list of many.
+  int dataRows() override { return EntryCount() * (1 + BandSize(1)); }
+  GridRow rowAt(int n) override {
+    const int size = 1 + BandSize(1);
+    return {(n - 1) / size + 1, (n - 1) % size};
   }
   std::string CornerHeader() override { return "Area"; }
   int RowHeaderWidth() override { return 50; }
@@ -54,9 +65,15 @@ class AreaValuesGrid : public BandedGrid {
       value(row)->RequestDataFile(selector, row.item, row.sub);
     };
     List("Type", 100, given, &AreaValue::format, Formats());
-    Number("Value", 60, given, &AreaValue::value, [this](GridRow row) {
-      return Quantity(row.item);
-    }).EnabledIf([given](GridRow row) { return given(row)->format == AreaValue::kConstant; });
+    Column& constant =
+        Number("Value", 60, given, &AreaValue::value, [this](GridRow row) {
+          return Quantity(row.item);
+        }).EnabledIf([given](GridRow row) { return given(row)->format == AreaValue::kConstant; });
+    constant.Tip([this, ofQuantity = constant.tip](GridRow row) {
+      const std::string tip = ValueTip(row.item);
+      return tip.empty() ? ofQuantity(row) : tip;
+    });
+    if (HasUnits()) Shown("Unit", 60, [this](GridRow row) { return UnitOf(row.item); });
     File({.file = fileOf(value, &AreaValue::file, kind, request), .enabled = isFile});
   }
 };

@@ -17,6 +17,7 @@ class BoundaryValuesKvs : public EntryConstantsKvs<Self, Module> {
 
   // Number of the boundary, from 1.
   unsigned Validate(ValidationList& messages, int, int number) {
+    if (this->format == kConstant) return this->CheckConstants(messages, number);
     if (this->format != kTimeSeries && this->format != kProfile) return 0;
     CVdFileSelectorDlg selector;
     RequestDataFile(selector, number);

@@ -4,6 +4,7 @@
 
 #include "basic/boundary.h"
 #include "families/data_files.h"
+#include "families/entry_constants.h"
 #include "families/root_member.h"
 #include "families/transport_page_texts.h"
 #include "pages/cell_grid.h"
@@ -56,9 +57,12 @@ class BoundaryConstantsGrid : public ColumnGrid {
         auto* held = values({boundary});
         return constant(row) != nullptr && held->format == std::remove_pointer_t<decltype(held)>::kConstant;
       };
-      Number(formatted(texts::boundaryHeader, boundary), 90, constant, [this](GridRow row) {
-        return Module::quantity(GetKvs(), row.item);
-      }).EnabledIf(isConstant);
+      [[maybe_unused]] Column& column =
+          Number(formatted(texts::boundaryHeader, boundary), 90, constant, [this](GridRow row) {
+            return Module::quantity(GetKvs(), row.item);
+          }).EnabledIf(isConstant);
+      if constexpr (HasTips<Module>)
+        column.Tip([this](GridRow row) { return Module::tip(GetKvs(), document().units(), row.item); });
     }
   }
 };

@@ -5,7 +5,11 @@
 namespace gridbay {
 
 // What settles on the surface, and what comes from the soil, by entry and area. `Surface` and `Soil` are
-// AreaValuesKvs, and the two lists are of one length always.
+// AreaValuesKvs, and the two lists are of one length always. An entry may have
+//   void Bind(int number)    by which it knows what it is of
+// `Self` has kEntrySection, the numbered sections of the entries, or
+//   static constexpr auto entryItems(list)    the row of the list whose member this is
+// and it may have kSurface and kSoil, which the checks of an item get to tell the two apart.
 template <class Self, class Surface, class Soil>
 class DepositionKvs : public TableKvs<Self> {
  public:
@@ -18,9 +22,9 @@ class DepositionKvs : public TableKvs<Self> {
 
   static constexpr auto table() {
     return section(Self::kSection, keyword("IncludeSurfaceDeposition", &DepositionKvs::includeSurface),
-                   section("SurfaceDeposition", items(Self::kEntrySection, &DepositionKvs::surface)),
+                   section("SurfaceDeposition", entryRow(&DepositionKvs::surface)),
                    keyword("IncludeSoilDeposition", &DepositionKvs::includeSoil),
-                   section("SoilDeposition", items(Self::kEntrySection, &DepositionKvs::soil)));
+                   section("SoilDeposition", entryRow(&DepositionKvs::soil)));
   }
 
   int GetCount() const { return surface.GetCount(); }
@@ -40,16 +44,32 @@ class DepositionKvs : public TableKvs<Self> {
   // What is not included is not checked.
   unsigned Validate(ValidationList& messages, int deep) override {
     unsigned faults = 0;
-    for (int entry = 1; includeSurface && entry <= surface.GetCount(); ++entry)
-      faults += surface.GetItem(entry)->Validate(messages, deep, entry);
-    for (int entry = 1; includeSoil && entry <= soil.GetCount(); ++entry)
-      faults += soil.GetItem(entry)->Validate(messages, deep, entry);
+    const auto check = [&](auto& list, const auto&... which) {
+      for (int entry = 1; entry <= list.GetCount(); ++entry)
+        faults += list.GetItem(entry)->Validate(messages, deep, entry, which...);
+    };
+    if constexpr (requires { Self::kSurface; }) {
+      if (includeSurface) check(surface, Self::kSurface);
+      if (includeSoil) check(soil, Self::kSoil);
+    } else {
+      if (includeSurface) check(surface);
+      if (includeSoil) check(soil);
+    }
     return faults;
   }
 
  private:
   template <class Entry>
-  static void setUp(CKvsBase& owner, Entry& entry, int) {
+  static constexpr auto entryRow(ItemList<Entry> DepositionKvs::*list) {
+    if constexpr (requires { Self::kEntrySection; }) {
+      return items(Self::kEntrySection, list);
+    } else {
+      return Self::entryItems(list);
+    }
+  }
+  template <class Entry>
+  static void setUp(CKvsBase& owner, Entry& entry, int number) {
+    if constexpr (requires { entry.Bind(number); }) entry.Bind(number);
     entry.SetCount(areaCount(owner));
   }
 };

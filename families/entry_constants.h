@@ -3,9 +3,12 @@
 #include <cstdint>
 #include <string>
 #include <tuple>
+#include <type_traits>
 #include <vector>
 
 #include "core/list_kvs.h"
+#include "core/selections.h"
+#include "platform/units/edit_style.h"
 
 // What a module carries with the water: components, fractions or state variables. The templates of this room
 // call each of them an entry, number them from 1, and know the module as a class of static functions, where
@@ -13,20 +16,30 @@
 //
 //   struct Entries {
 //     using Value = float;                                           of a constant
-//     using File = UFileName;                                        of a data file
+//     using File = UFileName;                                        of a data file, or UTsbSelection
 //     static int count(CKvsBase& object);
 //     static std::string name(CKvsBase& object, int entry);          at the head of its row or column
 //     static int quantity(CKvsBase& object, int entry);              the item code of its concentration
 //     static int sourceQuantity(CKvsBase& object, int entry, int source);   of what a source brings, from 1
 //     static void requestItems(CVdFileSelectorDlg& selector, CKvsBase& object);    what a file must have
 //     static void requestSourceItems(CVdFileSelectorDlg& selector, CKvsBase& object, int source);
+//     static std::string tip(CKvsBase& object, const UnitChoices& units, int entry);   of a constant's cell;
+//                                                                    may be left out, for that of its
+//                                                                    quantity
 //   };
 
 namespace gridbay {
 
+template <class Module>
+concept HasTips = requires(CKvsBase& object, const UnitChoices& units) {
+  Module::tip(object, units, 1);
+};
+
 // Concentrations as a constant for each entry, or from a data file with an item for each. `Self` may have
 //   Value newConstant(int entry)          in place of 0
 //   int numberOnFile(int entry) const     where the numbers on file have another order than the entries
+//   unsigned CheckConstant(ValidationList& messages, int place, int entry)   a check of one constant, at
+//                                         place `place` of a list; it returns the number of faults
 template <class Self, class Module>
 class EntryConstantsKvs : public TableKvs<Self> {
  public:
@@ -38,9 +51,11 @@ class EntryConstantsKvs : public TableKvs<Self> {
   std::vector<Value> constants;  // base units
   typename Module::File file;
 
-  // Constants come and go at the tail. A negative count does nothing.
+  // Constants come and go at the tail, and so do the items of a file that has such to choose. A negative
+  // count does nothing.
   void SetNoConstants(int n) {
     if (n < 0) return;
+    if constexpr (kHasItems) file.SetNoItems(n);
     auto entry = static_cast<int>(constants.size());
     constants.resize(static_cast<std::size_t>(n));
     if constexpr (requires(Self & self) { self.newConstant(1); }) {
@@ -60,6 +75,17 @@ class EntryConstantsKvs : public TableKvs<Self> {
   }
   void RemoveHeadConstant() {
     if (!constants.empty()) constants.erase(constants.begin());
+  }
+  // All as new, for other entries.
+  void Rebuild() {
+    if constexpr (requires { Self::kFormat; }) {
+      format = Self::kFormat;
+    } else {
+      format = 0;
+    }
+    file = typename Module::File();
+    constants.clear();
+    SetNoConstants(Module::count(*this));
   }
   // The constant of an entry, or null for one that has none.
   Value* Constant(int entry) {
@@ -104,8 +130,28 @@ class EntryConstantsKvs : public TableKvs<Self> {
   };
 
   static constexpr auto table() {
-    return keywords(keyword("Data_Format", &EntryConstantsKvs::format), ConstantsRow{},
-                    keyword("FILE_NAME", &EntryConstantsKvs::file));
+    return keywords(keyword("Data_Format", &EntryConstantsKvs::format), ConstantsRow{}, fileRow());
+  }
+
+ protected:
+  unsigned CheckConstants(ValidationList& messages, int place = 0) {
+    unsigned faults = 0;
+    if constexpr (requires(Self & self) { self.CheckConstant(messages, place, 1); }) {
+      for (int entry = 1; entry <= static_cast<int>(constants.size()); ++entry)
+        faults += static_cast<Self&>(*this).CheckConstant(messages, place, entry);
+    }
+    return faults;
+  }
+
+ private:
+  static constexpr bool kHasItems = std::is_same_v<typename Module::File, UTsbSelection>;
+
+  static constexpr auto fileRow() {
+    if constexpr (kHasItems) {
+      return selection(&EntryConstantsKvs::file);
+    } else {
+      return keyword("FILE_NAME", &EntryConstantsKvs::file);
+    }
   }
 };
 
@@ -131,6 +177,10 @@ class EntryConstantsListKvs : public ListKvs<Self, Item> {
   }
   void RemoveHeadConstant() {
     for (int number = 1; number <= this->GetCount(); ++number) this->GetItem(number)->RemoveHeadConstant();
+  }
+  // The module has other entries now.
+  void Rebuild() {
+    for (int number = 1; number <= this->GetCount(); ++number) this->GetItem(number)->Rebuild();
   }
 };
 

@@ -66,6 +66,35 @@ struct ChosenRow {
   }
 };
 
+// A flag for each entry, 0 or 1, all under one keyword. On load flags that it lacks stay as they are, and
+// those without an entry are passed over.
+template <class Object>
+struct FlagsRow {
+  std::string_view name;
+  EntryFlags Object::*member;
+
+  void save(const Object& object, KvsFile& file, const std::string&) const {
+    kvsAddKeyword(file, name);
+    for (const std::uint8_t flag : object.*member) kvsAddInt(file, flag);
+  }
+  void load(Object& object, KvsSection from, const std::string&) const {
+    const KvsKeyword flags = kvsKeywordByNameNum(from, name, 1);
+    if (flags == nullptr) return;
+    int place = 0;
+    for (std::uint8_t& flag : object.*member) {
+      if (++place > kvsGetNoParams(flags)) break;
+      flag = kvsGetInt(kvsParamByNum(flags, place)) != 0 ? 1 : 0;
+    }
+  }
+  void copy(Object& object, const Object& other) const { object.*member = other.*member; }
+  constexpr auto members() const { return std::tuple(member); }
+};
+
+template <class Object>
+constexpr FlagsRow<Object> entryFlags(std::string_view name, EntryFlags Object::*member) {
+  return {name, member};
+}
+
 // The numbers, and then their count. A load begins with no entry chosen.
 template <class Object>
 struct NumbersThenCount : ChosenRow<Object> {

@@ -40,7 +40,7 @@ class ResultFileGrid : public ColumnGrid {
 
 // A row for each area: its hot start file. `results` is the member of a room that holds the module's results,
 // with the files in `hotStarts` and the flag `generateHotStart`.
-template <auto results>
+template <auto results, const FileKind& kind = texts::hotStartResultFile>
 class ResultHotStartGrid final : public ResultFileGrid {
   using Room = decltype(result_pages_detail::roomOf(results));
 
@@ -52,7 +52,7 @@ class ResultHotStartGrid final : public ResultFileGrid {
     const Column::Rule isOn = [holder](GridRow) { return holder().generateHotStart; };
     using HotStart = std::remove_pointer_t<decltype(hotStart(GridRow{}))>;
     Rows([holder] { return holder().hotStarts.GetCount(); });
-    const FileChoice file = resultFileOf(hotStart, &HotStart::file, texts::hotStartResultFile);
+    const FileChoice file = resultFileOf(hotStart, &HotStart::file, kind);
     FileName("Hot Start File", 230, file).EnabledIf(isOn);
     BrowseBeside(file).EnabledIf(isOn);
     Text("Title", 140, hotStart, &HotStart::title).EnabledIf(isOn);

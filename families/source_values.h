@@ -16,7 +16,8 @@ class SourceValuesKvs : public EntryConstantsKvs<Self, Module> {
 
   // Number of the source, from 1, which says what it is.
   unsigned Validate(ValidationList& messages, int, int number) {
-    if (this->format <= kConstant) return 0;
+    if (this->format == kConstant) return this->CheckConstants(messages, number);
+    if (this->format < kConstant) return 0;
     CVdFileSelectorDlg selector;
     RequestDataFile(selector, number);
     return checkDataFile(messages, Self::kPage, selector, this->file);

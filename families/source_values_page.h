@@ -4,6 +4,7 @@
 
 #include "basic/source_sink.h"
 #include "families/data_files.h"
+#include "families/entry_constants.h"
 #include "families/transport_page_texts.h"
 #include "pages/cell_grid.h"
 
@@ -34,11 +35,14 @@ class SourceValuesGrid : public ColumnGrid {
         .EnabledIf(isSource);
     for (int entry = 1; entry <= LayoutKey(); ++entry) {
       const auto constant = [values, entry](GridRow row) { return values(row)->Constant(entry); };
-      Number(Module::name(GetKvs(), entry), 80, constant, [this, entry](GridRow row) {
-        return Module::sourceQuantity(GetKvs(), entry, row.item);
-      }).EnabledIf([constant, isConstant = hasFormat(Values::kConstant)](GridRow row) {
-        return isConstant(row) && constant(row) != nullptr;
-      });
+      [[maybe_unused]] Column& column =
+          Number(Module::name(GetKvs(), entry), 80, constant, [this, entry](GridRow row) {
+            return Module::sourceQuantity(GetKvs(), entry, row.item);
+          }).EnabledIf([constant, isConstant = hasFormat(Values::kConstant)](GridRow row) {
+            return isConstant(row) && constant(row) != nullptr;
+          });
+      if constexpr (HasTips<Module>)
+        column.Tip([this, entry](GridRow) { return Module::tip(GetKvs(), document().units(), entry); });
     }
     File({.file = fileOf(values, &Values::file, texts::timeSeriesFile, &Values::RequestDataFile),
           .header = "File name",

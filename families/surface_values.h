@@ -9,6 +9,7 @@ namespace gridbay {
 // `Self::kSection`. A new one has the format `Self::kFormat`; `Self::kPage` is the page of its messages.
 // `Self` may have
 //   bool Applies()    whether there is such water: without it nothing is checked
+//   static constexpr Text kFileNotValid    in place of the usual text for a file that is not what it must be
 template <class Self, class Module>
 class SurfaceValuesKvs : public EntryConstantsKvs<Self, Module> {
  public:
@@ -26,10 +27,17 @@ class SurfaceValuesKvs : public EntryConstantsKvs<Self, Module> {
     if constexpr (requires(Self & self) { self.Applies(); }) {
       if (!static_cast<Self&>(*this).Applies()) return 0;
     }
+    if (this->format == kConstant) return this->CheckConstants(messages);
     if (!IsFile()) return 0;
     CVdFileSelectorDlg selector;
     RequestDataFile(selector);
-    return checkDataFile(messages, Self::kPage, selector, this->file);
+    if constexpr (requires { Self::kFileNotValid; }) {
+      ValidationList usual;
+      if (checkDataFile(usual, Self::kPage, selector, this->file) == 0) return 0;
+      return report(messages, Self::kPage, Severity::fault, Self::kFileNotValid, this->file.fileName.text());
+    } else {
+      return checkDataFile(messages, Self::kPage, selector, this->file);
+    }
   }
 
   // What the data file must be: an item for each entry, and a map of Area 1 where it is one.

@@ -2,6 +2,7 @@
 
 #include <string>
 
+#include "families/entry_constants.h"
 #include "families/root_member.h"
 #include "families/transport_page_texts.h"
 #include "pages/cell_grid.h"
@@ -20,7 +21,10 @@ class SurfaceValuesGrid : public ColumnGrid {
       auto& values = rootMember<member>(GetKvs());
       return values.format == values.kConstant ? values.Constant(row.item) : nullptr;
     };
-    Number("Value", 120, constant, [this](GridRow row) { return Module::quantity(GetKvs(), row.item); });
+    [[maybe_unused]] Column& column =
+        Number("Value", 120, constant, [this](GridRow row) { return Module::quantity(GetKvs(), row.item); });
+    if constexpr (HasTips<Module>)
+      column.Tip([this](GridRow row) { return Module::tip(GetKvs(), document().units(), row.item); });
   }
 };
 

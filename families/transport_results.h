@@ -60,8 +60,7 @@ class TransportOutputKvs final : public TableKvs<TransportOutputKvs<page>>, publ
 //   bool hydrodynamicHotStart()   whether the flow calculation writes hot start files: only then does this
 //   int valuesAtPoint(const Output&)   that are written at each point and step
 //   int itemsOfHotStart()   in the hot start file of an area
-// `Output` may have
-//   void startItems()   gives a new one its choice of what is written
+// An output may have a Rebuild() of its own, for what it chooses of the module's entries.
 template <class Self, class Output, PageId page>
 class TransportResultsKvs : public TableKvs<Self> {
  public:
@@ -138,7 +137,7 @@ class TransportResultsKvs : public TableKvs<Self> {
 
   static void startOutput(CKvsBase& owner, Output& output, int number) {
     startTransportOutput(output, owner, number);
-    if constexpr (requires { output.startItems(); }) output.startItems();
+    if constexpr (requires { output.Rebuild(); }) output.Rebuild();
   }
   Self& self() { return static_cast<Self&>(*this); }
 };

@@ -124,7 +124,7 @@ void CNmtExpResultObjectKvs::SetItemCounts(int newLayers, int newFractions) {
   fractions = newFractions;
 }
 
-void CNmtExpResultObjectKvs::startItems() {
+void CNmtExpResultObjectKvs::Rebuild() {
   SetItemCounts(layerCount(*this), fractionCount(*this));
 }
 

@@ -35,7 +35,7 @@ class CNmtExpResultObjectKvs final : public TableKvs<CNmtExpResultObjectKvs>, pu
 
   // Each item that there is before and after keeps its flag; new ones are not chosen.
   void SetItemCounts(int newLayers, int newFractions);
-  void startItems();
+  void Rebuild();
   // How many are written: those that are chosen and that the model has.
   int WrittenItems() const;
 

@@ -19,6 +19,20 @@
 #include "basic/bathymetry.h"
 #include "basic/boundary.h"
 #include "basic/source_sink.h"
+#include "ecology/boundary.h"
+#include "ecology/constants.h"
+#include "ecology/deposition.h"
+#include "ecology/dispersion.h"
+#include "ecology/evaporation.h"
+#include "ecology/forcings.h"
+#include "ecology/infiltration.h"
+#include "ecology/initial_conditions.h"
+#include "ecology/mass_budget.h"
+#include "ecology/model_definition.h"
+#include "ecology/precipitation.h"
+#include "ecology/results.h"
+#include "ecology/source_sink.h"
+#include "ecology/starting_conditions.h"
 #include "hydrodynamic/boundary.h"
 #include "hydrodynamic/eddy_viscosity.h"
 #include "hydrodynamic/resistance.h"
@@ -102,6 +116,12 @@ void changeHeadConstant(G& root, std::span<const int> counts) {
   if (counts[CNmtTaskSelectionKvs::kHead] < 0) (root.*member)->RemoveHeadConstant();
 }
 
+// What is made of a model definition is cleared, and made anew of what is declared now.
+template <auto member>
+void rebuild(G& root, std::span<const int>) {
+  (root.*member)->Rebuild();
+}
+
 // The same for the flags of each line or box.
 template <auto member, std::size_t which = 0>
 void resizeEntries(G& root, std::span<const int> counts) {
@@ -158,18 +178,20 @@ constexpr std::array kOfAreas{
     resize<&G::nmtExpBedRoughness>,
     resizeAreas<&G::nmtExpTransition>,
     resize<&G::nmtExpResult>,
+    resize<&G::wqsStartingConditions>,
+    resizeAreas<&G::wqsInitialConditions>,
+    resizeAreas<&G::wqsAdDispersion>,
+    resizeAreas<&G::wqsAdDeposition>,
+    resizeAreas<&G::wqsConstants>,
+    resize<&G::wqsResults>,
 };
 constexpr std::array kOfBoundaries{
-    resize<&G::nhdBoundary>,
-    resize<&G::nadBoundary>,
-    resize<&G::nmtBoundary>,
-    resize<&G::nmtExpBoundary>,
+    resize<&G::nhdBoundary>,    resize<&G::nadBoundary>,   resize<&G::nmtBoundary>,
+    resize<&G::nmtExpBoundary>, resize<&G::wqsAdBoundary>,
 };
 constexpr std::array kOfSources{
-    resize<&G::nhdSourceSink>,
-    resize<&G::nadSourceSink>,
-    resize<&G::nmtSourceSink>,
-    resize<&G::nmtExpSources>,
+    resize<&G::nhdSourceSink>, resize<&G::nadSourceSink>,   resize<&G::nmtSourceSink>,
+    resize<&G::nmtExpSources>, resize<&G::wqsAdSourceSink>,
 };
 constexpr std::array kOfComponents{
     resize<&G::nadInitialConcentration>,    resize<&G::nadDecaySpecification>,
@@ -231,10 +253,22 @@ constexpr std::array<Follower, 14> kOfExpandedMud{
     },
 };
 
+// What is made of the model definition, in the order in which it is made anew.
+constexpr std::array kOfDefinition{
+    rebuild<&G::wqsInitialConditions>, rebuild<&G::wqsAdBoundary>,    rebuild<&G::wqsAdSourceSink>,
+    rebuild<&G::wqsAdPrecipitation>,   rebuild<&G::wqsAdEvaporation>, rebuild<&G::wqsAdInfiltration>,
+    rebuild<&G::wqsAdDeposition>,      rebuild<&G::wqsConstants>,     rebuild<&G::wqsForcings>,
+    rebuild<&G::wqsMassBudget>,        rebuild<&G::wqsResults>,
+};
+
 constexpr LeaderRow kLeaders[] = {
-    {leader<&G::bathymetry>, kOfAreas},         {leader<&G::boundary>, kOfBoundaries},
-    {leader<&G::sourceSink>, kOfSources},       {leader<&G::nadComponent>, kOfComponents},
-    {leader<&G::nmtTaskSelection>, kOfMudTask}, {leader<&G::nmtExpTaskSelection>, kOfExpandedMud},
+    {leader<&G::bathymetry>, kOfAreas},
+    {leader<&G::boundary>, kOfBoundaries},
+    {leader<&G::sourceSink>, kOfSources},
+    {leader<&G::nadComponent>, kOfComponents},
+    {leader<&G::nmtTaskSelection>, kOfMudTask},
+    {leader<&G::nmtExpTaskSelection>, kOfExpandedMud},
+    {leader<&G::wqsModelDefinition>, kOfDefinition},
 };
 
 }  // namespace

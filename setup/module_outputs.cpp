@@ -2,6 +2,7 @@
 
 #include "advection_dispersion/result.h"
 #include "basic/module_selection.h"
+#include "ecology/results.h"
 #include "mud_transport/result.h"
 #include "mud_transport_expanded/result.h"
 #include "setup/global_kvs.h"
@@ -24,6 +25,7 @@ constexpr std::array kOutputs{
     OutputRow{module::kAdvectionDispersion, outputOf<&CGlobalKvs::nadResult>},
     OutputRow{module::kMudTransport, outputOf<&CGlobalKvs::nmtResult>},
     OutputRow{module::kMudTransportExpanded, outputOf<&CGlobalKvs::nmtExpResult>},
+    OutputRow{module::kEcological, outputOf<&CGlobalKvs::wqsResults>},
 };
 
 }  // namespace

@@ -10,6 +10,7 @@
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
 #include "core/edition.h"
+#include "ecology/starting_conditions.h"
 #include "hydrodynamic/infiltration.h"
 #include "hydrodynamic/resistance.h"
 #include "hydrodynamic/source_sink.h"
@@ -317,6 +318,11 @@ void rule21SlidingCoefficients(CNavigationView& tree, CGlobalKvs& model) {
   tree.Show(65, isOn && (!varies || model.nmtExpTaskSelection->layers >= 2));
 }
 
+// Only hides, as rule 5.
+void rule22EcologyHotStart(CNavigationView& tree, CGlobalKvs& model) {
+  if (model.wqsStartingConditions->hotStart) tree.Show(118, false);
+}
+
 // In this order. Nothing is remembered between runs.
 constexpr void (*kRules[])(CNavigationView&, CGlobalKvs&) = {
     rule1ModuleRoots,            //
@@ -340,6 +346,7 @@ constexpr void (*kRules[])(CNavigationView&, CGlobalKvs&) = {
     rule19SandFractions,         //
     rule20Sliding,               //
     rule21SlidingCoefficients,   //
+    rule22EcologyHotStart,       //
 };
 
 }  // namespace

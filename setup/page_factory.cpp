@@ -25,6 +25,21 @@
 #include "basic/module_selection_page.h"
 #include "basic/simulation_period_page.h"
 #include "basic/source_sink_page.h"
+#include "ecology/boundary_page.h"
+#include "ecology/constants_page.h"
+#include "ecology/deposition_page.h"
+#include "ecology/dispersion_page.h"
+#include "ecology/evaporation_page.h"
+#include "ecology/forcings_page.h"
+#include "ecology/infiltration_page.h"
+#include "ecology/initial_conditions_page.h"
+#include "ecology/mass_budget_page.h"
+#include "ecology/model_definition_page.h"
+#include "ecology/precipitation_page.h"
+#include "ecology/results_page.h"
+#include "ecology/source_sink_page.h"
+#include "ecology/starting_conditions_page.h"
+#include "ecology/state_variables_page.h"
 #include "hydrodynamic/boundary_page.h"
 #include "hydrodynamic/eddy_viscosity_page.h"
 #include "hydrodynamic/infiltration_page.h"
@@ -197,6 +212,21 @@ constexpr Entry kPages[] = {
     {"CNmtExpMassBudgetDlg", make<CNmtExpMassBudgetDlg>},
     {"CNmtExpLineDischargeDlg", make<CNmtExpLineDischargeDlg>},
     {"CNmtExpResultDlg", make<CNmtExpResultDlg>},
+    {"CWQSModelDefinitionDlg", make<CWQSModelDefinitionDlg>},
+    {"CWQSStartingConditionsDlg", make<CWQSStartingConditionsDlg>},
+    {"CWQSStateVariablesDlg", make<CWQSStateVariablesDlg>},
+    {"CWQSInitialConditionsDlg", make<CWQSInitialConditionsDlg>},
+    {"CWQSConstantsDlg", make<CWQSConstantsDlg>},
+    {"CWQSForcingsDlg", make<CWQSForcingsDlg>},
+    {"CWQSADBoundaryDlg", make<CWQSADBoundaryDlg>},
+    {"CWQSADDispersionDlg", make<CWQSADDispersionDlg>},
+    {"CWQSADSourceSinkDlg", make<CWQSADSourceSinkDlg>},
+    {"CWQSADPrecipitationDlg", make<CWQSADPrecipitationDlg>},
+    {"CWQSADEvaporationDlg", make<CWQSADEvaporationDlg>},
+    {"CWQSADInfiltrationDlg", make<CWQSADInfiltrationDlg>},
+    {"CWQSADDepositionDlg", make<CWQSADDepositionDlg>},
+    {"CWQSMassBudgetDlg", make<CWQSMassBudgetDlg>},
+    {"CWQSResultsDlg", make<CWQSResultsDlg>},
 };
 
 }  // namespace
