@@ -1,5 +1,7 @@
 #pragma once
 
+#include <unordered_map>
+
 #include "core/item_rows.h"
 #include "ecology/transported.h"
 #include "families/area_values.h"
@@ -29,8 +31,10 @@ struct VariableItemsRow : ListRow<List> {
   void load(auto& object, KvsSection from, const std::string& documentPath) const {
     auto& items = list.of(object);
     NumberedText name(kSection);
+    std::unordered_map<int, int> occurrences;  // of variables that have a number in common
     for (int entry = 1; entry <= items.GetCount(); ++entry) {
-      const KvsSection section = kvsSectionByNameNum(from, name.of(idOf(object, entry)), 1);
+      const int id = idOf(object, entry);
+      const KvsSection section = kvsSectionByNameNum(from, name.of(id), ++occurrences[id]);
       if (section != nullptr) items.GetItem(entry)->Load(section, documentPath);
     }
   }

@@ -45,7 +45,13 @@ class BedPages : public test::ShapeTest {
     EXPECT_EQ(page->templateId(), dialogTemplate);
     EXPECT_EQ(page->pageId(), id);
   }
-  using test::ShapeTest::grid;
+  // The grid of a label, which a frame may have too.
+  CV27SetupGridWnd& grid(std::string_view label) {
+    for (const Control& it : page->form().controls()) {
+      if (it.grid != nullptr && it.label == label) return *it.grid;
+    }
+    throw std::logic_error("there is no such grid");
+  }
   static Labels headersOf(CV27SetupGridWnd& grid) {
     Labels all;
     for (int col = 0; col <= grid.GetColCount(); ++col) all.push_back(grid.GetColHeader(col));
@@ -174,16 +180,11 @@ TEST_F(BedPages, OfTheTransition) {
 
 TEST_F(BedPages, OfTheTransitionRates) {
   PageTest::open("CNmtTransitionBetweenLayersDlg");
-  const auto gridOf = [this] {
-    for (Control& it : page->form().controls()) {
-      if (it.kind == ControlKind::grid) return it.grid;
-    }
-    throw std::logic_error("no grid");
-  };
-  EXPECT_EQ(rowHeadersOf(*gridOf()), (Labels{"1", "2", "3"}));
-  EXPECT_EQ(gridOf()->StoreStyleRowCol(1, 2, "4"), 1);
+  CV27SetupGridWnd& rates = grid("Transition rates of mud");
+  EXPECT_EQ(rowHeadersOf(rates), (Labels{"1", "2", "3"}));
+  EXPECT_EQ(rates.StoreStyleRowCol(1, 2, "4"), 1);
   EXPECT_EQ(root().nmtTransitionBetweenLayers->at(1).constant, 4.0F);
-  EXPECT_EQ(styleIn(*gridOf(), 1, 2).toolTip, "");
+  EXPECT_EQ(styleIn(rates, 1, 2).toolTip, "");
 }
 
 TEST_F(BedPages, OfTheVariableFriction) {

@@ -102,7 +102,6 @@ TEST_F(MudTaskPage, TheCountsHaveLimitsThatTheModelLacks) {
   for (const char* bad : {"9", "-1", "x", "2.5"}) {
     edit("Number of fractions:", bad);
     EXPECT_EQ(task().fractions, 8) << bad;
-    EXPECT_NE(control("Number of fractions:").fault, "") << bad;
   }
   choose("Task", 1);
   edit("Number of layers:", "12");

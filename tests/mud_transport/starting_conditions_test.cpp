@@ -27,7 +27,8 @@ using Floats = std::vector<float>;
 
 // A hot start file of 12 by 10 points with the module's block.
 test::GridSpec hotSpec(const Floats& block) {
-  return {.noJ = 12, .noK = 10, .dx = 100, .dy = 100, .dataType = 2, .blocks = {{"V27_Misc", block}}};
+  return {
+      .noJ = 12, .noK = 10, .dx = 100, .dy = 100, .land = {}, .dataType = 2, .blocks = {{"V27_Misc", block}}};
 }
 
 class MudStart : public ::testing::Test {
@@ -41,7 +42,8 @@ class MudStart : public ::testing::Test {
   }
   ValidationList messages(int deep = 1) {
     ValidationList list;
-    EXPECT_EQ(start.Validate(list, deep), list.size());
+    const unsigned counted = start.Validate(list, deep);
+    EXPECT_EQ(counted, list.size());
     for (const CMessage& message : list) EXPECT_EQ(message.page, PageId::mtStartingConditions);
     return list;
   }

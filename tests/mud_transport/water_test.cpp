@@ -292,7 +292,8 @@ class MudPlaces : public MudWater {
     definition.time.step = 3000;
     definition.time.count = steps;
     definition.axes = std::move(axes);
-    for (int i = 0; i < items; ++i) definition.items.push_back({"Item", item::kSuspendedSediment, "g m-3"});
+    const std::string unit(qunBaseUnit(item::kSuspendedSediment)->text);
+    for (int i = 0; i < items; ++i) definition.items.push_back({"Item", item::kSuspendedSediment, unit});
     test::writeFile(path, definition);
   }
   CNmtBoundaryKvs& boundaries = *root.nmtBoundary;

@@ -235,6 +235,129 @@ std::string newModelText(const std::string& selection, const std::string& advect
          "}\n";
 }
 
+// A new module of mud transport: three fractions over one layer, in one area.
+std::string newMudText() {
+  const auto components = [](const std::string& indent, const std::string& rest) {
+    std::string all;
+    for (const char* number : {"1", "2", "3"}) all += indent + "COMPONENT_" + number + " {\n" + rest;
+    return all;
+  };
+  return std::string(
+             "        STARTING_CONDITIONS {\n"
+             "            Hot_Start #false\n"
+             "            Start_MT_at_HD_Time_Step 0\n"
+             "            End_MT_at_HD_Time_Step 100\n"
+             "            Integration_period_start 0\n"
+             "            Integration_period_end 100\n"
+             "            AREA_1 {\n"
+             "                DATA_FILE {\n"
+             "                    File_Name (file)\"\"\n"
+             "                }\n"
+             "            }\n"
+             "        }\n"
+             "        CALCULATION_METHOD {\n"
+             "            Max_rel_decrease_in_conc_pr_step 0.1\n"
+             "        }\n"
+             "        TASK_SELECTION {\n"
+             "            Multifraction #true\n"
+             "            MultiLayer #false\n"
+             "            Number_of_layers 1\n"
+             "            Number_of_fractions 3\n"
+             "            Include_salinity_component_for_flocculation #false\n"
+             "        }\n"
+             "        INITIAL_CONCENTRATIONS {\n") +
+         components("            ",
+                    "                AREA_1 {\n"
+                    "                    Data_Format 0\n"
+                    "                    Constant_Value 0.0\n"
+                    "                    File_Name (file)\"\"\n"
+                    "                    Item_Numbers 1\n"
+                    "                }\n"
+                    "            }\n") +
+         "        }\n"
+         "        DISPERSION_CONDITIONS {\n"
+         "            Dispersion_Prop_to_Current 0\n"
+         "            Proportionality_Factor_Xdir 1.0\n"
+         "            Proportionality_Factor_Ydir 1.0\n"
+         "            Min_Dispersion_Coefficient 0.0\n"
+         "            Max_Dispersion_Coefficient 0.0\n"
+         "            X_DIRECTION_COEFFICIENTS {\n"
+         "                Data_Format 0\n"
+         "                Constant_Value 0.0\n"
+         "                AREA_1 {\n"
+         "                    File_Name (file)\"\"\n"
+         "                    Item_Numbers 1\n"
+         "                }\n"
+         "            }\n"
+         "            Y_DIRECTION_COEFFICIENTS {\n"
+         "                Data_Format 0\n"
+         "                Constant_Value 0.0\n"
+         "                AREA_1 {\n"
+         "                    File_Name (file)\"\"\n"
+         "                    Item_Numbers 1\n"
+         "                }\n"
+         "            }\n"
+         "        }\n"
+         "        BOUNDARY_CONCENTRATIONS {}\n"
+         "        SOURCE_CONCENTRATIONS {}\n"
+         "        MT_PARAMETERS {\n"
+         "            SETTLING_AND_DEPOSITION {\n" +
+         components("                ",
+                    "                    Critical_Velocity_For_Deposition 0.1\n"
+                    "                    Critical_Velocity_For_Erosion 0.3\n"
+                    "                    Relative_Height_Of_Centroid 0.3\n"
+                    "                    Mean_Settling_Velocity 0.0005\n"
+                    "                    Initial_bed_composition {\n"
+                    "                        Data_Format 0\n"
+                    "                        Constant_Value 1.0\n"
+                    "                        AREA_1 {\n"
+                    "                            File_Name (file)\"\"\n"
+                    "                            Item_Numbers 1\n"
+                    "                        }\n"
+                    "                    }\n"
+                    "                    EROSION_COEFFICIENTS {\n"
+                    "                        Data_Format 0\n"
+                    "                        Constant_Value 0.005\n"
+                    "                        AREA_1 {\n"
+                    "                            File_Name (file)\"\"\n"
+                    "                            Item_Numbers 1\n"
+                    "                        }\n"
+                    "                    }\n"
+                    "                }\n") +
+         "            }\n"
+         "            EROSION_CHARACTERISTICS {\n"
+         "                SETTINGS {\n"
+         "                    Bed_Is_Erodible 1\n"
+         "                    Deposited_Sediment_Erodible 1\n"
+         "                }\n"
+         "                CALCULATION_METHOD {\n"
+         "                    Only_cohesive_sediment 1\n"
+         "                    Cohesive_and_non_cohesive_sediment 0\n"
+         "                    Scale_factor 1.0\n"
+         "                }\n"
+         "            }\n"
+         "        }\n"
+         "        MT_LINE_DISCHARGE_CALCULATIONS {\n"
+         "            No_Of_MT_Discharge_Lines 0\n"
+         "        }\n"
+         "        BOXES_FOR_MASS_SUMMATION {\n"
+         "            No_Of_MT_Mass_Boxes 0\n"
+         "        }\n"
+         "        OUTPUT_SPECIFICATION {\n"
+         "            Number_Of_Output_areas 0\n"
+         "            Include_Layers_In_Output_File 1\n"
+         "            NetSedimentation_in_mm 1\n"
+         "            NetSedimentation_in_gm2 0\n"
+         "            Generate_Hotstart #false\n"
+         "            HOTSTART_FILES {\n"
+         "                AREA_1 {\n"
+         "                    Title \"\"\n"
+         "                    File_Name (result)\"\"\n"
+         "                }\n"
+         "            }\n"
+         "        }\n";
+}
+
 std::string selectionText(int code) {
   const bool pinned = theEdition.wetlandSweepKit;
   return "            Simulation_Type " + std::to_string(pinned ? 0 : code) +
@@ -422,7 +545,7 @@ TEST(GlobalKvs, TheSectionsOfTheSelectedModuleAreWritten) {
                                      "                }\n"
                                      "            }\n"
                                      "        }\n"));
-  EXPECT_EQ(textFor(3), newModelText(selectionText(3), "", "        MT_PARAMETERS {}\n"));
+  EXPECT_EQ(textFor(3), newModelText(selectionText(3), "", newMudText()));
   EXPECT_EQ(textFor(8), newModelText(selectionText(8), "", "",
                                      "        FORCING_FUNCTIONS {\n"
                                      "            WAVE_DATA {}\n"

@@ -8,6 +8,7 @@
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
 #include "core/edition.h"
+#include "ecology/starting_conditions.h"
 #include "hydrodynamic/infiltration.h"
 #include "hydrodynamic/resistance.h"
 #include "hydrodynamic/source_sink.h"
@@ -161,6 +162,19 @@ TEST_F(NavigationTree, AHotStartOfTheTransportHidesItsInitialConcentrationsForGo
   EXPECT_FALSE(tree.IsVisible(19));
   tree.OnInitialUpdate(&model.root);
   EXPECT_TRUE(tree.IsVisible(19));
+}
+
+TEST_F(NavigationTree, AHotStartOfTheEcologicalModelHidesItsInitialConditionsForGood) {
+  rootsWith(9);
+  EXPECT_TRUE(tree.IsVisible(118));
+  model.root.wqsStartingConditions->hotStart = true;
+  tree.OnUpdate(&model.root);
+  EXPECT_FALSE(tree.IsVisible(118));
+  model.root.wqsStartingConditions->hotStart = false;
+  tree.OnUpdate(&model.root);
+  EXPECT_FALSE(tree.IsVisible(118));
+  tree.OnInitialUpdate(&model.root);
+  EXPECT_TRUE(tree.IsVisible(118));
 }
 
 TEST_F(NavigationTree, PagesForTheTypesOfComponents) {
@@ -325,6 +339,7 @@ TEST_F(NavigationTree, ExpandedSlidingHasThePagesOfItsCoefficients) {
 }
 
 TEST_F(NavigationTree, AHiddenParentHidesItsChildrenAndKeepsTheirFlags) {
+  model.root.nmtTaskSelection->SetLayers(1);
   rootsWith(3);
   EXPECT_TRUE(tree.IsVisible(53));
   tree.Show(59, false);
