@@ -40,6 +40,21 @@ std::string wordsOfOutput(const Json& output) {
   return title.empty() ? text : fmt::format("{} ({})", text, title);
 }
 
+void printPlaces(std::string_view label, const Json& places, const Line& line) {
+  int number = 0;
+  for (const Json& place : places) line(fmt::format("{} {}", label, ++number), wordsOfConcentrations(place));
+}
+
+void printLinesOrBoxes(std::string_view label, const Json& report, const Line& line) {
+  int number = 0;
+  for (const Json& place : report) {
+    line(fmt::format("{} {}", label, ++number),
+         fmt::format("{} - {} of area {}, time steps {} to {}{}", wordsOfPoint(place["from"]),
+                     wordsOfPoint(place["to"]), place["area"].get<int>(), place["steps"][0].get<int>(),
+                     place["steps"][1].get<int>(), wordsOfOutput(place)));
+  }
+}
+
 }  // namespace
 
 Json dataFile(const FileNameValue& file) {
@@ -107,9 +122,29 @@ std::string wordsOfAreas(const Json& areas) {
   return text;
 }
 
-void printPlaces(std::string_view label, const Json& places, const Line& line) {
-  int number = 0;
-  for (const Json& place : places) line(fmt::format("{} {}", label, ++number), wordsOfConcentrations(place));
+void printBoundaryValues(const Json& places, const Line& line) {
+  printPlaces("At boundary", places, line);
+}
+void printSourceValues(const Json& places, const Line& line) {
+  printPlaces("From source", places, line);
+}
+
+void printBeginning(const Json& report, const Line& line) {
+  if (!report["hot"].get<bool>()) return printEntryAreas("Initially", report["concentrations"], line);
+  int area = 0;
+  for (const Json& file : report["files"])
+    line("Initially", fmt::format("area {} as in {}", ++area, file.get<std::string>()));
+}
+
+void printConstantsOrMaps(std::string_view label, const Json& layers, const Line& line) {
+  std::string text;
+  for (const Json& layer : layers) {
+    text +=
+        fmt::format("{}{} in layer {}", text.empty() ? "" : "; ",
+                    layer.contains("value") ? wordsOfQuantity(layer["value"]) : wordsOfAreas(layer["areas"]),
+                    layer["layer"].get<int>());
+  }
+  if (!text.empty()) line(label, text);
 }
 
 void printEntryAreas(std::string_view label, const Json& entries, const Line& line) {
@@ -131,14 +166,22 @@ void printDispersion(const Json& report, const Line& line) {
   line("Dispersion", fmt::format("{} along x, {} along y", words(report["x"]), words(report["y"])));
 }
 
-void printLinesOrBoxes(std::string_view label, const Json& report, const Line& line) {
-  int number = 0;
-  for (const Json& place : report) {
-    line(fmt::format("{} {}", label, ++number),
-         fmt::format("{} - {} of area {}, time steps {} to {}{}", wordsOfPoint(place["from"]),
-                     wordsOfPoint(place["to"]), place["area"].get<int>(), place["steps"][0].get<int>(),
-                     place["steps"][1].get<int>(), wordsOfOutput(place)));
-  }
+void printLines(const Json& report, const Line& line) {
+  printLinesOrBoxes("Line", report, line);
+}
+void printBoxes(const Json& report, const Line& line) {
+  printLinesOrBoxes("Box", report, line);
+}
+
+void printWaves(const Json& report, const Line& line) {
+  const auto kind = report["given_as"].get<std::string>();
+  std::string text = kind;
+  if (report.contains("file")) text = "maps in " + wordsOfFile(report);
+  if (report.contains("maps")) text = fmt::format("a database of {} maps", report["maps"].get<int>());
+  if (report.contains("height"))
+    text = fmt::format("{} high, {} long, from {}", wordsOfQuantity(report["height"]),
+                       wordsOfQuantity(report["period"]), wordsOfQuantity(report["direction"]));
+  line("Waves", text);
 }
 
 void printMassFiles(const Json& report, const Line& line) {

@@ -128,6 +128,37 @@ Json describeDispersion(Coefs& coefs) {
           {"y", describeDispersionAlong(coefs.formatY == Coefs::kConstant, coefs.constantY, coefs.filesY)}};
 }
 
+// The values of a list that has a constant or maps for all areas, as the layers of the bed; numbered from 1.
+template <class List>
+Json describeConstantsOrMaps(List& list, int itemCode) {
+  Json report = Json::array();
+  for (int number = 1; number <= list.GetCount(); ++number) {
+    auto& layer = list.at(number);
+    Json entry{{"layer", number}};
+    if (layer.format == std::remove_reference_t<decltype(layer)>::kConstant) {
+      entry["value"] = quantity(static_cast<double>(layer.constant), itemCode);
+    } else {
+      entry["areas"] = Json::array();
+      for (int area = 1; area <= layer.GetCount(); ++area) {
+        Json map{{"area", area}};
+        map.update(dataFile(layer.at(area).file));
+        entry["areas"].push_back(std::move(map));
+      }
+    }
+    report.push_back(std::move(entry));
+  }
+  return report;
+}
+
+// How a module begins: hot from the files of all areas, or by what `cold` describes.
+template <class Start, class Cold>
+Json describeBeginning(Start& start, const Cold& cold) {
+  if (!start.hotStart) return {{"hot", false}, {"concentrations", cold()}};
+  Json files = Json::array();
+  for (int area = 1; area <= start.GetCount(); ++area) files.push_back(start.at(area).file.text());
+  return {{"hot", true}, {"files", files}};
+}
+
 Json describeLinesOrBoxes(LineOrBoxList& list);
 Json describeMassFiles(MassFileList& list);
 Json describeTransportOutput(const TransportOutput& output);
@@ -140,13 +171,40 @@ Json describeTransportOutputs(Results& results) {
   return report;
 }
 
+// The same as topics of a module whose objects are these members of the root.
+template <auto list, class Module>
+Json boundaryTopic(CGlobalKvs& model) {
+  return describeBoundaryValues<Module>(*(model.*list));
+}
+template <auto list, class Module>
+Json sourceTopic(CGlobalKvs& model) {
+  return describeSourceValues<Module>(*(model.*list));
+}
+template <auto coefs>
+Json dispersionTopic(CGlobalKvs& model) {
+  return describeDispersion(*(model.*coefs));
+}
+template <auto list>
+Json placesTopic(CGlobalKvs& model) {
+  return describeLinesOrBoxes(*(model.*list));
+}
+template <auto results>
+Json outputTopic(CGlobalKvs& model) {
+  return describeTransportOutputs(*(model.*results));
+}
+
 // Each told with a label of its own, from what was described.
 std::string wordsOfConcentrations(const Json& report);
 std::string wordsOfAreas(const Json& areas);
-void printPlaces(std::string_view label, const Json& places, const Line& line);
+void printBoundaryValues(const Json& places, const Line& line);
+void printSourceValues(const Json& places, const Line& line);
+void printBeginning(const Json& report, const Line& line);
+void printConstantsOrMaps(std::string_view label, const Json& layers, const Line& line);
 void printEntryAreas(std::string_view label, const Json& entries, const Line& line);
+void printWaves(const Json& report, const Line& line);
 void printDispersion(const Json& report, const Line& line);
-void printLinesOrBoxes(std::string_view label, const Json& report, const Line& line);
+void printLines(const Json& report, const Line& line);
+void printBoxes(const Json& report, const Line& line);
 void printMassFiles(const Json& report, const Line& line);
 void printTransportOutputs(const Json& report, const Line& line);
 

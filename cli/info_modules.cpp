@@ -35,6 +35,10 @@ const ModuleTopics& topicsOf(std::int32_t moduleCode) {
   static constexpr ModuleTopics kModules[] = {
       {module::kAdvectionDispersion, "advection_dispersion", "hydrodynamics and advection-dispersion",
        advectionDispersionTopics},
+      {module::kMudTransport, "mud_transport", "hydrodynamics and mud transport", mudTransportTopics},
+      {module::kMudTransportExpanded, "mud_transport_expanded", "hydrodynamics and expanded mud transport",
+       expandedMudTopics},
+      {module::kEcological, "ecology", "hydrodynamics and the ecological model", ecologyTopics},
   };
   const auto* found = std::ranges::find(kModules, moduleCode, &ModuleTopics::code);
   return found == std::end(kModules) ? kNone : *found;

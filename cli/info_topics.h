@@ -26,6 +26,11 @@ std::span<const Topic> structureTopics();
 
 // What is dissolved in the water.
 std::span<const Topic> advectionDispersionTopics();
+// The sediment in the water and on the bed, of either module.
+std::span<const Topic> mudTransportTopics();
+std::span<const Topic> expandedMudTopics();
+// The ecological model.
+std::span<const Topic> ecologyTopics();
 
 // The module that runs beside the flow calculation; one without topics has no name.
 struct ModuleTopics {

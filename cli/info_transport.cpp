@@ -83,37 +83,10 @@ void printFeedback(const Json& report, const Line& line) {
   if (report.get<bool>()) line("Feedback", "salinity and temperature change the density of the water");
 }
 
-Json describeBeginning(CGlobalKvs& model) {
-  CNadStartingConditionsKvs& start = *model.nadStartingConditions;
-  if (!start.hotStart)
-    return {{"hot", false},
-            {"concentrations", describeEntryAreas<AdComponents>(*model.nadInitialConcentration)}};
-  Json files = Json::array();
-  for (int area = 1; area <= start.GetCount(); ++area) files.push_back(start.at(area).file.text());
-  return {{"hot", true}, {"files", files}};
-}
-void printBeginning(const Json& report, const Line& line) {
-  if (!report["hot"].get<bool>()) return printEntryAreas("Initially", report["concentrations"], line);
-  int area = 0;
-  for (const Json& file : report["files"])
-    line("Initially", fmt::format("area {} as in {}", ++area, file.get<std::string>()));
-}
-
-Json describeDispersions(CGlobalKvs& model) {
-  return describeDispersion(*model.nadDispersionCoef);
-}
-
-Json describeBoundaries(CGlobalKvs& model) {
-  return describeBoundaryValues<AdComponents>(*model.nadBoundary);
-}
-void printBoundaries(const Json& report, const Line& line) {
-  printPlaces("At boundary", report, line);
-}
-Json describeSources(CGlobalKvs& model) {
-  return describeSourceValues<AdComponents>(*model.nadSourceSink);
-}
-void printSources(const Json& report, const Line& line) {
-  printPlaces("From source", report, line);
+Json describeStart(CGlobalKvs& model) {
+  return describeBeginning(*model.nadStartingConditions, [&model] {
+    return describeEntryAreas<AdComponents>(*model.nadInitialConcentration);
+  });
 }
 
 // What comes with water that does not come or go is not told.
@@ -148,40 +121,24 @@ void printDeposition(const Json& report, const Line& line) {
   if (!report["soil"].is_null()) printEntryAreas("From the soil", report["soil"], line);
 }
 
-Json describeLines(CGlobalKvs& model) {
-  return describeLinesOrBoxes(*model.nadLineDischarge);
-}
-void printLines(const Json& report, const Line& line) {
-  printLinesOrBoxes("Line", report, line);
-}
-Json describeBoxes(CGlobalKvs& model) {
-  return describeLinesOrBoxes(*model.nadBoxSummation);
-}
-void printBoxes(const Json& report, const Line& line) {
-  printLinesOrBoxes("Box", report, line);
-}
 Json describeBudgets(CGlobalKvs& model) {
   return model.moduleSelection->HasMassBudget() ? describeMassFiles(*model.nadMassBudget) : Json::array();
 }
-Json describeOutputs(CGlobalKvs& model) {
-  return describeTransportOutputs(*model.nadResult);
-}
-
 constexpr Topic kTopics[] = {
     {"components", describeComponents, printComponents},
     {"feedback", describeFeedback, printFeedback},
-    {"initially", describeBeginning, printBeginning},
-    {"dispersion", describeDispersions, printDispersion},
-    {"boundaries", describeBoundaries, printBoundaries},
-    {"sources", describeSources, printSources},
+    {"initially", describeStart, printBeginning},
+    {"dispersion", dispersionTopic<&CGlobalKvs::nadDispersionCoef>, printDispersion},
+    {"boundaries", boundaryTopic<&CGlobalKvs::nadBoundary, AdComponents>, printBoundaryValues},
+    {"sources", sourceTopic<&CGlobalKvs::nadSourceSink, AdComponents>, printSourceValues},
     {"precipitation", describeWater<&CGlobalKvs::nadPrecipitation>, printWater<kInRain>},
     {"evaporation", describeWater<&CGlobalKvs::nadEvaporation>, printWater<kInVapour>},
     {"infiltration", describeWater<&CGlobalKvs::nadInfiltration>, printWater<kInGround>},
     {"deposition", describeDeposition, printDeposition},
-    {"lines", describeLines, printLines},
-    {"boxes", describeBoxes, printBoxes},
+    {"lines", placesTopic<&CGlobalKvs::nadLineDischarge>, printLines},
+    {"boxes", placesTopic<&CGlobalKvs::nadBoxSummation>, printBoxes},
     {"mass_budgets", describeBudgets, printMassFiles},
-    {"outputs", describeOutputs, printTransportOutputs},
+    {"outputs", outputTopic<&CGlobalKvs::nadResult>, printTransportOutputs},
 };
 
 }  // namespace

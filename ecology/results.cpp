@@ -44,6 +44,15 @@ std::string_view extensionOf(std::string_view path) {
   return dot == std::string_view::npos ? std::string_view() : name.substr(dot);
 }
 
+void writeAdditionalItem(const CSolverItem& item, int number, KvsFile& file) {
+  kvsAddSection(file, formatted(kAdditionalItem, number));
+  kvsPutParam(file, "ID", item.id);
+  kvsPutParam(file, "Description", std::string_view(item.description));
+  kvsPutParam(file, "Unit", std::string_view(item.unit));
+  kvsPutParam(file, "Dimension", item.spatialVariation);
+  kvsEndSection(file);
+}
+
 }  // namespace
 
 void CWQSResultsItemKvs::Rebuild() {
@@ -85,16 +94,8 @@ void CWQSResultsKvs::AdditionalOutputRow::save(const CWQSResultsKvs& object, Kvs
   kvsAddSection(file, kAdditionalOutput);
   kvsPutParam(file, "No_Of_Items", model == nullptr ? 0 : static_cast<int>(model->outputItems().size()));
   int number = 0;
-  NumberedText name(kAdditionalItem);
   if (model != nullptr) {
-    for (const CSolverItem* item : model->outputItems()) {
-      kvsAddSection(file, name.of(++number));
-      kvsPutParam(file, "ID", item->id);
-      kvsPutParam(file, "Description", std::string_view(item->description));
-      kvsPutParam(file, "Unit", std::string_view(item->unit));
-      kvsPutParam(file, "Dimension", item->spatialVariation);
-      kvsEndSection(file);
-    }
+    for (const CSolverItem* item : model->outputItems()) writeAdditionalItem(*item, ++number, file);
   }
   kvsEndSection(file);
 }
@@ -102,9 +103,23 @@ void CWQSResultsKvs::AdditionalOutputRow::save(const CWQSResultsKvs& object, Kvs
 bool CWQSResultsKvs::AdditionalOutputRow::access(CWQSResultsKvs& object, std::string_view path,
                                                  PathAccess& access) const {
   const PathStep step = stepOf(path);
-  if (!sameName(step.first, kAdditionalOutput) || !step.isLast()) return false;
+  if (!sameName(step.first, kAdditionalOutput)) return false;
+  if (step.isLast()) {
+    access.isSection = true;
+    if (access.what == PathAccess::What::write) save(object, *access.out, *access.documentPath);
+    return true;
+  }
+  // One item. What an earlier model had here is not missed.
+  const PathStep inner = stepOf(step.rest);
+  const std::optional<int> number = numberIn(inner.first, kAdditionalItem);
+  if (!number || !inner.isLast()) return false;
+  const CWQSModelDefinitionKvs* model = modelDefinitionOf(object);
+  const bool isThere =
+      model != nullptr && *number >= 1 && static_cast<std::size_t>(*number) <= model->outputItems().size();
+  if (!isThere && access.what != PathAccess::What::look) return false;
   access.isSection = true;
-  if (access.what == PathAccess::What::write) save(object, *access.out, *access.documentPath);
+  if (access.what == PathAccess::What::write)
+    writeAdditionalItem(*model->outputItems()[static_cast<std::size_t>(*number) - 1], *number, *access.out);
   return true;
 }
 

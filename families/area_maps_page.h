@@ -6,8 +6,8 @@
 #include "families/area_values_page.h"
 #include "families/root_member.h"
 
-// The grids of values that are a constant, or given by the map of an area (AreaMapKvs). `member` is that of
-// the root that holds them; `Words` has the kind of their files as `kFile`.
+// The grids of values that are a constant, or given by the map of an area (ValueOrMapKvs). `member` is that
+// of the root that holds them; `Words` has the kind of their files as `kFile`.
 
 namespace gridbay {
 

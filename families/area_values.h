@@ -36,7 +36,7 @@ void requestAnyMap(CVdFileSelectorDlg& selector, CKvsBase& object, int number, c
 //   static constexpr Text kDescription    what is asked of its file
 //   static constexpr int kQuantity        the item code of the constant; 0 for a plain number
 template <class Self>
-class AreaMapKvs : public ValueOrFileKvs<Self> {
+class ValueOrMapKvs : public ValueOrFileKvs<Self> {
  public:
   static constexpr std::int32_t kMap = 1;
 

@@ -7,9 +7,9 @@
 namespace gridbay {
 
 // The dry density of a layer of the bed in an area, in kg/m³.
-class CNmtExpBedDensityObjectKvs final : public AreaMapKvs<CNmtExpBedDensityObjectKvs> {
+class CNmtExpBedDensityObjectKvs final : public ValueOrMapKvs<CNmtExpBedDensityObjectKvs> {
  public:
-  using AreaMapKvs::AreaMapKvs;
+  using ValueOrMapKvs::ValueOrMapKvs;
 
   static constexpr PageId kPage = PageId::mtExpBedDensity;
   static constexpr Text kDescription = texts::bed::density;

@@ -8,9 +8,9 @@
 namespace gridbay {
 
 // The height of the roughness of the bed in an area, in metres.
-class CNmtExpBedRoughnessObjectKvs final : public AreaMapKvs<CNmtExpBedRoughnessObjectKvs> {
+class CNmtExpBedRoughnessObjectKvs final : public ValueOrMapKvs<CNmtExpBedRoughnessObjectKvs> {
  public:
-  using AreaMapKvs::AreaMapKvs;
+  using ValueOrMapKvs::ValueOrMapKvs;
 
   static constexpr PageId kPage = PageId::mtExpBedRoughness;
   static constexpr Text kDescription = texts::bed::roughness;

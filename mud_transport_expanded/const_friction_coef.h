@@ -7,9 +7,9 @@
 namespace gridbay {
 
 // The coefficient by which a layer of the bed slides in an area.
-class CNmtExpConstFrictionCoefObjectKvs final : public AreaMapKvs<CNmtExpConstFrictionCoefObjectKvs> {
+class CNmtExpConstFrictionCoefObjectKvs final : public ValueOrMapKvs<CNmtExpConstFrictionCoefObjectKvs> {
  public:
-  using AreaMapKvs::AreaMapKvs;
+  using ValueOrMapKvs::ValueOrMapKvs;
 
   static constexpr PageId kPage = PageId::mtExpConstFrictionCoef;
   static constexpr Text kDescription = texts::bed::frictionCoefficient;

@@ -7,9 +7,9 @@
 namespace gridbay {
 
 // The shear stress above which a layer of the bed erodes in an area, in N/m².
-class CNmtExpCriticalShearStressObjectKvs final : public AreaMapKvs<CNmtExpCriticalShearStressObjectKvs> {
+class CNmtExpCriticalShearStressObjectKvs final : public ValueOrMapKvs<CNmtExpCriticalShearStressObjectKvs> {
  public:
-  using AreaMapKvs::AreaMapKvs;
+  using ValueOrMapKvs::ValueOrMapKvs;
 
   static constexpr PageId kPage = PageId::mtExpCriticalShearStress;
   static constexpr Text kDescription = texts::bed::criticalShearStress;

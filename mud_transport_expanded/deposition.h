@@ -9,9 +9,9 @@
 namespace gridbay {
 
 // The shear stress below which a fraction settles in an area, in N/m².
-class CNmtExpDepositionObjectKvs final : public AreaMapKvs<CNmtExpDepositionObjectKvs> {
+class CNmtExpDepositionObjectKvs final : public ValueOrMapKvs<CNmtExpDepositionObjectKvs> {
  public:
-  using AreaMapKvs::AreaMapKvs;
+  using ValueOrMapKvs::ValueOrMapKvs;
 
   static constexpr PageId kPage = PageId::mtExpDeposition;
   static constexpr Text kDescription = texts::bed::criticalShearStressOfDeposition;

@@ -9,9 +9,9 @@ namespace gridbay {
 class CNmtExpErosionCoefficientComponentKvs;
 
 // How much of a layer of the bed erodes in an area, in kg/m²/s.
-class CNmtExpErosionCoefficientObjectKvs final : public AreaMapKvs<CNmtExpErosionCoefficientObjectKvs> {
+class CNmtExpErosionCoefficientObjectKvs final : public ValueOrMapKvs<CNmtExpErosionCoefficientObjectKvs> {
  public:
-  using AreaMapKvs::AreaMapKvs;
+  using ValueOrMapKvs::ValueOrMapKvs;
 
   static constexpr PageId kPage = PageId::mtExpErosionCoefficient;
   static constexpr Text kDescription = texts::bed::erosionCoefficient;

@@ -6,9 +6,9 @@
 namespace gridbay {
 
 // The velocity at which a fraction settles in an area, in m/s; with flocculation the coefficient of it.
-class CNmtExpFallVelocityObjectKvs final : public AreaMapKvs<CNmtExpFallVelocityObjectKvs> {
+class CNmtExpFallVelocityObjectKvs final : public ValueOrMapKvs<CNmtExpFallVelocityObjectKvs> {
  public:
-  using AreaMapKvs::AreaMapKvs;
+  using ValueOrMapKvs::ValueOrMapKvs;
 
   static constexpr PageId kPage = PageId::mtExpSettlingPar;
   static constexpr Text kDescription = texts::bed::fallVelocity;

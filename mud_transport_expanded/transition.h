@@ -9,9 +9,9 @@
 namespace gridbay {
 
 // The rate at which mud goes from a layer of the bed into the one below it, in an area.
-class CNmtExpTransitionObjectKvs final : public AreaMapKvs<CNmtExpTransitionObjectKvs> {
+class CNmtExpTransitionObjectKvs final : public ValueOrMapKvs<CNmtExpTransitionObjectKvs> {
  public:
-  using AreaMapKvs::AreaMapKvs;
+  using ValueOrMapKvs::ValueOrMapKvs;
 
   static constexpr PageId kPage = PageId::mtExpTransition;
   static constexpr Text kDescription = texts::bed::transition;

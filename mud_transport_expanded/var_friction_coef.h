@@ -7,9 +7,9 @@
 namespace gridbay {
 
 // The coefficient by which mud slides in an area, where it varies.
-class CNmtExpVarFrictionCoefObjectKvs final : public AreaMapKvs<CNmtExpVarFrictionCoefObjectKvs> {
+class CNmtExpVarFrictionCoefObjectKvs final : public ValueOrMapKvs<CNmtExpVarFrictionCoefObjectKvs> {
  public:
-  using AreaMapKvs::AreaMapKvs;
+  using ValueOrMapKvs::ValueOrMapKvs;
 
   static constexpr PageId kPage = PageId::mtExpVarFrictionCoef;
   static constexpr Text kDescription = texts::bed::frictionCoefficient;

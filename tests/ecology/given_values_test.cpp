@@ -176,7 +176,8 @@ TEST_F(GivenValues, MapsOfAConstantFitTheirAreasAndGiveOneMessage) {
   CWQSConstantsItemKvs& it = root.wqsConstants->at(1);
   const auto texts = [&] {
     ValidationList messages;
-    EXPECT_EQ(it.Validate(messages, 1, 1), messages.size());
+    const unsigned counted = it.Validate(messages, 1, 1);
+    EXPECT_EQ(counted, messages.size());
     return test::textsOf(messages);
   };
   it.format = CWQSConstantsItemKvs::kMap;
@@ -247,7 +248,7 @@ TEST_F(GivenValues, ForcingsAreTakenOverWhereTheyFit) {
   EXPECT_EQ(valueAfter("ID 4; User_Specified #true; Spatial_Variation 2"), 2.5);
   test::load(
       *root.wqsForcings,
-      "FORCINGS { FORCING_1 { ID 4; Data_Format 1; File_Name (file)\"f.tsb0\"; Item_Numbers 2; Value 3.0 } "
+      "FORCINGS { FORCING_1 { ID 4; Data_Format 1; File_Name (file)\"f.tsb0\"; Item_Numbers 2; Value 3.0 }; "
       "FORCING_2 { ID 6; User_Specified #false; Data_Format 1; Value 5.0 } }");
   EXPECT_EQ(root.wqsForcings->at(1).format, 1);
   EXPECT_EQ(root.wqsForcings->at(1).file.items, std::vector<std::uint32_t>{2});
@@ -425,10 +426,10 @@ TEST_F(GivenValues, WhatIsSetByItsPath) {
   if (theEdition.wetlandSweepKit) GTEST_SKIP() << "it has no such model";
   root.moduleSelection->simulationType = module::kEcological;
   const std::string document = folder.file("s.v27");
-  const auto set = [&](std::string_view path, std::string_view keyword) {
+  const auto set = [&](std::string_view at, std::string_view keyword) {
     const KvsHandle given = test::fileOf(keyword);
     PathAccess access{PathAccess::What::set, nullptr, &given->tree().root(), &document};
-    return root.AccessPath(path, access) && !access.isWrittenOnly;
+    return root.AccessPath(at, access) && !access.isWrittenOnly;
   };
   EXPECT_TRUE(set("BIO_RIG_MODULE/CONSTANTS/CONSTANT_1/Value", "Value 3.5"));
   EXPECT_EQ(root.wqsConstants->at(1).value, 3.5);

@@ -324,7 +324,7 @@ TEST_F(ExpandedBedPages, Dredging) {
   EXPECT_TRUE(dredgers.updateBed);
   EXPECT_EQ(headers(),
             (Labels{"Dredger", "Fraction 1", "Fraction 2", "Projection", "File Name", "", "", "Area"}));
-  EXPECT_EQ(rowOf(grid(), 2), (Labels{"0.5", "0.5", "UTM-32", "", "  ...  ", "View...", "2"}));
+  EXPECT_EQ(rowOf(grid(), 2), (Labels{"0.500000", "0.500000", "UTM-32", "", "  ...  ", "View...", "2"}));
   EXPECT_EQ(usableOf(grid(), 2), "xxxxx.x");
   EXPECT_EQ(store(2, 2, "0.75"), 1);
   EXPECT_EQ(dredgers.at(2).weights[1], 0.75F);

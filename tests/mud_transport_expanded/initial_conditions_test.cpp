@@ -4,6 +4,7 @@
 
 #include "basic/bathymetry.h"
 #include "mud_transport_expanded/task_selection.h"
+#include "platform/units/units.h"
 #include "tests/support/grids.h"
 #include "tests/support/model.h"
 #include "tests/support/temporary_folder.h"
@@ -209,7 +210,7 @@ TEST_F(ExpandedInitial, MapsMustFitTheirArea) {
   EXPECT_EQ(faults(), Texts{invalid});
   write();
   EXPECT_THAT(faults(), IsEmpty());
-  write(12, 999);  // of any quantity
+  write(12, item::kBedDensity);  // of any quantity
   EXPECT_THAT(faults(), IsEmpty());
   write(11);
   EXPECT_EQ(faults(), Texts{invalid});
@@ -229,12 +230,12 @@ TEST_F(ExpandedInitial, TheFormatOfAThicknessIsThatOfTheFirstArea) {
 
 TEST_F(ExpandedInitial, ValuesByTheirPaths) {
   root.nmtExpTaskSelection->SetCounts(1, 2, true);
-  const auto set = [this](std::string_view path, std::string_view text) {
+  const auto set = [this](std::string_view at, std::string_view text) {
     const KvsHandle file = test::fileOf(text);
     const std::string documentPath;
     PathAccess access{
         .what = PathAccess::What::set, .in = &file->tree().root(), .documentPath = &documentPath};
-    EXPECT_TRUE(initial.AccessPath(path, access)) << path;
+    EXPECT_TRUE(initial.AccessPath(at, access)) << at;
   };
   set("INITIAL_CONCENTRATIONS/SEDIMENT_FRACTION_1/AREA_1/Constant_Value", "Constant_Value 2.0");
   set("INITIAL_CONCENTRATIONS/Salinity/AREA_1/Constant_Value", "Constant_Value 30.0");

@@ -40,12 +40,12 @@ class ExpandedMudPages : public test::ShapeTest {
 TEST_F(ExpandedMudPages, HaveTheirNumbers) {
   CDlgEnumerator enumerator;
   for (const int id : {63, 64, 68, 73, 74, 75, 76, 79, 84, 85, 86, 88, 91, 92}) {
-    std::int32_t topic = 0;
-    std::int32_t local = 0;
+    std::string topic;
+    std::string local;
     open(enumerator.GetPageClass(id, &topic, &local));
     ASSERT_NE(page, nullptr) << id;
     EXPECT_EQ(static_cast<int>(page->pageId()), id);
-    EXPECT_EQ(page->templateId() + 131072, topic) << id;
+    EXPECT_EQ(page->templateId() + 131072, enumerator.GetHelpTopicNumber(id)) << id;
   }
 }
 
@@ -110,7 +110,7 @@ TEST_F(ExpandedMudPages, InitialConditions) {
   EXPECT_EQ(usableOf(concentrations, 2), "xx...");
   EXPECT_EQ(concentrations.StoreStyleRowCol(3, 2, "35"), 1);
   EXPECT_EQ(initial.components.at(1).at(2).value, 35);
-  EXPECT_EQ(concentrations.StoreStyleRowCol(5, 1, "1"), 1);
+  EXPECT_EQ(concentrations.StoreStyleRowCol(5, 1, "Type 2 data file"), 1);
   EXPECT_EQ(initial.components.at(2).at(1).format, 1);
   EXPECT_EQ(usableOf(concentrations, 5), "x.xx.");
   EXPECT_EQ(usableOf(concentrations, 6), "xx...");
@@ -126,7 +126,7 @@ TEST_F(ExpandedMudPages, AThicknessIsCommonToAllAreasButForItsMaps) {
   EXPECT_EQ(thickness.StoreStyleRowCol(6, 2, "1.5"), 1);
   EXPECT_EQ(initial.thicknesses.at(2).at(1).value, 1.5F);
   EXPECT_EQ(textIn(thickness, 5, 2), "1.500000");
-  EXPECT_EQ(thickness.StoreStyleRowCol(5, 1, "1"), 1);
+  EXPECT_EQ(thickness.StoreStyleRowCol(5, 1, "Type 2 data file"), 1);
   EXPECT_EQ(usableOf(thickness, 6), "x.xx.");
   EXPECT_EQ(thickness.StoreStyleRowCol(6, 3, "t.tsb2"), 1);
   EXPECT_EQ(initial.thicknesses.at(2).at(2).file.fileName.text(), "t.tsb2");
@@ -163,7 +163,7 @@ TEST_F(ExpandedMudPages, Boundaries) {
   EXPECT_EQ(constants.GetRowHeader(2), "Fraction no. 1");
   EXPECT_EQ(constants.StoreStyleRowCol(1, 2, "31"), 1);
   EXPECT_EQ(root().nmtExpBoundary->at(2).constants[0], 31);
-  EXPECT_EQ(grid("Boundary concentrations").StoreStyleRowCol(1, 1, "2"), 1);
+  EXPECT_EQ(grid("Boundary concentrations").StoreStyleRowCol(1, 1, "Type 1 data file"), 1);
   EXPECT_EQ(root().nmtExpBoundary->at(1).format, 2);
   EXPECT_EQ(usableOf(constants, 1), ".x");
 }
@@ -172,8 +172,8 @@ TEST_F(ExpandedMudPages, Sources) {
   root().sourceSink->SetNoSources(1);
   task.SetCounts(1, 1, true);
   open("CNmtExpSourcesDlg");
-  EXPECT_EQ(headers(), (Labels{"Source Sink", "Given as", "Salinity", "Fraction no. 1", "File name",
-                               "  ...  ", "View..."}));
+  EXPECT_EQ(headers(),
+            (Labels{"Source Sink", "Given as", "Salinity", "Fraction no. 1", "File name", "", ""}));
   EXPECT_EQ(cell(1, 2), "20.000000");
   EXPECT_EQ(store(1, 3, "0.5"), 1);
   EXPECT_EQ(root().nmtExpSources->at(1).constants, (std::vector<float>{20, 0.5F}));
@@ -241,8 +241,7 @@ TEST_F(ExpandedMudPages, TheWaveDatabase) {
   edit("Number:", "2");
   edit("Number:", "3", 2);
   EXPECT_EQ(database.maps.GetCount(), 6);
-  EXPECT_EQ(headers(),
-            (Labels{"", "Wind speed", "Water level", "Wind direction", "File Name", "  ...  ", "View..."}));
+  EXPECT_EQ(headers(), (Labels{"", "Wind speed", "Water level", "Wind direction", "File Name", "", ""}));
   EXPECT_EQ(rowOf(grid("Wave maps"), 5),
             (Labels{"10.000000", "0.000000", "180.000000", "", "  ...  ", "View..."}));
   EXPECT_EQ(usableOf(grid("Wave maps"), 5), "...xx.");

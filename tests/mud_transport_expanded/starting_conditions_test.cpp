@@ -176,10 +176,12 @@ TEST_F(ExpandedStart, WithoutTheBlockTheCountsStay) {
 TEST_F(ExpandedStart, ABlockThatCannotBeIsToldOfTheOlderPageAndChangesNothing) {
   constexpr float kNaN = std::numeric_limits<float>::quiet_NaN();
   constexpr float kInfinity = std::numeric_limits<float>::infinity();
-  const std::vector<std::vector<float>> bad{
-      {0, 2, -1},   {0, -1, 3},         {0, 2},        {},
-      {0, 2, kNaN}, {0, kNaN, 2},       {kNaN, 2, 3},  {0, 2, kInfinity},
-      {1, 0, 3},    {0, 2147483647, 3}, {0, 3, 1e30F}, {0, 101, 3}};
+  const std::vector<std::vector<float>> bad{{0, 2, -1},    {0, -1, 3},
+                                            {0, 2},        {},
+                                            {0, 2, kNaN},  {0, kNaN, 2},
+                                            {kNaN, 2, 3},  {0, 2, kInfinity},
+                                            {1, 0, 3},     {0, 2147483647.0F, 3},
+                                            {0, 3, 1e30F}, {0, 101, 3}};
   for (const std::vector<float>& values : bad) {
     if (values.empty()) continue;
     begin({{"V27_Misc", values}});

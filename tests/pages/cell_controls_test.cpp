@@ -115,6 +115,12 @@ TEST_F(Cells, ARebuildGivesAndTakesNothing) {
   EXPECT_EQ(page.cells.file, "old");
 }
 
+// Grids of which the table names no class, or one class for two.
+constexpr std::pair<std::string_view, int> kGridsBeyondTheTable[] = {
+    {"CNmtExpMassBudgetDlg", 1}, {"CNmtExpResultDlg", 1},      {"CWQSADBoundaryDlg", 1},
+    {"CWQSADDepositionDlg", 1},  {"CWQSStateVariablesDlg", 1},
+};
+
 TEST_F(Cells, EachPageHasTheGridsOfTheTable) {
   int pages = 0;
   for (const PageEntry& entry : CDlgEnumerator().pages()) {
@@ -125,11 +131,13 @@ TEST_F(Cells, EachPageHasTheGridsOfTheTable) {
     for (const Control& control : built->form().controls()) {
       if (control.grid != nullptr) classes.insert(typeid(*control.grid));
     }
-    const auto named = entry.grids.empty() ? 0 : 1 + std::ranges::count(entry.grids, ',');
+    auto named = entry.grids.empty() ? 0 : 1 + std::ranges::count(entry.grids, ',');
+    for (const auto& [pageClass, more] : kGridsBeyondTheTable)
+      named += pageClass == entry.pageClass ? more : 0;
     EXPECT_EQ(static_cast<std::ptrdiff_t>(classes.size()), named) << entry.pageClass;
     ++pages;
   }
-  EXPECT_EQ(pages, 38);
+  EXPECT_EQ(pages, 113);
 }
 
 TEST(FormTest, AnIntegerWithAUnitIsShownInItAndKeptInBaseUnits) {

@@ -372,6 +372,345 @@ TEST(GlobalKvs, ANewModelIsWholeAndHasOneArea) {
   EXPECT_EQ(savedText(model.root), newModelText(selectionText(0)));
 }
 
+// One fraction over one layer.
+constexpr const char* kNewExpandedMud = R"text(        STARTING_CONDITIONS {
+            Hot_Start #false
+            Start_MT_at_HD_Time_Step 0
+            End_MT_at_HD_Time_Step 100
+            Integration_period_start 0
+            Integration_period_end 100
+            AREA_1 {
+                DATA_FILE {
+                    File_Name (file)""
+                }
+            }
+        }
+        TASK_SELECTION {
+            Number_of_layers 1
+            Number_of_fractions 1
+            Include_salinity #false
+            Include_xenobiotics #false
+        }
+        INITIAL_CONCENTRATIONS {
+            SEDIMENT_FRACTION_1 {
+                AREA_1 {
+                    Data_Format 0
+                    Constant_Value 0.0
+                    File_Name (file)""
+                    Item_Numbers 1
+                }
+            }
+        }
+        INITIAL_BED_THICKNESS {
+            BED_LAYER_1 {
+                Data_Format 0
+                Constant_Value 0.0
+                AREA_1 {
+                    File_Name (file)""
+                    Item_Numbers 1
+                }
+            }
+        }
+        INITIAL_BED_SEDIMENT_DISTRIBUTION {
+            BED_LAYER_1 {
+                Fraction_Distribution 100
+            }
+        }
+        DISPERSION_CONDITIONS {
+            Dispersion_Prop_to_Current 0
+            Proportionality_Factor_Xdir 1.0
+            Proportionality_Factor_Ydir 1.0
+            Min_Dispersion_Coefficient 0.0
+            Max_Dispersion_Coefficient 0.0
+            X_DIRECTION_COEFFICIENTS {
+                Data_Format 0
+                Constant_Value 0.0
+                AREA_1 {
+                    File_Name (file)""
+                    Item_Numbers 1
+                }
+            }
+            Y_DIRECTION_COEFFICIENTS {
+                Data_Format 0
+                Constant_Value 0.0
+                AREA_1 {
+                    File_Name (file)""
+                    Item_Numbers 1
+                }
+            }
+        }
+        SOURCE_CONCENTRATIONS {}
+        BOUNDARY_CONCENTRATIONS {}
+        FORCING_FUNCTIONS {
+            WAVE_DATA {
+                Type_of_Wave_variation 0
+                Shearstress_Formulation 0
+                Include_Liquefaction 0
+                Do_Combined_Wave_Current_Shearstress_Calculations #true
+                Liquefaction_factor 1.0
+                Minimum_waterdepth_for_including_waves 0.0
+                TWOD_Wavefields {
+                    File_Name (file)""
+                    Item_Numbers 1
+                }
+                Constant_Wave_Data {
+                    Constant_Wave_Height 0.3
+                    Constant_Wave_Period 3.0
+                    Constant_Wave_Direction 0.0
+                }
+                WAVE_DATABASE_PARAMETERS {
+                    WIND_SPEED {
+                        Starting_value_of_windspeed 5.0
+                        Increment_value_of_windspeed 5.0
+                        Number_of_windspeeds 1
+                    }
+                    WIND_DIRECTION {
+                        Starting_value_of_wind_direction 90.0
+                        Increment_value_of_wind_direction 90.0
+                        Number_of_wind_directions 1
+                    }
+                    WATER_LEVEL {
+                        Starting_value_of_water_level 0.0
+                        Increment_value_of_water_level 1.0
+                        Number_of_water_levels 1
+                    }
+                    Data_Base_File_Name_1_1_1 (file)""
+                }
+            }
+            Include_dredging 0
+            DREDGING {
+                Number_of_active_dredgers 0
+                Update_bed #false
+            }
+        }
+        Watercoloumn_Parameters {
+            VISCOSITY_PARAMETERS {}
+            FALL_VELOCITY_PARAMETERS {
+                Flocculation_Description 0
+                Hindered_Settling_Description 0
+                RhoSed 2650.0
+                GelPoint 50.0
+                CHinder 10.0
+                C1Salt -0.33
+                C2Salt 0.01
+                Cfloc 0.0
+                SEDIMENT_FRACTION_1 {
+                    Gamma 1.0
+                    Wsn 1.0
+                    AREA_1 {
+                        Data_Format 0
+                        Constant_Value 0.0005
+                        File_Name (file)""
+                        Item_Numbers 1
+                    }
+                }
+            }
+            DEPOSITION_PARAMETERS {
+                Sediment_Profile_Description 1
+                CentroidHeight 0.3
+                CRITICAL_SHEAR_STRESS_DEPOSITION {
+                    SEDIMENT_FRACTION_1 {
+                        AREA_1 {
+                            Data_Format 0
+                            Constant_Value 0.07
+                            File_Name (file)""
+                            Item_Numbers 1
+                        }
+                    }
+                }
+            }
+            SAND_FRACTIONS {
+                Sand_Fraction_Description 0
+                Sand_fraction_1 1
+                Mean_Fall_Velocity_Fraction_1 0.001
+            }
+        }
+        BED_PARAMETERS {
+            EROSION_COEFFICIENTS {
+                CMax 50.0
+                BED_LAYER_1 {
+                    Erosion_Description 1
+                    Em 1.0
+                    AREA_1 {
+                        Data_Format 0
+                        Constant_Value 5e-05
+                        File_Name (file)""
+                        Item_Numbers 1
+                    }
+                }
+            }
+            CRITICAL_SHEAR_STRESS_EROSION {
+                BED_LAYER_1 {
+                    AREA_1 {
+                        Data_Format 0
+                        Constant_Value 0.1
+                        File_Name (file)""
+                        Item_Numbers 1
+                    }
+                }
+            }
+            DENSITY_OF_BED_MATERIAL {
+                BED_LAYER_1 {
+                    AREA_1 {
+                        Data_Format 0
+                        Constant_Value 180.0
+                        File_Name (file)""
+                        Item_Numbers 1
+                    }
+                }
+            }
+            SLIDING {
+                Include_sliding 0
+                Include_variable_sliding_coefficient 0
+                Variable_sliding_coefficient {
+                    Solid_Density 2650.0
+                    AREA_1 {
+                        Data_Format 0
+                        Constant_Value 0.0001
+                        File_Name (file)""
+                        Item_Numbers 1
+                    }
+                }
+                Constant_sliding_coefficient {
+                    BED_LAYER_1 {
+                        AREA_1 {
+                            Data_Format 0
+                            Constant_Value 0.0001
+                            File_Name (file)""
+                            Item_Numbers 1
+                        }
+                    }
+                }
+            }
+            MORPHOLOGY {
+                Include_Morphology 0
+                Include_Speedup_Factor 0
+                Speedup_Factor 1.0
+            }
+            BED_ROUGHNESS {
+                AREA_1 {
+                    Data_Format 0
+                    Constant_Value 0.001
+                    File_Name (file)""
+                    Item_Numbers 1
+                }
+            }
+            TRANSITION_OF_MUD_BETWEEN_LAYERS {
+                Include_transition_of_mud_within_layers 0
+            }
+        }
+        MASS_BUDGET {
+            NoOfMassFiles 0
+        }
+        MT_LINE_DISCHARGE_CALCULATIONS {
+            No_Of_MT_Discharge_Lines 0
+        }
+        OUTPUT_SPECIFICATION {
+            Number_Of_Output_areas 0
+            Generate_Hotstart #false
+            HOTSTART_FILES {
+                AREA_1 {
+                    Title ""
+                    File_Name (result)""
+                }
+            }
+        }
+        XENOBIOTIC_MODULE {
+            OPTION_PARAMETERS {}
+        }
+)text";
+
+// Without a model definition.
+constexpr const char* kNewEcology = R"text(        MODEL_DEFINITION {
+            Model_Definition_File (file)""
+            Integration_Method 1
+            Update_Frequency 1
+            Disable_Processes #false
+        }
+        STATE_VARIABLES {
+            NoOfComponents 0
+        }
+        STARTING_CONDITIONS {
+            Hot_Start #false
+            AREA_1 {
+                DATA_FILE {
+                    File_Name (file)""
+                }
+            }
+        }
+        INITIAL_CONDITIONS {}
+        AD_TRANSPORT_PARAMETERS {
+            AD_BOUNDARY {}
+            AD_DISPERSION {
+                Dispersion_Prop_to_Current 0
+                Proportionality_Factor_Xdir 1.0
+                Proportionality_Factor_Ydir 1.0
+                Min_Dispersion_Coefficient 0.0
+                Max_Dispersion_Coefficient 0.0
+                X_DIRECTION_COEFFICIENTS {
+                    Data_Format 0
+                    Constant_Value 0.0
+                    AREA_1 {
+                        File_Name (file)""
+                        Item_Numbers 1
+                    }
+                }
+                Y_DIRECTION_COEFFICIENTS {
+                    Data_Format 0
+                    Constant_Value 0.0
+                    AREA_1 {
+                        File_Name (file)""
+                        Item_Numbers 1
+                    }
+                }
+            }
+            AD_SOURCESINK {}
+            PRECIPITATION {
+                Data_Format -1
+                File_Name (file)""
+                Item_Numbers
+            }
+            EVAPORATION {
+                Data_Format -1
+                File_Name (file)""
+                Item_Numbers
+            }
+            INFILTRATION {
+                Data_Format -3
+                File_Name (file)""
+                Item_Numbers
+            }
+            AD_DEPOSITION {
+                IncludeSurfaceDeposition #false
+                SurfaceDeposition {}
+                IncludeSoilDeposition #false
+                SoilDeposition {}
+            }
+        }
+        CONSTANTS {
+            No_Of_Constants 0
+        }
+        FORCINGS {
+            No_Of_Forcings 0
+        }
+        MASS_BUDGET {
+            No_Of_Mass_Files 0
+        }
+        OUTPUT_SPECIFICATION {
+            ADDITIONAL_OPTIONAL_OUTPUT {
+                No_Of_Items 0
+            }
+            Number_Of_Output_areas 0
+            Generate_Hotstart #false
+            HOTSTART_FILES {
+                AREA_1 {
+                    Title ""
+                    File_Name (result)""
+                }
+            }
+        }
+)text";
+
 TEST(GlobalKvs, TheSectionsOfTheSelectedModuleAreWritten) {
   Model model;
   const auto textFor = [&model](int code) {
@@ -546,76 +885,8 @@ TEST(GlobalKvs, TheSectionsOfTheSelectedModuleAreWritten) {
                                      "            }\n"
                                      "        }\n"));
   EXPECT_EQ(textFor(3), newModelText(selectionText(3), "", newMudText()));
-  EXPECT_EQ(textFor(8), newModelText(selectionText(8), "", "",
-                                     "        FORCING_FUNCTIONS {\n"
-                                     "            WAVE_DATA {}\n"
-                                     "            DREDGING {\n"
-                                     "                Number_of_active_dredgers 0\n"
-                                     "                Update_bed #false\n"
-                                     "            }\n"
-                                     "        }\n"
-                                     "        Watercoloumn_Parameters {\n"
-                                     "            VISCOSITY_PARAMETERS {}\n"
-                                     "            FALL_VELOCITY_PARAMETERS {\n"
-                                     "                Flocculation_Description 0\n"
-                                     "                Hindered_Settling_Description 0\n"
-                                     "                RhoSed 2650.0\n"
-                                     "                GelPoint 50.0\n"
-                                     "                CHinder 10.0\n"
-                                     "                C1Salt -0.33\n"
-                                     "                C2Salt 0.01\n"
-                                     "                Cfloc 0.0\n"
-                                     "            }\n"
-                                     "            DEPOSITION_PARAMETERS {\n"
-                                     "                Sediment_Profile_Description 1\n"
-                                     "                CentroidHeight 0.3\n"
-                                     "                CRITICAL_SHEAR_STRESS_DEPOSITION {}\n"
-                                     "            }\n"
-                                     "            SAND_FRACTIONS {\n"
-                                     "                Sand_Fraction_Description 0\n"
-                                     "            }\n"
-                                     "        }\n"
-                                     "        BED_PARAMETERS {\n"
-                                     "            EROSION_COEFFICIENTS {\n"
-                                     "                CMax 50.0\n"
-                                     "            }\n"
-                                     "            CRITICAL_SHEAR_STRESS_EROSION {}\n"
-                                     "            DENSITY_OF_BED_MATERIAL {}\n"
-                                     "            SLIDING {\n"
-                                     "                Include_sliding 0\n"
-                                     "                Include_variable_sliding_coefficient 0\n"
-                                     "                Variable_sliding_coefficient {\n"
-                                     "                    Solid_Density 2650.0\n"
-                                     "                    AREA_1 {\n"
-                                     "                        Data_Format 0\n"
-                                     "                        Constant_Value 0.0001\n"
-                                     "                        File_Name (file)\"\"\n"
-                                     "                        Item_Numbers 1\n"
-                                     "                    }\n"
-                                     "                }\n"
-                                     "                Constant_sliding_coefficient {}\n"
-                                     "            }\n"
-                                     "            MORPHOLOGY {\n"
-                                     "                Include_Morphology 0\n"
-                                     "                Include_Speedup_Factor 0\n"
-                                     "                Speedup_Factor 1.0\n"
-                                     "            }\n"
-                                     "            BED_ROUGHNESS {\n"
-                                     "                AREA_1 {\n"
-                                     "                    Data_Format 0\n"
-                                     "                    Constant_Value 0.001\n"
-                                     "                    File_Name (file)\"\"\n"
-                                     "                    Item_Numbers 1\n"
-                                     "                }\n"
-                                     "            }\n"
-                                     "            TRANSITION_OF_MUD_BETWEEN_LAYERS {\n"
-                                     "                Include_transition_of_mud_within_layers 0\n"
-                                     "            }\n"
-                                     "        }\n"
-                                     "        XENOBIOTIC_MODULE {\n"
-                                     "            OPTION_PARAMETERS {}\n"
-                                     "        }\n"));
-  EXPECT_EQ(textFor(9), newModelText(selectionText(9), "", "", "", "        AD_TRANSPORT_PARAMETERS {}\n"));
+  EXPECT_EQ(textFor(8), newModelText(selectionText(8), "", "", kNewExpandedMud));
+  EXPECT_EQ(textFor(9), newModelText(selectionText(9), "", "", "", kNewEcology));
   EXPECT_EQ(textFor(11), newModelText(selectionText(11)));
 }
 
