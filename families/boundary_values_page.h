@@ -43,6 +43,15 @@ class BoundaryValuesGrid : public ColumnGrid {
 // The constants: a row for each entry, a column for each boundary.
 template <auto list, class Module>
 class BoundaryConstantsGrid : public ColumnGrid {
+ public:
+  RowLook GetRowLook(int row) override {
+    constexpr double kTwoLines = 1.8;
+    RowLook look = ColumnGrid::GetRowLook(row);
+    if (GetRowHeader(row).find('\n') != std::string::npos) look.height = kTwoLines;
+    return look;
+  }
+
+ private:
   int LayoutKey() override { return rootMember<list>(GetKvs()).GetCount(); }
   int RowHeaderWidth() override { return 120; }
   std::string RowHeader(GridRow row) override { return Module::name(GetKvs(), row.item); }
