@@ -6,6 +6,7 @@
 #include "basic/boundary.h"
 #include "basic/page_texts.h"
 #include "core/edition.h"
+#include "core/model_root.h"
 
 namespace gridbay {
 
@@ -34,7 +35,10 @@ void CBathymetryGrid::LayOut() {
 
 // Another grid for Area 1 brings its projection, and makes boundaries that were detected worthless.
 void CBathymetryGrid::OnFileChanged(int row) {
-  if (row != 1) return;
+  if (row != 1) {
+    if (!isByButton_) ResetDispersion();
+    return;
+  }
   CBathymetryKvs& areas = *parts<BasicParts>().bathymetry;
   areas.OnArea1FileChanged();
   CBoundaryKvs& boundaries = *parts<BasicParts>().boundary;
@@ -42,6 +46,21 @@ void CBathymetryGrid::OnFileChanged(int row) {
   const bool ask = boundaries.GetCount() > 0;
   if (!ask || document().host().askYesNo(formatted(texts::recalculateBoundaries)))
     boundaries.RecalculateBoundaries();
+  ResetDispersion();
+}
+
+void CBathymetryGrid::OnClickedButtonRowCol(int row, int col) {
+  isByButton_ = true;
+  ColumnGrid::OnClickedButtonRowCol(row, col);
+  isByButton_ = false;
+}
+
+// Who has a dispersion by the spacing of the grids is told, unless the user has given one.
+void CBathymetryGrid::ResetDispersion() {
+  CBathymetryObjectKvs* area1 = parts<BasicParts>().bathymetry->GetArea(1);
+  auto* root = area1 == nullptr ? nullptr : area1->parts<ModelRoot>();
+  if (root != nullptr && !document().HasBeenTouched(PageId::mtExpDispersionCoef))
+    root->TellFollowers(*area1, {});
 }
 
 void CBathymetryDlg::DoDataExchange(Form& form) {

@@ -2,9 +2,12 @@
 
 #include <fmt/ranges.h>
 
+#include <array>
+
 #include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
 #include "basic/simulation_period.h"
+#include "core/model_root.h"
 #include "platform/units/units.h"
 
 namespace gridbay {
@@ -47,6 +50,16 @@ void CSimulationPeriodDlg::SetData() {
   maxCourant_ = isKnown ? fmt::format("{:.6g}", courant) : std::string();
   courantArea_ = isKnown ? std::to_string(area) : std::string();
   CV27SetupFormView::SetData();
+}
+
+void CSimulationPeriodDlg::OnLeave() {
+  CSimulationPeriodKvs& period = *parts<BasicParts>().simulationPeriod;
+  const std::array steps{0, period.noPointsInTime - 1};
+  auto* root = period.parts<ModelRoot>();
+  if (root == nullptr) return;
+  const auto told = [&] { root->TellFollowers(period, steps); };
+  document().Attempt(told);
+  document().RecordEdit(pageId(), "Simulation Period");
 }
 
 }  // namespace gridbay

@@ -12,6 +12,8 @@ class CSimulationPeriodDlg final : public Page<18926, PageId::simulationPeriod> 
  public:
   using Page::Page;
   void SetData() override;
+  // The period is told to those who begin with it.
+  void OnLeave() override;
 
  private:
   void DoDataExchange(Form& form) override;

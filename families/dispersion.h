@@ -91,6 +91,18 @@ class DispersionCoefKvs : public TableKvs<Self> {
     filesY.SetCount(n);
   }
 
+  // The coefficients that suit the grids: 0.06 of the square of the smallest spacing, in a time step. They
+  // stay while no grid is known.
+  void SetToGrids() {
+    constexpr Real kPart{0.06F};
+    auto* basic = this->template parts<BasicParts>();
+    const std::optional<GridSpacing> least = smallestSpacing(*this);
+    if (basic == nullptr || !least || basic->simulationPeriod->timeStepInterval <= 0) return;
+    const Real dt = basic->simulationPeriod->timeStepInterval;
+    constantX = least->dx * least->dx * kPart / dt;
+    constantY = least->dy * least->dy * kPart / dt;
+  }
+
   unsigned Validate(ValidationList& messages, int deep) override {
     const bool isProportional = proportional != 0;
     unsigned faults = 0;

@@ -41,6 +41,12 @@ class CNmtExpStartingConditionsKvs final
                    keyword(kIntegrationEnd, &Self::integrationEnd), hotFileRows());
   }
 
+  // Both ranges become those steps.
+  void SetPeriod(std::int32_t first, std::int32_t last) {
+    firstStep = integrationStart = first;
+    lastStep = integrationEnd = last;
+  }
+
   // The integration period may also stand in a section beside, which has the last word.
   void Load(KvsSection section, const std::string& documentPath) override;
 

@@ -4,6 +4,7 @@
 
 #include "basic/bathymetry.h"
 #include "basic/boundary.h"
+#include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "mud_transport_expanded/boundary.h"
 #include "mud_transport_expanded/dispersion_coef.h"
@@ -332,6 +333,37 @@ TEST_F(ExpandedMudPages, OutputsHaveADialogForTheirItems) {
   EXPECT_EQ(results.outputs.GetCount(), 18);
   choose("Generate hot Start", 1);
   EXPECT_TRUE(results.generateHotStart);
+}
+
+TEST_F(ExpandedMudPages, ThePeriodIsTakenOverWhenItsPageIsLeft) {
+  CNmtExpStartingConditionsKvs& start = *root().nmtExpStartingConditions;
+  start.firstStep = start.integrationStart = 7;
+  open("CSimulationPeriodDlg");
+  root().simulationPeriod->noPointsInTime = 501;
+  page->OnLeave();
+  EXPECT_EQ((std::vector{start.firstStep, start.lastStep, start.integrationStart, start.integrationEnd}),
+            (std::vector{0, 500, 0, 500}));
+}
+
+TEST_F(ExpandedMudPages, AnotherGridResetsTheDispersionUntilThatIsTheUsers) {
+  root().bathymetry->SetNoAreas(2);
+  for (const int area : {1, 2}) {
+    root().bathymetry->GetArea(area)->dx = area == 1 ? 90.0F : 30.0F;
+    root().bathymetry->GetArea(area)->dy = 20;
+  }
+  root().simulationPeriod->timeStepInterval = 3;
+  CNmtExpDispersionCoefKvs& dispersion = *root().nmtExpDispersionCoef;
+  open("CBathymetryDlg");
+  EXPECT_EQ(grid("Areas").StoreStyleRowCol(2, 1, "y.tsb2"), 1);
+  EXPECT_FLOAT_EQ(dispersion.constantX, 18);
+  EXPECT_FLOAT_EQ(dispersion.constantY, 8);
+  dispersion.constantX = 5;
+  host.chosenFile = folder.write("z.tsb2", "");
+  grid("Areas").OnClickedButtonRowCol(2, 2);  // chosen for another area than the first
+  EXPECT_EQ(dispersion.constantX, 5);
+  document.Touch(PageId::mtExpDispersionCoef);
+  EXPECT_EQ(grid("Areas").StoreStyleRowCol(2, 1, "x.tsb2"), 1);
+  EXPECT_EQ(dispersion.constantX, 5);
 }
 
 }  // namespace
