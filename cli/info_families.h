@@ -2,6 +2,8 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
+
 #include "cli/info_topics.h"
 #include "families/boundary_values.h"
 #include "families/line_box.h"
@@ -19,7 +21,18 @@ namespace gridbay::cli {
 // A data file by its name alone, where its items are those of what is carried.
 Json dataFile(const FileNameValue& file);
 
-// The constant of each entry, or the file that gives them.
+// The value of an entry, in the unit of its declaration where the module's entries are declared.
+template <class Module>
+Json quantityOfEntry(CKvsBase& object, int entry, double value, int itemCode) {
+  Json told = quantity(value, itemCode);
+  if constexpr (requires { Module::declaration(object, entry); }) {
+    if (const auto* declared = Module::declaration(object, entry); declared != nullptr)
+      told["unit"] = declared->unit;
+  }
+  return told;
+}
+
+// The constant of each entry that there is, or the file that gives them.
 template <class Module, class Values, class QuantityOf>
 Json describeConcentrations(CKvsBase& object, Values& values, std::string_view fileKind,
                             const QuantityOf& quantityOf) {
@@ -29,8 +42,10 @@ Json describeConcentrations(CKvsBase& object, Values& values, std::string_view f
     return report;
   }
   Json report{{"given_as", "constant"}, {"values", Json::array()}};
-  for (int entry = 1; entry <= static_cast<int>(values.constants.size()); ++entry) {
-    Json value = quantity(static_cast<double>(*values.Constant(entry)), quantityOf(entry));
+  const int entries = std::min(static_cast<int>(values.constants.size()), Module::count(object));
+  for (int entry = 1; entry <= entries; ++entry) {
+    Json value = quantityOfEntry<Module>(object, entry, static_cast<double>(*values.Constant(entry)),
+                                         quantityOf(entry));
     value["name"] = Module::name(object, entry);
     report["values"].push_back(std::move(value));
   }
@@ -75,21 +90,25 @@ Json describeSurfaceValues(Values& values) {
                                         [&values](int entry) { return Module::quantity(values, entry); });
 }
 
-// An entry for each area of what has a format, a value and a file there.
-template <class Areas>
-Json describeAreas(Areas& areas, int itemCode) {
+// An entry for each area of what has a format, a value and a file there; `told` describes the value.
+template <class Areas, class Told>
+Json describeAreasAs(Areas& areas, const Told& told) {
   Json report = Json::array();
   for (int number = 1; number <= areas.GetCount(); ++number) {
     auto& value = areas.at(number);
     Json entry{{"area", number}};
     if (value.format == std::remove_reference_t<decltype(value)>::kConstant) {
-      entry["value"] = quantity(static_cast<double>(value.value), itemCode);
+      entry["value"] = told(static_cast<double>(value.value));
     } else {
       entry.update(dataFile(value.file));
     }
     report.push_back(std::move(entry));
   }
   return report;
+}
+template <class Areas>
+Json describeAreas(Areas& areas, int itemCode) {
+  return describeAreasAs(areas, [itemCode](double value) { return quantity(value, itemCode); });
 }
 
 // The same for each entry of a module.
@@ -98,7 +117,9 @@ Json describeEntryAreas(List& list) {
   Json report = Json::array();
   for (int entry = 1; entry <= list.GetCount(); ++entry) {
     report.push_back({{"name", Module::name(list, entry)},
-                      {"areas", describeAreas(list.at(entry), Module::quantity(list, entry))}});
+                      {"areas", describeAreasAs(list.at(entry), [&list, entry](double value) {
+                         return quantityOfEntry<Module>(list, entry, value, Module::quantity(list, entry));
+                       })}});
   }
   return report;
 }

@@ -131,5 +131,56 @@ TEST_F(InfoTransport, OfTheModuleThatRunsAlone) {
                                              : "module code 2 (hydrodynamics and advection-dispersion)"));
 }
 
+// What is told of the module of a whole setup.
+std::string toldOf(const std::string& name) {
+  const std::string text = runTool({"info", std::string(GRIDBAY_TESTS) + "/main_job/setups/" + name}).out;
+  const std::size_t start = text.find("\n\n");
+  return start == text.npos ? text : text.substr(start + 2);
+}
+
+TEST_F(InfoTransport, MudOfLayers) {
+  if (theEdition.wetlandSweepKit) GTEST_SKIP() << "this edition has no such module";
+  EXPECT_EQ(toldOf("mud_layers.v27"),
+            "Mud              multi layer task: 1 fraction over 3 layers, with salinity\n"
+            "Initially        Salinity 30 PSU in area 1; 0 PSU in area 2\n"
+            "Initially        Fraction 0 mg/l in area 1; 0 mg/l in area 2\n"
+            "Initially        Thickness layer no. 1 0 m in area 1; 0 m in area 2\n"
+            "Initially        Thickness layer no. 2 0.3 m in area 1; 0.3 m in area 2\n"
+            "Initially        Thickness layer no. 3 0 m in area 1; 0 m in area 2\n"
+            "Dispersion       0 m²/s along x, 0 m²/s along y\n"
+            "At boundary 1    Salinity 0 PSU, Fraction 0 mg/l\n"
+            "At boundary 2    Salinity 0 PSU, Fraction 0 mg/l\n"
+            "At boundary 3    Salinity 0 PSU, Fraction 0 mg/l\n"
+            "At boundary 4    Salinity 0 PSU, Fraction 0 mg/l\n"
+            "From source 1    Salinity 0 PSU, Fraction 0 mg/l\n"
+            "Eroding from     0.1 N/m² in layer 1; 0.4 N/m² in layer 2; 0.1 N/m² in layer 3\n"
+            "Density of bed   150000 g/m³ in layer 1; 150000 g/m³ in layer 2; 150000 g/m³ in layer 3\n"
+            "Sliding          the bed slides\n"
+            "Waves            1 m high, 5 s long, from 180°\n");
+}
+
+TEST_F(InfoTransport, ExpandedMud) {
+  if (theEdition.wetlandSweepKit) GTEST_SKIP() << "this edition has no such module";
+  const std::string text = toldOf("expanded_mud.v27");
+  EXPECT_THAT(text, ::testing::StartsWith("Mud              2 fractions over 3 layers\n"));
+  EXPECT_THAT(text, ::testing::HasSubstr(
+                        "Bed layer 2      thick 0.05 m in area 1; 0.05 m in area 2; dense 300 kg/m³ in "
+                        "area 1; 300 kg/m³ in area 2; fractions 50, 50 %\n"));
+  EXPECT_THAT(text,
+              ::testing::HasSubstr("At boundary 3    Fraction no. 1 0.3 kg/m³, Fraction no. 2 0.1 kg/m³\n"));
+  EXPECT_THAT(text, ::testing::HasSubstr("Waves            0.8 m high, 5 s long, from 280°\n"));
+}
+
+TEST_F(InfoTransport, Ecology) {
+  if (theEdition.wetlandSweepKit) GTEST_SKIP() << "this edition has no such module";
+  const std::string text = toldOf("oxygen.v27");
+  EXPECT_THAT(text, ::testing::HasSubstr(": 5 state variables, 5 constants, 2 forcings, 5 processes\n"));
+  EXPECT_THAT(text, ::testing::HasSubstr("Initially        NO3 0.5 g/m3 in area 1; 0.5 g/m3 in area 2\n"));
+  EXPECT_THAT(text, ::testing::HasSubstr("Constant         ka: 1 m/d\n"));
+  EXPECT_THAT(text, ::testing::HasSubstr("Forcing          temp: 15 °C\nForcing          depth: built in\n"));
+  EXPECT_THAT(text,
+              ::testing::HasSubstr("From source 1    OXY 3 g/m3, BOD 60 g/m3, NH4 12 g/m3, NO3 0.5 g/m3\n"));
+}
+
 }  // namespace
 }  // namespace gridbay
