@@ -148,7 +148,7 @@ TEST_P(EditorOf, AStateIsKnownAgainWhereTheOldestEditsAreForgotten) {
   constexpr int kEdits = 1010;  // more than are kept
   std::vector<std::uint64_t> states;
   for (int i = 1; i <= kEdits; ++i) {
-    edit(39, "Last:", std::to_string(i));
+    edit(26, "Drying depth:", std::to_string(i * 0.001));
     states.push_back(editor->modelState());
   }
   int undone = 0;
