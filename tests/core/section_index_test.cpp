@@ -29,7 +29,7 @@ void expectAsAWalkFinds(const Node& section) {
     names.push_back(other);
   }
   std::ranges::sort(names);
-  names.erase(std::ranges::unique(names).begin(), names.end());
+  names.erase(std::unique(names.begin(), names.end()), names.end());
   for (const std::string& name : names) {
     for (const std::uint32_t occurrence : {0U, 1U, 2U, 3U, 7U}) {
       const Node* expectedSection = occurrence == 0 ? nullptr : walk(section, name, occurrence, true);

@@ -47,7 +47,7 @@ class Holder final : public TableKvs<Holder> {
   ItemList<Layer> outputs;
   ItemList<Area> areas;
 
-  static constexpr bool kReadsOtherFiles = true;
+  [[maybe_unused]] static constexpr bool kReadsOtherFiles = true;
   static void numbered(CKvsBase&, Layer& layer, int number) { layer.format = number; }
 
   struct LoadedName {
