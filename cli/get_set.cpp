@@ -1,9 +1,10 @@
 #include <fmt/format.h>
 
 #include "cli/commands.h"
-#include "cli/member_keyword.h"
-#include "cli/setup_path.h"
 #include "core/kdl_writer.h"
+#include "setup/member_keyword.h"
+#include "setup/setting.h"
+#include "setup/setup_path.h"
 
 namespace gridbay::cli {
 namespace {
@@ -44,48 +45,6 @@ int get(const GetOptions& options, const Console& console) {
   return show(**found, console);
 }
 
-struct Setting {
-  std::string path;
-  std::string value;
-};
-
-Result<Setting> settingOf(const std::string& text) {
-  const std::size_t equals = text.find('=');
-  if (equals == text.npos) return Failure{fmt::format("\"{}\" is not of the form PATH=VALUE", text)};
-  return Setting{text.substr(0, equals), text.substr(equals + 1)};
-}
-
-// The engine's options are not in the model: a save passes on what stands in the file that was read.
-Outcome setOption(SetupFile& setup, const Setting& setting) {
-  const Result<const Node*> keyword = findPath(setup.source(), setting.path);
-  if (!keyword) return Failure{keyword.error()};
-  if ((*keyword)->isSection())
-    return Failure{fmt::format("\"{}\" is a section; name a keyword in it", setting.path)};
-  ParameterTree keeper;
-  const Result<std::vector<Value>> values = valuesOfText(**keyword, setting.value, false, keeper);
-  if (!values) return Failure{values.error()};
-  setup.replaceSource(withValues(setup.source(), *keyword, *values));
-  return {};
-}
-
-Outcome setMember(SetupFile& setup, const Setting& setting, const std::string& file) {
-  Result<MemberKeyword> keyword = findKeyword(setup.model(), setting.path, file);
-  if (!keyword) {
-    const KvsHandle effective = setup.tree(file);
-    const Result<const Node*> found = findPath(*effective, setting.path);
-    return found && (*found)->isSection()
-               ? Failure{fmt::format("\"{}\" is a section; name a keyword in it", setting.path)}
-               : Failure{found ? keyword.error() : found.error()};
-  }
-  ParameterTree keeper;
-  const Result<std::vector<Value>> values =
-      valuesOfText(keyword->node(), setting.value, keyword->takesAnyNumber(), keeper);
-  if (!values) return Failure{values.error()};
-  if (keyword->set(*values)) return {};
-  return Failure{fmt::format("{} cannot be {} here: it stays {}", setting.path, setting.value,
-                             shownValues(keyword->node()))};
-}
-
 int set(const SetOptions& options, const Console& console) {
   ConsoleMessageHost host(console);
   Result<SetupFile> setup = SetupFile::open(options.file, &host);
@@ -93,8 +52,7 @@ int set(const SetOptions& options, const Console& console) {
   for (const std::string& text : options.settings) {
     const Result<Setting> setting = settingOf(text);
     if (!setting) return console.fail(setting.error());
-    const Outcome done =
-        isOption(setting->path) ? setOption(*setup, *setting) : setMember(*setup, *setting, options.file);
+    const Outcome done = applySetting(*setup, *setting, options.file);
     if (!done) return console.fail(done.error());
   }
   return saveSetup(*setup, options.file, console);

@@ -6,7 +6,7 @@
 #include <vector>
 
 #include "cli/commands.h"
-#include "cli/nearest.h"
+#include "core/nearest.h"
 #include "core/number_text.h"
 
 namespace gridbay::cli {

@@ -3,8 +3,8 @@
 
 #include <cstdlib>
 
-#include "cli/member_keyword.h"
-#include "cli/setup_path.h"
+#include "setup/member_keyword.h"
+#include "setup/setup_path.h"
 
 using namespace gridbay;
 
@@ -14,15 +14,15 @@ extern "C" int LLVMFuzzerTestOneInput(const unsigned char* data, std::size_t siz
   if (equals == setting.npos) return 0;
   const std::string path(setting.substr(0, equals));
   CGlobalKvs model;
-  Result<cli::MemberKeyword> keyword = cli::findKeyword(model, path, "/nowhere/setup.v27");
+  Result<MemberKeyword> keyword = findKeyword(model, path, "/nowhere/setup.v27");
   if (!keyword) return 0;
   ParameterTree keeper;
   const auto values =
-      cli::valuesOfText(keyword->node(), setting.substr(equals + 1), keyword->takesAnyNumber(), keeper);
+      valuesOfText(keyword->node(), setting.substr(equals + 1), keyword->takesAnyNumber(), keeper);
   if (!values) return 0;
-  const std::string before = cli::shownValues(keyword->node());
+  const std::string before = shownValues(keyword->node());
   const bool taken = keyword->set(*values);
-  const Result<cli::MemberKeyword> after = cli::findKeyword(model, path, "/nowhere/setup.v27");
-  if (!after || (!taken && cli::shownValues(after->node()) != before)) std::abort();
+  const Result<MemberKeyword> after = findKeyword(model, path, "/nowhere/setup.v27");
+  if (!after || (!taken && shownValues(after->node()) != before)) std::abort();
   return 0;
 }

@@ -7,7 +7,7 @@
 #include "core/kvs.h"
 #include "platform/result.h"
 
-namespace gridbay::cli {
+namespace gridbay {
 
 // A path of the target without the target's own name, where it begins with that.
 std::string_view withoutTarget(std::string_view path);
@@ -33,4 +33,4 @@ KvsHandle withValues(const KvsFile& file, const Node* keyword, const std::vector
 // What a keyword holds, for people: a single text without quotes.
 std::string shownValues(const Node& keyword);
 
-}  // namespace gridbay::cli
+}  // namespace gridbay

@@ -4,7 +4,7 @@
 #include <string>
 #include <string_view>
 
-namespace gridbay::cli {
+namespace gridbay {
 
 // A text in small letters (those of ASCII).
 std::string lowered(std::string_view text);
@@ -16,4 +16,4 @@ std::size_t slipsBetween(std::string_view a, std::string_view b);
 // where none is near enough to be meant.
 std::string_view nearestOf(std::string_view wanted, std::span<const std::string_view> candidates);
 
-}  // namespace gridbay::cli
+}  // namespace gridbay

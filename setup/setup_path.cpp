@@ -1,17 +1,17 @@
-#include "cli/setup_path.h"
+#include "setup/setup_path.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
 #include <limits>
 
-#include "cli/nearest.h"
 #include "core/kdl_writer.h"
+#include "core/nearest.h"
 #include "core/number_text.h"
 #include "core/object_state.h"
 #include "setup/global_kvs.h"
 
-namespace gridbay::cli {
+namespace gridbay {
 namespace {
 
 void listPaths(const Node& section, const std::string& prefix, std::vector<std::string>& paths) {
@@ -188,4 +188,4 @@ std::string shownValues(const Node& keyword) {
   return text;
 }
 
-}  // namespace gridbay::cli
+}  // namespace gridbay

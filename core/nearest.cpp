@@ -1,11 +1,11 @@
-#include "cli/nearest.h"
+#include "core/nearest.h"
 
 #include <algorithm>
 #include <cctype>
 #include <numeric>
 #include <vector>
 
-namespace gridbay::cli {
+namespace gridbay {
 
 std::size_t slipsBetween(std::string_view a, std::string_view b) {
   std::vector<std::size_t> row(b.size() + 1);
@@ -42,4 +42,4 @@ std::string_view nearestOf(std::string_view wanted, std::span<const std::string_
   return nearest;
 }
 
-}  // namespace gridbay::cli
+}  // namespace gridbay

@@ -1,13 +1,13 @@
-#include "cli/member_keyword.h"
+#include "setup/member_keyword.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
 
-#include "cli/setup_path.h"
 #include "core/number_text.h"
+#include "setup/setup_path.h"
 
-namespace gridbay::cli {
+namespace gridbay {
 namespace {
 
 // Whether a keyword has these values; the model may hold a number with fewer digits.
@@ -58,4 +58,4 @@ Result<MemberKeyword> findKeyword(CGlobalKvs& model, std::string_view path, cons
   return keyword;
 }
 
-}  // namespace gridbay::cli
+}  // namespace gridbay

@@ -8,7 +8,7 @@
 #include "platform/result.h"
 #include "setup/global_kvs.h"
 
-namespace gridbay::cli {
+namespace gridbay {
 
 // A keyword that a path of a setup's target names, with the member behind it: what it holds is written and
 // taken by the rules of its own object, with nothing else loaded or saved.
@@ -38,4 +38,4 @@ class MemberKeyword {
 // An error when the model has no such keyword, or when its value follows from others.
 Result<MemberKeyword> findKeyword(CGlobalKvs& model, std::string_view path, const std::string& documentPath);
 
-}  // namespace gridbay::cli
+}  // namespace gridbay
