@@ -19,7 +19,9 @@ const Node* Node::find(std::string_view name, std::uint32_t occurrence, bool wan
   constexpr std::uint32_t kIndexFrom = 16;
   if (body_->index == nullptr && body_->sections + body_->keywords < kIndexFrom) {
     for (const Node* node = body_->first; node != nullptr; node = node->next_) {
-      if (node->isSection() == wantSection && names::sameTrimmed(node->name(), name) && --occurrence == 0)
+      const bool isLongEnough = node->nameLength_ >= name.size();
+      if (isLongEnough && node->isSection() == wantSection && names::sameTrimmed(node->name(), name) &&
+          --occurrence == 0)
         return node;
     }
     return nullptr;

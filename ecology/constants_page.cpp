@@ -11,7 +11,8 @@ int CWQSConstantsGridDlg::areas() {
 }
 
 Constant* CWQSConstantsGridDlg::constant(int number) {
-  return parts<EcologyParts>().wqsConstants->GetItem(number);
+  if (list_ == nullptr) list_ = parts<EcologyParts>().wqsConstants.get();
+  return list_->GetItem(number);
 }
 
 RowLook CWQSConstantsGridDlg::GetRowLook(int row) {
@@ -24,6 +25,7 @@ RowLook CWQSConstantsGridDlg::GetRowLook(int row) {
 }
 
 void CWQSConstantsGridDlg::LayOut() {
+  list_ = nullptr;
   Rows([this] { return parts<EcologyParts>().wqsConstants->GetCount(); });
   ListDeclared<Constant>(
       [](EcologyParts& module, int number) { return module.wqsConstants->GetItem(number); },

@@ -21,6 +21,9 @@ class CWQSConstantsGridDlg final : public GivenGrid<BandedGrid> {
 
   int areas();
   CWQSConstantsItemKvs* constant(int number);
+
+  // Looked up once for all rows: there may be very many.
+  CWQSConstantsKvs* list_ = nullptr;
 };
 
 class CWQSConstantsDlg final : public Page<18943, PageId::ecoConstants> {

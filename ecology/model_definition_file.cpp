@@ -76,7 +76,10 @@ bool takeDeclarations(KvsSection target, ModelDefinition& definition) {
   int left = ModelDefinition::kMostDeclarations;
   for (const KindOfSection& section : kSections) {
     auto& items = definition.items[section.kind];
-    forEachNumbered(kvsSectionByNameNum(target, section.list, 1), section.item, [&](KvsSection found) {
+    const KvsSection list = kvsSectionByNameNum(target, section.list, 1);
+    if (list != nullptr)
+      items.reserve(std::min<std::size_t>(list->sectionCount(), ModelDefinition::kMostDeclarations));
+    forEachNumbered(list, section.item, [&](KvsSection found) {
       if (--left < 0) return false;
       items.emplace_back(section.kind, found);
       return true;
