@@ -24,7 +24,7 @@ class ComponentCoefficientsGrid : public ColumnGrid {
       return [value, format](GridRow row) { return value(row) != nullptr && value(row)->format == format; };
     };
     List("Given as", 95, value, &Coefficient::format,
-         Choices::numbered({"Constant value", "Type 0 data file"}));
+         Choices::lines("Constant value\r\nType 0 data file\r\n"));
     Number("Value", 75, value, &Coefficient::value, Coefficient::kQuantity)
         .EnabledIf(hasFormat(Coefficient::kConstant));
     File({.file = fileOf(value, &Coefficient::file, Words::kFile, &Coefficient::RequestDataFile),

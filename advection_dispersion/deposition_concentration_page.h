@@ -22,7 +22,7 @@ class NadDepositionGrid
   }
   int Quantity(int) override { return item::kDepositionRate; }
   Choices Formats() override {
-    return Choices::numbered({"Constant value", "Type 0 data file", "Type 2 data file"});
+    return Choices::lines("Constant value\r\nType 0 data file\r\nType 2 data file\r\n");
   }
   static bool isMap(std::int32_t format) { return format == CNadSurfaceDepositionObjectKvs::kMap; }
 };

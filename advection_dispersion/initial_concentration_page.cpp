@@ -23,7 +23,7 @@ int CNadInitialConcentrationGrid::Quantity(int number) {
 }
 
 Choices CNadInitialConcentrationGrid::Formats() {
-  return Choices::numbered({"Constant value", "Type 2 data file"});
+  return Choices::lines("Constant value\r\nType 2 data file\r\n");
 }
 
 FileKind CNadInitialConcentrationGrid::KindOfFile(std::int32_t) {

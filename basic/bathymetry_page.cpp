@@ -21,9 +21,14 @@ void CBathymetryGrid::LayOut() {
       fileOf(area, &Area::fileName, texts::bathymetryFile, [this](CVdFileSelectorDlg& selector, GridRow) {
         RequestBathymetry(selector, parts<BasicParts>().bathymetry->hotStart == 1);
       });
-  file.changed = [this](GridRow row) { OnFileChanged(row); };
+  file.changed = [this](GridRow row) {
+    if (row == 1) OnArea1FileChanged();
+  };
   file.chosen = [this](GridRow row) {
     if (row == 1) parts<BasicParts>().bathymetry->projectionStale = true;
+  };
+  file.typed = [this](GridRow row) {
+    if (row != 1) ResetDispersion();
   };
   FileName("Bathymetry", 210, file);
   Browse(texts::browse.format, 30, file);
@@ -34,11 +39,7 @@ void CBathymetryGrid::LayOut() {
 }
 
 // Another grid for Area 1 brings its projection, and makes boundaries that were detected worthless.
-void CBathymetryGrid::OnFileChanged(int row) {
-  if (row != 1) {
-    if (!isByButton_) ResetDispersion();
-    return;
-  }
+void CBathymetryGrid::OnArea1FileChanged() {
   CBathymetryKvs& areas = *parts<BasicParts>().bathymetry;
   areas.OnArea1FileChanged();
   CBoundaryKvs& boundaries = *parts<BasicParts>().boundary;
@@ -49,18 +50,10 @@ void CBathymetryGrid::OnFileChanged(int row) {
   ResetDispersion();
 }
 
-void CBathymetryGrid::OnClickedButtonRowCol(int row, int col) {
-  isByButton_ = true;
-  ColumnGrid::OnClickedButtonRowCol(row, col);
-  isByButton_ = false;
-}
-
 // Who has a dispersion by the spacing of the grids is told, unless the user has given one.
 void CBathymetryGrid::ResetDispersion() {
-  CBathymetryObjectKvs* area1 = parts<BasicParts>().bathymetry->GetArea(1);
-  auto* root = area1 == nullptr ? nullptr : area1->parts<ModelRoot>();
-  if (root != nullptr && !document().HasBeenTouched(PageId::mtExpDispersionCoef))
-    root->TellFollowers(*area1, {});
+  if (document().HasBeenTouched(PageId::mtExpDispersionCoef)) return;
+  if (auto* root = parts<BasicParts>().bathymetry->parts<ModelRoot>(); root != nullptr) root->TellOfGrids();
 }
 
 void CBathymetryDlg::DoDataExchange(Form& form) {

@@ -10,11 +10,8 @@ namespace gridbay {
 // One row for each area: its grid file and where it lies.
 class CBathymetryGrid final : public ColumnGrid {
   void LayOut() override;
-  void OnClickedButtonRowCol(int row, int col) override;
-  void OnFileChanged(int row);
+  void OnArea1FileChanged();
   void ResetDispersion();
-
-  bool isByButton_ = false;  // a file is being chosen, not typed
 };
 
 // The areas, the start, the projection and the overland solver.

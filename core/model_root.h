@@ -21,6 +21,9 @@ class ModelRoot : public CKvsBase {
   // Tells all lists that follow this one, in their order, what its counts are now; a list has one.
   virtual void TellFollowers(const CKvsBase& leader, std::span<const int> counts) = 0;
 
+  // The areas have other grids than before.
+  virtual void TellOfGrids() {}
+
   virtual ModuleOutput OutputOfModule() { return {}; }
 };
 

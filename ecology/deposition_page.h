@@ -24,7 +24,7 @@ class CWQSADDepositionGridDlg final
   std::string UnitOf(int number) override {
     return unitText(WqsVariables::declaration(this->GetKvs(), number), this->document().units());
   }
-  Choices Formats() override { return Choices::numbered({"Constant value", "Type 2 data file"}); }
+  Choices Formats() override { return Choices::lines("Constant value\r\nType 2 data file\r\n"); }
   FileKind KindOfFile(std::int32_t) override { return kind; }
 };
 

@@ -32,7 +32,7 @@ std::string CWQSInitialConditionsGridDlg::UnitOf(int number) {
 }
 
 Choices CWQSInitialConditionsGridDlg::Formats() {
-  return Choices::numbered({"Constant value", "Type 2 data file"});
+  return Choices::lines("Constant value\r\nType 2 data file\r\n");
 }
 
 FileKind CWQSInitialConditionsGridDlg::KindOfFile(std::int32_t) {

@@ -12,7 +12,7 @@
 namespace gridbay {
 
 inline Choices areaMapFormats() {
-  return Choices::numbered({"Constant value", "Type 2 data file"});
+  return Choices::lines("Constant value\r\nType 2 data file\r\n");
 }
 
 // Of an EntryAreasKvs, a band for each entry. `Words` has its title as `static std::string band(int entry)`.

@@ -31,7 +31,7 @@ class BoundaryValuesGrid : public ColumnGrid {
       return values(row)->format == Values::kProfile ? texts::profileFile : texts::timeSeriesFile;
     };
     List("Given as", 90, values, &Values::format,
-         Choices::numbered({"Constant value", "Type 0 data file", "Type 1 data file"}));
+         Choices::lines("Constant value\r\nType 0 data file\r\nType 1 data file\r\n"));
     File({.file = fileOf(values, &Values::file, kind, &Values::RequestDataFile),
           .header = "File name",
           .width = 190,

@@ -17,7 +17,7 @@ inline constexpr Text dataFilesOf{"Data files of %s"};
 
 // How a value is given that is a constant or a map for each area.
 inline Choices constantOrMaps() {
-  return Choices::numbered({"Constant value", "Type 2 data file"});
+  return Choices::lines("Constant value\r\nType 2 data file\r\n");
 }
 
 // The maps of a value, a row for each area.

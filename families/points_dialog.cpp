@@ -14,12 +14,13 @@
 namespace gridbay {
 namespace {
 
-// A text that is a number and nothing else.
+// A text that is a number and nothing else: one field of the form "%lf%32s", with the value that atof gives.
 std::optional<double> numberOf(std::string_view text) {
   const std::optional<double> number = doubleOfText(trimmed(text));
   return number && std::isfinite(*number) ? number : std::nullopt;
 }
 
+// Cut towards 0 as atoi does, and within what an integer holds.
 std::int32_t wholeOf(double number) {
   using Limits = std::numeric_limits<std::int32_t>;
   return static_cast<std::int32_t>(std::clamp(number, double{Limits::min()}, double{Limits::max()}));

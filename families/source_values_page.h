@@ -31,7 +31,7 @@ class SourceValuesGrid : public ColumnGrid {
     const auto hasFormat = [isSource, values](std::int32_t format) {
       return [=](GridRow row) { return isSource(row) && values(row)->format == format; };
     };
-    List("Given as", 100, values, &Values::format, Choices::numbered({"Constant value", "Type 0 data file"}))
+    List("Given as", 100, values, &Values::format, Choices::lines("Constant value\r\nType 0 data file\r\n"))
         .EnabledIf(isSource);
     for (int entry = 1; entry <= LayoutKey(); ++entry) {
       const auto constant = [values, entry](GridRow row) { return values(row)->Constant(entry); };

@@ -61,13 +61,13 @@ void CNhdBoundaryGrid::LayOut() {
       Choices{{0, "0"}, {1, "1"}, {2, "2"}, {12, "12"}});
   NewLine();
   List("", 0, object, &Object::tiltType,
-       Choices::numbered({"No tilting", "Non-linear tilting about:", "Linear tilting about:"}, -1));
+       Choices::lines("No tilting\r\nNon-linear tilting about:\r\nLinear tilting about:\r\n", -1));
   Integer("", 0, object, &Object::tiltingPoint).EnabledIf([object](GridRow row) {
     return object(row)->tiltType >= 0;
   });
   NewLine();
   List("", 0, object, &Object::enableUserDirections,
-       Choices::numbered({"No user defined flow direction", "Flow direction from file:"}));
+       Choices::lines("No user defined flow direction\r\nFlow direction from file:\r\n"));
   // The name can be typed before directions are switched on.
   const FileChoice file =
       fileOf(object, &Object::directionFile, texts::flowDirectionFile, &Object::RequestDirectionFile);

@@ -33,7 +33,7 @@ void CNhdResistanceGrid::LayOut() {
                      ValueOrFile<Entry>{.formatHeader = "Format",
                                         .formatWidth = 90,
                                         .format = &Entry::dataFormat,
-                                        .formats = Choices::numbered({"Excluded", "Constant", "Data file"}),
+                                        .formats = Choices::lines("Excluded\r\nConstant\r\nData file\r\n"),
                                         .valueHeader = "Constant",
                                         .valueWidth = 75,
                                         .value = &Entry::constantValue,

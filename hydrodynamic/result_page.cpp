@@ -89,7 +89,7 @@ void CResultGrid::LayOut() {
   const FileChoice file = resultFileOf(output, &Output::file, kind);
 
   // A type that is none of the list is shown all the same.
-  List("Type", 45, output, &Output::type, Choices::numbered({"0", "1", "2"})).get = [output](GridRow row) {
+  List("Type", 45, output, &Output::type, Choices::lines("0\r\n1\r\n2\r\n")).get = [output](GridRow row) {
     return std::to_string(output(row)->type);
   };
   Shown("Area", 45, [](GridRow) { return std::to_string(Output::kAreaNumber); }).Static();

@@ -24,7 +24,7 @@ int CNmtInitialConcentrationGrid::Quantity(int number) {
 }
 
 Choices CNmtInitialConcentrationGrid::Formats() {
-  return Choices::numbered({"Constant value", "Type 2 data file"});
+  return Choices::lines("Constant value\r\nType 2 data file\r\n");
 }
 
 FileKind CNmtInitialConcentrationGrid::KindOfFile(std::int32_t) {

@@ -16,7 +16,7 @@ CNmtExpInitialConditionsKvs& initial(CKvsBase& model) {
 }
 
 Choices formats() {
-  return Choices::numbered({"Constant value", "Type 2 data file"});
+  return Choices::lines("Constant value\r\nType 2 data file\r\n");
 }
 
 }  // namespace

@@ -10,6 +10,26 @@ Choices Choices::numbered(const std::vector<std::string>& texts, std::int32_t fi
   return choices;
 }
 
+Choices Choices::lines(std::string_view text, std::int32_t first) {
+  constexpr std::string_view kEnd = "\r\n";
+  Choices choices;
+  while (!text.empty()) {
+    const std::size_t end = std::min(text.find(kEnd), text.size());
+    choices.Add({first++, std::string(text.substr(0, end))});
+    text.remove_prefix(std::min(end + kEnd.size(), text.size()));
+  }
+  return choices;
+}
+
+Choices Choices::lines(std::string_view text, std::initializer_list<std::int32_t> values) {
+  Choices choices = lines(text);
+  std::ranges::transform(choices.choices_, values, choices.choices_.begin(),
+                         [](Choice choice, std::int32_t value) {
+                           return Choice{value, std::move(choice.text)};
+                         });
+  return choices;
+}
+
 Choices Choices::first(std::size_t n) const {
   Choices few = *this;
   few.choices_.resize(std::min(n, choices_.size()));

@@ -24,6 +24,9 @@ class Choices {
   explicit Choices(std::vector<Choice> choices) : choices_(std::move(choices)) {}
   // Texts whose values are their places, from `first` on.
   static Choices numbered(const std::vector<std::string>& texts, std::int32_t first = 0);
+  // As the list of a grid's cells is told: in one text, with a choice on each line.
+  static Choices lines(std::string_view text, std::int32_t first = 0);
+  static Choices lines(std::string_view text, std::initializer_list<std::int32_t> values);
 
   // The place, from 0, that stands for a value which is no choice. Without it such a value shows nothing, and
   // is kept until there is a choice.

@@ -10,11 +10,12 @@ std::string FileChoice::text(GridRow row) const {
 }
 
 // A name that is typed as it stands stays where it was relative to.
-void FileChoice::type(std::string_view typed, GridRow row, CVdDoc& document) const {
+void FileChoice::type(std::string_view text, GridRow row, CVdDoc& document) const {
   const FileRef held = file(row);
   if (held.name == nullptr) return;
-  if (typed != held.name->text()) held.name->Set(typed, document.path());
+  if (text != held.name->text()) held.name->Set(text, document.path());
   if (changed) changed(row);
+  if (typed) typed(row);
 }
 
 bool FileChoice::choose(GridRow row, CVdDoc& document) const {

@@ -44,8 +44,9 @@ struct FileChoice {
   std::function<bool(GridRow)> ready = {};
   // The file is another one now, by choice or by typing.
   std::function<void(GridRow)> changed = {};
-  // What follows from a choice in a dialog alone.
+  // What follows from a choice in a dialog alone, and from typing alone.
   std::function<void(GridRow)> chosen = {};
+  std::function<void(GridRow)> typed = {};
 
   std::string text(GridRow row) const;
   void type(std::string_view text, GridRow row, CVdDoc& document) const;

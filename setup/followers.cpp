@@ -262,21 +262,12 @@ constexpr std::array kOfDefinition{
     rebuild<&G::wqsMassBudget>,        rebuild<&G::wqsResults>,
 };
 
-// A simulation of other steps, and another grid: Area 1 tells of those of all areas.
 constexpr std::array<Follower, 1> kOfPeriod{
     [](G& root, std::span<const int> steps) { root.nmtExpStartingConditions->SetPeriod(steps[0], steps[1]); },
 };
-constexpr std::array<Follower, 1> kOfGrids{
-    [](G& root, std::span<const int>) { root.nmtExpDispersionCoef->SetToGrids(); },
-};
-const CKvsBase& area1(const G& root) {
-  const CKvsBase* area = root.bathymetry == nullptr ? nullptr : root.bathymetry->GetArea(1);
-  return area == nullptr ? root : *area;
-}
 
 constexpr LeaderRow kLeaders[] = {
     {leader<&G::bathymetry>, kOfAreas},
-    {area1, kOfGrids},
     {leader<&G::simulationPeriod>, kOfPeriod},
     {leader<&G::boundary>, kOfBoundaries},
     {leader<&G::sourceSink>, kOfSources},
@@ -293,6 +284,10 @@ void CGlobalKvs::TellFollowers(const CKvsBase& leader, std::span<const int> coun
     if (&row.leader(*this) != &leader) continue;
     for (const Follower follower : row.followers) follower(*this, counts);
   }
+}
+
+void CGlobalKvs::TellOfGrids() {
+  nmtExpDispersionCoef->SetToGrids();
 }
 
 }  // namespace gridbay

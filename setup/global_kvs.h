@@ -59,6 +59,7 @@ class CGlobalKvs final : public ModelRoot,
   // Whether a save writes what the section of a loaded file holds, or its name at least; by its path.
   bool KnowsSection(std::string_view path);
 
+  void TellOfGrids() override;
   void TellFollowers(const CKvsBase& leader, std::span<const int> counts) override;
   // By the table of setup/module_outputs.cpp.
   ModuleOutput OutputOfModule() override;

@@ -400,6 +400,25 @@ constexpr std::array kExpandedWater{
     child<&G::nmtExpBoundary>(),
 };
 
+constexpr std::array kExpandedWaves{
+    in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/WAVE_DATA", kExpandedMud),
+    child<&G::nmtExpWaves>(),
+    child<&G::nmtExpTsvWaves>(),
+    child<&G::nmtExpConstantWaves>(),
+    child<&G::nmtExpWaveDatabase>(),
+};
+
+constexpr std::array kExpandedColumn{
+    in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/DREDGING", kExpandedMud),
+    child<&G::nmtExpDredgings>(),
+    in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters", kExpandedMud),
+    child<&G::nmtExpWaterColParameters>(),
+    in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters/FALL_VELOCITY_PARAMETERS", kExpandedMud),
+    child<&G::nmtExpSettlings>(),
+    child<&G::nmtExpSettlingPar>(),
+    in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters", kExpandedMud),
+};
+
 constexpr std::array kExpandedErosion{
     in("MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/EROSION_COEFFICIENTS", kExpandedMud),
     child<&G::nmtExpErosionLayer>(),
@@ -457,20 +476,10 @@ constexpr auto kSaving = joined(
     std::array{child<&G::nmtLineDischarge>(), child<&G::nmtBoxSummation>(), child<&G::nmtResult>()},
     std::array{in("MUD_TRANSPORT_EXPANDED_MODULE"), options(),
                in("MUD_TRANSPORT_EXPANDED_MODULE", kExpandedMud)},
-    kExpandedWater,
-    std::array{
-        in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/WAVE_DATA", kExpandedMud),
-        child<&G::nmtExpWaves>(), child<&G::nmtExpTsvWaves>(), child<&G::nmtExpConstantWaves>(),
-        child<&G::nmtExpWaveDatabase>(), in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS", kExpandedMud),
-        child<&G::nmtExpForcings>(),
-        in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/DREDGING", kExpandedMud),
-        child<&G::nmtExpDredgings>(),
-        in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters", kExpandedMud),
-        child<&G::nmtExpWaterColParameters>(),
-        in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters/FALL_VELOCITY_PARAMETERS", kExpandedMud),
-        child<&G::nmtExpSettlings>(), child<&G::nmtExpSettlingPar>(),
-        in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters", kExpandedMud),
-        child<&G::nmtExpDeposition>(), child<&G::nmtExpSandFractions>()},
+    kExpandedWater, kExpandedWaves,
+    std::array{in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS", kExpandedMud),
+               child<&G::nmtExpForcings>()},
+    kExpandedColumn, std::array{child<&G::nmtExpDeposition>(), child<&G::nmtExpSandFractions>()},
     kExpandedErosion,
     std::array{child<&G::nmtExpSliding>(), child<&G::nmtExpVarFrictionCoef>(),
                child<&G::nmtExpConstFrictionCoef>()},
@@ -481,31 +490,20 @@ constexpr auto kSaving = joined(
     kEcologyOrder);
 
 // The module selection comes first: what else is read depends on it.
-constexpr auto kLoading = joined(
-    std::array{in("NESTED_MODEL_GLOBALS")}, kGlobals,  //
-    std::array{in("HYDRODYNAMIC_MODULE")}, kFlow, kStructures,
-    std::array{in("ADVECTION_DISPERSION_MODULE", kAd)}, kTransport, kTransportResults,
-    std::array{in("MUD_TRANSPORT_MODULE", kMud)}, kMudWater, kMudParameters,
-    std::array{child<&G::nmtBedRoughness>(), child<&G::nmtWaveData>()}, kMudBed,
-    std::array{child<&G::nmtBoxSummation>(), child<&G::nmtLineDischarge>(), child<&G::nmtResult>()},
-    std::array{in("MUD_TRANSPORT_EXPANDED_MODULE", kExpandedMud)}, kExpandedWater,
-    // The forcings are looked for among the waves, where they do not stand.
-    std::array{
-        in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/WAVE_DATA", kExpandedMud),
-        child<&G::nmtExpWaves>(), child<&G::nmtExpTsvWaves>(), child<&G::nmtExpConstantWaves>(),
-        child<&G::nmtExpWaveDatabase>(), child<&G::nmtExpForcings>(),
-        in("MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/DREDGING", kExpandedMud),
-        child<&G::nmtExpDredgings>(),
-        in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters", kExpandedMud),
-        child<&G::nmtExpWaterColParameters>(),
-        in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters/FALL_VELOCITY_PARAMETERS", kExpandedMud),
-        child<&G::nmtExpSettlings>(), child<&G::nmtExpSettlingPar>(),
-        in("MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters", kExpandedMud),
-        child<&G::nmtExpSandFractions>(), child<&G::nmtExpDeposition>()},
-    kExpandedErosion,
-    std::array{child<&G::nmtExpVarFrictionCoef>(), child<&G::nmtExpSliding>(),
-               child<&G::nmtExpConstFrictionCoef>()},
-    kExpandedBed, std::array{in("BIO_RIG_MODULE", kEcology)}, kEcologyOrder);
+constexpr auto kLoading =
+    joined(std::array{in("NESTED_MODEL_GLOBALS")}, kGlobals,  //
+           std::array{in("HYDRODYNAMIC_MODULE")}, kFlow, kStructures,
+           std::array{in("ADVECTION_DISPERSION_MODULE", kAd)}, kTransport, kTransportResults,
+           std::array{in("MUD_TRANSPORT_MODULE", kMud)}, kMudWater, kMudParameters,
+           std::array{child<&G::nmtBedRoughness>(), child<&G::nmtWaveData>()}, kMudBed,
+           std::array{child<&G::nmtBoxSummation>(), child<&G::nmtLineDischarge>(), child<&G::nmtResult>()},
+           std::array{in("MUD_TRANSPORT_EXPANDED_MODULE", kExpandedMud)}, kExpandedWater,
+           // The forcings are looked for among the waves, where they do not stand.
+           kExpandedWaves, std::array{child<&G::nmtExpForcings>()}, kExpandedColumn,
+           std::array{child<&G::nmtExpSandFractions>(), child<&G::nmtExpDeposition>()}, kExpandedErosion,
+           std::array{child<&G::nmtExpVarFrictionCoef>(), child<&G::nmtExpSliding>(),
+                      child<&G::nmtExpConstFrictionCoef>()},
+           kExpandedBed, std::array{in("BIO_RIG_MODULE", kEcology)}, kEcologyOrder);
 
 constexpr auto kChecking = joined(
     std::array{

@@ -37,9 +37,9 @@ void CCulvertDataGrid::LayOut() {
   const auto isCircular = isOf(Object::kCircular);
   const auto isRectangular = isOf(Object::kRectangular);
   List("Geometry Type", 140, culvert, &Object::geometryType,
-       Choices::numbered({"Rectangular", "Circular", "Irregular, level-width"}));
+       Choices::lines("Rectangular\r\nCircular\r\nIrregular, level-width"));
   LevelWidthColumn(culvert).EnabledIf(isOf(Object::kIrregular)).header = "Geometry";
-  List("Section Type", 80, culvert, &Object::sectionType, Choices::numbered({"Closed", "Open"}))
+  List("Section Type", 80, culvert, &Object::sectionType, Choices::lines("Closed\r\nOpen"))
       .EnabledIf([isCircular](GridRow row) { return !isCircular(row); });
   Number("Circular", kWidth, culvert, &Object::diameter, item::kLevel)
       .SubHeader("Diameter")

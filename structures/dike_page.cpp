@@ -36,7 +36,7 @@ void CDikeGrid::LayOut() {
         // The one that is shown keeps its fraction.
         if (crest != dike(row)->crest()) dike(row)->crestLevelSpecification = crest;
       },
-      Choices::numbered({"Constant", "In space", "In space and time"}, Dike::kConstant));
+      Choices::lines("Constant\r\nIn space\r\nIn space and time", Dike::kConstant));
   Number("Crest level", 120, dike, &Dike::crestLevel, item::kCrestLevel);
 }
 

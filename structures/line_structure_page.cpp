@@ -22,7 +22,7 @@ void LineStructureGrid::PlaceColumns(const Structure& structure) {
 
 void LineStructureGrid::ValveColumn(const Structure& structure) {
   List("Valve", 120, structure, &LineStructure::valve,
-       Choices::numbered({"None", "Only negative flow", "Only positive flow", "No flow"}));
+       Choices::lines("None\r\nOnly negative flow\r\nOnly positive flow\r\nNo flow"));
 }
 
 void LineStructureGrid::AlphaZeroColumn(const Structure& structure) {

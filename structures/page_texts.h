@@ -11,6 +11,11 @@ inline constexpr Text pointSelectionTitle{"Point Selection"};
 inline constexpr Text weirHeadLosses{"Head  loss factors"};
 inline constexpr Text culvertHeadLosses{"Head loss factors"};
 
+inline constexpr Text weirFormula3Title{"Weir Formula 3 (Extended Honma) Parameters"};
+inline constexpr Text weirFormula3Free{"C0 = a(h1/W)^p + b"};
+inline constexpr Text weirFormula3Incomplete{"C = C0 ( Al (h2/h1)^q + Be)"};
+inline constexpr Text weirFormula3Submerged{"C = C0 ( Ga (h2/h1)^r + De)"};
+
 // Dikes.
 inline constexpr Text itemOfFile{"Item: %s"};
 inline constexpr Text fileNotFound{"File '%s' not found"};

@@ -32,7 +32,7 @@ std::from_chars_result hexadecimal(const char* first, const char* last, double& 
   return read;
 }
 
-// Numbers at the front of a line, one after the other.
+// Numbers at the front of a line, one after the other, as the form "%lf %lf %lf %[^\n]" has them.
 class NumberScan {
  public:
   explicit NumberScan(std::string_view line) : at_(line.data()), end_(line.data() + line.size()) {}

@@ -38,7 +38,7 @@ std::string CVdEditStyle::GetQunToolTipText() const {
   const QunItem* found = qunFindItem(itemCode_);
   const QunUnit* shown = choices_->unitOf(itemCode_);
   if (found == nullptr || shown == nullptr) return {};
-  return fmt::format("{} [{}]", found->name, shown->symbol);
+  return fmt::sprintf("%s [%s]", found->name, shown->symbol);
 }
 
 }  // namespace gridbay

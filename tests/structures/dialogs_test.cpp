@@ -4,6 +4,8 @@
 
 #include "structures/level_width_dialog.h"
 #include "structures/point_import_dialog.h"
+#include "structures/weir.h"
+#include "structures/weir_formula3_dialog.h"
 #include "tests/support/shapes.h"
 
 namespace gridbay {
@@ -140,6 +142,34 @@ TEST_F(StructureDialogs, AreInTheUsersUnit) {
   EXPECT_EQ(editPoints(), 1);
   EXPECT_DOUBLE_EQ(x[0], 3.048);
   EXPECT_EQ(x[1], 400100);  // what is not edited keeps its digits
+}
+
+TEST_F(StructureDialogs, TheParametersOfWeirFormula3) {
+  CNhdWeirObjectKvs weir;
+  host.fillForm = [](Form& form) {
+    Labels labels;
+    Labels texts;
+    for (const Control& control : form.controls()) {
+      labels.push_back(control.label);
+      texts.push_back(control.text);
+    }
+    EXPECT_EQ(labels, (Labels{"Width", "Height", "Crest level", "(hd/hu)i", "a", "b", "p", "Alpha", "Beta",
+                              "q", "Gamma", "Delta", "r", "(hd/hu)s", "", "", ""}));
+    EXPECT_EQ(texts[4], "1.02");
+    EXPECT_EQ(texts[14], "C0 = a(h1/W)^p + b");
+    EXPECT_EQ(texts[15], "C = C0 ( Al (h2/h1)^q + Be)");
+    EXPECT_EQ(texts[16], "C = C0 ( Ga (h2/h1)^r + De)");
+    Control& width = *form.find("Width");
+    width.text = "12.5";
+    form.act(width);
+    return true;
+  };
+  WeirFormula3Dialog dialog(document, weir.formula3);
+  ASSERT_EQ(dialog.DoModal(), 1);
+  EXPECT_EQ(weir.formula3[0], 0);
+  dialog.OnOK(weir.formula3);
+  EXPECT_EQ(host.titles, Labels{"Weir Formula 3 (Extended Honma) Parameters"});
+  EXPECT_THAT(weir.formula3, ElementsAre(12.5, 0, 0, 0.6, 1.02, 1.37, 1, 0.03, 1.018, 1, 0, 2.6, 1, 0.7));
 }
 
 }  // namespace
