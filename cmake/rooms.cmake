@@ -4,6 +4,9 @@
 #   room(basic USES pages core platform SOURCES bathymetry.cpp ...)
 function(room name)
   cmake_parse_arguments(ROOM "" "" "USES;SOURCES;LIBRARIES" ${ARGN})
+  if(GRIDBAY_FUZZ)  # opens no page
+    list(FILTER ROOM_SOURCES EXCLUDE REGEX "_(page|pages|dialog|factory|doc|tree)\\.cpp$")
+  endif()
   add_library(gridbay_${name} STATIC ${ROOM_SOURCES})
   foreach(used ${ROOM_USES})
     target_link_libraries(gridbay_${name} PUBLIC gridbay_${used})
