@@ -19,6 +19,7 @@
 #include "advection_dispersion/source_sink.h"
 #include "advection_dispersion/starting_conditions.h"
 #include "core/model_root.h"
+#include "core/table_code.h"
 
 namespace gridbay {
 

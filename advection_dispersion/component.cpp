@@ -1,5 +1,7 @@
 #include "advection_dispersion/component.h"
 
+#include "core/table_code.h"
+
 namespace gridbay {
 
 unsigned CNadComponentObjectKvs::Validate(ValidationList& messages, int) {

@@ -8,6 +8,7 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "core/model_root.h"
+#include "core/table_code.h"
 
 namespace gridbay {
 

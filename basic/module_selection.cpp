@@ -1,5 +1,7 @@
 #include "basic/module_selection.h"
 
+#include "core/table_code.h"
+
 namespace gridbay {
 
 // A pinned selection holds after a load even where the file has no section for it.

@@ -1,6 +1,7 @@
 #include "ecology/ecology_parts.h"
 
 #include "core/model_root.h"
+#include "core/table_code.h"
 #include "ecology/boundary.h"
 #include "ecology/constants.h"
 #include "ecology/deposition.h"

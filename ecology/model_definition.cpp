@@ -6,6 +6,7 @@
 
 #include "core/item_rows.h"
 #include "core/model_root.h"
+#include "core/table_code.h"
 #include "ecology/ecology_parts.h"
 #include "ecology/texts.h"
 #include "platform/files/program_path.h"

@@ -1,6 +1,7 @@
 #include "hydrodynamic/hydrodynamic_parts.h"
 
 #include "core/model_root.h"
+#include "core/table_code.h"
 #include "hydrodynamic/boundary.h"
 #include "hydrodynamic/eddy_viscosity.h"
 #include "hydrodynamic/infiltration.h"

@@ -8,6 +8,7 @@
 #include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
 #include "core/model_root.h"
+#include "core/table_code.h"
 #include "families/result_texts.h"
 #include "hydrodynamic/hydrodynamic_parts.h"
 #include "hydrodynamic/infiltration.h"

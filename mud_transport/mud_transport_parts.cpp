@@ -1,6 +1,7 @@
 #include "mud_transport/mud_transport_parts.h"
 
 #include "core/model_root.h"
+#include "core/table_code.h"
 #include "mud_transport/bed_roughness.h"
 #include "mud_transport/boundary.h"
 #include "mud_transport/box_summation.h"

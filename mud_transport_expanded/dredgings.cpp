@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "core/table_code.h"
 #include "families/data_files.h"
 #include "mud_transport_expanded/bed_texts.h"
 #include "mud_transport_expanded/transported.h"

@@ -1,6 +1,7 @@
 #include "mud_transport_expanded/mud_transport_expanded_parts.h"
 
 #include "core/model_root.h"
+#include "core/table_code.h"
 #include "mud_transport_expanded/bed_density.h"
 #include "mud_transport_expanded/bed_roughness.h"
 #include "mud_transport_expanded/boundary.h"

@@ -1,6 +1,7 @@
 #include "structures/structures_parts.h"
 
 #include "core/model_root.h"
+#include "core/table_code.h"
 #include "structures/culvert.h"
 #include "structures/dike.h"
 #include "structures/weir.h"
