@@ -1,0 +1,73 @@
+#include "scripting/scripted_model.h"
+
+#include <cstdio>
+
+#include "basic/module_selection.h"
+#include "platform/files/paths.h"
+
+namespace gridbay {
+
+ScriptedModel::ScriptedModel(bool isInlandFlood) : isInlandFlood_(isInlandFlood) {
+  clearFeatures();
+}
+
+void ScriptedModel::clearFeatures() {
+  if (!isInlandFlood_) return;
+  root.moduleSelection->highPrecision = false;
+  root.moduleSelection->hydrodynamicFeatures = 0;
+}
+
+std::unique_lock<std::mutex> ScriptedModel::lockDataFiles() {
+  static std::mutex dataFiles;
+  return std::unique_lock(dataFiles);
+}
+
+void ScriptedModel::show(const std::string& text) const {
+  if (show_) {
+    show_(text);
+  } else {
+    std::fprintf(stderr, "%s\n", text.c_str());
+  }
+}
+
+bool ScriptedModel::load(const std::string& fileName) {
+  KvsHandle file = kvsLoadFile(fileName, 0);
+  const bool isRead = kvsPeekErrorGlb() == kKvsNoError;
+  if (isRead) {
+    if (kvsTargetByNameNum(*file, CGlobalKvs::kTarget, 1) != nullptr) {
+      if (!documentPath_.empty()) {  // a root takes one load
+        root.AssignState(CGlobalKvs());
+        clearFeatures();
+      }
+      documentPath_ = absolutePath(fileName, {});
+    }
+    root.Load(&file->tree().root(), fileName);
+  } else if (kvsGetErrorGlb() == kKvsSyntaxError) {
+    int line = 0;
+    int column = 0;
+    std::string text;
+    kvsGetSyntaxErr(file.get(), &line, &column, &text);
+    show(text);
+  }
+  kvsClose(&file);
+  const auto dataFiles = lockDataFiles();
+  ValidationList dropped;
+  root.Validate(dropped, 1);
+  return isRead;
+}
+
+bool ScriptedModel::write(const std::string& fileName) {
+  KvsHandle file = kvsCreate();
+  root.Save(*file, fileName);
+  if (kvsWrite(*file, fileName)) return true;
+  kvsGetErrorGlb();
+  return false;
+}
+
+void ScriptedModel::setSelection(UTsbSelection& selection, const std::string& fileName, int item) const {
+  setFileName(selection.fileName, fileName);
+  selection.SetNoItems(1);
+  selection.items.front() = static_cast<std::uint32_t>(item);
+}
+
+}  // namespace gridbay
