@@ -1,8 +1,6 @@
 #include "cli/console.h"
 
-#include <fmt/chrono.h>
-
-#include <ctime>
+#include <fmt/format.h>
 
 namespace gridbay::cli {
 
@@ -18,11 +16,6 @@ void Console::note(std::string_view text) const {
 std::string messageLine(const CMessage& message) {
   return fmt::format("page {}, severity {}: {}", static_cast<int>(message.page),
                      static_cast<int>(message.severity), message.text);
-}
-
-std::string historyWith(const std::string& before, const Console& console) {
-  return fmt::format("{}{}{:%Y-%m-%dT%H:%M:%SZ}: {}", before, before.empty() ? "" : "\n",
-                     fmt::gmtime(std::time(nullptr)), console.commandLine);
 }
 
 int saveSetup(SetupFile& setup, const std::string& path, const Console& console) {

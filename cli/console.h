@@ -37,10 +37,6 @@ class ConsoleMessageHost : public MessageHost {
 // A message of a validation on one line.
 std::string messageLine(const CMessage& message);
 
-// The history of a file that is written now: that of what it is made from, if any, and a line with the moment
-// (UTC) and the command.
-std::string historyWith(const std::string& before, const Console& console);
-
 // Saves a setup to its own file, and says which of its sections this version does not know and leaves out.
 int saveSetup(SetupFile& setup, const std::string& path, const Console& console);
 

@@ -6,7 +6,7 @@
 #include "basic/boundary.h"
 #include "basic/simulation_period.h"
 #include "cli/commands.h"
-#include "cli/output_file.h"
+#include "conversion/output_file.h"
 #include "core/edition.h"
 #include "platform/tsb/tsb_file.h"
 
@@ -80,7 +80,7 @@ int newSetup(const Options& options, const Console& console) {
   if (!areas) return console.fail(areas.error());
   std::vector<std::string> grids;
   for (const Area& area : *areas) grids.push_back(area.file);
-  if (const Outcome free = mayWrite(options.file, options.force, grids); !free)
+  if (const Outcome free = mayWrite(options.file, options.force, grids, "--force"); !free)
     return console.fail(free.error());
   const int most = theEdition.wetlandSweepKit ? 1 : CBathymetryKvs::kMostAreas;
   if (static_cast<int>(areas->size()) > most) {

@@ -1,4 +1,4 @@
-#include "cli/raster_layout.h"
+#include "conversion/raster_layout.h"
 
 #include <algorithm>
 #include <cmath>
@@ -6,7 +6,7 @@
 
 #include "platform/tsb/tsb_types.h"
 
-namespace gridbay::cli {
+namespace gridbay {
 namespace {
 
 using Vector = std::array<double, 2>;
@@ -67,4 +67,4 @@ Result<RasterLayout> layoutOf(const RasterPlace& place, int columns, int rows) {
   return layout;
 }
 
-}  // namespace gridbay::cli
+}  // namespace gridbay

@@ -2,10 +2,10 @@
 
 #include <array>
 
-#include "cli/raster.h"
+#include "conversion/raster.h"
 #include "platform/result.h"
 
-namespace gridbay::cli {
+namespace gridbay {
 
 // How the rows and columns of a raster become those of a grid: J and K along square axes, y to the left of x
 // as on a map, and K northwards (its direction less than 90 degrees from the projection's north, or due west
@@ -33,4 +33,4 @@ struct RasterLayout {
 // An error where the axes are not square to each other, or points lie on one another.
 Result<RasterLayout> layoutOf(const RasterPlace& place, int columns, int rows);
 
-}  // namespace gridbay::cli
+}  // namespace gridbay

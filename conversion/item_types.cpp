@@ -1,39 +1,15 @@
-#include "cli/item_types.h"
+#include "conversion/item_types.h"
 
 #include <fmt/format.h>
 
-#include <nlohmann/json.hpp>
 #include <vector>
 
-#include "cli/commands.h"
 #include "core/nearest.h"
 #include "core/number_text.h"
 
-namespace gridbay::cli {
-namespace {
+namespace gridbay {
 
-struct Options {
-  bool json = false;
-};
-
-int types(const Options& options, const Console& console) {
-  nlohmann::ordered_json list = nlohmann::ordered_json::array();
-  for (const QunItem& quantity : qunItems()) {
-    const QunUnit& unit = *qunBaseUnit(quantity.code);
-    if (options.json) {
-      list.push_back({{"code", quantity.code}, {"name", quantity.name}, {"unit", unit.symbol}});
-    } else {
-      console.out << fmt::format("{:>6}  {:<34}  {}\n", quantity.code, quantity.name, unit.symbol);
-    }
-  }
-  if (options.json) console.out << list.dump(2) << '\n';
-  return kClean;
-}
-
-}  // namespace
-
-Result<const QunItem*> itemTypeOfText(std::string_view text) {
-  const std::string where = fmt::format("\"{} convert types\" lists them", toolName());
+Result<const QunItem*> itemTypeOfText(std::string_view text, std::string_view where) {
   if (!text.empty() && text.find_first_not_of("0123456789") == text.npos) {
     const QunItem* byCode = qunFindItem(int32OfText(text).value_or(0));
     if (byCode != nullptr) return byCode;
@@ -60,12 +36,4 @@ Result<const QunItem*> itemTypeOfText(std::string_view text) {
                              nearest.empty() ? "" : fmt::format("did you mean \"{}\"? ", nearest), where)};
 }
 
-void addConvertTypes(CLI::App& convert, Action& action) {
-  std::shared_ptr<Options> options;
-  CLI::App& command =
-      addCommand(convert, action, "types",
-                 "Lists the item types: code, name, and the base unit that values are in", types, options);
-  command.add_flag("--json", options->json, "The same as JSON");
-}
-
-}  // namespace gridbay::cli
+}  // namespace gridbay

@@ -1,4 +1,4 @@
-#include "cli/tsb_raster.h"
+#include "conversion/tsb_raster.h"
 
 #include <fmt/format.h>
 
@@ -6,12 +6,12 @@
 #include <filesystem>
 #include <limits>
 
-#include "cli/moments.h"
+#include "conversion/moments.h"
 #include "platform/cartography/cartography.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/units/units.h"
 
-namespace gridbay::cli {
+namespace gridbay {
 namespace {
 
 class TsbRaster final : public Raster {
@@ -116,4 +116,4 @@ Result<std::unique_ptr<Raster>> openTsbRaster(const std::string& path, int subda
   return std::unique_ptr<Raster>(std::make_unique<TsbRaster>(std::move(*file), item));
 }
 
-}  // namespace gridbay::cli
+}  // namespace gridbay

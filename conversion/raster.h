@@ -6,7 +6,7 @@
 #include <string>
 #include <vector>
 
-namespace gridbay::cli {
+namespace gridbay {
 
 // Where a raster's points lie, eastwards and northwards in its projection: the centre of the point in row 0
 // and column 0, and the steps from there to the next column and to the next row.
@@ -55,4 +55,4 @@ class Raster {
 inline constexpr const char* kOpenRaster = "gridbayOpenRaster";
 using OpenRaster = Raster* (*)(const char* path, int subdataset, std::string* error);
 
-}  // namespace gridbay::cli
+}  // namespace gridbay

@@ -1,12 +1,13 @@
-#include "cli/output_file.h"
+#include "conversion/output_file.h"
 
 #include <fmt/format.h>
 
 #include <filesystem>
 
-namespace gridbay::cli {
+namespace gridbay {
 
-Outcome mayWrite(const std::string& path, bool force, std::span<const std::string> inputs) {
+Outcome mayWrite(const std::string& path, bool force, std::span<const std::string> inputs,
+                 std::string_view forceName) {
   std::error_code error;
   for (const std::string& input : inputs) {
     if (std::filesystem::equivalent(path, input, error))
@@ -15,8 +16,8 @@ Outcome mayWrite(const std::string& path, bool force, std::span<const std::strin
   }
   if (std::filesystem::is_directory(path, error)) return Failure{fmt::format("\"{}\" is a folder", path)};
   if (!force && std::filesystem::exists(path, error))
-    return Failure{fmt::format("\"{}\" is there already; --force replaces it", path)};
+    return Failure{fmt::format("\"{}\" is there already; {} replaces it", path, forceName)};
   return {};
 }
 
-}  // namespace gridbay::cli
+}  // namespace gridbay

@@ -7,9 +7,9 @@
 #include <cmath>
 #include <memory>
 
-#include "cli/raster.h"
+#include "conversion/raster.h"
 
-namespace gridbay::cli {
+namespace gridbay {
 namespace {
 
 struct CloseDataset {
@@ -117,13 +117,13 @@ class GdalRaster final : public Raster {
 };
 
 }  // namespace
-}  // namespace gridbay::cli
+}  // namespace gridbay
 
-extern "C" gridbay::cli::Raster* gridbayOpenRaster(const char* path, int subdataset, std::string* error) {
-  using gridbay::cli::subdatasetEntry;
+extern "C" gridbay::Raster* gridbayOpenRaster(const char* path, int subdataset, std::string* error) {
+  using gridbay::subdatasetEntry;
   GDALAllRegister();
   CPLSetErrorHandler(CPLQuietErrorHandler);
-  gridbay::cli::Dataset dataset = gridbay::cli::open(path);
+  gridbay::Dataset dataset = gridbay::open(path);
   std::vector<std::string> others;
   if (dataset) {
     for (int n = 1; const char* name = subdatasetEntry(dataset.get(), n, "NAME"); ++n) {
@@ -131,12 +131,12 @@ extern "C" gridbay::cli::Raster* gridbayOpenRaster(const char* path, int subdata
       others.push_back(std::string(description == nullptr ? "" : description) + " (" + name + ")");
     }
     const char* chosen = subdataset == 0 ? nullptr : subdatasetEntry(dataset.get(), subdataset, "NAME");
-    if (chosen != nullptr) dataset = gridbay::cli::open(std::string(chosen).c_str());
+    if (chosen != nullptr) dataset = gridbay::open(std::string(chosen).c_str());
   }
   if (!dataset || (GDALGetRasterCount(dataset.get()) < 1 && (others.empty() || subdataset != 0))) {
     *error = CPLGetLastErrorMsg();
     if (error->empty()) *error = "it has no raster band";
     return nullptr;
   }
-  return std::make_unique<gridbay::cli::GdalRaster>(std::move(dataset), std::move(others)).release();
+  return std::make_unique<gridbay::GdalRaster>(std::move(dataset), std::move(others)).release();
 }

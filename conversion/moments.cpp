@@ -1,4 +1,4 @@
-#include "cli/moments.h"
+#include "conversion/moments.h"
 
 #include <fmt/format.h>
 
@@ -7,7 +7,7 @@
 #include "core/date_time.h"
 #include "platform/units/units.h"
 
-namespace gridbay::cli {
+namespace gridbay {
 
 std::string momentText(const TsbTimeAxis& axis, std::size_t step) {
   if (!axis.isCalendar()) return fmt::format("{:.10g} {}", axis.at(step), axis.unit);
@@ -27,4 +27,4 @@ std::string momentText(const TsbTimeAxis& axis, std::size_t step) {
   return text;
 }
 
-}  // namespace gridbay::cli
+}  // namespace gridbay

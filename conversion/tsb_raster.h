@@ -3,10 +3,10 @@
 #include <memory>
 #include <string>
 
-#include "cli/raster.h"
+#include "conversion/raster.h"
 #include "platform/result.h"
 
-namespace gridbay::cli {
+namespace gridbay {
 
 // Whether a path leads to a data file of our own, by its content or at least by its name.
 bool isTsbRaster(const std::string& path);
@@ -14,4 +14,4 @@ bool isTsbRaster(const std::string& path);
 // A map of our own as a raster: its items are the rasters in the file, its time steps their bands.
 Result<std::unique_ptr<Raster>> openTsbRaster(const std::string& path, int subdataset);
 
-}  // namespace gridbay::cli
+}  // namespace gridbay

@@ -1,0 +1,322 @@
+#include "conversion/raster_conversion.h"
+
+#include <dlfcn.h>
+#include <fmt/format.h>
+
+#include <cmath>
+#include <filesystem>
+#include <memory>
+#include <vector>
+
+#include "conversion/history.h"
+#include "conversion/item_types.h"
+#include "conversion/output_file.h"
+#include "conversion/raster.h"
+#include "conversion/raster_layout.h"
+#include "conversion/tsb_raster.h"
+#include "platform/cartography/cartography.h"
+#include "platform/cartography/grid_mapping.h"
+#include "platform/files/program_path.h"
+#include "platform/tsb/tsb_writer.h"
+#include "platform/units/units.h"
+
+namespace gridbay {
+namespace {
+
+constexpr std::size_t kPointsAtOnce = 1 << 22;
+
+// What no raster could be converted with.
+Outcome check(const RasterConversion& options, const ConversionHost& host) {
+  const auto refuse = [&host](std::string_view name, const auto& given, std::string_view allowed) {
+    return Failure{fmt::format("{} cannot be {}: {}", host.option(name), given, allowed)};
+  };
+  const auto isFinite = [](const auto& number) { return !number || std::isfinite(*number); };
+  if (options.land && !(*options.land >= 0 && std::isfinite(*options.land)))
+    return refuse("land", *options.land, "it is a number of at least 0");
+  if (!isFinite(options.missingAs)) return refuse("nodata-as", *options.missingAs, "it is a finite number");
+  if (!isFinite(options.originX)) return refuse("origin-x", *options.originX, "it is a finite number");
+  if (!isFinite(options.originY)) return refuse("origin-y", *options.originY, "it is a finite number");
+  if (options.band && *options.band < 1) return refuse("band", *options.band, "bands count from 1");
+  if (options.subdataset < 0) return refuse("subdataset", options.subdataset, "rasters count from 1");
+  if (options.coarsen < 1) return refuse("coarsen", options.coarsen, "it is at least 1");
+  return {};
+}
+
+// Which points of the raster become the grid: a window, and every so many of its points.
+struct Selection {
+  int firstJ;
+  int firstK;
+  int noJ;
+  int noK;
+  int every;
+};
+
+// The raster reader stands beside the library that this code is in, or else beside the program.
+std::string readerModule() {
+  constexpr const char* kName = "v27raster.so";
+  std::error_code error;
+  ::Dl_info here{};
+  if (::dladdr(reinterpret_cast<const void*>(&readerModule), &here) != 0 && here.dli_fname != nullptr) {
+    const std::filesystem::path beside = std::filesystem::path(here.dli_fname).parent_path() / kName;
+    if (beside.is_absolute() && std::filesystem::exists(beside, error)) return beside.string();
+  }
+  return CKTOConfigFiles::GetProgramPath(1) + kName;
+}
+
+Result<std::unique_ptr<Raster>> openWithLibrary(const std::string& path, int subdataset) {
+  const std::string module = readerModule();
+  void* library = ::dlopen(module.c_str(), RTLD_NOW | RTLD_LOCAL);
+  void* entry = library == nullptr ? nullptr : ::dlsym(library, kOpenRaster);
+  if (entry == nullptr)
+    return Failure{fmt::format("The raster reader \"{}\" cannot be loaded: {}", module, ::dlerror())};
+  std::string why;
+  std::unique_ptr<Raster> raster(reinterpret_cast<OpenRaster>(entry)(path.c_str(), subdataset, &why));
+  if (raster == nullptr) return Failure{fmt::format("cannot read \"{}\": {}", path, why)};
+  return raster;
+}
+
+Result<std::unique_ptr<Raster>> openAny(const std::string& path, int subdataset) {
+  return isTsbRaster(path) ? openTsbRaster(path, subdataset) : openWithLibrary(path, subdataset);
+}
+
+// Texts with their numbers, a line each; of a long list the beginning.
+template <class TextOf>
+std::string numbered(int count, const TextOf& textOf) {
+  constexpr int kMost = 30;
+  std::string list;
+  for (int number = 1; number <= std::min(count, kMost); ++number)
+    list += fmt::format("\n  {}  {}", number, textOf(number));
+  if (count > kMost) list += fmt::format("\n  and {} more", count - kMost);
+  return list;
+}
+
+// Opens the raster and chooses what the options ask for; says what else there would be.
+Result<std::unique_ptr<Raster>> openRaster(const RasterConversion& options, ConversionHost& host) {
+  Result<std::unique_ptr<Raster>> opened = openAny(options.in, options.subdataset);
+  if (!opened) return opened;
+  const std::vector<std::string> others = (*opened)->subdatasets();
+  const int otherCount = static_cast<int>(others.size());
+  const std::string list =
+      numbered(otherCount, [&others](int number) { return others[static_cast<std::size_t>(number) - 1]; });
+  if (options.subdataset > otherCount) {
+    return Failure{
+        otherCount == 0
+            ? fmt::format("\"{}\" holds one raster only: leave {} out", options.in, host.option("subdataset"))
+            : fmt::format("\"{}\" has no raster {}. It holds{}", options.in, options.subdataset, list)};
+  }
+  if ((*opened)->bands() == 0) {
+    if (otherCount != 1)
+      return Failure{fmt::format("\"{}\" holds several rasters; choose one with {}:{}", options.in,
+                                 host.option("subdataset", "N"), list)};
+    opened = openAny(options.in, 1);
+    if (!opened) return opened;
+  } else if (options.subdataset == 0 && otherCount > 1) {
+    host.note(fmt::format("The file holds several rasters, of which {} takes another:{}",
+                          host.option("subdataset", "N"), list));
+  }
+  Raster& raster = **opened;
+  const auto bands = [&raster] {
+    return numbered(raster.bands(), [&raster](int band) { return raster.bandName(band); });
+  };
+  if (options.band && *options.band > raster.bands()) {
+    return Failure{
+        fmt::format("The raster has no band {}. It has {}:{}", *options.band, raster.bands(), bands())};
+  }
+  if (!options.band && raster.bands() > 1) {
+    host.note(fmt::format("The raster has {} bands, of which the first is taken; {} takes another:{}",
+                          raster.bands(), host.option("band", "N"), bands()));
+  }
+  raster.choose(options.band.value_or(1));
+  return opened;
+}
+
+Result<Selection> select(const RasterConversion& options, const Raster& raster) {
+  Selection all{0, 0, raster.columns(), raster.rows(), options.coarsen};
+  if (options.window) {
+    const auto [j0, k0, j1, k1] = *options.window;
+    if (j0 < 0 || k0 < 0 || j1 < j0 || k1 < k0 || j1 >= raster.columns() || k1 >= raster.rows()) {
+      return Failure{fmt::format("The window {},{},{},{} does not lie in the raster, which goes to {},{}", j0,
+                                 k0, j1, k1, raster.columns() - 1, raster.rows() - 1)};
+    }
+    all = {j0, k0, j1 - j0 + 1, k1 - k0 + 1, options.coarsen};
+  }
+  all.noJ = (all.noJ - 1) / all.every + 1;
+  all.noK = (all.noK - 1) / all.every + 1;
+  return all;
+}
+
+// The grid to write, and where its first point lies.
+struct Target {
+  TsbDefinition definition;
+  double east;
+  double north;
+};
+
+Result<Target> define(const RasterConversion& options, const Raster& raster, const RasterLayout& layout,
+                      const Selection& chosen, ConversionHost& host) {
+  const Result<const QunItem*> quantity =
+      itemTypeOfText(options.itemType.value_or(std::to_string(raster.itemType().value_or(item::kBathymetry))),
+                     host.itemTypeList());
+  if (!quantity) return Failure{quantity.error()};
+  if ((*quantity)->code == item::kBathymetry && !options.land)
+    return Failure{fmt::format("A bathymetry needs a land value: {} (points at or above it are land)",
+                               host.option("land", "VALUE"))};
+  const std::string_view baseUnit = qunBaseUnit((*quantity)->code)->text;
+  if (const CVdUnitConverter converter(raster.unit(), baseUnit);
+      !raster.unit().empty() &&
+      !(converter.IsValid() && converter.Convert(0) == 0 && converter.Convert(1) == 1)) {
+    return Failure{fmt::format("The values are in {}, and those of {} are to be in {}", raster.unit(),
+                               (*quantity)->name, baseUnit)};
+  }
+  const std::string projection = options.crs.empty() ? raster.projection() : options.crs;
+  const CVdMapProjection map(projection);
+  if (!map.IsValid()) return Failure{fmt::format("\"{}\" is no projection that is known here", projection)};
+  if (const auto mapping = gridMappingOf(map.Wkt2()); mapping && mapping->name == kGeographicMapping)
+    return Failure{fmt::format("\"{}\" is in degrees: a grid wants a projection in metres", map.Name())};
+
+  const std::array<double, 2> first = layout.at(chosen.firstJ, chosen.firstK);
+  Target target{{}, options.originX.value_or(first[0]), options.originY.value_or(first[1])};
+  TsbDefinition& definition = target.definition;
+  definition.title = std::filesystem::path(options.in).stem().string();
+  definition.history = historyWith(raster.history(), options.history);
+  definition.time.type = TsbTimeAxisType::relativeEquidistant;
+  const bool isTurned = layout.rotation != 0;
+  definition.axes = {
+      {static_cast<std::size_t>(chosen.noJ), isTurned ? 0 : target.east, layout.dx * chosen.every, "m"},
+      {static_cast<std::size_t>(chosen.noK), isTurned ? 0 : target.north, layout.dy * chosen.every, "m"}};
+  definition.items = {{std::string((*quantity)->name), (*quantity)->code, std::string(baseUnit)}};
+  if (options.land) definition.customBlocks = {{"V27_Misc", {0, 0, 0, *options.land}}};
+  if (map.IsLocal()) {
+    if (isTurned) {
+      host.note(fmt::format(
+          "The raster is turned by {:g} degrees, which a grid without a projection ({}) cannot tell",
+          layout.rotation, host.option("crs")));
+    }
+    return target;
+  }
+  TsbGeography place{projection, 0, 0, layout.rotation};
+  if (!map.Proj2Geo(target.east, target.north, &place.longitude, &place.latitude)) {
+    return Failure{fmt::format("The point {}, {} does not lie in the projection \"{}\"", target.east,
+                               target.north, map.Name())};
+  }
+  definition.geography = place;
+  return target;
+}
+
+// Copies the chosen points, some rows at a time; returns how many values were missing.
+Result<std::size_t> copyValues(const RasterConversion& options, Raster& raster, const RasterLayout& layout,
+                               const Selection& chosen, TsbWriter& writer, ConversionHost& host) {
+  const auto columns = static_cast<std::size_t>(raster.columns());
+  const int rowsAtOnce = static_cast<int>(std::max<std::size_t>(kPointsAtOnce / columns, 1));
+  const std::optional<float> missingAs = options.missingAs ? options.missingAs : options.land;
+  const std::optional<double> missing = raster.missingValue();
+  const auto isMissing = [&missing](float value) {
+    return !std::isfinite(value) || (missing && value == static_cast<float>(*missing));
+  };
+  std::size_t missingCount = 0;
+  std::vector<float> block;
+  std::vector<float> row(static_cast<std::size_t>(chosen.noJ));
+  int blockFirst = 0;
+  int blockCount = 0;
+  for (int k = 0; k < chosen.noK; ++k) {
+    const int wanted = layout.row(chosen.firstK + k * chosen.every);
+    if (wanted < blockFirst || wanted >= blockFirst + blockCount) {
+      // The rows that come next: before this one where the raster runs southwards.
+      blockFirst = layout.rowsBackwards ? std::max(wanted - rowsAtOnce + 1, 0) : wanted;
+      blockCount = std::min(rowsAtOnce, raster.rows() - blockFirst);
+      block.resize(columns * static_cast<std::size_t>(blockCount));
+      std::string why;
+      if (!raster.read(blockFirst, block, &why))
+        return Failure{fmt::format("cannot read \"{}\": {}", options.in, why)};
+    }
+    const float* source = block.data() + static_cast<std::size_t>(wanted - blockFirst) * columns;
+    for (int j = 0; j < chosen.noJ; ++j) {
+      const float value = source[layout.column(chosen.firstJ + j * chosen.every)];
+      const bool gone = isMissing(value);
+      missingCount += gone ? 1 : 0;
+      if (gone && !missingAs) {
+        return Failure{fmt::format("\"{}\" has missing values: say what stands for them with {}", options.in,
+                                   host.option("nodata-as"))};
+      }
+      row[static_cast<std::size_t>(j)] = gone ? *missingAs : value;
+    }
+    if (const Outcome written = writer.writeRows(1, 0, static_cast<std::size_t>(k), row); !written) {
+      return Failure{written.error()};
+    }
+    if (!host.reached(static_cast<std::size_t>(k) + 1, static_cast<std::size_t>(chosen.noK)))
+      return Failure{std::string(kConversionStopped)};
+  }
+  return missingCount;
+}
+
+// The files that a name of the raster library may mean, as NETCDF:"a.nc":depth: all that stand between its
+// colons and quotes.
+std::vector<std::string> filesIn(const std::vector<std::string>& names) {
+  std::vector<std::string> files;
+  for (const std::string& name : names) {
+    std::vector<std::size_t> ends{0};
+    for (std::size_t i = 0; i < name.size(); ++i) {
+      if (name[i] == ':' || name[i] == '"') ends.push_back(i + 1);
+    }
+    ends.push_back(name.size() + 1);
+    for (std::size_t first = 0; first < ends.size(); ++first) {
+      for (std::size_t last = first + 1; last < ends.size(); ++last)
+        files.push_back(name.substr(ends[first], ends[last] - 1 - ends[first]));
+    }
+  }
+  return files;
+}
+
+}  // namespace
+
+Result<ConvertedRaster> convertRaster(const RasterConversion& options, ConversionHost& host) {
+  if (const Outcome fit = check(options, host); !fit) return Failure{fit.error()};
+  if (const Outcome free = mayWrite(options.out, options.force, {&options.in, 1}, host.option("force"));
+      !free)
+    return Failure{free.error()};
+  const Result<std::unique_ptr<Raster>> opened = openRaster(options, host);
+  if (!opened) return Failure{opened.error()};
+  Raster& raster = **opened;
+  if (const Outcome free =
+          mayWrite(options.out, options.force, filesIn(raster.files()), host.option("force"));
+      !free)
+    return Failure{free.error()};
+  if (const std::string unit = raster.otherUnit(); !unit.empty() && options.crs.empty()) {
+    return Failure{fmt::format(
+        "The raster is in {}. Bring it to a projection in metres first, as with gdalwarp -t_srs", unit)};
+  }
+  if (!raster.hasPlace()) host.note("The raster does not say where it lies: its points are taken 1 m apart");
+  const Result<RasterLayout> layout = layoutOf(raster.place(), raster.columns(), raster.rows());
+  if (!layout) return Failure{layout.error()};
+  const Result<Selection> chosen = select(options, raster);
+  if (!chosen) return Failure{chosen.error()};
+  const Result<Target> target = define(options, raster, *layout, *chosen, host);
+  if (!target) return Failure{target.error()};
+  Result<TsbWriter> writer = TsbWriter::create(options.out, target->definition);
+  if (!writer) return Failure{writer.error()};
+  const Result<std::size_t> missing = copyValues(options, raster, *layout, *chosen, *writer, host);
+  if (!missing) return Failure{missing.error()};
+  if (const Outcome written = writer->commit(); !written) return Failure{written.error()};
+
+  const TsbGridAxis& x = target->definition.axes[0];
+  const TsbGridAxis& y = target->definition.axes[1];
+  const std::optional<TsbGeography>& place = target->definition.geography;
+  ConvertedRaster converted{.points = {static_cast<int>(x.points), static_cast<int>(y.points)},
+                            .spacing = {x.spacing, y.spacing},
+                            .first = {target->east, target->north},
+                            .rotation = place ? place->rotation : 0,
+                            .missing = *missing,
+                            .summary = {}};
+  converted.summary = fmt::format(
+      "{}: {} x {} points, {:.6g} x {:.6g} m apart, from {:.10g}, {:.10g}{}{}\n", options.out, x.points,
+      y.points, x.spacing, y.spacing, target->east, target->north,
+      place && place->isTurned() ? fmt::format(", turned {:g} degrees clockwise", place->rotation) : "",
+      options.land ? fmt::format("; land at {:g}", *options.land) : "");
+  if (*missing > 0) {
+    converted.summary += fmt::format("{} missing values written as {:g}\n", *missing,
+                                     options.missingAs ? *options.missingAs : *options.land);
+  }
+  return converted;
+}
+
+}  // namespace gridbay

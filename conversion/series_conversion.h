@@ -1,0 +1,36 @@
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "conversion/conversion_host.h"
+#include "platform/result.h"
+
+namespace gridbay {
+
+// Which table of text is to become which time series, and how.
+struct SeriesConversion {
+  std::string in;   // lines of a time and values, between commas, semicolons, tabs or blanks
+  std::string out;  // the time series (*.tsb0)
+  std::vector<std::string> itemTypes;  // one for all columns or one for each: code, name or beginning of one
+  std::string start;                   // the moment of time 0, "YYYY-MM-DD hh:mm:ss"
+  std::string timeUnit = "s";          // s, min, h, d
+  int skipLines = 0;                   // heading lines; the last one names the columns
+  bool force = false;                  // replaces a file that is there
+  std::string history;                 // how the series came about, a line of its history without the date
+};
+
+// The series that was written.
+struct ConvertedSeries {
+  std::vector<std::string> items;
+  std::size_t steps = 0;
+  bool equidistant = true;
+  std::string first;  // moments of the first and last step, as text
+  std::string last;
+  std::string summary;  // the same for people, one line
+};
+
+// Makes a time series from delimited text. An error leaves what is at the path as it was.
+Result<ConvertedSeries> convertSeries(const SeriesConversion& conversion, ConversionHost& host);
+
+}  // namespace gridbay

@@ -1,0 +1,1 @@
+from ._flow_model import *
