@@ -80,6 +80,7 @@ int runCommandLine(int argc, const char* const* argv, std::ostream& out, std::os
   addBoundaries(tool, action);
   addValidate(tool, action);
   addRun(tool, action);
+  addEnsemble(tool, action);
   try {
     tool.parse(argc, argv);
   } catch (const CLI::ParseError& error) {

@@ -25,6 +25,7 @@ void addSet(CLI::App& tool, Action& action);
 void addBoundaries(CLI::App& tool, Action& action);
 void addValidate(CLI::App& tool, Action& action);
 void addRun(CLI::App& tool, Action& action);
+void addEnsemble(CLI::App& tool, Action& action);
 
 // Adds a command whose options are held in a struct of its own and handed to `run`.
 template <class Options>

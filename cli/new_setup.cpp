@@ -6,8 +6,8 @@
 #include "basic/boundary.h"
 #include "basic/simulation_period.h"
 #include "cli/commands.h"
-#include "conversion/output_file.h"
 #include "core/edition.h"
+#include "platform/files/may_write.h"
 #include "platform/tsb/tsb_file.h"
 
 namespace gridbay::cli {

@@ -1,5 +1,4 @@
 #include <fmt/format.h>
-#include <unistd.h>
 
 #include <cstdlib>
 #include <filesystem>
@@ -7,6 +6,9 @@
 
 #include "cli/commands.h"
 #include "cli/engine_process.h"
+#include "cli/programs.h"
+#include "cli/run_members.h"
+#include "cli/slurm.h"
 #include "platform/files/paths.h"
 
 namespace gridbay::cli {
@@ -16,19 +18,16 @@ constexpr const char* kEngineNames[] = {"gridbay.exe", "gridbay"};
 constexpr const char* kEngineVariable = "GRIDBAY_ENGINE";
 
 struct Options {
-  std::string file;
+  std::vector<std::string> files;
   std::string engine;
+  std::string statusOf;
+  bool slurm = false;
   bool force = false;
 };
 
-bool isProgram(const std::filesystem::path& path) {
-  std::error_code error;
-  return std::filesystem::is_regular_file(path, error) && ::access(path.c_str(), X_OK) == 0;
-}
-
 std::optional<std::string> engineIn(const std::filesystem::path& folder) {
   for (const char* name : kEngineNames) {
-    if (isProgram(folder / name)) return (folder / name).string();
+    if (const std::string file = (folder / name).string(); isProgram(file)) return file;
   }
   return std::nullopt;
 }
@@ -47,12 +46,8 @@ Result<std::string> findEngine(const Options& options) {
     return Failure{fmt::format("There is no engine \"{}\" that can be run", named)};
   }
   if (const auto beside = engineIn(programFolder())) return *beside;
-  const char* variablePath = std::getenv("PATH");
-  const std::string path = variablePath == nullptr ? "" : variablePath;
-  for (std::size_t start = 0; start < path.size();) {
-    const std::size_t end = std::min(path.find(':', start), path.size());
-    if (const auto found = engineIn(path.substr(start, end - start))) return *found;
-    start = end + 1;
+  for (const std::string& folder : foldersOfPrograms()) {
+    if (const auto found = engineIn(folder)) return *found;
   }
   return Failure{fmt::format(
       "There is no engine: {} or {} was looked for in {}, and on the PATH. Name one with --engine or "
@@ -61,16 +56,16 @@ Result<std::string> findEngine(const Options& options) {
 }
 
 // Whether the setup can be started: loadable, and without faults unless they are to be passed over.
-int check(const Options& options, const Console& console) {
+int check(const std::string& file, bool force, const Console& console) {
   ConsoleMessageHost host(console);
-  Result<SetupFile> setup = SetupFile::open(options.file, &host);
+  Result<SetupFile> setup = SetupFile::open(file, &host);
   if (!setup) return console.fail(setup.error());
   ValidationList messages;
   const unsigned faults = setup->model().Validate(messages, 1);
   for (const CMessage& message : messages) console.note(messageLine(message));
   if (faults == 0) return kClean;
   const std::string count = fmt::format("{} fault{}", faults, faults == 1 ? "" : "s");
-  if (options.force) {
+  if (force) {
     console.note(count + ", started nevertheless");
     return kClean;
   }
@@ -78,30 +73,57 @@ int check(const Options& options, const Console& console) {
   return kFaultsFound;
 }
 
-int run(const Options& options, const Console& console) {
-  if (const int status = check(options, console); status != kClean) return status;
+int runOne(const Options& options, const Console& console) {
+  const std::string& file = options.files.front();
+  if (const int status = check(file, options.force, console); status != kClean) return status;
   const Result<std::string> engine = findEngine(options);
   if (!engine) return console.fail(engine.error());
   console.out.flush();
-  const Result<ProcessEnd> end = runProcess(*engine, {absolutePath(options.file, {})});
+  const Result<ProcessEnd> end = runProcess({*engine, {absolutePath(file, {})}});
   if (!end) return console.fail(end.error());
   if (end->interrupted) console.note("Stopped");
   return end->status;
+}
+
+int run(const Options& options, const Console& console) {
+  if (!options.statusOf.empty()) return showRun(options.statusOf, console);
+  if (options.files.empty()) return console.fail("FILE is required");
+  const bool bySlurm = options.slurm && slurm::isThere();
+  if (options.slurm && !bySlurm)
+    console.note("There is no sbatch on the PATH: the run is made on this machine");
+  if (options.files.size() == 1 && !bySlurm) return runOne(options, console);
+  const Result<std::string> engine = findEngine(options);
+  if (!engine) return console.fail(engine.error());
+  return runMembers({options.files, *engine, bySlurm, options.force}, console);
 }
 
 }  // namespace
 
 void addRun(CLI::App& tool, Action& action) {
   std::shared_ptr<Options> options;
-  CLI::App& command = addCommand(tool, action, "run",
-                                 "Checks a setup and hands it to the engine; the exit status is the "
-                                 "engine's, or 1 for a setup with faults",
-                                 run, options);
-  command.add_option("FILE", options->file, "The setup, as it is saved")->required();
-  command.add_flag("--force", options->force, "Start it with its faults too");
-  command.add_option(
+  CLI::App& command = addCommand(
+      tool, action, "run",
+      "Checks setups and hands them to the engine. Of one setup the exit status is the engine's, or 1 "
+      "for one with faults. Several run side by side, as many as there are cores, with what each "
+      "engine says in a folder \"run-N\" beside them; the exit status is 1 when one failed",
+      run, options);
+  CLI::Option* files = command.add_option("FILE", options->files, "The setups, as they are saved");
+  CLI::Option* force = command.add_flag("--force", options->force, "Start them with their faults too");
+  CLI::Option* engine = command.add_option(
       "--engine", options->engine,
       "The engine (default: GRIDBAY_ENGINE, gridbay.exe or gridbay beside this program or on the PATH)");
+  CLI::Option* bySlurm = command.add_flag("--slurm", options->slurm,
+                                          "Hand the setups to Slurm as one job array, and come back at once; "
+                                          "SBATCH_PARTITION, SBATCH_TIMELIMIT and "
+                                          "the like hold. Without Slurm they run on this machine");
+  command
+      .add_option("--status", options->statusOf,
+                  "Tell how many setups of a run, by its folder, are done, and which have failed")
+      ->type_name("FOLDER")
+      ->excludes(files)
+      ->excludes(force)
+      ->excludes(engine)
+      ->excludes(bySlurm);
 }
 
 }  // namespace gridbay::cli

@@ -10,7 +10,7 @@
 
 #include "conversion/history.h"
 #include "conversion/item_types.h"
-#include "conversion/output_file.h"
+#include "platform/files/may_write.h"
 #include "conversion/raster.h"
 #include "conversion/raster_layout.h"
 #include "conversion/tsb_raster.h"

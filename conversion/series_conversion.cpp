@@ -10,7 +10,7 @@
 #include "conversion/history.h"
 #include "conversion/item_types.h"
 #include "conversion/moments.h"
-#include "conversion/output_file.h"
+#include "platform/files/may_write.h"
 #include "core/date_time.h"
 #include "core/number_text.h"
 #include "platform/files/read_file.h"

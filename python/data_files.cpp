@@ -8,7 +8,7 @@
 
 #include "conversion/history.h"
 #include "conversion/item_types.h"
-#include "conversion/output_file.h"
+#include "platform/files/may_write.h"
 #include "platform/cartography/cartography.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_writer.h"

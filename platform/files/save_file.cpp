@@ -93,7 +93,7 @@ Outcome FileSave::writeThrough(std::string_view text) {
   return {};
 }
 
-Outcome FileSave::flush() {
+Outcome FileSave::writeBuffer() {
   if (Outcome written = writeThrough(state_->buffer); !written) return written;
   state_->buffer.clear();
   return {};
@@ -104,27 +104,34 @@ Outcome FileSave::write(std::string_view text) {
     state_->buffer.append(text);
     return {};
   }
-  if (Outcome flushed = flush(); !flushed) return flushed;
+  if (Outcome flushed = writeBuffer(); !flushed) return flushed;
   return writeThrough(text);
 }
 
-Outcome FileSave::commit() {
-  if (Outcome flushed = flush(); !flushed) return flushed;
-  if (::fsync(state_->file.get()) != 0) return state_->failure();
+Outcome FileSave::commit(Flush flush) {
+  if (Outcome flushed = writeBuffer(); !flushed) return flushed;
+  if (flush == Flush::now && ::fsync(state_->file.get()) != 0) return state_->failure();
   if (::close(state_->file.release()) != 0) return state_->failure();
   if (::rename(state_->temporary.c_str(), state_->target.c_str()) != 0) return state_->failure();
   state_->temporary.clear();
+  if (flush == Flush::withOthers) return {};
   // The new name is durable once its folder is; a file system that cannot flush folders keeps the old rule.
   const FileDescriptor folder(::open(state_->folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
   if (folder && ::fsync(folder.get()) != 0) errno = 0;
   return {};
 }
 
-Outcome saveFile(const std::string& path, std::string_view text) {
+Outcome saveFile(const std::string& path, std::string_view text, FileSave::Flush flush) {
   Result<FileSave> save = FileSave::begin(path);
   if (!save) return Failure{save.error()};
   if (Outcome written = save->write(text); !written) return written;
-  return save->commit();
+  return save->commit(flush);
+}
+
+Outcome flushFiles(const std::string& folder) {
+  const FileDescriptor descriptor(::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
+  if (!descriptor || ::syncfs(descriptor.get()) != 0) return Failure{systemError("cannot flush", folder)};
+  return {};
 }
 
 }  // namespace gridbay

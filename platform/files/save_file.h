@@ -14,6 +14,10 @@ namespace gridbay {
 // where the system allows it, ownership of the old file are kept.
 class FileSave {
  public:
+  // When what is written reaches the disk. One of many files is not flushed by itself: a `flushFiles` behind
+  // the last of them does it for all. It is whole or not there either way, but for a crash of the machine.
+  enum class Flush { now, withOthers };
+
   static Result<FileSave> begin(const std::string& path);
 
   FileSave(FileSave&&) noexcept;
@@ -21,18 +25,22 @@ class FileSave {
   ~FileSave();
 
   Outcome write(std::string_view text);
-  Outcome commit();
+  Outcome commit(Flush flush = Flush::now);
 
  private:
   struct State;
   explicit FileSave(std::unique_ptr<State> state);
 
   Outcome writeThrough(std::string_view text);
-  Outcome flush();
+  Outcome writeBuffer();
 
   std::unique_ptr<State> state_;
 };
 
-Outcome saveFile(const std::string& path, std::string_view text);
+Outcome saveFile(const std::string& path, std::string_view text,
+                 FileSave::Flush flush = FileSave::Flush::now);
+
+// Flushes all that has been written to the file system that the folder is on.
+Outcome flushFiles(const std::string& folder);
 
 }  // namespace gridbay

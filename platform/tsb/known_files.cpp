@@ -19,6 +19,11 @@ std::optional<KnownFiles::State> KnownFiles::stateOf(const std::string& path) {
                file.st_ctim.tv_sec, file.st_ctim.tv_nsec};
 }
 
+std::optional<KnownFiles::State> KnownFiles::known(const std::string& path) const {
+  const std::optional<State> state = stateOf(path);
+  return state && std::ranges::find(known_, *state) != known_.end() ? state : std::nullopt;
+}
+
 void KnownFiles::keep(const State& state) {
   constexpr std::time_t kMoment = 2;
   if (std::time(nullptr) - state[3] < kMoment) return;

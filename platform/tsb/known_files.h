@@ -20,9 +20,13 @@ class KnownFiles {
   // Whether the check holds for each file as it is now. It is asked once, for those that are not known.
   std::vector<bool> hold(std::span<const std::string> paths, const Check& check);
 
- private:
-  // Device, number, size and the time of the last change to its content or owner, in seconds and nanoseconds.
+  // What tells a file from all others and from itself before a write: device, number, size and the time of
+  // the last change to its content or owner, in seconds and nanoseconds.
   using State = std::array<std::int64_t, 5>;
+  // That of a file which is known as it is now.
+  std::optional<State> known(const std::string& path) const;
+
+ private:
   static std::optional<State> stateOf(const std::string& path);
   void keep(const State& state);
 

@@ -285,21 +285,46 @@ class DefinitionReader {
   std::vector<int>& itemVariables_;
 };
 
+// What a file says of itself, and its items' variables in the library.
+struct Content {
+  TsbDefinition definition;
+  std::vector<int> itemVariables;
+};
+
+KnownFiles& knownFiles() {
+  static KnownFiles files;
+  return files;
+}
+
+// The contents of known files, by the state in which they were read: a model asks for its files at each
+// check, and to open one takes longer than most of what is done with it.
+std::map<KnownFiles::State, std::shared_ptr<const Content>>& knownContents() {
+  static std::map<KnownFiles::State, std::shared_ptr<const Content>> contents;
+  return contents;
+}
+
+void keepContent(const KnownFiles::State& state, const std::shared_ptr<const Content>& content) {
+  constexpr std::size_t kMost = 64;
+  if (knownContents().size() >= kMost) knownContents().clear();
+  knownContents()[state] = content;
+}
+
 }  // namespace
 
 struct TsbFile::State {
   State(std::string name, NetcdfFile open) : path(std::move(name)), file(std::move(open)) {}
+  State(std::string name, const KnownFiles::State& as, std::shared_ptr<const Content> known)
+      : path(std::move(name)), knownAs(as), content(std::move(known)) {}
 
   std::string path;
-  NetcdfFile file;
-  TsbDefinition definition;
-  std::vector<int> itemVariables;
+  mutable std::optional<NetcdfFile> file;    // opened when it is read from
+  std::optional<KnownFiles::State> knownAs;  // where the content was read before
+  std::shared_ptr<const Content> content;
 
   // Whether the library stands all that is asked of it for each file. Its reader was not written for files
   // that are made to harm, so it is tried apart.
   static std::vector<bool> canBeRead(std::span<const std::string> paths) {
-    static KnownFiles knownFiles;
-    return knownFiles.hold(paths, [](std::span<const std::string> unknown) {
+    return knownFiles().hold(paths, [](std::span<const std::string> unknown) {
       // Set up here, once, and not in each copy.
       prepareHdf5();
       nc_initialize();
@@ -316,10 +341,10 @@ struct TsbFile::State {
     if (!file) return false;
     State state(path, *std::move(file));
     if (!state.readDefinition()) return true;  // the caller will see why
-    const std::size_t steps = state.definition.time.count;
+    const std::size_t steps = state.definition().time.count;
     const std::size_t rows = state.rowCount();
-    std::vector<float> row(state.definition.pointCount() / rows);
-    for (std::size_t item = 1; item <= state.itemVariables.size(); ++item) {
+    std::vector<float> row(state.definition().pointCount() / rows);
+    for (std::size_t item = 1; item <= state.content->itemVariables.size(); ++item) {
       // What can't be read is told when it is asked for.
       static_cast<void>(
           static_cast<bool>(state.readBlock(item, {0, 1}, {0, 1}, std::span(row), nc_get_vara_float)));
@@ -330,12 +355,28 @@ struct TsbFile::State {
   }
 
   Outcome readDefinition() {
-    return DefinitionReader(file.id(), static_cast<double>(sizeOf(path)), definition, itemVariables).read();
+    auto reading = std::make_shared<Content>();
+    content = reading;
+    return DefinitionReader(file->id(), static_cast<double>(sizeOf(path)), reading->definition,
+                            reading->itemVariables)
+        .read();
+  }
+
+  const TsbDefinition& definition() const { return content->definition; }
+
+  Outcome openFile() const {
+    if (file) return {};
+    if (knownFiles().known(path) != knownAs) return fail("it has been written to since it was opened");
+    if (std::optional<NetcdfFile> opened = NetcdfFile::open(path)) {
+      file.emplace(*std::move(opened));
+      return {};
+    }
+    return fail(kNoDataFile);
   }
 
   template <class Number, class Get>
   Outcome read(std::size_t item, std::size_t step, std::span<Number> values, Get get) const {
-    if (values.size() != definition.pointCount()) return fail("its grid has another size");
+    if (values.size() != definition().pointCount()) return fail("its grid has another size");
     return readBlock(item, {step, 1}, {0, rowCount()}, values, get);
   }
 
@@ -346,18 +387,21 @@ struct TsbFile::State {
   };
   template <class Number, class Get>
   Outcome readBlock(std::size_t item, Block steps, Block rows, std::span<Number> values, Get get) const {
-    if (item < 1 || item > itemVariables.size()) return fail("it has no item " + std::to_string(item));
-    if (steps.first >= definition.time.count || steps.count > definition.time.count - steps.first)
+    if (item < 1 || item > content->itemVariables.size())
+      return fail("it has no item " + std::to_string(item));
+    if (steps.first >= definition().time.count || steps.count > definition().time.count - steps.first)
       return fail("it has no time step " + std::to_string(steps.first));
     if (rows.first + rows.count > rowCount()) return fail("it has no row " + std::to_string(rows.first));
+    if (Outcome opened = openFile(); !opened) return opened;
     std::vector<std::size_t> start{steps.first};
     std::vector<std::size_t> count{steps.count};
-    for (auto axis = definition.axes.rbegin(); axis != definition.axes.rend(); ++axis) {
-      const bool isRows = definition.axes.size() == 2 && axis == definition.axes.rbegin();
+    for (auto axis = definition().axes.rbegin(); axis != definition().axes.rend(); ++axis) {
+      const bool isRows = definition().axes.size() == 2 && axis == definition().axes.rbegin();
       start.push_back(isRows ? rows.first : 0);
       count.push_back(isRows ? rows.count : axis->points);
     }
-    const int status = get(file.id(), itemVariables[item - 1], start.data(), count.data(), values.data());
+    const int status =
+        get(file->id(), content->itemVariables[item - 1], start.data(), count.data(), values.data());
     if (status == NC_NOERR) return {};
     return fail("item " + std::to_string(item) + ", step " + std::to_string(steps.first) + ": " +
                 nc_strerror(status));
@@ -366,21 +410,21 @@ struct TsbFile::State {
   template <class Number, class Get>
   Outcome readRows(std::size_t item, std::size_t step, std::size_t firstRow, std::span<Number> values,
                    Get get) const {
-    const std::size_t row = definition.axes.empty() ? 1 : definition.axes[0].points;
-    if (definition.axes.size() != 2 || row == 0 || values.size() % row != 0)
+    const std::size_t row = definition().axes.empty() ? 1 : definition().axes[0].points;
+    if (definition().axes.size() != 2 || row == 0 || values.size() % row != 0)
       return fail("a part of it was asked for that is not of whole rows");
     return readBlock(item, {step, 1}, {firstRow, values.size() / row}, values, get);
   }
 
   template <class Number, class Get>
   Outcome readSteps(std::size_t item, std::size_t firstStep, std::span<Number> values, Get get) const {
-    const std::size_t points = definition.pointCount();
+    const std::size_t points = definition().pointCount();
     if (points == 0 || values.size() % points != 0)
       return fail("a part of it was asked for that is not of whole steps");
     return readBlock(item, {firstStep, values.size() / points}, {0, rowCount()}, values, get);
   }
 
-  std::size_t rowCount() const { return definition.axes.size() == 2 ? definition.axes[1].points : 1; }
+  std::size_t rowCount() const { return definition().axes.size() == 2 ? definition().axes[1].points : 1; }
   Failure fail(std::string_view why) const { return cannotRead(path, why); }
 };
 
@@ -393,10 +437,16 @@ Result<TsbFile> TsbFile::open(const std::string& path) {
   if (path.empty()) return Failure{"no data file is named"};
   if (const std::string_view why = hindranceOf(path); !why.empty()) return cannotRead(path, why);
   if (!State::canBeRead({&path, 1})[0]) return cannotRead(path, kNoDataFile);
+  const std::optional<KnownFiles::State> known = knownFiles().known(path);
+  if (known) {
+    if (const auto content = knownContents().find(*known); content != knownContents().end())
+      return TsbFile(std::make_unique<State>(path, *known, content->second));
+  }
   std::optional<NetcdfFile> file = NetcdfFile::open(path);
   if (!file) return cannotRead(path, kNoDataFile);
   auto state = std::make_unique<State>(path, *std::move(file));
   if (const Outcome read = state->readDefinition(); !read) return cannotRead(path, read.error());
+  if (known && knownFiles().known(path) == known) keepContent(*known, state->content);
   return TsbFile(std::move(state));
 }
 
@@ -408,7 +458,7 @@ void TsbFile::lookAhead(std::span<const std::string> paths) {
 }
 
 const TsbDefinition& TsbFile::definition() const {
-  return state_->definition;
+  return state_->definition();
 }
 const std::string& TsbFile::path() const {
   return state_->path;

@@ -53,7 +53,8 @@ TEST_F(Tool, HelpOnEveryCommand) {
                                                        {"set"},
                                                        {"boundaries"},
                                                        {"validate"},
-                                                       {"run"}};
+                                                       {"run"},
+                                                       {"ensemble"}};
   for (std::vector<std::string> words : commands) {
     words.push_back("--help");
     const ProgramRun run = runTool(words);

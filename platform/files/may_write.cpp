@@ -1,4 +1,4 @@
-#include "conversion/output_file.h"
+#include "platform/files/may_write.h"
 
 #include <fmt/format.h>
 

@@ -1,0 +1,305 @@
+// The commands for many setups: an ensemble made, and several setups run at once.
+
+#include <gmock/gmock.h>
+#include <signal.h>
+#include <sys/stat.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <chrono>
+#include <filesystem>
+#include <thread>
+
+#include "core/edition.h"
+#include "platform/side_by_side.h"
+#include "tests/support/grids.h"
+#include "tests/support/programs.h"
+#include "tests/support/temporary_folder.h"
+
+namespace gridbay {
+namespace {
+
+namespace fs = std::filesystem;
+using test::ProgramRun;
+using test::runTool;
+using test::textOf;
+using ::testing::HasSubstr;
+using ::testing::StartsWith;
+
+const std::string kDrying = "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth";
+const std::string kKind = "." + std::string(theEdition.fileKind);
+
+// A program started by itself, to be told to stop.
+class Started {
+ public:
+  explicit Started(std::vector<std::string> words) : process_(::fork()) {
+    if (process_ != 0) return;
+    words.insert(words.begin(), test::toolPath());
+    std::vector<char*> argv;
+    for (std::string& word : words) argv.push_back(word.data());
+    argv.push_back(nullptr);
+    ::close(STDERR_FILENO);
+    ::close(STDOUT_FILENO);
+    ::execv(argv[0], argv.data());
+    ::_exit(98);
+  }
+  int endWith(int signal) {
+    ::kill(process_, signal);
+    int status = 0;
+    ::waitpid(process_, &status, 0);
+    return WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status);
+  }
+
+ private:
+  pid_t process_;
+};
+
+void waitFor(const std::function<bool()>& condition) {
+  for (int i = 0; i < 1000 && !condition(); ++i) std::this_thread::sleep_for(std::chrono::milliseconds(10));
+}
+
+class Members : public ::testing::Test {
+ protected:
+  Members() {
+    test::writeGrid(folder.file("grid.tsb2"), {}, [](int j, int) { return j < 3 ? -5.0F : 10.0F; });
+    const ProgramRun run = runTool({"new", base, "--area", folder.file("grid.tsb2")});
+    EXPECT_EQ(run.status, 0) << run.err;
+  }
+  std::string table(const std::string& text) { return folder.write("table.csv", text); }
+  // Makes members of these names.
+  std::vector<std::string> make(const std::vector<std::string>& names) {
+    std::string text = "name," + kDrying + "\n";
+    std::vector<std::string> files;
+    for (const std::string& name : names) {
+      text += name + ",0.1\n";
+      files.push_back(out + "/" + name + kKind);
+    }
+    const ProgramRun run = runTool({"ensemble", table(text), base, out});
+    EXPECT_EQ(run.status, 0) << run.err;
+    return files;
+  }
+  // An engine that says its setup's name, and fails for one whose name begins with "bad".
+  std::string engine(const std::string& more = "") {
+    const std::string path =
+        folder.write("gridbay", "#!/bin/sh\nname=$(basename \"$1\")\necho \"ran $name\"\n" + more +
+                                    "\ncase $name in bad*) exit 3;; esac\n");
+    EXPECT_EQ(::chmod(path.c_str(), 0755), 0);
+    return path;
+  }
+  ProgramRun run(std::vector<std::string> words, const std::vector<std::string>& files) {
+    words.insert(words.begin(), "run");
+    words.insert(words.end(), files.begin(), files.end());
+    return runTool(words);
+  }
+
+  test::TemporaryFolder folder;
+  std::string base = folder.file("base" + kKind);
+  std::string out = folder.file("out");
+};
+
+TEST_F(Members, AnEnsembleIsMadeAndReported) {
+  ProgramRun run = runTool({"ensemble", table("name," + kDrying + "\nwell,0.1\ndry,-1\n"), base, out});
+  EXPECT_EQ(run.status, 1);
+  EXPECT_EQ(run.err, "");
+  EXPECT_EQ(run.out, out + ": 2 members, 1 with faults; see " + out + "/report.csv\n");
+  EXPECT_EQ(textOf(out + "/report.csv"),
+            "\"member\",\"file\",\"faults\",\"messages\"\n\"well\",\"" + out + "/well" + kKind +
+                "\",\"0\",\"\"\n\"dry\",\"" + out + "/dry" + kKind +
+                "\",\"1\",\"page 26, severity 1: Drying depth must be positive\"\n");
+  EXPECT_EQ(runTool({"get", out + "/well" + kKind, kDrying}).out, "0.1\n");
+  EXPECT_EQ(runTool({"validate", out + "/well" + kKind}).status, 0);
+
+  run = runTool({"ensemble", table("name," + kDrying + "\nwell,0.2\n"), base, out});
+  EXPECT_EQ(run.status, 2);
+  EXPECT_THAT(run.err, HasSubstr("is there already; --force replaces it"));
+  run = runTool({"ensemble", table("name," + kDrying + "\nwell,0.2\n"), base, out, "--force"});
+  EXPECT_EQ(run.status, 0);
+  EXPECT_EQ(run.out, out + ": 1 member, 0 with faults; see " + out + "/report.csv\n");
+  EXPECT_EQ(runTool({"get", out + "/well" + kKind, kDrying}).out, "0.2\n");
+}
+
+TEST_F(Members, AnEnsembleThatCannotBe) {
+  const std::string file = table("name," + kDrying + "\nm,wet\n");
+  ProgramRun run = runTool({"ensemble", file, base, out});
+  EXPECT_EQ(run.status, 2);
+  EXPECT_EQ(run.err,
+            file + ", line 2 (m), column 2 (" + kDrying + "): Drying_Depth takes a number, not \"wet\"\n");
+  EXPECT_FALSE(fs::exists(out));
+  EXPECT_EQ(runTool({"ensemble", folder.file("none.csv"), base, out}).status, 2);
+  EXPECT_EQ(runTool({"ensemble", file, folder.file("none" + kKind), out}).status, 2);
+  EXPECT_THAT(runTool({"ensemble", file, base}).err, HasSubstr("FOLDER is required"));
+}
+
+TEST_F(Members, AnEnsembleThatIsStoppedHasWholeFilesAndAReport) {
+  std::string text = kDrying + "\n";
+  for (int i = 0; i < 20000; ++i) text += "0.1\n";
+  Started tool({"ensemble", table(text), base, out});
+  waitFor([&] { return fs::exists(out) && !fs::is_empty(out); });
+  EXPECT_EQ(tool.endWith(SIGINT), 2);
+  std::size_t files = 0;
+  for (const auto& entry : fs::directory_iterator(out)) {
+    const std::string name = entry.path().filename().string();
+    EXPECT_FALSE(name.starts_with(".")) << name;
+    if (!name.ends_with(kKind)) continue;
+    ++files;
+    EXPECT_THAT(textOf(entry.path().string()), ::testing::EndsWith("}\n"));
+  }
+  EXPECT_GT(files, 0U);
+  EXPECT_LT(files, 20000U);
+  const std::string report = textOf(out + "/report.csv");
+  EXPECT_EQ(static_cast<std::size_t>(std::ranges::count(report, '\n')), files + 1);
+}
+
+TEST_F(Members, SeveralRunOnAsManyCoresAsThereAre) {
+  const std::vector<std::string> files = make({"a", "bad", "c", "d", "e"});
+  // Each leaves a mark while it runs, and counts the marks that it sees.
+  const std::string marks = folder.file("marks");
+  fs::create_directory(marks);
+  const std::string program =
+      engine("touch " + marks + "/$$; ls " + marks + " | wc -l; sleep 0.2; rm " + marks + "/$$");
+  const ProgramRun ran = run({"--engine", program}, files);
+  EXPECT_EQ(ran.status, 1) << ran.err;
+  EXPECT_EQ(ran.out, "5 setups: 4 done, 1 failed, 0 running, 0 waiting\n" + files[1] +
+                         " failed: status 3, see " + out + "/run-1/2.log\n");
+  int most = 0;
+  for (int n = 1; n <= 5; ++n) {
+    const std::string log = textOf(out + "/run-1/" + std::to_string(n) + ".log");
+    EXPECT_THAT(log,
+                StartsWith("ran " + fs::path(files[static_cast<std::size_t>(n) - 1]).filename().string()));
+    most = std::max(most, std::stoi(log.substr(log.find('\n'))));
+  }
+  EXPECT_LE(most, static_cast<int>(coreCount()));
+  if (coreCount() > 1) EXPECT_GT(most, 1);
+
+  const ProgramRun status = runTool({"run", "--status", out + "/run-1"});
+  EXPECT_EQ(status.out, ran.out);
+  EXPECT_EQ(status.status, 1);
+  const ProgramRun again = run({"--engine", program}, {files[0], files[2]});
+  EXPECT_EQ(again.status, 0);
+  EXPECT_EQ(again.out, "2 setups: 2 done, 0 failed, 0 running, 0 waiting\n");
+  EXPECT_EQ(runTool({"run", "--status", out + "/run-2"}).status, 0);
+}
+
+TEST_F(Members, NoneIsStartedWithFaultsUnasked) {
+  std::vector<std::string> files = make({"a", "b"});
+  ASSERT_EQ(runTool({"set", files[1], kDrying + "=-1"}).status, 0);
+  const std::string program = engine();
+  ProgramRun ran = run({"--engine", program}, files);
+  EXPECT_EQ(ran.status, 1);
+  EXPECT_EQ(ran.out, "");
+  EXPECT_EQ(ran.err, files[1] +
+                         ": page 26, severity 1: Drying depth must be positive\n"
+                         "1 setup with faults: none is started; --force starts all nevertheless\n");
+  EXPECT_FALSE(fs::exists(out + "/run-1"));
+  ran = run({"--engine", program, "--force"}, files);
+  EXPECT_EQ(ran.status, 0);
+  EXPECT_THAT(ran.err, HasSubstr("1 setup with faults, started nevertheless\n"));
+  files.push_back(folder.file("none" + kKind));
+  EXPECT_EQ(run({"--engine", program, "--force"}, files).status, 2);
+  ran = run({"--engine", program}, {files[0], out + "/../out/a" + kKind});
+  EXPECT_EQ(ran.status, 2);
+  EXPECT_THAT(ran.err, HasSubstr("is named twice"));
+}
+
+TEST_F(Members, ARunThatIsStoppedEndsItsEngines) {
+  const std::vector<std::string> files = make({"a", "b", "c", "d", "e", "f", "g", "h"});
+  const std::string program = engine("trap 'exit 9' TERM; touch \"$1.on\"; while :; do sleep 0.05; done");
+  std::vector<std::string> words{"run", "--engine", program};
+  words.insert(words.end(), files.begin(), files.end());
+  Started tool(words);
+  waitFor([&] { return fs::exists(files[0] + ".on"); });
+  EXPECT_EQ(tool.endWith(SIGINT), 2);
+  const ProgramRun status = runTool({"run", "--status", out + "/run-1"});
+  EXPECT_THAT(status.out, HasSubstr(files[0] + " failed: status 9"));
+  EXPECT_THAT(status.out, HasSubstr(" 0 running, "));
+  if (coreCount() < files.size()) EXPECT_THAT(status.out, ::testing::Not(HasSubstr(" 0 waiting")));
+}
+
+TEST_F(Members, ARunThatIsNone) {
+  EXPECT_EQ(runTool({"run"}).status, 2);
+  EXPECT_EQ(runTool({"run"}).err, "FILE is required\n");
+  EXPECT_THAT(runTool({"run", "--status", out}).err, HasSubstr("is no folder of a run"));
+  EXPECT_EQ(runTool({"run", "--status", out, base}).status, 2);
+  const std::vector<std::string> files = make({"a", "b"});
+  EXPECT_THAT(runTool({"run", files[0], files[1]}, {"PATH=/nowhere"}).err, HasSubstr("There is no engine"));
+}
+
+TEST_F(Members, WithoutSlurmTheyRunHere) {
+  const std::vector<std::string> files = make({"a", "bad"});
+  fs::create_directory(folder.file("bin"));
+  for (const char* program : {"basename", "sh"})
+    fs::create_symlink(fs::exists("/usr/bin/" + std::string(program)) ? "/usr/bin/" + std::string(program)
+                                                                      : "/bin/" + std::string(program),
+                       folder.file("bin/" + std::string(program)));
+  const ProgramRun ran =
+      runTool({"run", "--slurm", "--engine", engine(), files[0], files[1]}, {"PATH=" + folder.file("bin")});
+  EXPECT_EQ(ran.status, 1);
+  EXPECT_THAT(ran.err, StartsWith("There is no sbatch on the PATH: the run is made on this machine\n"));
+  EXPECT_THAT(ran.out, StartsWith("2 setups: 1 done, 1 failed"));
+}
+
+// Runs the tool's words with a Slurm of the test's own; skips the test where it can't be had.
+class BySlurm : public Members {
+ protected:
+  ProgramRun withSlurm(const std::string& script) {
+    const test::TemporaryFolder slurm;
+    const std::string file =
+        folder.write("script", "tool=" + test::toolPath() + "\ncd " + out + "\n" + script);
+    return test::runProgram(std::string(GRIDBAY_TESTS) + "/support/with_slurm",
+                            {slurm.path().string(), "bash", file});
+  }
+  // Waits until no member runs or waits.
+  static constexpr const char* kWait =
+      "for i in $(seq 300); do $tool run --status run-1 >status; code=$?\n"
+      "grep -q ' 0 running, 0 waiting' status && break; sleep 0.1; done\n"
+      "cat status; exit $code\n";
+};
+constexpr int kNoSlurm = 77;
+
+TEST_F(BySlurm, MembersAreOneJobArrayWithItsStatus) {
+  const std::vector<std::string> files = make({"a", "bad1", "c", "d", "bad2"});
+  // The folder's arrays have three tasks: two of them run two members.
+  const ProgramRun ran =
+      withSlurm("$tool run --slurm --engine " + engine("sleep 0.3") + " a" + kKind + " bad1" + kKind + " c" +
+                kKind + " d" + kKind + " bad2" + kKind + " || exit\n$tool run --status run-1\n" + kWait);
+  if (ran.status == kNoSlurm) GTEST_SKIP() << ran.err;
+  EXPECT_EQ(ran.status, 1) << ran.err;
+  const std::string tool = fs::path(test::toolPath()).filename().string();
+  EXPECT_THAT(ran.out, StartsWith("Job 1: 5 setups. \"" + tool + " run --status " + out +
+                                  "/run-1\" tells how they are\nJob 1, 5 setups: 0 done, 0 failed, "));
+  EXPECT_THAT(ran.out, ::testing::EndsWith("Job 1, 5 setups: 3 done, 2 failed, 0 running, 0 waiting\n" +
+                                           files[1] + " failed: status 3, see run-1/2.log\n" + files[4] +
+                                           " failed: status 3, see run-1/5.log\n"));
+  for (std::size_t n = 1; n <= files.size(); ++n)
+    EXPECT_EQ(textOf(out + "/run-1/" + std::to_string(n) + ".log"),
+              "ran " + fs::path(files[n - 1]).filename().string() + "\n");
+}
+
+TEST_F(BySlurm, MembersWhoseJobIsCancelledHaveFailed) {
+  const std::vector<std::string> files = make({"a", "b", "c"});
+  const ProgramRun ran = withSlurm("$tool run --slurm --engine " + engine("sleep 60") + " a" + kKind + " b" +
+                                   kKind + " c" + kKind +
+                                   " || exit\nfor i in $(seq 300); do $tool run --status run-1 >status\n"
+                                   "grep -q ' 2 running, 1 waiting' status && break; sleep 0.1; done\n"
+                                   "cat status; scancel 1\n" +
+                                   kWait);
+  if (ran.status == kNoSlurm) GTEST_SKIP() << ran.err;
+  EXPECT_EQ(ran.status, 1) << ran.err;
+  EXPECT_THAT(ran.out, HasSubstr("Job 1, 3 setups: 0 done, 0 failed, 2 running, 1 waiting\n"));
+  EXPECT_THAT(ran.out,
+              ::testing::EndsWith("Job 1, 3 setups: 0 done, 3 failed, 0 running, 0 waiting\n" + files[0] +
+                                  " failed: Slurm ended it\n" + files[1] + " failed: Slurm ended it\n" +
+                                  files[2] + " failed: Slurm ended it before it began\n"));
+}
+
+TEST_F(BySlurm, AJobThatSlurmRefusesIsToldAndNothingRuns) {
+  make({"a", "b"});
+  const ProgramRun ran = withSlurm("export SBATCH_PARTITION=nowhere\n$tool run --slurm --engine " + engine() +
+                                   " a" + kKind + " b" + kKind);
+  if (ran.status == kNoSlurm) GTEST_SKIP() << ran.err;
+  EXPECT_EQ(ran.status, 2);
+  EXPECT_THAT(ran.err, HasSubstr("invalid partition specified: nowhere"));
+}
+
+}  // namespace
+}  // namespace gridbay
