@@ -65,7 +65,7 @@ int runCommandLine(int argc, const char* const* argv, std::ostream& out, std::os
                     std::string(theEdition.editorName.format) +
                     ".\nExit status: 0 clean, 1 faults found, 2 could not do it.",
                 std::string(toolName()));
-  tool.set_version_flag("--version", "0.1.0");
+  tool.set_version_flag("--version", GRIDBAY_VERSION);
   tool.require_subcommand(1);
   Action action;
   CLI::App& convert = *tool.add_subcommand("convert", "Makes data files from rasters and text series");
@@ -81,12 +81,18 @@ int runCommandLine(int argc, const char* const* argv, std::ostream& out, std::os
   addValidate(tool, action);
   addRun(tool, action);
   addEnsemble(tool, action);
+  addCompletion(tool, action);
+  const std::span<const char* const> words(argv + 1, argv + std::max(argc, 1));
+  if (!words.empty() && words[0] == kCompleteWords) {
+    printCompletions(tool, words.subspan(1), out);
+    return kClean;
+  }
   try {
     tool.parse(argc, argv);
   } catch (const CLI::ParseError& error) {
     return tool.exit(error, out, err) == 0 ? kClean : kCouldNotDoIt;
   }
-  return action(Console{out, err, commandLineText(tool.get_name(), {argv + 1, argv + argc})});
+  return action(Console{out, err, commandLineText(tool.get_name(), words)});
 }
 
 }  // namespace gridbay::cli

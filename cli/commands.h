@@ -4,6 +4,7 @@
 #include <functional>
 #include <limits>
 #include <memory>
+#include <span>
 #include <string>
 #include <string_view>
 
@@ -26,6 +27,14 @@ void addBoundaries(CLI::App& tool, Action& action);
 void addValidate(CLI::App& tool, Action& action);
 void addRun(CLI::App& tool, Action& action);
 void addEnsemble(CLI::App& tool, Action& action);
+void addCompletion(CLI::App& tool, Action& action);
+
+// The first word of a command line by which a shell asks for completions.
+inline constexpr std::string_view kCompleteWords = "complete-words";
+// What a word that is being typed can become: `words` are those after the tool's name, the last one as far as
+// it is there. A line each on `out`, with a tab and what it is where that is known; nothing where files are
+// wanted.
+void printCompletions(const CLI::App& tool, std::span<const char* const> words, std::ostream& out);
 
 // Adds a command whose options are held in a struct of its own and handed to `run`.
 template <class Options>

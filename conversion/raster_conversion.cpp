@@ -51,20 +51,8 @@ struct Selection {
   int every;
 };
 
-// The raster reader stands beside the library that this code is in, or else beside the program.
-std::string readerModule() {
-  constexpr const char* kName = "v27raster.so";
-  std::error_code error;
-  ::Dl_info here{};
-  if (::dladdr(reinterpret_cast<const void*>(&readerModule), &here) != 0 && here.dli_fname != nullptr) {
-    const std::filesystem::path beside = std::filesystem::path(here.dli_fname).parent_path() / kName;
-    if (beside.is_absolute() && std::filesystem::exists(beside, error)) return beside.string();
-  }
-  return CKTOConfigFiles::GetProgramPath(1) + kName;
-}
-
 Result<std::unique_ptr<Raster>> openWithLibrary(const std::string& path, int subdataset) {
-  const std::string module = readerModule();
+  const std::string module = pluginFolder() + "/v27raster.so";
   void* library = ::dlopen(module.c_str(), RTLD_NOW | RTLD_LOCAL);
   void* entry = library == nullptr ? nullptr : ::dlsym(library, kOpenRaster);
   if (entry == nullptr)

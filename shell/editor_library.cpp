@@ -2,12 +2,12 @@
 
 #include <dlfcn.h>
 
-#include <QCoreApplication>
+#include "platform/files/program_path.h"
 
 namespace gridbay::shell {
 
 std::unique_ptr<EditorLibrary> EditorLibrary::load(const QString& name, QString* error) {
-  const QString path = QCoreApplication::applicationDirPath() + "/" + name + ".so";
+  const QString path = QString::fromStdString(pluginFolder()) + "/" + name + ".so";
   void* library = ::dlopen(path.toUtf8().constData(), RTLD_NOW | RTLD_LOCAL);
   if (library == nullptr) {
     *error = QString("There is no editor %1: %2").arg(path, QString::fromUtf8(::dlerror()));

@@ -7,7 +7,7 @@
 
 namespace gridbay::shell {
 
-// An editor found in a plug-in library beside the program, through its entry points.
+// An editor found in a plug-in library of the installation, through its entry points.
 class EditorLibrary {
  public:
   // Null, with the reason and where it was looked for, when there is none.

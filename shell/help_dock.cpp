@@ -1,13 +1,14 @@
 #include "shell/help_dock.h"
 
-#include <QApplication>
 #include <QDir>
+
+#include "platform/files/program_path.h"
 
 namespace gridbay::shell {
 
 HelpDock::HelpDock(QWidget* parent)
     : QDockWidget(tr("Help"), parent),
-      folder_(QApplication::applicationDirPath() + "/help"),
+      folder_(QString::fromStdString(CKTOConfigFiles::GetProgramPath(1)) + "help"),
       browser_(new QTextBrowser(this)) {
   setObjectName("help");
   setWidget(browser_);

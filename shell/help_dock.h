@@ -5,8 +5,8 @@
 
 namespace gridbay::shell {
 
-// The help of a page, by the number of its topic. The pages are Markdown files in the folder "help" beside
-// the program, named by number and subject; page 0 is the overview.
+// The help of a page, by the number of its topic. The pages are Markdown files in the folder "help" of
+// the installation, named by number and subject; page 0 is the overview.
 class HelpDock final : public QDockWidget {
   Q_OBJECT
  public:

@@ -21,8 +21,8 @@ void openFiles(MainWindow& window, const QStringList& paths) {
   }
 }
 
-// Pictures of the start view, of a setup's first view and each page that its tree shows, and of each data
-// file that is open.
+// Pictures of the start view, of a setup's first view and each page that its tree shows, of the help, and of
+// each data file that is open.
 void takeScreenshots(MainWindow& window, const QStringList& paths, const QString& folder) {
   const auto take = [&window, &folder](const QString& name) {
     QApplication::processEvents();
@@ -38,6 +38,11 @@ void takeScreenshots(MainWindow& window, const QStringList& paths, const QString
     if (!item.visible || !window.currentDocument()->goToPage(item.id)) continue;
     take(QString("page-%1").arg(item.id));
   }
+  if (QString error; window.help().showTopic(0, "Overview", &error)) {
+    take("help");
+  } else {
+    qWarning("%s", qPrintable(error));
+  }
   for (DataWindow* data : window.findChildren<DataWindow*>()) {
     QApplication::processEvents();
     data->grab().save(QString("%1/data-%2.png").arg(folder, data->windowTitle()));
@@ -51,9 +56,14 @@ int main(int argc, char** argv) {
   QApplication::setApplicationDisplayName("VaneDeck");
   QApplication::setOrganizationName("VaneDeck");
   QApplication::setApplicationName("vanedeck-shell");
+  QApplication::setApplicationVersion(GRIDBAY_VERSION);
+  // By these a desktop knows the window as that of its entry.
+  QApplication::setDesktopFileName("vanedeck-shell");
+  QApplication::setWindowIcon(QIcon::fromTheme("vanedeck-shell"));
   QCommandLineParser parser;
   parser.setApplicationDescription("Opens setups in their editor.");
   parser.addHelpOption();
+  parser.addVersionOption();
   parser.addOption({"edition", "The editor of new documents: v27 or wsk.", "edition", "v27"});
   parser.addOption({"new", "Begins with a new document where no setup is given."});
   parser.addOption({"screenshots", "Writes a picture of each page to a folder, and ends.", "folder"});
