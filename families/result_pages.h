@@ -3,6 +3,7 @@
 #include <string>
 
 #include "basic/page_texts.h"
+#include "families/page_texts.h"
 #include "families/result_output.h"
 #include "families/result_texts.h"
 #include "pages/cell_grid.h"
@@ -40,7 +41,7 @@ class ResultFileGrid : public ColumnGrid {
 
 // A row for each area: its hot start file. `results` is the member of a room that holds the module's results,
 // with the files in `hotStarts` and the flag `generateHotStart`.
-template <auto results, const FileKind& kind = texts::hotStartResultFile>
+template <auto results, const FileKind& kind = texts::hotStartFile>
 class ResultHotStartGrid final : public ResultFileGrid {
   using Room = decltype(result_pages_detail::roomOf(results));
 

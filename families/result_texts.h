@@ -25,8 +25,6 @@ inline constexpr FileKind lineResultFile{
     "tsb1", "Profile (*.tsb1)|*.tsb1|Profile (*.tb1)|*.tb1|All Files (*.*)|*.*||"};
 inline constexpr FileKind mapResultFile{
     "tsb2", "Result files(*.tsb2)|*.tsb2|Result files (*.tb2)|*.tb2|All Files (*.*)|*.*||"};
-inline constexpr FileKind hotStartResultFile{
-    "tsb2", "HotStart files (*.tsb2;*.tb2)|*.tsb2; *.tb2|All Files (*.*)|*.*||"};
 
 // The choice of points.
 inline constexpr Text pointSelection{"Point Selection"};

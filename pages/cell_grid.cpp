@@ -8,6 +8,19 @@
 #include "pages/scan.h"
 
 namespace gridbay {
+namespace {
+
+// The look of a button in a column of files: a row that has no file has no button.
+auto blankWithout(const FileChoice& file) {
+  return [file](GridRow row, CellStyle& style) {
+    if (file.file(row).name != nullptr) return;
+    style.kind = CellKind::label;
+    style.value.clear();
+    style.enabled = false;
+  };
+}
+
+}  // namespace
 
 const std::vector<std::deque<Column>>& CellGrid::lines() {
   const int key = LayoutKey();
@@ -213,13 +226,15 @@ Column& CellGrid::FileName(std::string_view header, int width, const FileChoice&
 }
 
 Column& CellGrid::Browse(std::string_view face, int width, const FileChoice& file) {
-  return Button(face, width, [this, file](GridRow row) {
+  const auto choose = [this, file](GridRow row) {
     if (file.choose(row, document())) UpdateDoc();
-  });
+  };
+  return Button(face, width, choose).Look(blankWithout(file));
 }
 
 Column& CellGrid::View(std::string_view face, int width, const FileChoice& file, Column::Rule enabled) {
   return Button(face, width, [this, file](GridRow row) { file.view(row, document()); })
+      .Look(blankWithout(file))
       .EnabledIf([file, enabled = std::move(enabled)](GridRow row) {
         return (!enabled || enabled(row)) && file.canView(row);
       });

@@ -214,6 +214,8 @@ void CellDelegate::setModelData(QWidget* editor, QAbstractItemModel* model, cons
 
 void CellDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
                          const QModelIndex& index) const {
+  // A row without height: styles draw a button that has no room beside it, and what comes after too.
+  if (option.rect.isEmpty()) return;
   const CellStyle cell = gridOf(index).style(index);
   const QPalette& palette = option.palette;
   const bool isHeader = cell.isHeader || cell.isHeading;

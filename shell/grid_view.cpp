@@ -29,6 +29,8 @@ constexpr double kMostGrowth = 1.5;
 constexpr int kSampledRows = 12;
 constexpr int kLongestSample = 32;  // letters
 constexpr int kRowsAtLeast = 5;
+constexpr int kLettersOfText = 40;  // of the least width
+constexpr int kLettersOfNumbers = 60;
 constexpr int kManyRows = 10;
 
 bool hasListEditor(CellKind kind) {
@@ -249,10 +251,11 @@ QSize GridView::sizeHint() const {
 }
 
 QSize GridView::minimumSizeHint() const {
-  constexpr int kLetters = 40;
+  // Text may be cut; what is short and holds none is seen whole.
+  const int letters = hasText_ ? kLettersOfText : kLettersOfNumbers;
   const int rows = std::max(0, shownRows_ - kRowsAtLeast) * rowHeader_->defaultSectionSize();
   const QSize wanted = sizeHint();
-  return {std::min(wanted.width(), kLetters * fontMetrics().averageCharWidth()),
+  return {std::min(wanted.width(), letters * fontMetrics().averageCharWidth()),
           std::max(wanted.height() - rows, 0)};
 }
 

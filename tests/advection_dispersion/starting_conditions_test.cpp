@@ -2,21 +2,16 @@
 
 #include <gmock/gmock.h>
 
-#include <filesystem>
-
 #include "advection_dispersion/component.h"
-#include "basic/bathymetry.h"
-#include "basic/simulation_period.h"
 #include "core/edition.h"
 #include "platform/tsb/tsb_writer.h"
-#include "tests/support/grids.h"
-#include "tests/support/model.h"
 #include "tests/support/pages.h"
-#include "tests/support/temporary_folder.h"
+#include "tests/support/starting_conditions.h"
 
 namespace gridbay {
 namespace {
 
+using test::hotSpec;
 using test::Model;
 using test::savedText;
 using ::testing::HasSubstr;
@@ -57,62 +52,25 @@ void writeHotFile(const std::string& path, const HotFileSpec& spec) {
   ASSERT_TRUE(written) << written.error();
 }
 
-// A model of one area, 12 by 10 points.
-class AdStart : public ::testing::Test {
+class AdStart : public test::StartingConditions<CNadStartingConditionsKvs, &CGlobalKvs::nadStartingConditions,
+                                                PageId::adStartingConditions> {
  protected:
-  AdStart() { setArea(1, 12, 10, 100); }
-  void setArea(int number, int noJ, int noK, float spacing) {
-    CBathymetryObjectKvs& area = *model.root.bathymetry->GetArea(number);
-    area.noJ = noJ;
-    area.noK = noK;
-    area.dx = area.dy = spacing;
-  }
-  CNadStartingConditionsKvs& start() { return *model.root.nadStartingConditions; }
-  CNadComponentKvs& components() { return *model.root.nadComponent; }
-  ValidationList messages(int deep = 1) {
-    ValidationList list;
-    const unsigned counted = start().Validate(list, deep);
-    EXPECT_EQ(counted, list.size());
-    for (const CMessage& message : list) EXPECT_EQ(message.page, PageId::adStartingConditions);
-    return list;
-  }
-  Texts faults(int deep = 1) { return test::textsOf(messages(deep)); }
-  // Hot from the file of area 1.
-  void begin() {
-    start().hotStart = true;
-    start().GetItem(1)->file = path;
-  }
   Texts names() {
     Texts all;
-    for (int number = 1; number <= components().GetCount(); ++number)
-      all.push_back(components().at(number).name);
+    for (int number = 1; number <= components.GetCount(); ++number) all.push_back(components.at(number).name);
     return all;
   }
   std::vector<int> types() {
     std::vector<int> all;
-    for (int number = 1; number <= components().GetCount(); ++number)
-      all.push_back(components().at(number).type);
+    for (int number = 1; number <= components.GetCount(); ++number) all.push_back(components.at(number).type);
     return all;
   }
-  std::string notValid(const std::string& name) { return "Data file  \" " + name + "\"  is not valid"; }
 
-  test::TemporaryFolder folder;
-  Model model;
-  std::string path = folder.file("hot.tsb2");
+  CNadComponentKvs& components = *root.nadComponent;
 };
 
-TEST_F(AdStart, ANewOneIsColdAndCoversTheSimulation) {
-  EXPECT_EQ(savedText(start()),
-            "STARTING_CONDITIONS {\n"
-            "    Hot_Start #false\n"
-            "    Start_AD_at_HD_Time_Step 0\n"
-            "    End_AD_at_HD_Time_Step 100\n"
-            "    AREA_1 {\n"
-            "        DATA_FILE {\n"
-            "            File_Name (file)\"\"\n"
-            "        }\n"
-            "    }\n"
-            "}\n");
+TEST_F(AdStart, ANewOneIsColdAndHasNoFault) {
+  EXPECT_FALSE(start.hotStart);
   EXPECT_TRUE(faults().empty());
 }
 
@@ -135,89 +93,69 @@ TEST_F(AdStart, IsReadBackInAHotModel) {
       "}\n";
   model.root.bathymetry->SetNoAreas(2);
   model.root.bathymetry->hotStart = 1;
-  test::load(start(), text);
-  EXPECT_TRUE(start().hotStart);
-  EXPECT_EQ(start().firstStep, 3);
-  EXPECT_EQ(start().lastStep, 77);
-  EXPECT_EQ(savedText(start()), text);
+  test::load(start, text);
+  EXPECT_TRUE(start.hotStart);
+  EXPECT_EQ(start.firstStep, 3);
+  EXPECT_EQ(start.lastStep, 77);
+  EXPECT_EQ(savedText(start), text);
 }
 
 TEST_F(AdStart, InAColdModelAFileLoadsCold) {
-  start().hotStart = true;
-  test::load(start(), "STARTING_CONDITIONS { Hot_Start #true; Start_AD_at_HD_Time_Step 4 }");
-  EXPECT_FALSE(start().hotStart);
-  EXPECT_EQ(start().firstStep, 4);
+  start.hotStart = true;
+  test::load(start, "STARTING_CONDITIONS { Hot_Start #true; Start_AD_at_HD_Time_Step 4 }");
+  EXPECT_FALSE(start.hotStart);
+  EXPECT_EQ(start.firstStep, 4);
   model.root.bathymetry->hotStart = 1;
-  test::load(start(), "STARTING_CONDITIONS { Hot_Start #true }");
-  EXPECT_TRUE(start().hotStart);
-  test::load(start(), "STARTING_CONDITIONS { Start_AD_at_HD_Time_Step 5 }");
-  EXPECT_TRUE(start().hotStart);
-  test::load(start(), "STARTING_CONDITIONS { Hot_Start #false }");
-  EXPECT_FALSE(start().hotStart);
+  test::load(start, "STARTING_CONDITIONS { Hot_Start #true }");
+  EXPECT_TRUE(start.hotStart);
+  test::load(start, "STARTING_CONDITIONS { Start_AD_at_HD_Time_Step 5 }");
+  EXPECT_TRUE(start.hotStart);
+  test::load(start, "STARTING_CONDITIONS { Hot_Start #false }");
+  EXPECT_FALSE(start.hotStart);
 }
 
 TEST_F(AdStart, WhatTheFileLacksStays) {
-  start().GetItem(1)->file = "old.tsb2";
-  start().lastStep = 7;
+  start.GetItem(1)->file = "old.tsb2";
+  start.lastStep = 7;
   model.root.bathymetry->hotStart = 1;
-  start().hotStart = true;
-  test::load(start(), "OTHER {}");
-  EXPECT_TRUE(start().hotStart);
+  start.hotStart = true;
+  test::load(start, "OTHER {}");
+  EXPECT_TRUE(start.hotStart);
   for (const char* text : {"STARTING_CONDITIONS {}", "STARTING_CONDITIONS { AREA_1 {} }",
                            "STARTING_CONDITIONS { AREA_1 { DATA_FILE {} }; AREA_2 { DATA_FILE {} } }"}) {
-    test::load(start(), text);
-    EXPECT_EQ(start().GetItem(1)->file.text(), "old.tsb2") << text;
-    EXPECT_EQ(start().lastStep, 7) << text;
-    EXPECT_EQ(start().GetCount(), 1) << text;
+    test::load(start, text);
+    EXPECT_EQ(start.GetItem(1)->file.text(), "old.tsb2") << text;
+    EXPECT_EQ(start.lastStep, 7) << text;
+    EXPECT_EQ(start.GetCount(), 1) << text;
   }
   EXPECT_TRUE(model.host.texts.empty());
 }
 
 TEST_F(AdStart, FollowsTheAreas) {
-  start().GetItem(1)->file = "a.tsb2";
+  start.GetItem(1)->file = "a.tsb2";
   model.root.bathymetry->SetNoAreas(3);
-  EXPECT_EQ(start().GetCount(), 3);
-  EXPECT_EQ(start().GetItem(1)->file.text(), "a.tsb2");
-  EXPECT_TRUE(start().GetItem(3)->file.empty());
+  EXPECT_EQ(start.GetCount(), 3);
+  EXPECT_EQ(start.GetItem(1)->file.text(), "a.tsb2");
+  EXPECT_TRUE(start.GetItem(3)->file.empty());
   model.root.bathymetry->SetNoAreas(1);
-  EXPECT_EQ(start().GetCount(), 1);
+  EXPECT_EQ(start.GetCount(), 1);
 }
 
 TEST_F(AdStart, TheTimeSteps) {
-  const auto at = [this](int first, int last) {
-    start().firstStep = first;
-    start().lastStep = last;
-    EXPECT_EQ(faults(0), faults(1));
-    for (const CMessage& message : messages()) EXPECT_EQ(message.severity, Severity::fault);
-    return faults();
-  };
-  const std::string negative = "First time step can not be negative";
-  const std::string greater = "The first time step is greater than the last";
-  const std::string outside = "Last timestep out of range";
-  EXPECT_THAT(at(0, 100), IsEmpty());
-  EXPECT_THAT(at(100, 100), IsEmpty());
-  EXPECT_EQ(at(-1, 100), Texts{negative});
-  EXPECT_EQ(at(51, 50), Texts{greater});
-  EXPECT_EQ(at(0, 101), Texts{outside});
-  EXPECT_EQ(at(200, 101), (Texts{greater, outside}));
-  EXPECT_EQ(at(-1, -2), (Texts{negative, greater}));
-  EXPECT_EQ(at(0, 2147483647), Texts{outside});
-  model.root.simulationPeriod->noPointsInTime = 51;
-  EXPECT_EQ(at(0, 100), Texts{outside});
-  EXPECT_THAT(at(0, 50), IsEmpty());
+  checkTimeSteps();
 }
 
 TEST_F(AdStart, AColdStartAsksForNoFile) {
-  start().GetItem(1)->file = "none.tsb2";
+  start.GetItem(1)->file = "none.tsb2";
   EXPECT_TRUE(faults().empty());
-  start().hotStart = true;
+  start.hotStart = true;
   EXPECT_TRUE(faults(0).empty());
   EXPECT_EQ(faults(), Texts{notValid("none.tsb2")});
 }
 
 TEST_F(AdStart, TheFileOfArea1TellsTheComponents) {
   begin();
-  components().at(1).type = -2;
+  components.at(1).type = -2;
   writeHotFile(path, {});
   EXPECT_THAT(faults(), IsEmpty());
   EXPECT_EQ(names(), (Texts{"Salt", "Coli", "Heat"}));
@@ -238,8 +176,8 @@ TEST_F(AdStart, TheFirstTimeStepAloneIsRead) {
 
 TEST_F(AdStart, ACellThatIsNoTypeLeavesTheTypeAsItWas) {
   begin();
-  components().SetCount(2);
-  components().at(2).type = -2;
+  components.SetCount(2);
+  components.at(2).type = -2;
   writeHotFile(path, {.types = {0, 3, 2}});
   const ValidationList told = messages();
   EXPECT_EQ(told, (ValidationList{{PageId::adStartingConditions,
@@ -279,42 +217,18 @@ TEST_F(AdStart, FewerCellsThanComponents) {
   writeHotFile(path, spec);
   EXPECT_EQ(faults(), (Texts{"Component 9 in file " + path + " is not a valid type",
                              "Component 10 in file " + path + " is not a valid type"}));
-  EXPECT_EQ(components().GetCount(), 10);
+  EXPECT_EQ(components.GetCount(), 10);
 }
 
 TEST_F(AdStart, ABadFileLeavesTheListUntouched) {
+  components.at(1).name = "Mine";
+  test::GridSpec good = hotSpec({});
+  good.items = 3;
+  checkBadFiles(good, [this](const std::string& why) { EXPECT_EQ(names(), Texts{"Mine"}) << why; });
   begin();
-  components().at(1).name = "Mine";
-  const auto refused = [this](const std::string& file, const char* why) {
-    start().GetItem(1)->file = file;
-    EXPECT_EQ(messages(),
-              (ValidationList{{PageId::adStartingConditions, notValid(file), Severity::dependedUpon}}))
-        << why;
-    EXPECT_EQ(names(), Texts{"Mine"}) << why;
-  };
-  refused("", "no name");
-  refused(folder.file("none.tsb2"), "not there");
-  refused(folder.path().string(), "a folder");
-  refused(folder.write("text.tsb2", "no data file"), "of another kind");
-  refused(folder.write("empty.tsb2", ""), "empty");
-  const auto written = [&](const HotFileSpec& spec, const char* why) {
-    writeHotFile(path, spec);
-    refused(path, why);
-  };
-  written({.names = {"Salt"}, .hasTypeItem = false}, "a single item");
-  written({.noJ = 11}, "another extent");
-  written({.noK = 11}, "another extent");
-  written({.spacing = 50}, "another spacing");
-  written({.dataType = 0}, "another data type");
-  written({.dataType = 11}, "another data type");
-  writeHotFile(path, {});
-  const auto size = std::filesystem::file_size(path);
-  for (const auto left : {size - 1, size / 2, size / 10, std::uintmax_t{8}}) {
-    std::filesystem::resize_file(path, left);
-    refused(path, "cut short");
-  }
-  test::writeSeries(path, {}, 100201, "mg l-1", 3);
-  refused(path, "a time series");
+  writeHotFile(path, {.names = {"Salt"}, .hasTypeItem = false});
+  EXPECT_EQ(messages(), refusal(path)) << "a single item";
+  EXPECT_EQ(names(), Texts{"Mine"});
 }
 
 TEST_F(AdStart, OtherAreasMustHaveWhatArea1Tells) {
@@ -322,7 +236,7 @@ TEST_F(AdStart, OtherAreasMustHaveWhatArea1Tells) {
   setArea(2, 7, 7, 50);
   begin();
   const std::string second = folder.file("second.tsb2");
-  start().GetItem(2)->file = second;
+  start.GetItem(2)->file = second;
   writeHotFile(path, {});
   const HotFileSpec inner{.noJ = 7, .noK = 7, .spacing = 50};
   writeHotFile(second, inner);
@@ -341,16 +255,16 @@ TEST_F(AdStart, OtherAreasMustHaveWhatArea1Tells) {
   EXPECT_EQ(names(), (Texts{"Salt", "Coli", "Heat"}));  // of area 1 alone
   EXPECT_EQ(types(), (std::vector{0, 1, 2}));
 
-  start().GetItem(1)->file = "none.tsb2";
+  start.GetItem(1)->file = "none.tsb2";
   EXPECT_EQ(faults(), Texts{notValid("none.tsb2")});
 }
 
 TEST_F(AdStart, HotFilesComeBehindTheTimeStepsAndInAreaOrder) {
   model.root.bathymetry->SetNoAreas(2);
-  start().hotStart = true;
-  start().GetItem(1)->file = "hot1.tsb2";
-  start().firstStep = -5;
-  start().lastStep = -9;
+  start.hotStart = true;
+  start.GetItem(1)->file = "hot1.tsb2";
+  start.firstStep = -5;
+  start.lastStep = -9;
   EXPECT_EQ(faults(),
             (Texts{"First time step can not be negative", "The first time step is greater than the last",
                    notValid("hot1.tsb2"), notValid("")}));
@@ -368,7 +282,7 @@ TEST_F(AdStart, TheCheckOfTheModelSetsTheComponentsBeforeTheyAreChecked) {
   model.root.moduleSelection->simulationType = module::kAdvectionDispersion;
   test::writeGrid(folder.file("a.tsb2"), {.noJ = 12, .noK = 10, .dx = 100, .dy = 100});
   model.root.bathymetry->GetArea(1)->fileName = folder.file("a.tsb2");
-  components().SetCount(17);
+  components.SetCount(17);
   begin();
   writeHotFile(path, {});
   const Texts told = test::textsOf(test::messagesOf(model.root));
@@ -377,12 +291,12 @@ TEST_F(AdStart, TheCheckOfTheModelSetsTheComponentsBeforeTheyAreChecked) {
 }
 
 TEST_F(AdStart, CopyingTakesFlagStepsAndFiles) {
-  start().hotStart = true;
-  start().firstStep = 3;
-  start().GetItem(1)->file = "/x/y.tsb2";
+  start.hotStart = true;
+  start.firstStep = 3;
+  start.GetItem(1)->file = "/x/y.tsb2";
   Model other;
-  other.root.nadStartingConditions->CopyFrom(start());
-  EXPECT_EQ(savedText(*other.root.nadStartingConditions), savedText(start()));
+  other.root.nadStartingConditions->CopyFrom(start);
+  EXPECT_EQ(savedText(*other.root.nadStartingConditions), savedText(start));
 }
 
 // What the check changes is announced, and can be taken back.

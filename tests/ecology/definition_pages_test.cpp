@@ -107,7 +107,7 @@ TEST_F(WqsDefinitionPages, ChoosingAModelReadsIt) {
   document.Touch(PageId::bathymetry);
   openDefinition();
   choose("Model", 0);
-  EXPECT_EQ(host.titles.size(), 1U);  // read once
+  EXPECT_EQ(host.titles, Labels{"Reading the ecological model"});  // once
   EXPECT_EQ(control("Model").index, 0);
   EXPECT_EQ(text("File"), (templates / "a.biorig").string());
   EXPECT_FALSE(control("File").usable());

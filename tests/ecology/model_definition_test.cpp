@@ -213,8 +213,12 @@ TEST_F(DefinitionFile, BadFilesSayWhereTheyAreBad) {
   EXPECT_THAT(read("BIO_RIG_SETUP {\n ID = }\n").fault, HasSubstr("line 2"));
   EXPECT_THAT(read("BIO_RIG_SETUP { DESCRIPTION \"\xff\xfe\" }").fault, HasSubstr("m.biorig"));
   EXPECT_THAT(read(std::string_view("B\0I\0O\0", 6)).fault, HasSubstr("m.biorig"));
-  EXPECT_THAT(read("OTHER { }").fault, HasSubstr("has no BIO_RIG_SETUP"));
-  EXPECT_THAT(read("").fault, HasSubstr("has no BIO_RIG_SETUP"));
+  const std::string noTarget =
+      "\"" + folder.file("m.biorig") +
+      "\" is not a model definition: it has no BIO_RIG_SETUP. Choose the .biorig file "
+      "of an ecological model";
+  EXPECT_EQ(read("OTHER { }").fault, noTarget);
+  EXPECT_EQ(read("").fault, noTarget);
   std::string deep = "BIO_RIG_SETUP ";
   for (int level = 0; level < 100'000; ++level) deep += "{ a ";
   EXPECT_NE(read(deep).fault, "");
@@ -234,7 +238,9 @@ TEST_F(DefinitionFile, AFileThatMayNotBeRead) {
 TEST_F(DefinitionFile, TooLargeAFileIsNotRead) {
   const std::string path = folder.write("m.biorig", "BIO_RIG_SETUP { }");
   std::filesystem::resize_file(path, ModelDefinition::kMostBytes + 1);  // a hole takes no room
-  EXPECT_THAT(readModelDefinition(path)->fault, HasSubstr("larger than 64 MB"));
+  EXPECT_EQ(
+      readModelDefinition(path)->fault,
+      "The model definition \"" + path + "\" is not read: it is larger than 64 MB, which no model needs");
 }
 
 TEST_F(DefinitionFile, TooManyDeclarationsAreNone) {
@@ -243,7 +249,9 @@ TEST_F(DefinitionFile, TooManyDeclarationsAreNone) {
   EXPECT_EQ(read(text + "}}").fault, "");
   EXPECT_EQ(held->items[CSolverItem::kConstant].size(),
             static_cast<std::size_t>(ModelDefinition::kMostDeclarations));
-  EXPECT_THAT(read(text + "}; FORCINGS { FORCING_1 {} } }").fault, HasSubstr("more than 200000"));
+  EXPECT_EQ(read(text + "}; FORCINGS { FORCING_1 {} } }").fault,
+            "The model definition \"" + folder.file("m.biorig") +
+                "\" is not read: it declares more than 200000 items, which no model needs");
   EXPECT_TRUE(held->IsEmpty());
 }
 
@@ -334,7 +342,11 @@ TEST_F(DefinitionFile, AModelThatIsGoneLeavesAllListsEmptyAndSaysSo) {
   test::load(*root.wqsModelDefinition, "MODEL_DEFINITION { Model_Definition_File (file)\"none.biorig\" }",
              folder.file("s.v27"));
   ASSERT_EQ(model.host.texts.size(), 1U);
-  EXPECT_THAT(model.host.texts[0], HasSubstr("none.biorig"));
+  EXPECT_THAT(
+      model.host.texts[0],
+      AllOf(HasSubstr("none.biorig"),
+            HasSubstr("\nThe ecological model has no state variables, constants and forcings until its "
+                      "file is read, and a save leaves out their values.")));
   test::load(*root.wqsConstants, "CONSTANTS { No_Of_Constants 1; CONSTANT_1 { Value 3.0 } }");
   EXPECT_EQ(savedText(*root.wqsConstants), "CONSTANTS {\n    No_Of_Constants 0\n}\n");
   const ValidationList messages = test::messagesOf(*root.wqsModelDefinition);

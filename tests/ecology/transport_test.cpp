@@ -341,30 +341,6 @@ TEST_F(WqsTransport, ByPath) {
 }
 
 TEST_F(WqsTransport, DispersionInFileOrder) {
-  EXPECT_EQ(savedText(*root.wqsAdDispersion),
-            "AD_DISPERSION {\n"
-            "    Dispersion_Prop_to_Current 0\n"
-            "    Proportionality_Factor_Xdir 1.0\n"
-            "    Proportionality_Factor_Ydir 1.0\n"
-            "    Min_Dispersion_Coefficient 0.0\n"
-            "    Max_Dispersion_Coefficient 0.0\n"
-            "    X_DIRECTION_COEFFICIENTS {\n"
-            "        Data_Format 0\n"
-            "        Constant_Value 0.0\n"
-            "        AREA_1 {\n"
-            "            File_Name (file)\"\"\n"
-            "            Item_Numbers 1\n"
-            "        }\n"
-            "    }\n"
-            "    Y_DIRECTION_COEFFICIENTS {\n"
-            "        Data_Format 0\n"
-            "        Constant_Value 0.0\n"
-            "        AREA_1 {\n"
-            "            File_Name (file)\"\"\n"
-            "            Item_Numbers 1\n"
-            "        }\n"
-            "    }\n"
-            "}\n");
   CWQSADDispersionKvs& coefs = *root.wqsAdDispersion;
   coefs.factorX = 1.0 / 3;  // held in full
   coefs.filesY.at(1).file.items = {3};

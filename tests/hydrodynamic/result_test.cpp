@@ -381,8 +381,10 @@ TEST_F(SavedResult, ASaveThatCannotBeMadeLeavesTheFileWhole) {
   EXPECT_FALSE(document.OnSaveDocument(path));
   EXPECT_EQ(test::textOf(path), text);
   ASSERT_EQ(host.texts.size(), 1U);
-  EXPECT_THAT(host.texts[0], HasSubstr("The setup cannot be written: Saturation is the last item of the "
-                                       "output \"wet.tsb2\""));
+  EXPECT_EQ(
+      host.texts[0],
+      "The setup cannot be written: Saturation is the last item of the output \"wet.tsb2\", and there is "
+      "no infiltration: such a list can't be saved. Without the item it can.");
   EXPECT_TRUE(document.IsModified());
   EXPECT_EQ(document.UndoStep()->name, "Save");  // without the item, as the model is now
   ASSERT_TRUE(document.OnSaveDocument(path));

@@ -3,87 +3,44 @@
 #include <gmock/gmock.h>
 
 #include <cmath>
-#include <filesystem>
 #include <limits>
 
-#include "basic/bathymetry.h"
-#include "basic/simulation_period.h"
 #include "mud_transport/boundary.h"
 #include "mud_transport/initial_concentration.h"
 #include "mud_transport/result.h"
 #include "mud_transport/task_selection.h"
-#include "tests/support/grids.h"
-#include "tests/support/model.h"
 #include "tests/support/pages.h"
-#include "tests/support/temporary_folder.h"
+#include "tests/support/starting_conditions.h"
 
 namespace gridbay {
 namespace {
 
+using test::hotSpec;
 using test::Model;
 using test::savedText;
 using Texts = std::vector<std::string>;
 using Floats = std::vector<float>;
 
-// A hot start file of 12 by 10 points with the module's block.
-test::GridSpec hotSpec(const Floats& block) {
-  return {
-      .noJ = 12, .noK = 10, .dx = 100, .dy = 100, .land = {}, .dataType = 2, .blocks = {{"V27_Misc", block}}};
+// The module's block in a hot start file.
+std::vector<TsbCustomBlock> blockOf(const Floats& values) {
+  return {{"V27_Misc", values}};
 }
 
-class MudStart : public ::testing::Test {
+class MudStart
+    : public test::StartingConditions<CNmtStartingConditionsKvs, &CGlobalKvs::nmtStartingConditions,
+                                      PageId::mtStartingConditions> {
  protected:
-  MudStart() { setArea(1, 12, 10, 100); }
-  void setArea(int number, int noJ, int noK, float spacing) {
-    CBathymetryObjectKvs& area = *model.root.bathymetry->GetArea(number);
-    area.noJ = noJ;
-    area.noK = noK;
-    area.dx = area.dy = spacing;
-  }
-  ValidationList messages(int deep = 1) {
-    ValidationList list;
-    const unsigned counted = start.Validate(list, deep);
-    EXPECT_EQ(counted, list.size());
-    for (const CMessage& message : list) EXPECT_EQ(message.page, PageId::mtStartingConditions);
-    return list;
-  }
-  Texts faults(int deep = 1) { return test::textsOf(messages(deep)); }
-  // Hot from the file of area 1.
-  void begin() {
-    start.hotStart = true;
-    start.GetItem(1)->file = path;
-  }
-  Texts notValid(const std::string& name) { return {"Data file  \"" + (" " + name) + "\"  is not valid"}; }
   std::string state() const {
     return std::string(task.multiFraction ? "fractions " : "layers ") + std::to_string(task.fractions) + " " +
            std::to_string(task.layers) + (task.includeSalinity ? " salt " : " ") +
-           std::to_string(model.root.nmtResult->netSedimentationInMm);
+           std::to_string(root.nmtResult->netSedimentationInMm);
   }
 
-  test::TemporaryFolder folder;
-  Model model;
-  CNmtStartingConditionsKvs& start = *model.root.nmtStartingConditions;
-  CNmtTaskSelectionKvs& task = *model.root.nmtTaskSelection;
-  std::string path = folder.file("hot.tsb2");
+  CNmtTaskSelectionKvs& task = *root.nmtTaskSelection;
 };
 
-TEST_F(MudStart, ANewOneIsColdAndCoversTheSimulation) {
-  EXPECT_EQ(savedText(start),
-            "STARTING_CONDITIONS {\n"
-            "    Hot_Start #false\n"
-            "    Start_MT_at_HD_Time_Step 0\n"
-            "    End_MT_at_HD_Time_Step 100\n"
-            "    Integration_period_start 0\n"
-            "    Integration_period_end 100\n"
-            "    AREA_1 {\n"
-            "        DATA_FILE {\n"
-            "            File_Name (file)\"\"\n"
-            "        }\n"
-            "    }\n"
-            "}\n"
-            "CALCULATION_METHOD {\n"
-            "    Max_rel_decrease_in_conc_pr_step 0.1\n"
-            "}\n");
+TEST_F(MudStart, ANewOneIsColdAndHasNoFault) {
+  EXPECT_FALSE(start.hotStart);
   EXPECT_TRUE(faults().empty());
 }
 
@@ -149,28 +106,15 @@ TEST_F(MudStart, AnIntegrationPeriodAtTheMethodOverrides) {
 }
 
 TEST_F(MudStart, TheTimeSteps) {
-  const auto at = [this](int first, int last) {
-    start.firstStep = first;
-    start.lastStep = last;
-    EXPECT_EQ(faults(0), faults(1));
-    return faults();
-  };
-  const std::string negative = "First time step can not be negative";
-  const std::string greater = "The first time step is greater than the last";
-  const std::string outside = "Last timestep out of range";
-  EXPECT_EQ(at(0, 100), Texts{});
-  EXPECT_EQ(at(-1, 100), Texts{negative});
-  EXPECT_EQ(at(51, 50), Texts{greater});
-  EXPECT_EQ(at(200, 101), (Texts{greater, outside}));
-  start.integrationStart = -7;
+  start.integrationStart = -7;  // not tested
   start.integrationEnd = -9;
-  EXPECT_EQ(at(0, 100), Texts{});
+  checkTimeSteps();
 }
 
 TEST_F(MudStart, TheFileOfArea1TellsTheTask) {
   begin();
   const auto read = [this](const Floats& block) {
-    test::writeGrid(path, hotSpec(block));
+    test::writeGrid(path, hotSpec(blockOf(block)));
     EXPECT_EQ(faults(), Texts{});
     return state();
   };
@@ -211,41 +155,17 @@ TEST_F(MudStart, ABlockThatMakesNoSenseChangesNothing) {
         Floats{0, 1, 0, large, 2}, Floats{1, 1, 0, 2, large}, Floats{0, 1, 0, 257, 2},
         Floats{0, 1, 0, nan, 2}, Floats{1, 1, 0, 2, infinity}, Floats{0, 1, 0, 3e38F, 2},
         Floats{nan, 1, 0, 2, 2}, Floats{0, nan, 0, 2, 2}, Floats{0, 1, infinity, 2, 2}}) {
-    test::writeGrid(path, hotSpec(block));
+    test::writeGrid(path, hotSpec(blockOf(block)));
     EXPECT_EQ(messages(),
-              (ValidationList{{PageId::mtStartingConditions, notValid(path)[0], Severity::dependedUpon}}))
+              (ValidationList{{PageId::mtStartingConditions, notValid(path), Severity::dependedUpon}}))
         << ::testing::PrintToString(block);
     EXPECT_EQ(state(), "fractions 3 1 1");
   }
 }
 
 TEST_F(MudStart, ABadFileLeavesTheTask) {
-  begin();
-  const auto refused = [this](const std::string& file) {
-    start.GetItem(1)->file = file;
-    EXPECT_EQ(messages(),
-              (ValidationList{{PageId::mtStartingConditions, notValid(file)[0], Severity::dependedUpon}}));
-    EXPECT_EQ(state(), "fractions 3 1 1") << file;
-  };
-  refused("");
-  refused(folder.file("none.tsb2"));
-  refused(folder.path().string());
-  refused(folder.write("text.tsb2", "no data file"));
-  const Floats block{1, 1, 0, 0, 4};
-  for (const auto& change : std::vector<std::function<void(test::GridSpec&)>>{
-           [](auto& spec) { spec.noJ = 11; }, [](auto& spec) { spec.noK = 11; },
-           [](auto& spec) { spec.dx = 50; }, [](auto& spec) { spec.dataType = 0; }}) {
-    test::GridSpec spec = hotSpec(block);
-    change(spec);
-    test::writeGrid(path, spec);
-    refused(path);
-  }
-  test::writeGrid(path, hotSpec(block));
-  const auto size = std::filesystem::file_size(path);
-  for (const auto left : {size - 1, size / 2, std::uintmax_t{8}}) {
-    std::filesystem::resize_file(path, left);
-    refused(path);
-  }
+  checkBadFiles(hotSpec(blockOf({1, 1, 0, 0, 4})),
+                [this](const std::string& why) { EXPECT_EQ(state(), "fractions 3 1 1") << why; });
 }
 
 TEST_F(MudStart, OtherAreasAreCheckedAndTellNothing) {
@@ -254,9 +174,9 @@ TEST_F(MudStart, OtherAreasAreCheckedAndTellNothing) {
   begin();
   const std::string second = folder.file("second.tsb2");
   start.GetItem(2)->file = second;
-  test::writeGrid(path, hotSpec({1, 0, 0, 0, 4}));
-  EXPECT_EQ(faults(), notValid(second));
-  test::GridSpec inner = hotSpec({0, 1, 1, 8, 8});
+  test::writeGrid(path, hotSpec(blockOf({1, 0, 0, 0, 4})));
+  EXPECT_EQ(faults(), Texts{notValid(second)});
+  test::GridSpec inner = hotSpec(blockOf({0, 1, 1, 8, 8}));
   inner.noJ = inner.noK = 7;
   inner.dx = inner.dy = 50;
   inner.items = 5;  // how many is not asked
@@ -265,7 +185,7 @@ TEST_F(MudStart, OtherAreasAreCheckedAndTellNothing) {
   EXPECT_EQ(state(), "layers 1 4 0");
   start.GetItem(1)->file = "h.tsb2";
   start.firstStep = -5;
-  EXPECT_EQ(faults(), (Texts{"First time step can not be negative", notValid("h.tsb2")[0]}));
+  EXPECT_EQ(faults(), (Texts{"First time step can not be negative", notValid("h.tsb2")}));
   start.hotStart = false;
   EXPECT_EQ(faults(), Texts{"First time step can not be negative"});
   start.hotStart = true;
@@ -280,7 +200,7 @@ class MudHotStartInADocument : public test::PageTest {
 
 TEST_F(MudHotStartInADocument, TheNewTaskIsAStepOfItsOwn) {
   const std::string path = folder.file("hot.tsb2");
-  test::writeGrid(path, hotSpec({1, 1, 0, 0, 4}));
+  test::writeGrid(path, hotSpec(blockOf({1, 1, 0, 0, 4})));
   root().moduleSelection->simulationType = module::kMudTransport;
   root().bathymetry->GetArea(1)->noJ = 12;
   root().bathymetry->GetArea(1)->noK = 10;

@@ -533,20 +533,6 @@ class MudResult : public MudWater {
 };
 
 TEST_F(MudResult, InFileOrder) {
-  EXPECT_EQ(savedText(results),
-            "OUTPUT_SPECIFICATION {\n"
-            "    Number_Of_Output_areas 0\n"
-            "    Include_Layers_In_Output_File 1\n"
-            "    NetSedimentation_in_mm 1\n"
-            "    NetSedimentation_in_gm2 0\n"
-            "    Generate_Hotstart #false\n"
-            "    HOTSTART_FILES {\n"
-            "        AREA_1 {\n"
-            "            Title \"\"\n"
-            "            File_Name (result)\"\"\n"
-            "        }\n"
-            "    }\n"
-            "}\n");
   results.outputs.SetCount(1);
   results.outputs.at(1).title = "bay";
   results.outputs.at(1).file.Set("bay.tsb2", "/case/setup.v27");

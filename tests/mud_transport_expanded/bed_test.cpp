@@ -601,7 +601,13 @@ TEST_F(ExpandedDredging, FewerThanFourItemsAreNone) {
   dredgers.at(1).RequestDataFile(selector, 1);
   EXPECT_EQ(dredgers.at(1).file.items, all);
   std::vector<int> types;
-  for (const auto& request : selector.requests()) types.push_back(request->types().front());
+  Texts labels;
+  for (const auto& request : selector.requests()) {
+    types.push_back(request->types().front());
+    labels.push_back(request->description());
+  }
+  EXPECT_EQ(labels, (Texts{"X coordinate of dredger", "Y coordinate of dredger", "Dredged mass rate",
+                           "Dredging spill"}));
   EXPECT_EQ(types, (std::vector<int>{100183, 100183, 100504, 100505}));
 }
 

@@ -110,30 +110,6 @@ TEST_F(ExpandedConcentrations, AFileHasAnItemForEachFraction) {
 }
 
 TEST_F(ExpandedConcentrations, Dispersion) {
-  EXPECT_EQ(savedText(*root.nmtExpDispersionCoef),
-            "DISPERSION_CONDITIONS {\n"
-            "    Dispersion_Prop_to_Current 0\n"
-            "    Proportionality_Factor_Xdir 1.0\n"
-            "    Proportionality_Factor_Ydir 1.0\n"
-            "    Min_Dispersion_Coefficient 0.0\n"
-            "    Max_Dispersion_Coefficient 0.0\n"
-            "    X_DIRECTION_COEFFICIENTS {\n"
-            "        Data_Format 0\n"
-            "        Constant_Value 0.0\n"
-            "        AREA_1 {\n"
-            "            File_Name (file)\"\"\n"
-            "            Item_Numbers 1\n"
-            "        }\n"
-            "    }\n"
-            "    Y_DIRECTION_COEFFICIENTS {\n"
-            "        Data_Format 0\n"
-            "        Constant_Value 0.0\n"
-            "        AREA_1 {\n"
-            "            File_Name (file)\"\"\n"
-            "            Item_Numbers 1\n"
-            "        }\n"
-            "    }\n"
-            "}\n");
   root.bathymetry->SetNoAreas(2);
   CNmtExpDispersionCoefKvs& coefs = *root.nmtExpDispersionCoef;
   EXPECT_EQ(coefs.filesY.GetCount(), 2);

@@ -43,35 +43,6 @@ class ExpandedInitial : public ::testing::Test {
   const std::string invalid = "Data file  \" " + path + "\"  is not valid";
 };
 
-TEST_F(ExpandedInitial, OfANewModel) {
-  EXPECT_EQ(savedText(initial),
-            "INITIAL_CONCENTRATIONS {\n"
-            "    SEDIMENT_FRACTION_1 {\n"
-            "        AREA_1 {\n"
-            "            Data_Format 0\n"
-            "            Constant_Value 0.0\n"
-            "            File_Name (file)\"\"\n"
-            "            Item_Numbers 1\n"
-            "        }\n"
-            "    }\n"
-            "}\n"
-            "INITIAL_BED_THICKNESS {\n"
-            "    BED_LAYER_1 {\n"
-            "        Data_Format 0\n"
-            "        Constant_Value 0.0\n"
-            "        AREA_1 {\n"
-            "            File_Name (file)\"\"\n"
-            "            Item_Numbers 1\n"
-            "        }\n"
-            "    }\n"
-            "}\n"
-            "INITIAL_BED_SEDIMENT_DISTRIBUTION {\n"
-            "    BED_LAYER_1 {\n"
-            "        Fraction_Distribution 100\n"
-            "    }\n"
-            "}\n");
-}
-
 TEST_F(ExpandedInitial, AFilledOneHasSalinityLastAndTheThicknessOnce) {
   root.bathymetry->SetNoAreas(2);
   root.nmtExpTaskSelection->SetCounts(2, 2, true);

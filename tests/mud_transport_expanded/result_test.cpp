@@ -56,23 +56,6 @@ class ExpandedResult : public ::testing::Test {
   CNmtExpTaskSelectionKvs& task = *root.nmtExpTaskSelection;
 };
 
-TEST_F(ExpandedResult, OfANewModel) {
-  EXPECT_EQ(savedText(results),
-            "OUTPUT_SPECIFICATION {\n"
-            "    Number_Of_Output_areas 0\n"
-            "    Generate_Hotstart #false\n"
-            "    HOTSTART_FILES {\n"
-            "        AREA_1 {\n"
-            "            Title \"\"\n"
-            "            File_Name (result)\"\"\n"
-            "        }\n"
-            "    }\n"
-            "}\n");
-  EXPECT_EQ(savedText(*root.nmtExpLineDischarge),
-            "MT_LINE_DISCHARGE_CALCULATIONS {\n    No_Of_MT_Discharge_Lines 0\n}\n");
-  EXPECT_EQ(savedText(*root.nmtExpMassBudget), "MASS_BUDGET {\n    NoOfMassFiles 0\n}\n");
-}
-
 TEST_F(ExpandedResult, AnOutputInFileOrder) {
   task.SetCounts(2, 1, true);
   root.nmtExpForcings->includeWaves = 1;

@@ -2,82 +2,35 @@
 
 #include <gmock/gmock.h>
 
-#include <filesystem>
 #include <limits>
 
-#include "basic/bathymetry.h"
 #include "mud_transport_expanded/initial_conditions.h"
 #include "mud_transport_expanded/task_selection.h"
-#include "tests/support/grids.h"
-#include "tests/support/model.h"
-#include "tests/support/temporary_folder.h"
+#include "tests/support/starting_conditions.h"
 
 namespace gridbay {
 namespace {
 
+using test::hotSpec;
 using test::savedText;
 using ::testing::IsEmpty;
 using Texts = std::vector<std::string>;
 
-// A model of one area, 12 by 10 points, with two fractions over three layers.
-class ExpandedStart : public ::testing::Test {
+// With two fractions over three layers.
+class ExpandedStart
+    : public test::StartingConditions<CNmtExpStartingConditionsKvs, &CGlobalKvs::nmtExpStartingConditions,
+                                      PageId::mtExpStartingConditions> {
  protected:
-  ExpandedStart() {
-    setArea(1, 12, 10, 100);
-    task.SetCounts(3, 2, false);
-  }
-  void setArea(int number, int noJ, int noK, float spacing) {
-    CBathymetryObjectKvs& area = *root.bathymetry->GetArea(number);
-    area.noJ = noJ;
-    area.noK = noK;
-    area.dx = area.dy = spacing;
-  }
-  // A hot start file of area 1 with such blocks.
-  static test::GridSpec fileWith(std::vector<TsbCustomBlock> blocks) {
-    return {.noJ = 12,
-            .noK = 10,
-            .dx = 100,
-            .dy = 100,
-            .land = {},
-            .itemType = 100403,
-            .dataType = 2,
-            .unit = "kg m-3",
-            .blocks = std::move(blocks)};
-  }
+  ExpandedStart() { task.SetCounts(3, 2, false); }
   void begin(std::vector<TsbCustomBlock> blocks) {
-    test::writeGrid(path, fileWith(std::move(blocks)));
-    start.hotStart = true;
-    start.at(1).file = path;
+    test::writeGrid(path, hotSpec(std::move(blocks)));
+    StartingConditions::begin();
   }
-  ValidationList messages(int deep = 1) { return test::messagesOf(start, deep); }
-  Texts faults() { return test::textsOf(messages()); }
   std::vector<int> counts() const { return {task.layers, task.fractions, task.includeSalinity ? 1 : 0}; }
   using Counts = std::vector<int>;
 
-  test::TemporaryFolder folder;
-  test::Model model;
-  CGlobalKvs& root = model.root;
-  CNmtExpStartingConditionsKvs& start = *root.nmtExpStartingConditions;
   CNmtExpTaskSelectionKvs& task = *root.nmtExpTaskSelection;
-  std::string path = folder.file("hot.tsb2");
-  const std::string invalid = "Data file  \" " + path + "\"  is not valid";
 };
-
-TEST_F(ExpandedStart, ANewOneIsColdAndCoversTheSimulation) {
-  EXPECT_EQ(savedText(start),
-            "STARTING_CONDITIONS {\n"
-            "    Hot_Start #false\n"
-            "    Start_MT_at_HD_Time_Step 0\n"
-            "    End_MT_at_HD_Time_Step 100\n"
-            "    Integration_period_start 0\n"
-            "    Integration_period_end 100\n"
-            "    AREA_1 {\n"
-            "        DATA_FILE {\n"
-            "            File_Name (file)\"\"\n"
-            "        }\n"
-            "    }\n"
-            "}\n");
-}
 
 TEST_F(ExpandedStart, AFilledOneComesBack) {
   root.bathymetry->SetNoAreas(2);
@@ -127,16 +80,9 @@ TEST_F(ExpandedStart, TheSectionBesideHasTheLastWordOnTheIntegration) {
   EXPECT_EQ(start.integrationEnd, 8);
 }
 
-TEST_F(ExpandedStart, TimeStepsOutsideOfTheSimulation) {
-  start.firstStep = -1;
-  start.lastStep = -2;
-  EXPECT_EQ(faults(),
-            (Texts{"First time step can not be negative", "The first time step is greater than the last"}));
-  start.firstStep = 0;
-  start.lastStep = 101;
+TEST_F(ExpandedStart, TheTimeSteps) {
   start.integrationEnd = 900;  // not tested
-  const ValidationList list = messages(0);
-  EXPECT_EQ(list, (ValidationList{{PageId::mtExpStartingConditions, "Last timestep out of range"}}));
+  checkTimeSteps();
 }
 
 TEST_F(ExpandedStart, TheFileOfArea1BringsTheCounts) {
@@ -185,40 +131,24 @@ TEST_F(ExpandedStart, ABlockThatCannotBeIsToldOfTheOlderPageAndChangesNothing) {
   for (const std::vector<float>& values : bad) {
     if (values.empty()) continue;
     begin({{"V27_Misc", values}});
-    EXPECT_EQ(messages(), (ValidationList{{PageId::mtStartingConditions, invalid, Severity::dependedUpon}}))
+    EXPECT_EQ(messages(),
+              (ValidationList{{PageId::mtStartingConditions, notValid(path), Severity::dependedUpon}}))
         << ::testing::PrintToString(values);
     EXPECT_EQ(counts(), (Counts{3, 2, 0}));
   }
 }
 
 TEST_F(ExpandedStart, FilesThatDoNotFit) {
-  const auto refused = [this](const char* what) {
-    EXPECT_EQ(messages(),
-              (ValidationList{{PageId::mtExpStartingConditions, invalid, Severity::dependedUpon}}))
-        << what;
-    EXPECT_EQ(counts(), (Counts{3, 2, 0})) << what;
-  };
   const std::vector<TsbCustomBlock> block{{"V27_Misc", {1, 5, 5}}};
-  begin(block);
-  std::filesystem::remove(path);
-  refused("missing");
-  test::GridSpec spec = fileWith(block);
-  spec.noJ = 11;
-  test::writeGrid(path, spec);
-  refused("another extent");
-  spec = fileWith(block);
-  spec.dataType = 11;
-  test::writeGrid(path, spec);
-  refused("another data type");
-  spec = fileWith(block);
+  checkBadFiles(hotSpec(block), [this](const std::string& why) {
+    EXPECT_EQ(counts(), (Counts{3, 2, 0})) << why;
+  });
+  test::GridSpec spec = hotSpec(block);
   spec.steps = 2;
   test::writeGrid(path, spec);
-  refused("two time steps");
-  test::writeGrid(path, fileWith(block));
-  std::filesystem::resize_file(path, std::filesystem::file_size(path) / 2);
-  refused("cut short");
-  folder.write("hot.tsb2", "");
-  refused("empty");
+  start.at(1).file = path;
+  EXPECT_EQ(messages(), refusal(path)) << "two time steps";
+  EXPECT_EQ(counts(), (Counts{3, 2, 0}));
 }
 
 TEST_F(ExpandedStart, FilesOfOtherAreasBringNothing) {
@@ -227,12 +157,12 @@ TEST_F(ExpandedStart, FilesOfOtherAreasBringNothing) {
   begin({{"V27_Misc", {0, 2, 3}}});
   const std::string second = folder.file("second.tsb2");
   start.at(2).file = second;
-  test::writeGrid(second, fileWith({{"V27_Misc", {1, 7, -7}}}));
+  test::writeGrid(second, hotSpec({{"V27_Misc", {1, 7, -7}}}));
   EXPECT_THAT(faults(), IsEmpty());
   EXPECT_EQ(counts(), (Counts{3, 2, 0}));
   start.at(1).file = "none.tsb2";
   start.at(2).file = "";
-  EXPECT_EQ(faults(), (Texts{"Data file  \" none.tsb2\"  is not valid", "Data file  \" \"  is not valid"}));
+  EXPECT_EQ(faults(), (Texts{notValid("none.tsb2"), notValid("")}));
 }
 
 }  // namespace

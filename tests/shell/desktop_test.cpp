@@ -156,6 +156,30 @@ class DesktopTest : public DesktopFixture {
     QVERIFY(!window_->currentDocument()->title().endsWith("*"));
   }
 
+  // A load leaves dredging off, so the page shows only when it is chosen. Its picture is taken on request.
+  void dredgingIsShownOnceItIsChosen() {
+    QVERIFY(QFile::copy(file("s.v27"), file("m.v27")));
+    run("v27setup", {"set", "m.v27", "NESTED_MODEL_GLOBALS/MODULE_SELECTION/Simulation_Type=8"});
+    DocumentTab* tab = window_->openDocument(file("m.v27"));
+    QVERIFY(tab != nullptr && tab->goToPage(73));
+    QVERIFY(!tab->goToPage(70));
+    qobject_cast<QCheckBox*>(tab->pane().widgetOf("Include Dredging"))->click();
+    QVERIFY(tab->goToPage(86));
+    type("Number of grain size fractions:", "3");
+    QVERIFY(tab->goToPage(70));
+    QCOMPARE(grid().rowCount(), 0);
+    type("Number of dredgers", "2");
+    QCOMPARE(grid().rowCount(), 2);
+    QCOMPARE(grid().columnCount(), 3 + 5);
+    QVERIFY(grid().setData(grid().index(0, 4), "dredger.tsb0", Qt::EditRole));
+    const QString folder = qEnvironmentVariable("GRIDBAY_PICTURES");
+    QTest::qWait(50);
+    if (!folder.isEmpty()) window_->grab().save(folder + "/dredging.png");
+    tab->editor().undo();
+    tab->editor().undo();
+    QCOMPARE(grid().rowCount(), 0);
+  }
+
   void aTextThatIsNoNumberComesBack() {
     QVERIFY(window_->currentDocument()->goToPage(26));
     answer(QMessageBox::Ok);
