@@ -5,6 +5,7 @@
 #include <string>
 #include <vector>
 
+#include "basic/grid_file.h"
 #include "basic/nesting.h"
 #include "platform/cartography/cartography.h"
 #include "platform/tsb/tsb_file.h"
@@ -28,13 +29,12 @@ std::optional<TsbGeography> geographyOf(const CBathymetryObjectKvs* area) {
   return found ? std::optional(place) : std::nullopt;
 }
 
-// "UTM" alone gets its zone from the longitude.
+}  // namespace
+
 std::string completeProjection(const TsbGeography& place) {
   if (place.projection != "UTM") return place.projection;
   return formatted(texts::utmZone, place.projection, std::floor((place.longitude + 180) / 6 + 1));
 }
-
-}  // namespace
 
 void CBathymetryKvs::OverlandFileRow::save(const CBathymetryKvs& areas, KvsFile& file,
                                            const std::string& documentPath) const {

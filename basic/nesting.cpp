@@ -55,23 +55,36 @@ Rectangle footprint(const CBathymetryObjectKvs& area) {
   return {firstJ, firstJ + area.noJ - 1, firstK, firstK + area.noK - 1};
 }
 
+// What an area of so many points along an edge spans in steps of the outer grid.
+std::int64_t extentIn(std::int32_t points) {
+  return (std::int64_t{points} - 1) / kNestingRatio;
+}
+
+unsigned refuseNesting(const CBathymetryObjectKvs& inner, const CBathymetryObjectKvs& outer,
+                       ValidationList& messages, const Text& text) {
+  return report(messages, PageId::bathymetry, Severity::fault, text, inner.fileName.text(),
+                outer.fileName.text());
+}
+
 }  // namespace
 
-unsigned CheckNesting(const CBathymetryObjectKvs& inner, const CBathymetryObjectKvs& outer,
-                      ValidationList& messages) {
-  const auto refuse = [&](const Text& text) {
-    return report(messages, PageId::bathymetry, Severity::fault, text, inner.fileName.text(),
-                  outer.fileName.text());
-  };
+unsigned CheckNestingGeometry(const CBathymetryObjectKvs& inner, const CBathymetryObjectKvs& outer,
+                              ValidationList& messages) {
+  const auto refuse = [&](const Text& text) { return refuseNesting(inner, outer, messages, text); };
   if (hasWrongRatio(outer.dx, inner.dx) || hasWrongRatio(outer.dy, inner.dy)) return refuse(texts::nestRatio);
   if ((inner.noJ - 1) % kNestingRatio != 0) return refuse(texts::nestJextr);
   if ((inner.noK - 1) % kNestingRatio != 0) return refuse(texts::nestKextr);
-  const std::int64_t jextr = (inner.noJ - 1) / kNestingRatio;
-  const std::int64_t kextr = (inner.noK - 1) / kNestingRatio;
-  const bool inside = inner.origin.j >= 1 && inner.origin.k >= 1 && inner.origin.j + jextr <= outer.noJ - 2 &&
-                      inner.origin.k + kextr <= outer.noK - 2;
-  if (!inside || !landRuleHolds(inner, outer, jextr, kextr)) return refuse(texts::nestPosition);
-  return 0;
+  const bool inside = inner.origin.j >= 1 && inner.origin.k >= 1 &&
+                      inner.origin.j + extentIn(inner.noJ) <= outer.noJ - 2 &&
+                      inner.origin.k + extentIn(inner.noK) <= outer.noK - 2;
+  return inside ? 0 : refuse(texts::nestPosition);
+}
+
+unsigned CheckNesting(const CBathymetryObjectKvs& inner, const CBathymetryObjectKvs& outer,
+                      ValidationList& messages) {
+  const unsigned faults = CheckNestingGeometry(inner, outer, messages);
+  if (faults != 0 || landRuleHolds(inner, outer, extentIn(inner.noJ), extentIn(inner.noK))) return faults;
+  return refuseNesting(inner, outer, messages, texts::nestPosition);
 }
 
 unsigned CheckOverlap(const CBathymetryObjectKvs& a, const CBathymetryObjectKvs& b,

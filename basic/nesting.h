@@ -8,6 +8,11 @@ namespace gridbay {
 // outer point (origin J + a, origin K + b).
 inline constexpr int kNestingRatio = 3;
 
+// Whether the inner area can lie in the outer one as far as spacing, extent and position tell, so that no
+// grid need be in memory; 1 with a message for the first rule that it breaks.
+unsigned CheckNestingGeometry(const CBathymetryObjectKvs& inner, const CBathymetryObjectKvs& outer,
+                              ValidationList& messages);
+
 // Whether the inner area can lie in the outer one; 1 with a message for the first rule that it breaks.
 unsigned CheckNesting(const CBathymetryObjectKvs& inner, const CBathymetryObjectKvs& outer,
                       ValidationList& messages);

@@ -7,6 +7,7 @@
 #include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
 #include "basic/bathymetry_requests.h"
+#include "basic/grid_file.h"
 #include "basic/simulation_period.h"
 #include "core/name_bytes.h"
 #include "platform/tsb/tsb_operations.h"
@@ -14,7 +15,6 @@
 namespace gridbay {
 namespace {
 
-constexpr float kNoLandValue = -999.0F;
 constexpr int kLeastPoints = 3;
 constexpr std::string_view kMiscBlock = "V27_Misc";
 constexpr std::size_t kLandPlace = 3;
@@ -55,7 +55,8 @@ int readItem(TsbHeader& header, int item, CVdArray2D<float>& grid) {
   return status != 0 ? status : tsbReadItemTimeStep(header, grid.values());
 }
 
-// The land value stands in a custom block. False when the blocks cannot be read to that point.
+}  // namespace
+
 bool readLandValue(const TsbHeader& header, float& landValue) {
   const TsbCustomBlock* block = nullptr;
   if (tsbGetCustomBlockRef(header, &block) != 0) return false;
@@ -69,8 +70,6 @@ bool readLandValue(const TsbHeader& header, float& landValue) {
   }
   return true;
 }
-
-}  // namespace
 
 unsigned CBathymetryObjectKvs::ReadGrid(ValidationList& messages, int areaNumber) {
   auto* basic = parts<BasicParts>();

@@ -78,6 +78,8 @@ int runCommandLine(int argc, const char* const* argv, std::ostream& out, std::os
   addGet(tool, action);
   addSet(tool, action);
   addBoundaries(tool, action);
+  addArea(tool, action);
+  addExport(tool, action);
   addValidate(tool, action);
   addRun(tool, action);
   addEnsemble(tool, action);

@@ -24,6 +24,8 @@ void addNew(CLI::App& tool, Action& action);
 void addGet(CLI::App& tool, Action& action);
 void addSet(CLI::App& tool, Action& action);
 void addBoundaries(CLI::App& tool, Action& action);
+void addArea(CLI::App& tool, Action& action);
+void addExport(CLI::App& tool, Action& action);
 void addValidate(CLI::App& tool, Action& action);
 void addRun(CLI::App& tool, Action& action);
 void addEnsemble(CLI::App& tool, Action& action);

@@ -52,6 +52,12 @@ void addConvertRaster(CLI::App& convert, Action& action) {
       ->check(finite());
   command.add_option("--crs", options->crs,
                      "The projection, as EPSG:28356, UTM-32 or a full text (default: the raster's own)");
+  command.add_option("--reproject", options->reproject,
+                     "The projection to bring the raster to, in metres, as EPSG:28356 or UTM-32");
+  command
+      .add_option("--resample", options->resample,
+                  "The spacing to bring the raster to (m): interpolated, or means of what the points cover")
+      ->check(CLI::PositiveNumber & finite());
   command
       .add_option("--origin-x", options->originX,
                   "Easting of the first point written (m; default: as the raster lies)")

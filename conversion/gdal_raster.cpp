@@ -2,9 +2,12 @@
 #include <cpl_error.h>
 #include <cpl_string.h>
 #include <gdal.h>
+#include <gdalwarper.h>
 #include <ogr_srs_api.h>
 
+#include <algorithm>
 #include <cmath>
+#include <iterator>
 #include <memory>
 
 #include "conversion/raster.h"
@@ -33,7 +36,7 @@ const char* subdatasetEntry(GDALDatasetH dataset, int number, const char* what) 
   return CSLFetchNameValue(GDALGetMetadata(dataset, "SUBDATASETS"), key.c_str());
 }
 
-class GdalRaster final : public Raster {
+class GdalRaster : public Raster {
  public:
   GdalRaster(Dataset dataset, std::vector<std::string> subdatasets)
       : dataset_(std::move(dataset)), subdatasets_(std::move(subdatasets)) {
@@ -116,27 +119,194 @@ class GdalRaster final : public Raster {
   double offset_ = 0;
 };
 
+// A raster of the file with what else it holds; null with the reason.
+struct Opened {
+  Dataset dataset;
+  std::vector<std::string> subdatasets;
+};
+
+Opened openFile(const char* path, int subdataset, std::string* error) {
+  GDALAllRegister();
+  CPLSetErrorHandler(CPLQuietErrorHandler);
+  Opened file{open(path), {}};
+  if (file.dataset) {
+    for (int n = 1; const char* name = subdatasetEntry(file.dataset.get(), n, "NAME"); ++n) {
+      const char* description = subdatasetEntry(file.dataset.get(), n, "DESC");
+      file.subdatasets.push_back(std::string(description == nullptr ? "" : description) + " (" + name + ")");
+    }
+    const char* chosen = subdataset == 0 ? nullptr : subdatasetEntry(file.dataset.get(), subdataset, "NAME");
+    if (chosen != nullptr) file.dataset = open(std::string(chosen).c_str());
+  }
+  if (!file.dataset ||
+      (GDALGetRasterCount(file.dataset.get()) < 1 && (file.subdatasets.empty() || subdataset != 0))) {
+    *error = CPLGetLastErrorMsg();
+    if (error->empty()) *error = "it has no raster band";
+    file.dataset.reset();
+  }
+  return file;
+}
+
+struct FreeWarpOptions {
+  void operator()(GDALWarpOptions* options) const { GDALDestroyWarpOptions(options); }
+};
+
+// A data set that is worked out from another one as it is read. Points that the raster does not reach are
+// missing.
+class Warp {
+ public:
+  // Null with the reason.
+  static Dataset of(GDALDatasetH source, const WarpTarget& target, std::string* error) {
+    CPLErrorReset();
+    double transform[6] = {0, 1, 0, 0, 0, 1};
+    if (GDALGetGeoTransform(source, transform) != CE_None) {
+      *error = "it does not say where it lies, so that it can't be brought to another grid";
+      return nullptr;
+    }
+    const std::string own = target.from.empty() ? projectionOf(source) : target.from;
+    const std::string wanted = target.projection.empty() ? own : target.projection;
+    if (own.empty() && !target.projection.empty()) {
+      *error = "it does not say in which projection it is";
+      return nullptr;
+    }
+    int columns = target.columns;
+    int rows = target.rows;
+    if (columns > 0) {
+      const RasterPlace& at = target.place;
+      transform[1] = at.nextColumn[0];
+      transform[2] = at.nextRow[0];
+      transform[4] = at.nextColumn[1];
+      transform[5] = at.nextRow[1];
+      transform[0] = at.first[0] - transform[1] / 2 - transform[2] / 2;
+      transform[3] = at.first[1] - transform[4] / 2 - transform[5] / 2;
+    } else if (!cover(source, own, wanted, target.spacing, transform, &columns, &rows)) {
+      return failed(error);
+    }
+    void* way = transformer(source, own, wanted);
+    if (way == nullptr) return failed(error);
+    GDALSetGenImgProjTransformerDstGeoTransform(way, transform);
+    const std::unique_ptr<GDALWarpOptions, FreeWarpOptions> options(optionsFor(source));
+    // Interpolation from the nearest four points; where the new points lie wider, means of what they cover.
+    options->eResampleAlg = GRA_Bilinear;
+    options->hSrcDS = source;
+    options->pfnTransformer = GDALGenImgProjTransform;
+    options->pTransformerArg = way;  // which the new data set owns
+    Dataset warped(GDALCreateWarpedVRT(source, columns, rows, transform, options.get()));
+    if (!warped) {
+      GDALDestroyGenImgProjTransformer(way);
+      return failed(error);
+    }
+    GDALSetProjection(warped.get(), wanted.c_str());
+    for (int band = 1; band <= GDALGetRasterCount(warped.get()); ++band) {
+      const GDALRasterBandH from = GDALGetRasterBand(source, band);
+      const GDALRasterBandH to = GDALGetRasterBand(warped.get(), band);
+      GDALSetRasterNoDataValue(to, options->padfDstNoDataReal[band - 1]);
+      GDALSetRasterScale(to, GDALGetRasterScale(from, nullptr));
+      GDALSetRasterOffset(to, GDALGetRasterOffset(from, nullptr));
+      GDALSetDescription(to, GDALGetDescription(from));
+    }
+    return warped;
+  }
+
+ private:
+  static Dataset failed(std::string* error) {
+    *error = CPLGetLastErrorMsg();
+    if (error->empty()) *error = "it can't be brought to that grid";
+    return nullptr;
+  }
+  static std::string projectionOf(GDALDatasetH source) {
+    const char* text = GDALGetProjectionRef(source);
+    return text == nullptr ? "" : text;
+  }
+  static void* transformer(GDALDatasetH source, const std::string& own, const std::string& projection) {
+    char** texts = CSLSetNameValue(nullptr, "DST_SRS", projection.c_str());
+    texts = CSLSetNameValue(texts, "SRC_SRS", own.c_str());
+    const std::unique_ptr<char*, FreeTexts> settings(texts);
+    return GDALCreateGenImgProjTransformer2(source, nullptr, projection.empty() ? nullptr : settings.get());
+  }
+  // A grid northwards up, at whole multiples of its spacing, that covers the raster.
+  static bool cover(GDALDatasetH source, const std::string& own, const std::string& projection,
+                    double spacing, double* transform, int* columns, int* rows) {
+    void* way = transformer(source, own, projection);
+    if (way == nullptr) return false;
+    double extent[4] = {};
+    const CPLErr done =
+        GDALSuggestedWarpOutput2(source, GDALGenImgProjTransform, way, transform, columns, rows, extent, 0);
+    GDALDestroyGenImgProjTransformer(way);
+    if (done != CE_None) return false;
+    if (!(spacing > 0)) return true;
+    const double west = std::floor(extent[0] / spacing) * spacing;
+    const double north = std::ceil(extent[3] / spacing) * spacing;
+    const double across = std::ceil((extent[2] - west) / spacing);
+    const double down = std::ceil((north - extent[1]) / spacing);
+    constexpr double kMost = 1e6;  // columns or rows
+    if (!(across >= 1 && down >= 1 && across <= kMost && down <= kMost)) {
+      CPLError(CE_Failure, CPLE_AppDefined, "points %g apart would be %g x %g of them", spacing, across,
+               down);
+      return false;
+    }
+    *columns = static_cast<int>(across);
+    *rows = static_cast<int>(down);
+    const double north_up[6] = {west, spacing, 0, north, 0, -spacing};
+    std::copy(std::begin(north_up), std::end(north_up), transform);
+    return true;
+  }
+  static GDALWarpOptions* optionsFor(GDALDatasetH source) {
+    constexpr double kMissing = -1e35;
+    const int bands = GDALGetRasterCount(source);
+    GDALWarpOptions* options = GDALCreateWarpOptions();
+    options->eWorkingDataType = GDT_Float32;
+    GDALWarpInitDefaultBandMapping(options, bands);
+    GDALWarpInitSrcNoDataReal(options, kMissing);
+    GDALWarpInitDstNoDataReal(options, kMissing);
+    for (int band = 1; band <= bands; ++band) {
+      int given = 0;
+      const double missing = GDALGetRasterNoDataValue(GDALGetRasterBand(source, band), &given);
+      if (given == 0) continue;
+      options->padfSrcNoDataReal[band - 1] = missing;
+      options->padfDstNoDataReal[band - 1] = missing;
+    }
+    options->papszWarpOptions = CSLSetNameValue(options->papszWarpOptions, "INIT_DEST", "NO_DATA");
+    options->papszWarpOptions = CSLSetNameValue(options->papszWarpOptions, "UNIFIED_SRC_NODATA", "NO");
+    return options;
+  }
+};
+
+// A raster that was brought to another grid, with the file that it reads.
+class WarpedRaster final : public GdalRaster {
+ public:
+  WarpedRaster(Dataset warped, Opened source)
+      : GdalRaster(std::move(warped), source.subdatasets), source_(std::move(source.dataset)) {}
+
+  std::vector<std::string> files() const override {
+    const std::unique_ptr<char*, FreeTexts> list(GDALGetFileList(source_.get()));
+    std::vector<std::string> names{GDALGetDescription(source_.get())};
+    for (char** name = list.get(); name != nullptr && *name != nullptr; ++name) names.emplace_back(*name);
+    return names;
+  }
+
+ private:
+  Dataset source_;
+};
+
 }  // namespace
 }  // namespace gridbay
 
 extern "C" gridbay::Raster* gridbayOpenRaster(const char* path, int subdataset, std::string* error) {
-  using gridbay::subdatasetEntry;
-  GDALAllRegister();
-  CPLSetErrorHandler(CPLQuietErrorHandler);
-  gridbay::Dataset dataset = gridbay::open(path);
-  std::vector<std::string> others;
-  if (dataset) {
-    for (int n = 1; const char* name = subdatasetEntry(dataset.get(), n, "NAME"); ++n) {
-      const char* description = subdatasetEntry(dataset.get(), n, "DESC");
-      others.push_back(std::string(description == nullptr ? "" : description) + " (" + name + ")");
-    }
-    const char* chosen = subdataset == 0 ? nullptr : subdatasetEntry(dataset.get(), subdataset, "NAME");
-    if (chosen != nullptr) dataset = gridbay::open(std::string(chosen).c_str());
-  }
-  if (!dataset || (GDALGetRasterCount(dataset.get()) < 1 && (others.empty() || subdataset != 0))) {
-    *error = CPLGetLastErrorMsg();
-    if (error->empty()) *error = "it has no raster band";
+  gridbay::Opened file = gridbay::openFile(path, subdataset, error);
+  if (!file.dataset) return nullptr;
+  return std::make_unique<gridbay::GdalRaster>(std::move(file.dataset), std::move(file.subdatasets))
+      .release();
+}
+
+extern "C" gridbay::Raster* gridbayOpenWarped(const char* path, int subdataset,
+                                              const gridbay::WarpTarget* target, std::string* error) {
+  gridbay::Opened file = gridbay::openFile(path, subdataset, error);
+  if (!file.dataset) return nullptr;
+  if (GDALGetRasterCount(file.dataset.get()) < 1) {
+    *error = "it holds several rasters, of which one must be chosen";
     return nullptr;
   }
-  return std::make_unique<gridbay::GdalRaster>(std::move(dataset), std::move(others)).release();
+  gridbay::Dataset warped = gridbay::Warp::of(file.dataset.get(), *target, error);
+  if (!warped) return nullptr;
+  return std::make_unique<gridbay::WarpedRaster>(std::move(warped), std::move(file)).release();
 }

@@ -55,4 +55,18 @@ class Raster {
 inline constexpr const char* kOpenRaster = "gridbayOpenRaster";
 using OpenRaster = Raster* (*)(const char* path, int subdataset, std::string* error);
 
+// The grid that a raster is brought to: points between those of the raster are interpolated, wider ones are
+// means.
+struct WarpTarget {
+  std::string projection{};  // its full text; empty for the raster's own
+  double spacing = 0;        // in its unit; 0 for one like the raster's
+  RasterPlace place{};       // with a number of columns and rows, else the grid covers all of the raster
+  int columns = 0;
+  int rows = 0;
+  std::string from{};  // the raster's own projection where it names none, or another one
+};
+inline constexpr const char* kOpenWarped = "gridbayOpenWarped";
+using OpenWarped = Raster* (*)(const char* path, int subdataset, const WarpTarget* target,
+                               std::string* error);
+
 }  // namespace gridbay

@@ -1,6 +1,5 @@
 #include "conversion/raster_conversion.h"
 
-#include <dlfcn.h>
 #include <fmt/format.h>
 
 #include <cmath>
@@ -10,13 +9,12 @@
 
 #include "conversion/history.h"
 #include "conversion/item_types.h"
-#include "platform/files/may_write.h"
-#include "conversion/raster.h"
 #include "conversion/raster_layout.h"
+#include "conversion/raster_reader.h"
 #include "conversion/tsb_raster.h"
 #include "platform/cartography/cartography.h"
 #include "platform/cartography/grid_mapping.h"
-#include "platform/files/program_path.h"
+#include "platform/files/may_write.h"
 #include "platform/tsb/tsb_writer.h"
 #include "platform/units/units.h"
 
@@ -38,6 +36,8 @@ Outcome check(const RasterConversion& options, const ConversionHost& host) {
   if (!isFinite(options.originY)) return refuse("origin-y", *options.originY, "it is a finite number");
   if (options.band && *options.band < 1) return refuse("band", *options.band, "bands count from 1");
   if (options.subdataset < 0) return refuse("subdataset", options.subdataset, "rasters count from 1");
+  if (options.resample && !(*options.resample > 0 && std::isfinite(*options.resample)))
+    return refuse("resample", *options.resample, "it is a number of metres above 0");
   if (options.coarsen < 1) return refuse("coarsen", options.coarsen, "it is at least 1");
   return {};
 }
@@ -50,22 +50,6 @@ struct Selection {
   int noK;
   int every;
 };
-
-Result<std::unique_ptr<Raster>> openWithLibrary(const std::string& path, int subdataset) {
-  const std::string module = pluginFolder() + "/v27raster.so";
-  void* library = ::dlopen(module.c_str(), RTLD_NOW | RTLD_LOCAL);
-  void* entry = library == nullptr ? nullptr : ::dlsym(library, kOpenRaster);
-  if (entry == nullptr)
-    return Failure{fmt::format("The raster reader \"{}\" cannot be loaded: {}", module, ::dlerror())};
-  std::string why;
-  std::unique_ptr<Raster> raster(reinterpret_cast<OpenRaster>(entry)(path.c_str(), subdataset, &why));
-  if (raster == nullptr) return Failure{fmt::format("cannot read \"{}\": {}", path, why)};
-  return raster;
-}
-
-Result<std::unique_ptr<Raster>> openAny(const std::string& path, int subdataset) {
-  return isTsbRaster(path) ? openTsbRaster(path, subdataset) : openWithLibrary(path, subdataset);
-}
 
 // Texts with their numbers, a line each; of a long list the beginning.
 template <class TextOf>
@@ -80,7 +64,7 @@ std::string numbered(int count, const TextOf& textOf) {
 
 // Opens the raster and chooses what the options ask for; says what else there would be.
 Result<std::unique_ptr<Raster>> openRaster(const RasterConversion& options, ConversionHost& host) {
-  Result<std::unique_ptr<Raster>> opened = openAny(options.in, options.subdataset);
+  Result<std::unique_ptr<Raster>> opened = openAnyRaster(options.in, options.subdataset);
   if (!opened) return opened;
   const std::vector<std::string> others = (*opened)->subdatasets();
   const int otherCount = static_cast<int>(others.size());
@@ -96,7 +80,7 @@ Result<std::unique_ptr<Raster>> openRaster(const RasterConversion& options, Conv
     if (otherCount != 1)
       return Failure{fmt::format("\"{}\" holds several rasters; choose one with {}:{}", options.in,
                                  host.option("subdataset", "N"), list)};
-    opened = openAny(options.in, 1);
+    opened = openAnyRaster(options.in, 1);
     if (!opened) return opened;
   } else if (options.subdataset == 0 && otherCount > 1) {
     host.note(fmt::format("The file holds several rasters, of which {} takes another:{}",
@@ -116,6 +100,41 @@ Result<std::unique_ptr<Raster>> openRaster(const RasterConversion& options, Conv
   }
   raster.choose(options.band.value_or(1));
   return opened;
+}
+
+// The full text of a projection in metres that a user names.
+Result<std::string> projectionInMetres(const std::string& text) {
+  const CVdMapProjection map(text);
+  if (!map.IsValid() || map.IsLocal())
+    return Failure{fmt::format("\"{}\" is no projection that is known here", text)};
+  if (const auto mapping = gridMappingOf(map.Wkt2()); mapping && mapping->name == kGeographicMapping)
+    return Failure{fmt::format("\"{}\" is in degrees: a grid wants a projection in metres", map.Name())};
+  return map.Wkt2();
+}
+
+// The raster brought to another projection or spacing, as the options ask.
+Result<std::unique_ptr<Raster>> warpedRaster(const RasterConversion& options, const Raster& raster,
+                                             const ConversionHost& host) {
+  if (isTsbRaster(options.in))
+    return Failure{fmt::format("{} and {} take rasters of other kinds; a map of our own takes {}",
+                               host.option("resample"), host.option("reproject"), host.option("coarsen"))};
+  WarpTarget target{.spacing = options.resample.value_or(0)};
+  if (!options.reproject.empty()) {
+    const Result<std::string> projection = projectionInMetres(options.reproject);
+    if (!projection) return Failure{projection.error()};
+    target.projection = *projection;
+  }
+  if (!options.crs.empty()) {
+    const CVdMapProjection own(options.crs);
+    if (!own.IsValid())
+      return Failure{fmt::format("\"{}\" is no projection that is known here", options.crs)};
+    target.from = own.Wkt2();
+  }
+  // A file that holds one raster only, inside of others, has that as its first.
+  const int subdataset = options.subdataset == 0 && raster.bands() == 0 ? 1 : options.subdataset;
+  Result<std::unique_ptr<Raster>> warped = openWarpedRaster(options.in, subdataset, target);
+  if (warped) (*warped)->choose(options.band.value_or(1));
+  return warped;
 }
 
 Result<Selection> select(const RasterConversion& options, const Raster& raster) {
@@ -156,7 +175,8 @@ Result<Target> define(const RasterConversion& options, const Raster& raster, con
     return Failure{fmt::format("The values are in {}, and those of {} are to be in {}", raster.unit(),
                                (*quantity)->name, baseUnit)};
   }
-  const std::string projection = options.crs.empty() ? raster.projection() : options.crs;
+  const bool isOwn = options.crs.empty() || !options.reproject.empty();
+  const std::string projection = isOwn ? raster.projection() : options.crs;
   const CVdMapProjection map(projection);
   if (!map.IsValid()) return Failure{fmt::format("\"{}\" is no projection that is known here", projection)};
   if (const auto mapping = gridMappingOf(map.Wkt2()); mapping && mapping->name == kGeographicMapping)
@@ -262,16 +282,21 @@ Result<ConvertedRaster> convertRaster(const RasterConversion& options, Conversio
   if (const Outcome free = mayWrite(options.out, options.force, {&options.in, 1}, host.option("force"));
       !free)
     return Failure{free.error()};
-  const Result<std::unique_ptr<Raster>> opened = openRaster(options, host);
+  Result<std::unique_ptr<Raster>> opened = openRaster(options, host);
   if (!opened) return Failure{opened.error()};
+  if (!options.reproject.empty() || options.resample) {
+    opened = warpedRaster(options, **opened, host);
+    if (!opened) return Failure{opened.error()};
+  }
   Raster& raster = **opened;
   if (const Outcome free =
           mayWrite(options.out, options.force, filesIn(raster.files()), host.option("force"));
       !free)
     return Failure{free.error()};
-  if (const std::string unit = raster.otherUnit(); !unit.empty() && options.crs.empty()) {
-    return Failure{fmt::format(
-        "The raster is in {}. Bring it to a projection in metres first, as with gdalwarp -t_srs", unit)};
+  if (const std::string unit = raster.otherUnit();
+      !unit.empty() && (options.crs.empty() || !options.reproject.empty())) {
+    return Failure{fmt::format("The raster is in {}. Bring it to a projection in metres with {}", unit,
+                               host.option("reproject", "CRS"))};
   }
   if (!raster.hasPlace()) host.note("The raster does not say where it lies: its points are taken 1 m apart");
   const Result<RasterLayout> layout = layoutOf(raster.place(), raster.columns(), raster.rows());

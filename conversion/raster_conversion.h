@@ -19,6 +19,8 @@ struct RasterConversion {
   int subdataset = 0;                   // of a file that holds several rasters, from 1; 0 for none
   std::optional<float> missingAs;       // stands for missing values (unit of the values); else the land value
   std::string crs;                      // as EPSG:28356, UTM-32 or a full text; empty for the raster's own
+  std::string reproject;                // the projection to bring it to; empty for its own
+  std::optional<double> resample;       // the spacing to bring it to (m), else its own
   std::optional<double> originX;        // easting and northing of the first point (m), else as it lies
   std::optional<double> originY;
   int coarsen = 1;                           // every so many points, at least 1

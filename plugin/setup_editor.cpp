@@ -1,5 +1,6 @@
 #include "plugin/setup_editor.h"
 
+#include "map/document_map.h"
 #include "plugin/cover_pages.h"
 #include "setup/graphical_view.h"
 #include "setup/gridbay_doc.h"
@@ -50,6 +51,8 @@ class Editor final : public SetupEditor {
   }
 
   SetupSummary summary() override { return summaryOf(document_.root(), document_.units()); }
+
+  MapEditor& map() override { return *map_; }
 
   std::vector<Item> items() const override {
     std::vector<Item> items;
@@ -113,6 +116,7 @@ class Editor final : public SetupEditor {
   }
 
   CGridbayDoc document_;
+  std::unique_ptr<MapEditor> map_ = makeMapEditor(document_);
   CNavigationView tree_;
   std::unique_ptr<CV27SetupFormView> page_;
   std::function<void()> changed_;

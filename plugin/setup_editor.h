@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "core/message.h"
+#include "map/map_editor.h"
 #include "pages/form.h"
 #include "pages/grid_wnd.h"
 #include "pages/host.h"
@@ -74,6 +75,8 @@ class SetupEditor {
 
   virtual FirstView firstView() const = 0;
   virtual SetupSummary summary() = 0;
+  // What the setup places, on a map, and what can be grasped there. An edit is shown by the open page too.
+  virtual MapEditor& map() = 0;
   virtual std::vector<Item> items() const = 0;
   // Works out anew which items are visible; done by itself after each change.
   virtual void applyRules() = 0;

@@ -131,6 +131,67 @@ TEST_F(ConvertRaster, WhatCannotBeDone) {
   EXPECT_THAT(refused({folder.file("d.tif"), out, "--land", "1"}), HasSubstr("The raster is in degrees"));
 }
 
+// Of a plane the values are known wherever a point lies.
+TEST_F(ConvertRaster, ToAnotherSpacingAndProjection) {
+  const auto plane = [](double east, double north) {
+    return 0.01 * (east - 500000) + 0.02 * (north - 6000000);
+  };
+  std::string rows = "ncols 40\nnrows 30\nxllcorner 500000\nyllcorner 6000000\ncellsize 10\n";
+  for (int row = 0; row < 30; ++row) {
+    for (int column = 0; column < 40; ++column)
+      rows += fmt::format("{:.6f} ", plane(500005 + column * 10, 6000295 - row * 10));
+    rows += "\n";
+  }
+  const std::string plain = folder.write("p.asc", rows);
+  const std::string degrees = folder.file("d.tif");
+  ASSERT_EQ(test::runProgram("gdalwarp", {"-q", "-r", "bilinear", "-s_srs", "EPSG:32632", "-t_srs",
+                                          "EPSG:4326", "-dstnodata", "-9999", plain, degrees})
+                .status,
+            0);
+  struct Case {
+    std::vector<std::string> options;
+    double spacing;
+    double tolerance;
+  };
+  const std::vector<Case> cases{{{plain, out, "--resample", "25", "--crs", "EPSG:32632"}, 25, 1e-3},
+                                {{plain, out, "--resample", "4"}, 4, 1e-3},
+                                {{degrees, out, "--reproject", "UTM-32", "--resample", "20"}, 20, 0.05},
+                                {{plain, out, "--crs", "UTM-32", "--reproject", "EPSG:32632"}, 10, 0.01}};
+  for (const Case& each : cases) {
+    std::vector<std::string> words{"convert", "raster", "--force", "--land", "60"};
+    words.insert(words.end(), each.options.begin(), each.options.end());
+    run = runTool(words);
+    ASSERT_EQ(run.status, 0) << run.err;
+    const nlohmann::json x = info()["axes"][0];
+    const nlohmann::json y = info()["axes"][1];
+    EXPECT_NEAR(x["spacing"], each.spacing, 1e-6);
+    const std::size_t columns = x["points"];
+    const std::size_t count = columns * y["points"].get<std::size_t>();
+    ASSERT_GT(count, 100U);
+    const std::vector<float> got = values(count);
+    int inside = 0;
+    for (std::size_t i = 0; i < count; ++i) {
+      const double east = x["first"].get<double>() + static_cast<double>(i % columns) * each.spacing;
+      const double north = y["first"].get<double>() + static_cast<double>(i / columns) * each.spacing;
+      if (east < 500050 || east > 500350 || north < 6000050 || north > 6000250) continue;
+      ++inside;
+      EXPECT_NEAR(got[i], plane(east, north), each.tolerance) << east << " " << north;
+    }
+    EXPECT_GT(inside, 50);
+  }
+  fs::remove(out);
+  EXPECT_THAT(refused({degrees, out, "--land", "1"}), HasSubstr("--reproject CRS"));
+  EXPECT_THAT(refused({degrees, out, "--land", "1", "--reproject", "EPSG:4258"}), HasSubstr("is in degrees"));
+  EXPECT_THAT(refused({plain, out, "--land", "1", "--reproject", "nonsense"}), HasSubstr("\"nonsense\""));
+  EXPECT_THAT(refused({plain, out, "--land", "1", "--reproject", "UTM-32"}),
+              HasSubstr("in which projection"));
+  EXPECT_THAT(refused({plain, out, "--land", "1", "--resample", "1e-5"}), HasSubstr("points 1e-05 apart"));
+  EXPECT_THAT(refused({plain, out, "--land", "1", "--resample", "0"}), HasSubstr("--resample"));
+  test::writeGrid(folder.file("own.tsb2"));
+  EXPECT_THAT(refused({folder.file("own.tsb2"), out, "--land", "1", "--resample", "5"}),
+              HasSubstr("--coarsen"));
+}
+
 TEST_F(ConvertRaster, WhatIsThereIsReplacedOnlyWhenAsked) {
   const std::string raster = folder.write("r.asc", kRaster);
   folder.write("r.tsb2", "of old");

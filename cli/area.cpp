@@ -1,0 +1,181 @@
+#include <fmt/format.h>
+
+#include <cmath>
+#include <filesystem>
+
+#include "basic/bathymetry.h"
+#include "cli/commands.h"
+#include "core/grid_point.h"
+#include "map/setup_map.h"
+
+namespace gridbay::cli {
+namespace {
+
+struct Options {
+  std::string setup;
+  std::string grid;
+  int number = 0;
+  std::optional<int> enclosing;
+  std::optional<std::string> at;
+  bool snap = false;
+};
+
+Result<std::optional<GridPoint>> given(const Options& options) {
+  if (!options.at) return std::optional<GridPoint>();
+  const std::optional<GridPoint> point = pointOfText(*options.at);
+  if (!point) return Failure{fmt::format("\"{}\" is no grid point; write it as J,K", *options.at)};
+  return point;
+}
+
+// A distance to the centimetre.
+std::string metres(double distance) {
+  return fmt::format("{:.4g} m", std::round(distance * 100) / 100);
+}
+
+std::string placeText(const CBathymetryObjectKvs& area, int number) {
+  return fmt::format("Area {} lies in area {} from {}", number, area.enclosingArea, pointText(area.origin));
+}
+
+// Gives the area its position, and says how it goes with the coordinates of the grids.
+Outcome place(SetupMap& map, CGlobalKvs& root, int number, const std::optional<GridPoint>& at, bool snap,
+              const Console& console) {
+  CBathymetryObjectKvs& area = root.bathymetry->at(number);
+  if (at) area.origin = *at;
+  const Result<AreaSnap> found = map.snapOf(root, number);
+  if (!found && snap) return Failure{found.error()};
+  if (found) {
+    const std::string where = fmt::format("By the grids' coordinates its first point lies at ({:.2f},{:.2f})",
+                                          found->exact[0], found->exact[1]);
+    if (snap) {
+      const bool isOther = at && *at != found->nearest;
+      if (isOther) console.note(fmt::format("{} is {} off", pointText(*at), metres(found->heldOffBy)));
+      area.origin = found->nearest;
+      console.out << fmt::format("{}, {} from the point that it snaps to\n", where, metres(found->offBy));
+    } else if (found->nearest != area.origin) {
+      console.note(fmt::format("{}: {} is {} off, {} would be {} off", where, pointText(area.origin),
+                               metres(found->heldOffBy), pointText(found->nearest), metres(found->offBy)));
+    }
+  }
+  return {};
+}
+
+// What stands against where the areas lie now; it is for the check to count.
+void tellFaults(SetupMap& map, CGlobalKvs& root, int number, const Console& console) {
+  const MapArea* area = map.scene(root).area(number);
+  if (area != nullptr && !area->fault.empty()) console.note(area->fault);
+}
+
+int finish(SetupFile& setup, const Options& options, int number, SetupMap& map, const Console& console) {
+  tellFaults(map, setup.model(), number, console);
+  if (const int status = saveSetup(setup, options.setup, console); status != kClean) return status;
+  console.out << placeText(setup.model().bathymetry->at(number), number) << '\n';
+  return kClean;
+}
+
+int add(const Options& options, const Console& console) {
+  const Result<std::optional<GridPoint>> at = given(options);
+  if (!at) return console.fail(at.error());
+  ConsoleMessageHost host(console);
+  Result<SetupFile> setup = SetupFile::open(options.setup, &host);
+  if (!setup) return console.fail(setup.error());
+  CGlobalKvs& root = setup->model();
+  SetupMap map;
+  const int enclosing = options.enclosing.value_or(1);
+  if (enclosing < 1 || enclosing > root.bathymetry->GetCount())
+    return console.fail(fmt::format("There is no area {} for it to lie in: the setup has {}", enclosing,
+                                    root.bathymetry->GetCount()));
+  if (!*at && !options.snap)
+    return console.fail("Say where it lies, with --at J,K, or take that from the grids with --snap");
+  const std::string grid = std::filesystem::absolute(options.grid).lexically_normal().string();
+  if (const GridHeader& header = map.headers().of(grid); !header.fault.empty())
+    return console.fail(header.fault);
+  const MapEdit made = map.addArea(root, enclosing, at->value_or(GridPoint{}), grid);
+  if (!made.fault.empty()) return console.fail(made.fault);
+  const int number = root.bathymetry->GetCount();
+  if (const Outcome done = place(map, root, number, *at, options.snap, console); !done)
+    return console.fail(done.error() + "; the setup is unchanged");
+  return finish(*setup, options, number, map, console);
+}
+
+int move(const Options& options, const Console& console) {
+  const Result<std::optional<GridPoint>> at = given(options);
+  if (!at) return console.fail(at.error());
+  ConsoleMessageHost host(console);
+  Result<SetupFile> setup = SetupFile::open(options.setup, &host);
+  if (!setup) return console.fail(setup.error());
+  CGlobalKvs& root = setup->model();
+  const int count = root.bathymetry->GetCount();
+  if (options.number < 2 || options.number > count)
+    return console.fail(
+        fmt::format("There is no area {} that could be moved: the setup has {}, of which the first lies "
+                    "where its file says",
+                    options.number, count));
+  if (root.bathymetry->hotStart == 1) return console.fail("A hot start file says itself where its area lies");
+  if (!*at && !options.snap && !options.enclosing)
+    return console.fail("Say where it lies, with --at J,K, or take that from the grids with --snap");
+  if (options.enclosing &&
+      (*options.enclosing < 1 || *options.enclosing > count || *options.enclosing == options.number))
+    return console.fail(fmt::format("Area {} can't lie in area {}", options.number, *options.enclosing));
+  if (options.enclosing) root.bathymetry->at(options.number).enclosingArea = *options.enclosing;
+  SetupMap map;
+  // A position that is not given is the one that the setup has.
+  const std::optional<GridPoint> held = *at ? *at : std::optional(root.bathymetry->at(options.number).origin);
+  if (const Outcome done = place(map, root, options.number, held, options.snap, console); !done)
+    return console.fail(done.error() + "; the setup is unchanged");
+  return finish(*setup, options, options.number, map, console);
+}
+
+int remove(const Options& options, const Console& console) {
+  ConsoleMessageHost host(console);
+  Result<SetupFile> setup = SetupFile::open(options.setup, &host);
+  if (!setup) return console.fail(setup.error());
+  CGlobalKvs& root = setup->model();
+  const int count = root.bathymetry->GetCount();
+  if (options.number < 1 || options.number > count)
+    return console.fail(fmt::format("There is no area {}: the setup has {}", options.number, count));
+  if (count == 1) return console.fail("A setup keeps one area at least");
+  // What is said of each area stands by its number.
+  if (options.number != count)
+    return console.fail(
+        fmt::format("Area {} can't be removed before those behind it: all that is set up for them stands by "
+                    "their numbers",
+                    options.number));
+  SetupMap map;
+  for (const MapFeature& feature : map.scene(root).features) {
+    if (feature.area == options.number)
+      console.note(fmt::format("\"{}\" of page {} stands on it", feature.label, feature.id.page));
+  }
+  root.bathymetry->SetNoAreas(count - 1);
+  if (const int status = saveSetup(*setup, options.setup, console); status != kClean) return status;
+  console.out << fmt::format("Area {} is removed; its grid file is left\n", options.number);
+  return kClean;
+}
+
+void addPosition(CLI::App& command, Options& options) {
+  command.add_option("--in", options.enclosing, "Number of the area that encloses it");
+  command.add_option("--at", options.at, "J,K: the point of that area at which its first point lies");
+  command.add_flag("--snap", options.snap,
+                   "Take the point from the coordinates of the grids, and say how far a given one is off");
+}
+
+}  // namespace
+
+void addArea(CLI::App& tool, Action& action) {
+  CLI::App& area = *tool.add_subcommand("area", "Adds, moves and removes nested areas");
+  area.require_subcommand(1);
+  std::shared_ptr<Options> options;
+  CLI::App& adding =
+      addCommand(area, action, "add", "Adds an area of a grid file (default: in area 1)", add, options);
+  adding.add_option("FILE", options->setup, "The setup")->required();
+  adding.add_option("GRID", options->grid, "The grid file (*.tsb2)")->required();
+  addPosition(adding, *options);
+  CLI::App& moving = addCommand(area, action, "move", "Places an area anew", move, options);
+  moving.add_option("FILE", options->setup, "The setup")->required();
+  moving.add_option("AREA", options->number, "Its number, from 2")->required();
+  addPosition(moving, *options);
+  CLI::App& removing = addCommand(area, action, "remove", "Removes the last area", remove, options);
+  removing.add_option("FILE", options->setup, "The setup")->required();
+  removing.add_option("AREA", options->number, "Its number")->required();
+}
+
+}  // namespace gridbay::cli

@@ -1,0 +1,63 @@
+#include <fmt/format.h>
+
+#include "cli/commands.h"
+#include "conversion/output_file.h"
+#include "conversion/vector_writer.h"
+#include "map/gis_export.h"
+#include "map/setup_map.h"
+
+namespace gridbay::cli {
+namespace {
+
+struct Options {
+  std::string setup;
+  std::string out;
+  bool force = false;
+};
+
+int exportGis(const Options& options, const Console& console) {
+  ConsoleMessageHost host(console);
+  Result<SetupFile> setup = SetupFile::open(options.setup, &host);
+  if (!setup) return console.fail(setup.error());
+  if (const Outcome free = mayWrite(options.out, options.force, {&options.setup, 1}, "--force"); !free)
+    return console.fail(free.error());
+  SetupMap map;
+  const MapScene& scene = map.scene(setup->model());
+  for (const MapArea& area : scene.areas) {
+    if (!area.isPlaced) console.note(area.fault);
+  }
+  if (scene.area(1) == nullptr || !scene.area(1)->isPlaced)
+    return console.fail("Without the grid of Area 1 nothing has a place on the map");
+  if (scene.projectionText.empty())
+    console.note("The grid of Area 1 names no projection: the layers have local coordinates");
+  int leftOut = 0;
+  const VectorFile file = gisLayers(setup->model(), scene, &leftOut);
+  for (const MapFeature& feature : scene.features) {
+    if (!feature.fault.empty())
+      console.note(fmt::format("Page {}, {}: {}", feature.id.page, feature.label, feature.fault));
+  }
+  if (const Outcome written = writeGeoPackage(options.out, file); !written)
+    return console.fail(written.error());
+  for (const VectorLayer& layer : file.layers)
+    console.out << fmt::format("{} {}\n", layer.name, layer.features.size());
+  if (leftOut > 0) console.note(fmt::format("Left out, as they can't be placed: {}", leftOut));
+  return kClean;
+}
+
+}  // namespace
+
+void addExport(CLI::App& tool, Action& action) {
+  CLI::App& exporting = *tool.add_subcommand("export", "Writes a setup for other programs");
+  exporting.require_subcommand(1);
+  std::shared_ptr<Options> options;
+  CLI::App& gis =
+      addCommand(exporting, action, "gis",
+                 "All that is placed, as a GeoPackage with a layer for each kind, in the projection "
+                 "of Area 1",
+                 exportGis, options);
+  gis.add_option("FILE", options->setup, "The setup")->required();
+  gis.add_option("OUT", options->out, "The file to write (*.gpkg)")->required();
+  addForce(gis, options->force);
+}
+
+}  // namespace gridbay::cli

@@ -1,0 +1,557 @@
+#include "map/setup_map.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <cmath>
+#include <limits>
+
+#include "basic/boundary.h"
+#include "basic/mass_budget.h"
+#include "basic/module_selection.h"
+#include "basic/source_sink.h"
+#include "core/edition.h"
+#include "hydrodynamic/result.h"
+#include "map/map_areas.h"
+#include "structures/line_structure.h"
+
+namespace gridbay {
+namespace {
+
+MapFeatureId idOf(MapKind kind, int number, PageId page) {
+  return {kind, number, static_cast<std::int32_t>(page)};
+}
+
+MapEdit refused(std::string fault) {
+  return {.fault = std::move(fault)};
+}
+
+std::string kindName(MapKind kind) {
+  switch (kind) {
+    case MapKind::boundary:
+      return "Boundary";
+    case MapKind::source:
+      return "Source";
+    case MapKind::massBudget:
+      return "Polygon";
+    case MapKind::dike:
+      return "Dike";
+    case MapKind::weir:
+      return "Weir";
+    case MapKind::culvert:
+      return "Culvert";
+    case MapKind::discharge:
+      return "Discharge line";
+    case MapKind::box:
+      return "Box";
+    default:
+      return "Output";
+  }
+}
+
+MapEdit made(MapFeatureId feature, std::string_view what) {
+  return {.page = static_cast<PageId>(feature.page),
+          .name = fmt::format("{} {}, {}", kindName(feature.kind), feature.number, what)};
+}
+
+std::string pointName(MapFeatureId feature, std::size_t vertex) {
+  if (feature.kind == MapKind::boundary) return vertex == 0 ? "First point" : "Last point";
+  return fmt::format("{} {}", feature.kind == MapKind::massBudget ? "Corner point" : "point", vertex + 1);
+}
+
+// What is wrong with points on grids; empty when nothing.
+std::string faultOf(const GridShape& shape, MapKind kind, const std::vector<MapArea>& areas) {
+  if (shape.points.empty()) return "There are no points";
+  if (kind == MapKind::boundary && shape.points[0].j != shape.points[1].j &&
+      shape.points[0].k != shape.points[1].k)
+    return "The boundary is parallel to neither axis of the grid";
+  // The border itself takes no part in a mass budget.
+  const std::int32_t margin = kind == MapKind::massBudget ? 1 : 0;
+  for (std::size_t i = 0; i < shape.points.size(); ++i) {
+    const std::int32_t number = shape.areas[i];
+    const GridPoint point = shape.points[i];
+    if (number < 1 || static_cast<std::size_t>(number) > areas.size())
+      return fmt::format("There is no area {}", number);
+    const MapArea& area = areas[static_cast<std::size_t>(number) - 1];
+    if (!area.isPlaced) return fmt::format("Area {} has no place on the map", number);
+    if (point.j < margin || point.k < margin || point.j >= area.nx - margin || point.k >= area.ny - margin)
+      return fmt::format("Point {} lies {} the grid of area {}, which has {} x {} points", pointText(point),
+                         margin == 0 ? "outside" : "outside, or on the border of,", number, area.nx, area.ny);
+    if (kind != MapKind::source) continue;
+    const MapPoint place = area.grid.at(point.j, point.k);
+    for (const MapArea& inner : areas) {
+      if (inner.number > 1 && inner.enclosing == number && pointAt(inner, place))
+        return fmt::format("Point {} of area {} is covered by area {}", pointText(point), number,
+                           inner.number);
+    }
+  }
+  return {};
+}
+
+constexpr std::array kOutputs{MapKind::outputMap, MapKind::outputLine, MapKind::outputPoints};
+
+bool isOutput(MapKind kind) {
+  return std::ranges::find(kOutputs, kind) != kOutputs.end();
+}
+
+}  // namespace
+
+GridPoint slideAlongBorder(double j, double k, std::int32_t nx, std::int32_t ny,
+                           std::optional<GridPoint> otherEnd) {
+  const auto within = [](double at, std::int32_t points) {
+    return std::clamp(static_cast<std::int32_t>(std::lround(std::clamp(at, -1.0, double(points)))), 0,
+                      points - 1);
+  };
+  const GridPoint nearest{within(j, nx), within(k, ny)};
+  const std::array<GridPoint, 4> candidates{
+      {{0, nearest.k}, {nx - 1, nearest.k}, {nearest.j, 0}, {nearest.j, ny - 1}}};
+  const auto holdsOther = [&](const GridPoint& at) {
+    if (!otherEnd) return true;
+    const bool alongK = (at.j == 0 || at.j == nx - 1) && otherEnd->j == at.j;
+    const bool alongJ = (at.k == 0 || at.k == ny - 1) && otherEnd->k == at.k;
+    return alongJ || alongK;
+  };
+  const bool isBound = std::ranges::any_of(candidates, holdsOther);
+  GridPoint best = nearest;
+  double least = std::numeric_limits<double>::max();
+  for (const GridPoint& candidate : candidates) {
+    const double distance = std::hypot(candidate.j - j, candidate.k - k);
+    if ((isBound && !holdsOther(candidate)) || distance >= least) continue;
+    least = distance;
+    best = candidate;
+  }
+  return best;
+}
+
+const MapScene& SetupMap::scene(CGlobalKvs& root) {
+  const std::string before = scene_.projectionText;
+  scene_.areas = placeAreas(*root.bathymetry, headers_, coordinates_);
+  scene_.projection = coordinates_.projection().Name();
+  scene_.projectionText = coordinates_.projection().Wkt();
+  if (scene_.projectionText != before) structures_.forget();
+  scene_.features.clear();
+  appendOnGrids(root);
+  structures_.append(root, coordinates_, scene_.areas, scene_.features);
+  return scene_;
+}
+
+void SetupMap::appendOnGrids(CGlobalKvs& root) {
+  for (ListedShape& listed : listedShapes(root)) {
+    const std::optional<GridShape> shape = shapeOf(root, listed.id);
+    if (!shape) continue;
+    MapFeature feature{.id = listed.id, .label = std::move(listed.label), .drive = listed.drive};
+    feature.row = listed.row;
+    feature.column = listed.column;
+    feature.area = shape->area();
+    feature.closed = shape->closed;
+    feature.joined = shape->joined;
+    feature.fault = faultOf(*shape, listed.id.kind, scene_.areas);
+    auto points = std::make_shared<std::vector<MapPoint>>();
+    for (std::size_t i = 0; i < shape->points.size(); ++i) {
+      const MapArea* area = scene_.area(shape->areas[i]);
+      if (area != nullptr && area->isPlaced)
+        points->push_back(area->grid.at(shape->points[i].j, shape->points[i].k));
+    }
+    feature.points = std::move(points);
+    scene_.features.push_back(std::move(feature));
+  }
+}
+
+std::optional<MapPick> SetupMap::pick(MapPoint place, std::int32_t area) const {
+  const std::int32_t number = area == 0 ? finestAt(scene_.areas, place) : area;
+  const MapArea* picked = scene_.area(number);
+  const auto point = picked == nullptr ? std::nullopt : pointAt(*picked, place);
+  return point ? std::optional(MapPick{number, *point}) : std::nullopt;
+}
+
+std::optional<std::array<double, 2>> SetupMap::geographic(MapPoint place) const {
+  double longitude = 0;
+  double latitude = 0;
+  if (coordinates_.isLocal() ||
+      !coordinates_.projection().Proj2Geo(place.east, place.north, &longitude, &latitude))
+    return std::nullopt;
+  return std::array{longitude, latitude};
+}
+
+AreaPlace SetupMap::previewMoveArea(CGlobalKvs& root, std::int32_t number, MapPoint first) {
+  return placeArea(*root.bathymetry, scene(root).areas, number, first);
+}
+
+MapEdit SetupMap::moveArea(CGlobalKvs& root, std::int32_t number, MapPoint first) {
+  const AreaPlace place = previewMoveArea(root, number, first);
+  if (place.nx == 0) return refused(place.fault);
+  if (root.bathymetry->hotStart == 1) return refused("A hot start file says itself where its area lies");
+  root.bathymetry->at(number).origin = place.origin;
+  return {.page = PageId::bathymetry, .name = fmt::format("Area {}, Origin", number)};
+}
+
+Result<AreaSnap> SetupMap::snapOf(CGlobalKvs& root, std::int32_t number) {
+  const MapArea* area = scene(root).area(number);
+  if (area == nullptr || number < 2)
+    return Failure{fmt::format("There is no area {} in another one", number)};
+  const MapArea* outer = scene_.area(area->enclosing);
+  if (outer == nullptr || !outer->isPlaced)
+    return Failure{fmt::format("Area {}, in which area {} is to lie, has no place on the map{}",
+                               area->enclosing, number,
+                               outer == nullptr || outer->fault.empty() ? "" : ": " + outer->fault)};
+  if (!area->isPlaced) return Failure{area->fault};
+  const auto there = ownPlace(headers_.of(area->file), coordinates_);
+  if (!there)
+    return Failure{
+        fmt::format("The files of areas 1 and {} do not both have coordinates of one kind: give the "
+                    "position as J,K",
+                    number)};
+  AreaSnap snap{outer->grid.pointOf(*there), {}};
+  constexpr double kFar = 1e9;
+  if (!(std::abs(snap.exact[0]) < kFar && std::abs(snap.exact[1]) < kFar))
+    return Failure{fmt::format("The file of area {} lies nowhere near area {}", number, outer->number)};
+  snap.nearest = {static_cast<std::int32_t>(std::lround(snap.exact[0])),
+                  static_cast<std::int32_t>(std::lround(snap.exact[1]))};
+  const auto offBy = [&](GridPoint point) {
+    const MapPoint place = outer->grid.at(point.j, point.k);
+    return std::hypot(place.east - there->east, place.north - there->north);
+  };
+  snap.offBy = offBy(snap.nearest);
+  snap.heldOffBy = offBy(area->origin);
+  return snap;
+}
+
+AreaPlace SetupMap::previewNestedArea(CGlobalKvs& root, MapPoint corner, MapPoint opposite) {
+  return placeNewArea(*root.bathymetry, scene(root).areas, corner, opposite);
+}
+
+std::string SetupMap::noMoreAreas(const CGlobalKvs& root) {
+  if (theEdition.wetlandSweepKit) return "This edition has one area";
+  if (root.bathymetry->overlandSolver) return "With the overland solver there is one area";
+  if (root.bathymetry->GetCount() < CBathymetryKvs::kMostAreas) return {};
+  return fmt::format("A setup has no more than {} areas", CBathymetryKvs::kMostAreas);
+}
+
+MapEdit SetupMap::addArea(CGlobalKvs& root, std::int32_t enclosing, GridPoint origin,
+                          const std::string& file) {
+  if (std::string fault = noMoreAreas(root); !fault.empty()) return refused(std::move(fault));
+  CBathymetryKvs& areas = *root.bathymetry;
+  const int number = areas.GetCount() + 1;
+  areas.SetNoAreas(number);
+  CBathymetryObjectKvs& area = areas.at(number);
+  area.enclosingArea = enclosing;
+  area.origin = origin;
+  area.fileName = file;
+  return {.page = PageId::bathymetry, .name = fmt::format("New area {}", number)};
+}
+
+SetupMap::Shaped SetupMap::shaped(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex,
+                                  MapPoint place) {
+  Shaped result;
+  std::optional<GridShape> shape = shapeOf(root, feature);
+  if (!shape || vertex >= shape->points.size()) {
+    result.fault = fmt::format("{} {} has no point {}", kindName(feature.kind), feature.number, vertex + 1);
+    return result;
+  }
+  std::vector<GridPoint>& points = shape->points;
+  // A source goes to the finest area there; what belongs to one area stays in it.
+  if (feature.kind == MapKind::source) {
+    const auto there = pick(place, 0);
+    if (!there) {
+      result.fault = "There is no area";
+      return result;
+    }
+    shape->areas[vertex] = there->area;
+    points[vertex] = there->point;
+  } else {
+    const MapArea* area = scene_.area(shape->area());
+    if (area == nullptr || !area->isPlaced) {
+      result.fault = fmt::format("Area {} has no place on the map", shape->area());
+      return result;
+    }
+    const auto [j, k] = area->grid.pointOf(place);
+    if (feature.kind == MapKind::boundary) {
+      points[vertex] = slideAlongBorder(j, k, area->nx, area->ny, points[1 - vertex]);
+    } else {
+      const auto point = pointAt(*area, place);
+      if (!point) {
+        result.fault = fmt::format("Area {} does not reach there", area->number);
+        return result;
+      }
+      points[vertex] = *point;
+      // An output along a line follows the axis along which it is longer.
+      if (feature.kind == MapKind::outputLine) {
+        const GridPoint other = points[1 - vertex];
+        const bool alongJ = std::abs(point->j - other.j) >= std::abs(point->k - other.k);
+        (alongJ ? points[vertex].k : points[vertex].j) = alongJ ? other.k : other.j;
+      }
+    }
+  }
+  result.point = points[vertex];
+  if (feature.kind == MapKind::outputMap || feature.kind == MapKind::box)
+    points = rectangleOf(points[vertex], points[(vertex + 2) % points.size()]);
+  result.shape = std::move(*shape);
+  result.fault = faultOf(result.shape, feature.kind, scene_.areas);
+  return result;
+}
+
+VertexPlace SetupMap::previewVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex,
+                                    MapPoint place) {
+  scene(root);
+  if (isStructure(feature.kind)) return {place, std::nullopt, {}};
+  const Shaped result = shaped(root, feature, vertex, place);
+  if (result.shape.points.empty()) return {place, std::nullopt, result.fault};
+  const std::int32_t number =
+      feature.kind == MapKind::source ? result.shape.areas[vertex] : result.shape.area();
+  return {scene_.area(number)->grid.at(result.point.j, result.point.k), result.point, result.fault};
+}
+
+MapEdit SetupMap::moveVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place) {
+  scene(root);
+  if (isStructure(feature.kind)) {
+    if (feature.number < 1 || feature.number > structureCount(root, feature.kind))
+      return refused(fmt::format("There is no {} {}", kindName(feature.kind), feature.number));
+    const StructureLine line = structureLine(root, feature.kind, feature.number);
+    if (vertex >= line.points.size())
+      return refused(fmt::format("\"{}\" has no point {}", line.name, vertex + 1));
+    std::vector<MapPoint> own{place};
+    if (const std::string fault = coordinates_.fromMap(line.projection, own); !fault.empty())
+      return refused(fmt::format("\"{}\" {}", line.name, fault));
+    moveStructurePoint(root, feature.kind, feature.number, vertex, own.front());
+    return made(feature, pointName(feature, vertex));
+  }
+  if (feature.kind == MapKind::boundary && !root.boundary->isUserSpecified())
+    return refused("The boundaries are found by the program; choose \"User specified\" on their page first");
+  const Shaped result = shaped(root, feature, vertex, place);
+  if (result.shape.points.empty()) return refused(result.fault);
+  giveShape(root, feature, result.shape);
+  return made(feature, pointName(feature, vertex));
+}
+
+MapEdit SetupMap::insertVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place) {
+  scene(root);
+  return insertPoint(root, feature, vertex, place);
+}
+
+MapEdit SetupMap::insertPoint(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place) {
+  if (isStructure(feature.kind)) {
+    if (feature.number < 1 || feature.number > structureCount(root, feature.kind))
+      return refused(fmt::format("There is no {} {}", kindName(feature.kind), feature.number));
+    const StructureLine line = structureLine(root, feature.kind, feature.number);
+    if (vertex > line.points.size())
+      return refused(fmt::format("\"{}\" has {} points", line.name, line.points.size()));
+    if (feature.kind != MapKind::dike && line.points.size() >= LineStructure::kMostPoints)
+      return refused(fmt::format("A line has no more than {} points", LineStructure::kMostPoints));
+    std::vector<MapPoint> own{place};
+    if (const std::string fault = coordinates_.fromMap(line.projection, own); !fault.empty())
+      return refused(fmt::format("\"{}\" {}", line.name, fault));
+    insertStructurePoint(root, feature.kind, feature.number, vertex, own.front());
+    return made(feature, "new point");
+  }
+  std::optional<GridShape> shape = shapeOf(root, feature);
+  if (!shape || !shapeRule(feature.kind).canGrow || shape->joined == (feature.kind == MapKind::outputPoints))
+    return refused(fmt::format("{} {} takes no further points", kindName(feature.kind), feature.number));
+  if (feature.kind == MapKind::outputPoints) {
+    const bool isOfFlow = feature.page == static_cast<std::int32_t>(PageId::hdResult);
+    const auto* output = isOfFlow ? root.nhdResult->outputs.GetItem(feature.number) : nullptr;
+    if (output == nullptr || output->type != CNhdResultObjectKvs::kPoints)
+      return refused("An output of ranges has no further points");
+  }
+  const MapArea* area = scene_.area(shape->area());
+  const auto point = area == nullptr ? std::nullopt : pointAt(*area, place);
+  if (!point) return refused(fmt::format("Area {} does not reach there", shape->area()));
+  const std::size_t before = std::min(vertex, shape->points.size());
+  const std::int32_t number = shape->area();
+  shape->points.insert(shape->points.begin() + static_cast<std::ptrdiff_t>(before), *point);
+  shape->areas.assign(shape->points.size(), number);
+  giveShape(root, feature, *shape);
+  return made(feature, "new point");
+}
+
+MapEdit SetupMap::removeVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex) {
+  const ShapeRule rule = shapeRule(feature.kind);
+  const auto tooFew = [&] {
+    return refused(
+        fmt::format("{} {} keeps {} points at least", kindName(feature.kind), feature.number, rule.least));
+  };
+  if (isStructure(feature.kind)) {
+    if (feature.number < 1 || feature.number > structureCount(root, feature.kind))
+      return refused(fmt::format("There is no {} {}", kindName(feature.kind), feature.number));
+    const std::size_t count = structureLine(root, feature.kind, feature.number).points.size();
+    if (vertex >= count) return refused(fmt::format("There is no point {}", vertex + 1));
+    if (count <= rule.least) return tooFew();
+    removeStructurePoint(root, feature.kind, feature.number, vertex);
+    return made(feature, "point removed");
+  }
+  std::optional<GridShape> shape = shapeOf(root, feature);
+  if (!shape || vertex >= shape->points.size())
+    return refused(fmt::format("{} {} has no point {}", kindName(feature.kind), feature.number, vertex + 1));
+  if (!rule.canGrow || shape->points.size() <= rule.least) return tooFew();
+  shape->points.erase(shape->points.begin() + static_cast<std::ptrdiff_t>(vertex));
+  shape->areas.pop_back();
+  giveShape(root, feature, *shape);
+  return made(feature, "point removed");
+}
+
+MapEdit SetupMap::addFeature(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points) {
+  scene(root);
+  return isStructure(kind) ? addStructure(root, kind, points) : addOnGrid(root, kind, points);
+}
+
+MapEdit SetupMap::addStructure(CGlobalKvs& root, MapKind kind, std::vector<MapPoint> points) {
+  const int number = structureCount(root, kind) + 1;
+  if (points.size() < 2) return refused("A line has two points at least");
+  if (number > LineStructure::kMost)
+    return refused(fmt::format("There are no more than {} of them", LineStructure::kMost));
+  if (kind != MapKind::dike && points.size() > LineStructure::kMostPoints)
+    return refused(fmt::format("A line has no more than {} points", LineStructure::kMostPoints));
+  setStructureCount(root, kind, number);
+  // A new one stands in the projection of the map, whatever that of the setup's other structures is.
+  const std::string local = CVdMapProjection::IDtoProjectionString(1);
+  giveProjection(root, kind, number,
+                 coordinates_.isLocal() ? local : coordinates_.projection().GetProjectionString());
+  for (std::size_t i = structureLine(root, kind, number).points.size(); i > 0; --i)
+    removeStructurePoint(root, kind, number, i - 1);
+  for (std::size_t i = 0; i < points.size(); ++i) insertStructurePoint(root, kind, number, i, points[i]);
+  return {.page = pageOfStructure(kind), .name = fmt::format("New {}", kindName(kind))};
+}
+
+MapEdit SetupMap::addOnGrid(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points) {
+  if (points.empty()) return refused("There are no points");
+  const auto outer = pick(points.front(), 1);
+  // What the outermost area alone has.
+  const auto onOuter = [&](std::size_t least) {
+    if (points.size() < least) return fmt::format("{} points are needed", least);
+    const bool isInside =
+        std::ranges::all_of(points, [this](MapPoint point) { return pick(point, 1).has_value(); });
+    return isInside ? std::string() : std::string("Area 1 does not reach there");
+  };
+  if (kind == MapKind::boundary) {
+    CBoundaryKvs& list = *root.boundary;
+    const MapArea* area = scene_.area(1);
+    if (!list.isUserSpecified())
+      return refused(
+          "The boundaries are found by the program; choose \"User specified\" on their page first");
+    if (area == nullptr || !area->isPlaced) return refused("Area 1 has no place on the map");
+    if (points.size() < 2) return refused("2 points are needed");
+    if (list.GetCount() >= CBoundaryKvs::kMostOnPage)
+      return refused(fmt::format("There are no more than {} boundaries", CBoundaryKvs::kMostOnPage));
+    const auto [j, k] = area->grid.pointOf(points[0]);
+    const auto [lastJ, lastK] = area->grid.pointOf(points[1]);
+    const GridPoint first = slideAlongBorder(j, k, area->nx, area->ny, {});
+    list.SetNoBoundaries(list.GetCount() + 1);
+    CBoundaryObjectKvs& boundary = list.at(list.GetCount());
+    boundary.first = first;
+    boundary.last = slideAlongBorder(lastJ, lastK, area->nx, area->ny, first);
+    return {.page = PageId::boundary, .name = "New boundary"};
+  }
+  if (kind == MapKind::source) {
+    CSourceSinkKvs& list = *root.sourceSink;
+    const auto first = pick(points.front(), 0);
+    const auto second = points.size() > 1 ? pick(points[1], 0) : first;
+    if (!first || !second) return refused("There is no area");
+    if (list.GetCount() >= CSourceSinkKvs::kMostSources)
+      return refused(fmt::format("There are no more than {} sources", CSourceSinkKvs::kMostSources));
+    list.SetNoSources(list.GetCount() + 1);
+    CSourceSinkObjectKvs& source = list.at(list.GetCount());
+    source.type = points.size() > 1 ? CSourceSinkObjectKvs::kPair : CSourceSinkObjectKvs::kIsolatedSource;
+    source.source = first->point;
+    source.sourceArea = first->area;
+    source.sink = second->point;
+    source.sinkArea = second->area;
+    return {.page = PageId::sourceAndSink, .name = "New source"};
+  }
+  if (kind == MapKind::massBudget) {
+    CMassBudgetKvs& list = *root.massBudget;
+    if (!root.moduleSelection->HasMassBudget())
+      return refused("Mass budgets need a transport module with a scheme that keeps them");
+    if (points.size() < shapeRule(kind).least) return refused("A polygon has three corners at least");
+    if (list.GetCount() >= CMassBudgetKvs::kMostOnPage)
+      return refused(fmt::format("There are no more than {} polygons", CMassBudgetKvs::kMostOnPage));
+    // In the finest area that holds all of it.
+    std::int32_t number = 0;
+    for (const MapArea& area : scene_.areas) {
+      const bool holds =
+          std::ranges::all_of(points, [&](MapPoint point) { return pointAt(area, point).has_value(); });
+      if (holds && (number == 0 || area.level >= scene_.area(number)->level)) number = area.number;
+    }
+    if (number == 0) return refused("No area holds the whole polygon");
+    list.SetNoPolygons(list.GetCount() + 1);
+    CMassBudgetItemKvs& polygon = list.at(list.GetCount());
+    polygon.associatedArea = number;
+    polygon.corners.clear();
+    for (const MapPoint point : points) polygon.corners.push_back(*pointAt(*scene_.area(number), point));
+    return {.page = PageId::massBudget, .name = "New polygon"};
+  }
+  if (isOutput(kind)) {
+    CNhdResultKvs& results = *root.nhdResult;
+    const std::size_t least = kind == MapKind::outputPoints ? 1 : 2;
+    if (const std::string fault = onOuter(least); !fault.empty()) return refused(fault);
+    if (results.outputs.GetCount() >= CNhdResultKvs::kMostOutputs)
+      return refused(fmt::format("There are no more than {} outputs", CNhdResultKvs::kMostOutputs));
+    const GridPoint first = outer->point;
+    GridPoint last = pick(points.back(), 1)->point;
+    if (kind == MapKind::outputMap && (first.j == last.j || first.k == last.k))
+      return refused("The rectangle is narrower than the grid's cells");
+    if (kind == MapKind::outputLine) {
+      const bool alongJ = std::abs(first.j - last.j) >= std::abs(first.k - last.k);
+      (alongJ ? last.k : last.j) = alongJ ? first.k : first.j;
+      if (first == last) return refused("The line is shorter than the grid's cells");
+    }
+    results.outputs.SetCount(results.outputs.GetCount() + 1);
+    const int number = results.outputs.GetCount();
+    CNhdResultObjectKvs& output = results.outputs.at(number);
+    output.TakeWhole();
+    if (kind == MapKind::outputPoints) {
+      output.type = CNhdResultObjectKvs::kPoints;
+    } else {
+      output.type = kind == MapKind::outputMap ? CNhdResultObjectKvs::kMap : CNhdResultObjectKvs::kLine;
+    }
+    GridShape shape;
+    if (kind == MapKind::outputPoints) {
+      for (const MapPoint point : points) shape.points.push_back(pick(point, 1)->point);
+    } else {
+      shape.points = {first, last};
+    }
+    shape.areas.assign(shape.points.size(), 1);
+    giveShape(root, idOf(kind, number, PageId::hdResult), shape);
+    return {.page = PageId::hdResult, .name = "New output"};
+  }
+  return refused(fmt::format("A {} can't be drawn on the map", kindName(kind)));
+}
+
+MapEdit SetupMap::removeFeature(CGlobalKvs& root, MapFeatureId feature) {
+  const int number = feature.number;
+  const auto gone = [&](PageId page) {
+    return MapEdit{.page = page, .name = fmt::format("{} {} removed", kindName(feature.kind), number)};
+  };
+  // What else is said of these stands under their numbers, so that the last one alone can go.
+  const auto removeLast = [&](int count, PageId page, const std::function<void()>& remove) {
+    if (number != count) return refused(fmt::format("Only the last one, {}, can be removed", count));
+    remove();
+    return gone(page);
+  };
+  if (isStructure(feature.kind)) {
+    if (number < 1 || number > structureCount(root, feature.kind))
+      return refused(fmt::format("There is no {} {}", kindName(feature.kind), number));
+    removeStructure(root, feature.kind, number);
+    return gone(pageOfStructure(feature.kind));
+  }
+  if (!shapeOf(root, feature))
+    return refused(fmt::format("There is no {} {}", kindName(feature.kind), number));
+  switch (feature.kind) {
+    case MapKind::boundary:
+      if (!root.boundary->isUserSpecified()) return refused("The boundaries are found by the program");
+      return removeLast(root.boundary->GetCount(), PageId::boundary,
+                        [&] { root.boundary->SetNoBoundaries(number - 1); });
+    case MapKind::source:
+      return removeLast(root.sourceSink->GetCount(), PageId::sourceAndSink,
+                        [&] { root.sourceSink->SetNoSources(number - 1); });
+    case MapKind::massBudget:
+      return removeLast(root.massBudget->GetCount(), PageId::massBudget,
+                        [&] { root.massBudget->SetNoPolygons(number - 1); });
+    default:
+      break;
+  }
+  if (feature.page == static_cast<std::int32_t>(PageId::hdResult))
+    return removeLast(root.nhdResult->outputs.GetCount(), PageId::hdResult,
+                      [&] { root.nhdResult->outputs.SetCount(number - 1); });
+  return refused("It is removed on its page");
+}
+
+}  // namespace gridbay

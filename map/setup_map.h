@@ -1,0 +1,85 @@
+#pragma once
+
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "core/page_id.h"
+#include "map/grid_headers.h"
+#include "map/grid_shapes.h"
+#include "map/map_coordinates.h"
+#include "map/map_editor.h"
+#include "map/structure_lines.h"
+#include "platform/result.h"
+#include "setup/global_kvs.h"
+
+namespace gridbay {
+
+// What an edit on the map came to: why it can't be done, or the page and the name of the step.
+struct MapEdit {
+  std::string fault{};
+  PageId page = PageId::none;
+  std::string name{};
+};
+
+// Where the coordinates of an area's own file put its first point in its enclosing area.
+struct AreaSnap {
+  std::array<double, 2> exact;  // J and K
+  GridPoint nearest;
+  double offBy = 0;      // from there to the nearest point (metres)
+  double heldOffBy = 0;  // to the point that the setup names
+};
+
+// A model on a map, and the edits there (see MapEditor), with no document around it. What is read from files
+// is kept from one call to the next.
+class SetupMap {
+ public:
+  const MapScene& scene(CGlobalKvs& root);
+  std::optional<MapPick> pick(MapPoint place, std::int32_t area) const;
+  std::optional<std::array<double, 2>> geographic(MapPoint place) const;
+
+  AreaPlace previewMoveArea(CGlobalKvs& root, std::int32_t number, MapPoint first);
+  MapEdit moveArea(CGlobalKvs& root, std::int32_t number, MapPoint first);
+  // By the coordinates of the grids; an error where they have none.
+  Result<AreaSnap> snapOf(CGlobalKvs& root, std::int32_t number);
+  AreaPlace previewNestedArea(CGlobalKvs& root, MapPoint corner, MapPoint opposite);
+  // Why the setup can't have another area; empty where it can.
+  static std::string noMoreAreas(const CGlobalKvs& root);
+  // Another area at the end of the list, of a grid file that lies there.
+  MapEdit addArea(CGlobalKvs& root, std::int32_t enclosing, GridPoint origin, const std::string& file);
+
+  VertexPlace previewVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place);
+  MapEdit moveVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place);
+  MapEdit insertVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place);
+  MapEdit removeVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex);
+  MapEdit addFeature(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points);
+  MapEdit removeFeature(CGlobalKvs& root, MapFeatureId feature);
+
+  GridHeaders& headers() { return headers_; }
+  MapCoordinates& coordinates() { return coordinates_; }
+
+ private:
+  // The points that an edit of one of them leads to; empty with a fault.
+  struct Shaped {
+    GridShape shape;
+    GridPoint point;
+    std::string fault;
+  };
+  Shaped shaped(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place);
+  MapEdit insertPoint(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place);
+  MapEdit addOnGrid(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points);
+  MapEdit addStructure(CGlobalKvs& root, MapKind kind, std::vector<MapPoint> points);
+  void appendOnGrids(CGlobalKvs& root);
+
+  GridHeaders headers_;
+  MapCoordinates coordinates_;
+  StructureLines structures_;
+  MapScene scene_;
+};
+
+// The point of the border of a grid to which the end of a boundary slides: on an edge that holds the other
+// end, where there is one.
+GridPoint slideAlongBorder(double j, double k, std::int32_t nx, std::int32_t ny,
+                           std::optional<GridPoint> otherEnd);
+
+}  // namespace gridbay
