@@ -4,11 +4,13 @@
 #include <unistd.h>
 
 #include <QApplication>
+#include <QElapsedTimer>
 #include <QFile>
 #include <QProcess>
 #include <QScrollBar>
 #include <QTemporaryDir>
 #include <QTextStream>
+#include <cmath>
 
 #include "platform/tsb/tsb_writer.h"
 #include "platform/units/units.h"
@@ -84,6 +86,7 @@ class Window {
     QApplication::processEvents();
   }
   DocumentTab& tab() { return *window_.currentDocument(); }
+  MapDock& map() { return window_.map(); }
 
  private:
   MainWindow window_;
@@ -241,6 +244,157 @@ void openBigMap(benchmark::State& state) {
   }
 }
 
+// Nine areas of 10,000 x 10,000 points, each a third of the one around it in spacing and extent, on one file.
+class NinePlaces {
+ public:
+  static constexpr std::size_t kPoints = 10000;
+  static constexpr int kAreas = 9;
+
+  // A step of the enclosing grid is three of the nested one's.
+  static NinePlaces& instance() {
+    static NinePlaces made;
+    return made;
+  }
+  QString setup() const { return folder_.filePath("nine.v27"); }
+  std::string grid(int area) const {
+    return folder_.filePath(QString("grid%1.tsb2").arg(area)).toStdString();
+  }
+
+ private:
+  NinePlaces() {
+    for (int area = 1; area <= kAreas; ++area) {
+      const double spacing = 6561 / std::pow(3, area - 1);
+      TsbDefinition definition;
+      definition.axes = {{.points = kPoints, .spacing = spacing}, {.points = kPoints, .spacing = spacing}};
+      definition.items = {{.name = "Bathymetry", .type = item::kBathymetry, .unit = "m"}};
+      definition.customBlocks = {{"V27_Misc", {0, 0, 0, 10, 0, 0, 0}}};
+      Result<TsbWriter> writer = TsbWriter::create(grid(area), definition);
+      constexpr std::size_t kRows = 100;
+      std::vector<float> rows(kPoints * kRows);
+      for (std::size_t k = 0; k < kPoints; k += kRows) {
+        for (std::size_t i = 0; i < rows.size(); ++i)
+          rows[i] = -20.0F * static_cast<float>(std::sin(static_cast<double>(i % kPoints) / 900) +
+                                                std::cos(static_cast<double>(k + i / kPoints) / 700));
+        if (!writer || !writer->writeRows(1, 0, k, rows)) qFatal("the grid could not be written");
+      }
+      if (!writer->commit()) qFatal("the grid could not be written");
+    }
+    QStringList arguments{"new", setup()};
+    for (int area = 1; area <= kAreas; ++area)
+      arguments << "--area" << QString::fromStdString(grid(area)) + (area > 1 ? "@3300,3300" : "");
+    if (QProcess::execute(QCoreApplication::applicationDirPath() + "/v27setup", arguments) != 0)
+      qFatal("the setup cannot be made");
+  }
+  QTemporaryDir folder_;
+};
+
+void waitFor(const MapCanvas& canvas) {
+  while (!canvas.isSettled()) QApplication::processEvents(QEventLoop::AllEvents, 1);
+}
+
+// From the setup that is open until the whole map of its nine areas has been painted in full. "first" is the
+// first time of all, with all files to be looked at (milliseconds).
+void mapFirstPicture(benchmark::State& state) {
+  Window window(NinePlaces::instance().setup());
+  MapEditor& editor = window.tab().editor().map();
+  double first = 0;
+  for (auto _ : state) {
+    QElapsedTimer timer;
+    timer.start();
+    MapCanvas canvas(nullptr);
+    canvas.resize(700, 600);
+    canvas.show();
+    canvas.showMap(&editor);
+    waitFor(canvas);
+    if (canvas.grab().isNull()) state.SkipWithError("nothing was painted");
+    if (canvas.terrain().size() != NinePlaces::kAreas) state.SkipWithError("the areas are not all there");
+    if (first == 0) first = static_cast<double>(timer.nsecsElapsed()) * 1e-6;
+  }
+  state.counters["first"] = first;
+}
+
+// As many values of the same grids as the picture above has read, and no more.
+void mapPlainRead(benchmark::State& state) {
+  const QSize picture(700, 600);
+  for (auto _ : state) {
+    float sum = 0;
+    for (int area = 1; area <= NinePlaces::kAreas; ++area) {
+      const Result<StoredGrid> grid = StoredGrid::open(NinePlaces::instance().grid(area), 1);
+      const auto rows = static_cast<std::size_t>(picture.height() / std::pow(3, area - 1)) + 1;
+      std::vector<float> row(NinePlaces::kPoints);
+      for (std::size_t r = 0; r < rows; ++r) {
+        if (!grid || !grid->read(r * (NinePlaces::kPoints - 1) / rows, 0, row))
+          state.SkipWithError("not read");
+        sum += row[r];
+      }
+    }
+    benchmark::DoNotOptimize(sum);
+  }
+}
+
+// One frame of a pan and of a zoom, painted, while the finer picture is made beside it.
+void mapPan(benchmark::State& state) {
+  Window window(NinePlaces::instance().setup());
+  MapCanvas& canvas = window.map().canvas();
+  window.map().show();
+  waitFor(canvas);
+  int step = 0;
+  for (auto _ : state) {
+    MapFrame frame = canvas.frame();
+    ++step;
+    frame.pan(QPointF(step / 40 % 2 == 0 ? 7 : -7, step / 80 % 2 == 0 ? 3 : -3));
+    canvas.setFrame(frame);
+    canvas.repaint();
+    QApplication::processEvents();
+  }
+}
+
+void mapZoom(benchmark::State& state) {
+  Window window(NinePlaces::instance().setup());
+  MapCanvas& canvas = window.map().canvas();
+  window.map().show();
+  waitFor(canvas);
+  int step = 0;
+  for (auto _ : state) {
+    MapFrame frame = canvas.frame();
+    frame.zoom(step++ / 60 % 2 == 0 ? 1.05 : 1 / 1.05, {300, 260});
+    canvas.setFrame(frame);
+    canvas.repaint();
+    QApplication::processEvents();
+  }
+}
+
+// A frame with 1,000 dikes, weirs and culverts in view.
+void mapOfStructures(benchmark::State& state) {
+  Window window;
+  MapDock& map = window.map();
+  map.show();
+  MapEditor& editor = window.tab().editor().map();
+  const MapArea& area = *editor.scene().area(1);
+  const MapGrid grid = area.grid;
+  for (int i = 0; i < 1000; ++i) {
+    std::vector<MapPoint> points;
+    for (int n = 0; n < 20; ++n)
+      points.push_back(grid.at(5 + i % 40 * 2.5 + n * 0.1, 5 + i / 40 * 3 + n % 3));
+    const MapKind kind = i % 3 == 0 ? MapKind::dike : i % 3 == 1 ? MapKind::weir : MapKind::culvert;
+    if (!editor.addFeature(kind, points).empty()) state.SkipWithError("no place for a structure");
+  }
+  map.canvas().refresh();
+  waitFor(map.canvas());
+  int step = 0;
+  for (auto _ : state) {
+    MapFrame frame = map.canvas().frame();
+    frame.pan(QPointF(step++ / 40 % 2 == 0 ? 3 : -3, 0));
+    map.canvas().setFrame(frame);
+    map.canvas().repaint();
+  }
+}
+
+BENCHMARK(mapFirstPicture)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(mapPlainRead)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(mapPan)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(mapZoom)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(mapOfStructures)->Unit(benchmark::kMillisecond)->UseRealTime();
 BENCHMARK(openBigMap)->Unit(benchmark::kMillisecond);
 BENCHMARK(firstWindow)->Unit(benchmark::kMillisecond)->UseRealTime();
 BENCHMARK(pageSwitch)->Unit(benchmark::kMillisecond);

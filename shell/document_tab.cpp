@@ -68,6 +68,7 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
   connect(summary_, &SummaryView::checkWanted, this, [this] { runCommand(kValidate); });
   fillTree();
   showFirstView();
+  connect(pane_, &PagePane::rowChosen, this, &DocumentTab::rowChosen);
   connect(filter_, &QLineEdit::textChanged, this, [this] { applyVisibility(); });
   connect(tree_, &QTreeWidget::currentItemChanged, this, [this] { showCurrentPage(); });
   connect(&watcher_, &QFileSystemWatcher::fileChanged, this, [this] {
@@ -168,6 +169,11 @@ bool DocumentTab::goToPage(std::int32_t id) {
   return true;
 }
 
+void DocumentTab::goToRow(std::int32_t page, int row, int column) {
+  if (currentPage() != page && !goToPage(page)) return;
+  if (row > 0) pane_->showCell(row, column);
+}
+
 void DocumentTab::goToNeighbour(int direction) {
   QTreeWidgetItem* node = tree_->currentItem();
   if (node != nullptr) node = direction > 0 ? tree_->itemBelow(node) : tree_->itemAbove(node);
@@ -227,6 +233,7 @@ void DocumentTab::showCurrentPage() {
   }
   cover_->setVisible(form == nullptr);
   pane_->setVisible(form != nullptr);
+  emit rowChosen(0);
 }
 
 QString DocumentTab::name() const {

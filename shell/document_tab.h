@@ -64,6 +64,10 @@ class DocumentTab final : public QSplitter, public SetupHost {
   // Selects the tree item of a page, and ends a search that hides it; false when the page does not apply.
   bool goToPage(std::int32_t id);
   void goToNeighbour(int direction);
+  // A page, and a cell (from 1; column 0 for any) of its first table that has it; row 0 for the page alone.
+  void goToRow(std::int32_t page, int row, int column);
+  // The row (from 1) of the page that is at work; 0 for none.
+  int currentRow() const { return pane_->currentRow(); }
   // The item that is selected; 0 for none.
   std::int32_t currentPage() const;
   QString caption(std::int32_t id) const;
@@ -103,6 +107,8 @@ class DocumentTab final : public QSplitter, public SetupHost {
 
  signals:
   void documentChanged();
+  // Another page, or another row (from 1, 0 for none) of it.
+  void rowChosen(int row);
   // The setup was checked, or there is another one whose check is not known.
   void checked();
   void saved();

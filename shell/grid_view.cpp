@@ -416,6 +416,14 @@ void GridView::currentChanged(const QModelIndex& current, const QModelIndex& pre
   currentRow_ = row;
   model_->grid().OnCurrentRow(row);
   emit edited();
+  emit rowChosen(row);
+}
+
+void GridView::goTo(int row, int column) {
+  const bool outer = std::exchange(movingByKeys_, true);
+  setCurrentIndex(model_->index(row, column));
+  movingByKeys_ = outer;
+  scrollTo(currentIndex());
 }
 
 // To come here by Tab makes a cell the current one, and opens none. The focus that a closed editor gives back

@@ -21,6 +21,8 @@ class GridView final : public QTableView {
   // Whether it takes the width that is left over; a table of numbers alone has no use for it.
   void setStretches(bool stretches);
   GridModel& cells() { return *model_; }
+  // Makes a cell (from 0) the current one, and opens no editor.
+  void goTo(int row, int column);
   // Hands over what is typed in a cell and not yet entered.
   void commitEdit();
 
@@ -34,6 +36,8 @@ class GridView final : public QTableView {
  signals:
   // The model, or the current row, has changed.
   void edited();
+  // Another row (from 1, 0 for none) is the current one.
+  void rowChosen(int row);
 
  protected:
   bool edit(const QModelIndex& index, EditTrigger trigger, QEvent* event) override;

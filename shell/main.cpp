@@ -3,6 +3,7 @@
 #include <QDir>
 #include <QMessageBox>
 #include <QPixmap>
+#include <functional>
 
 #include "shell/appearance.h"
 #include "shell/main_window.h"
@@ -21,8 +22,37 @@ void openFiles(MainWindow& window, const QStringList& paths) {
   }
 }
 
-// Pictures of the start view, of a setup's first view and each page that its tree shows, of the help, and of
-// each data file that is open.
+// Pictures of the map beside the page of its areas, and of the innermost area with its cells.
+void takeMaps(MainWindow& window, const std::function<void(const QString&)>& take) {
+  constexpr int kWidth = 760;
+  constexpr int kInView = 40;  // cells
+  constexpr std::int32_t kAreas = 27;
+  MapCanvas& canvas = window.map().canvas();
+  const auto settle = [&canvas] {
+    do {
+      QApplication::processEvents(QEventLoop::AllEvents, 10);
+    } while (!canvas.isSettled());
+  };
+  const QSize before = window.size();
+  window.resize(1500, 860);
+  window.map().show();
+  window.resizeDocks({&window.map()}, {kWidth}, Qt::Horizontal);
+  window.currentDocument()->goToRow(kAreas, 2, 0);
+  settle();
+  take("map");
+  const std::vector<gridbay::MapArea>& areas = canvas.scene().areas;
+  if (!areas.empty() && areas.back().isPlaced) {
+    const gridbay::MapArea& area = areas.back();
+    canvas.setFrame({area.grid.at(area.nx / 3.0, area.ny / 2.0), area.dx * kInView / canvas.width(), {}});
+    settle();
+    take("map-cells");
+  }
+  window.map().hide();
+  window.resize(before);
+}
+
+// Pictures of the start view, of a setup's first view and each page that its tree shows, of the map, of the
+// help, and of each data file that is open.
 void takeScreenshots(MainWindow& window, const QStringList& paths, const QString& folder) {
   const auto take = [&window, &folder](const QString& name) {
     QApplication::processEvents();
@@ -47,6 +77,7 @@ void takeScreenshots(MainWindow& window, const QStringList& paths, const QString
     QApplication::processEvents();
     data->grab().save(QString("%1/data-%2.png").arg(folder, data->windowTitle()));
   }
+  takeMaps(window, take);
 }
 
 }  // namespace

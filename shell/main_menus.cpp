@@ -79,6 +79,7 @@ QMenu* MainWindow::buildViewMenu() {
   });
   view->addSeparator();
   for (QDockWidget* dock : findChildren<QDockWidget*>()) view->addAction(dock->toggleViewAction());
+  view->addAction(map_->pickAction());
   return view;
 }
 

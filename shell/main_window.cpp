@@ -51,6 +51,7 @@ MainWindow::MainWindow(std::vector<std::unique_ptr<EditorLibrary>> libraries)
     rebuildWindowMenu();
     refreshActions();
     messages_->showCheckOf(currentDocument());
+    map_->showDocument(currentDocument());
     showTabsOrStart();
   });
   recoveryTimer_.setSingleShot(true);
@@ -61,6 +62,7 @@ MainWindow::MainWindow(std::vector<std::unique_ptr<EditorLibrary>> libraries)
 // Documents go before the libraries that their code is in.
 MainWindow::~MainWindow() {
   disconnect(tabs_, nullptr, this, nullptr);
+  map_->showDocument(nullptr);
   while (tabs_->count() > 0) {
     QWidget* tab = tabs_->widget(0);
     tabs_->removeTab(0);
@@ -86,6 +88,11 @@ void MainWindow::buildDocks() {
   help_ = new HelpDock(this);
   addDockWidget(Qt::RightDockWidgetArea, help_);
   help_->hide();
+
+  map_ = new MapDock(this);
+  addDockWidget(Qt::RightDockWidgetArea, map_);
+  map_->hide();
+  connect(map_, &MapDock::failed, this, [this](const QString& text) { statusBar()->showMessage(text); });
 }
 
 DocumentTab* MainWindow::currentDocument() const {

@@ -14,6 +14,7 @@
 #include "shell/document_tab.h"
 #include "shell/editor_library.h"
 #include "shell/help_dock.h"
+#include "shell/map/map_dock.h"
 #include "shell/messages_dock.h"
 #include "shell/recovery.h"
 #include "shell/run_dock.h"
@@ -50,6 +51,7 @@ class MainWindow final : public QMainWindow {
   QToolBar& tools() { return *tools_; }
   RunDock& run() { return *run_; }
   HelpDock& help() { return *help_; }
+  MapDock& map() { return *map_; }
   UnitsMenu& units() { return *units_; }
   QAction* undoAction() { return undo_; }
   QAction* redoAction() { return redo_; }
@@ -131,6 +133,7 @@ class MainWindow final : public QMainWindow {
   MessagesDock* messages_ = nullptr;
   RunDock* run_ = nullptr;
   HelpDock* help_ = nullptr;
+  MapDock* map_ = nullptr;
 };
 
 }  // namespace gridbay::shell

@@ -8,6 +8,7 @@
 #include <unordered_map>
 #include <unordered_set>
 
+#include "core/grid_point.h"
 #include "shell/fields/frame.h"
 #include "shell/grid_view.h"
 
@@ -136,6 +137,10 @@ PagePane::Part PagePane::makePart(Control& control, QWidget* parent, bool hasBod
     grid->setStretches(control.alignRight);
     // What a cell changes may show in other controls.
     connect(grid, &GridView::edited, this, &PagePane::refresh);
+    connect(grid, &GridView::rowChosen, this, [this, grid](int row) {
+      lastGrid_ = grid;
+      emit rowChosen(row);
+    });
     return {&control, grid, nullptr, grid};
   }
   Part part{&control, nullptr, makeField(control, keys_, parent)};
@@ -244,6 +249,33 @@ void PagePane::refreshGroup(const Part& part, bool isShown) {
   const QString name = nameOf(control);
   if (part.widget->accessibleName() != name) part.widget->setAccessibleName(name);
   if (part.grid != nullptr) part.grid->cells().refresh();
+}
+
+bool PagePane::showCell(int row, int column) {
+  for (const Part& part : parts_) {
+    if (part.grid == nullptr || row < 1 || row > part.grid->cells().rowCount() ||
+        column > part.grid->cells().columnCount())
+      continue;
+    const QModelIndex now = part.grid->currentIndex();
+    const int any = now.isValid() ? now.column() : 0;
+    part.grid->goTo(row - 1, column > 0 ? column - 1 : any);
+    ensureWidgetVisible(part.grid);
+    return true;
+  }
+  return false;
+}
+
+int PagePane::currentRow() const {
+  return lastGrid_ != nullptr && lastGrid_->currentIndex().isValid() ? lastGrid_->currentIndex().row() + 1
+                                                                     : 0;
+}
+
+std::optional<QModelIndex> PagePane::pointCell() const {
+  if (lastGrid_ == nullptr || !lastGrid_->currentIndex().isValid()) return std::nullopt;
+  const QModelIndex index = lastGrid_->currentIndex();
+  const CellStyle cell = lastGrid_->cells().style(index);
+  const bool isPoint = cell.value.starts_with('(') && pointOfText(cell.value).has_value();
+  return isPoint && cell.editable() ? std::optional(index) : std::nullopt;
 }
 
 QSize PagePane::sizeHint() const {

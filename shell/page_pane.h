@@ -1,7 +1,10 @@
 #pragma once
 
+#include <QModelIndex>
+#include <QPointer>
 #include <QScrollArea>
 #include <memory>
+#include <optional>
 #include <vector>
 
 #include "shell/fields/accelerators.h"
@@ -33,8 +36,20 @@ class PagePane final : public QScrollArea {
   // The input of the n-th control of a label; null when there is none.
   QWidget* widgetOf(const QString& label, int n = 1) const;
 
+  // Makes a cell (from 1; column 0 for any) the current one of the first table that has it; rows that are
+  // headers do not count. False where there is none.
+  bool showCell(int row, int column);
+  // The row (from 1, without headers) of the table that was last at work; 0 for none.
+  int currentRow() const;
+  // The cell that is at work, where it holds a point of a grid and takes another one.
+  std::optional<QModelIndex> pointCell() const;
+
   // The whole page, as far as the screen has the room.
   QSize sizeHint() const override;
+
+ signals:
+  // Another row (from 1, without headers; 0 for none) of a table is at work.
+  void rowChosen(int row);
 
  private:
   // A control with what shows it: a field, a table, a frame, or a heading.
@@ -54,6 +69,7 @@ class PagePane final : public QScrollArea {
 
   Form* form_ = nullptr;
   std::vector<Part> parts_;
+  QPointer<GridView> lastGrid_;
   Accelerators keys_;
   bool refreshing_ = false;
 };

@@ -1,0 +1,294 @@
+// What the map shows.
+
+#include "shell/map/map_canvas.h"
+
+#include <QHelpEvent>
+#include <QPainter>
+#include <QToolTip>
+#include <algorithm>
+#include <cmath>
+
+#include "shell/shades.h"
+
+namespace gridbay::shell {
+namespace {
+
+constexpr double kMargin = 0.06;  // of the picture around the whole map
+constexpr double kTooCoarse = 6;  // a picture is drawn so much larger at most
+constexpr double kSameScale = 1e-9;
+
+// The whole map in a picture of a size.
+std::optional<MapFrame> wholeMap(const MapScene& scene, QSizeF size) {
+  const std::optional<QRectF> extent = extentOf(scene);
+  if (!extent || size.isEmpty()) return std::nullopt;
+  const QSizeF inside = size * (1 - 2 * kMargin);
+  const double metres =
+      std::max({extent->width() / inside.width(), extent->height() / inside.height(), 1e-3});
+  return MapFrame{{extent->center().x(), extent->center().y()}, metres, size};
+}
+
+bool isSame(const std::vector<TerrainArea>& a, const std::vector<TerrainArea>& b) {
+  return std::ranges::equal(a, b, [](const TerrainArea& x, const TerrainArea& y) {
+    return x.values == y.values && x.grid == y.grid && x.landValue == y.landValue;
+  });
+}
+
+}  // namespace
+
+MapCanvas::MapCanvas(QWidget* parent) : QWidget(parent), worker_(new TerrainWorker(this)) {
+  setFocusPolicy(Qt::StrongFocus);
+  setMouseTracking(true);
+  setAccessibleName(tr("Map"));
+  setAttribute(Qt::WA_OpaquePaintEvent);
+  frame_.size = size();
+  connect(worker_, &TerrainWorker::painted, this, &MapCanvas::takePicture);
+}
+
+void MapCanvas::showMap(MapEditor* editor, const std::optional<MapFrame>& frame) {
+  drop();
+  editor_ = editor;
+  drawing_.selection = {};
+  drawing_.setScene({});
+  terrain_.clear();
+  scale_.reset();
+  base_.reset();
+  coarse_.reset();
+  fine_.reset();
+  isFitted_ = !frame;
+  if (frame) {
+    frame_ = *frame;
+    frame_.size = size();
+  }
+  setTool(MapTool::select);
+  refresh();
+  update();
+}
+
+void MapCanvas::refresh() {
+  if (isPressed_) drop();
+  if (editor_ == nullptr) return update();
+  drawing_.setScene(editor_->scene());
+  std::vector<TerrainArea> terrain = store_.open(scene());
+  if (isFitted_) {
+    if (const std::optional<MapFrame> whole = wholeMap(scene(), size())) frame_ = *whole;
+  }
+  if (!isSame(terrain, terrain_)) {
+    terrain_ = std::move(terrain);
+    ++version_;
+    requestBase();
+  }
+  requestTerrain();
+  update();
+}
+
+void MapCanvas::fit() {
+  isFitted_ = true;
+  if (const std::optional<MapFrame> whole = wholeMap(scene(), size())) frame_ = *whole;
+  requestTerrain();
+  update();
+}
+
+void MapCanvas::zoom(double factor) {
+  MapFrame frame = frame_;
+  frame.zoom(factor, QRectF(rect()).center());
+  setFrame(frame);
+}
+
+void MapCanvas::setFrame(const MapFrame& frame) {
+  isFitted_ = false;
+  frame_ = frame;
+  frame_.size = size();
+  requestTerrain();
+  update();
+}
+
+void MapCanvas::selectFeature(const std::optional<MapFeatureId>& id, std::int32_t area) {
+  const std::optional<std::size_t> vertex =
+      id && drawing_.selection.feature == id ? drawing_.selection.vertex : std::nullopt;
+  drawing_.selection = {id, vertex, area};
+  update();
+}
+
+void MapCanvas::setLayer(MapLayer layer, bool on) {
+  drawing_.layers.set(placeOf(layer), on);
+  update();
+}
+
+void MapCanvas::setStyle(const TerrainStyle& style) {
+  if (style == style_) return;
+  const bool wasFixed = style_.scale.has_value();
+  style_ = style;
+  ++version_;
+  if (style_.scale) scale_ = style_.scale;
+  if (wasFixed && !style_.scale) scale_.reset();
+  requestBase();
+  requestTerrain();
+  emit scaleChanged();
+}
+
+void MapCanvas::requestBase() {
+  const double ratio = devicePixelRatio();
+  std::optional<MapFrame> frame = wholeMap(scene(), QSizeF(size()) * ratio);
+  if (!frame || terrain_.empty()) return;
+  TerrainRequest request{terrain_, *frame, style_, true, version_};
+  worker_->paint(std::move(request));
+}
+
+void MapCanvas::requestTerrain() {
+  if (terrain_.empty() || !drawing_.layers.test(placeOf(MapLayer::terrain)) || size().isEmpty()) return;
+  const double ratio = devicePixelRatio();
+  MapFrame frame = frame_;
+  frame.size *= ratio;
+  frame.metresPerPixel /= ratio;
+  if (fine_ && fine_->version == version_ && fine_->frame == frame) return;
+  TerrainRequest request{terrain_, frame, style_, false, version_};
+  if (!request.style.scale) request.style.scale = scale_;
+  worker_->paint(std::move(request));
+}
+
+void MapCanvas::takePicture(const TerrainPicture& picture) {
+  if (picture.version != version_) return;
+  for (std::optional<TerrainPicture>* each : {&base_, &coarse_, &fine_}) {
+    if (*each && (*each)->version != version_) each->reset();
+  }
+  const bool isNewScale = picture.isBase && !style_.scale && scale_ != picture.scale;
+  if (isNewScale || !scale_) {
+    scale_ = picture.scale;
+    emit scaleChanged();
+  }
+  (picture.isBase ? base_ : picture.isFinal ? fine_ : coarse_) = picture;
+  if (!picture.isBase && picture.isFinal) coarse_.reset();
+  if (isNewScale) {
+    fine_.reset();
+    requestTerrain();
+  }
+  update();
+}
+
+bool MapCanvas::isSettled() const {
+  if (terrain_.empty()) return true;
+  const double ratio = devicePixelRatio();
+  return fine_ && fine_->version == version_ && worker_->isIdle() && fine_->frame.centre == frame_.centre &&
+         std::abs(fine_->frame.metresPerPixel * ratio - frame_.metresPerPixel) < kSameScale;
+}
+
+void MapCanvas::paintEvent(QPaintEvent*) {
+  QPainter painter(this);
+  painter.fillRect(rect(), blend(palette().color(QPalette::Base), palette().color(QPalette::Text), 0.08));
+  if (editor_ == nullptr || !extentOf(scene())) {
+    painter.setPen(quietText(palette()));
+    painter.drawText(
+        rect(), Qt::AlignCenter | Qt::TextWordWrap,
+        editor_ == nullptr ? tr("No setup is open.") : tr("No area has a grid with a place yet."));
+    return;
+  }
+  if (drawing_.layers.test(placeOf(MapLayer::terrain))) paintTerrain(painter);
+  drawing_.paint(painter, frame_);
+  if (grasp_) grasp_->paint(painter, frame_);
+  drawing_.paintLegend(painter, frame_, style_, terrain_.empty() ? std::nullopt : scale_);
+  paintHeldText(painter);
+  if (!store_.faults().isEmpty()) {
+    painter.setPen(faultColour(palette()));
+    painter.drawText(rect().adjusted(8, 6, -8, -6), Qt::AlignTop | Qt::AlignLeft | Qt::TextWordWrap,
+                     store_.faults().join('\n'));
+  }
+}
+
+// From the coarsest to the finest; what is covered is left out.
+void MapCanvas::paintTerrain(QPainter& painter) {
+  const QRectF all(rect());
+  const auto covers = [&](const std::optional<TerrainPicture>& picture) {
+    return picture && picture->frame.in(frame_).adjusted(-1, -1, 1, 1).contains(all);
+  };
+  const auto draw = [&](const std::optional<TerrainPicture>& picture) {
+    if (!picture) return;
+    const QRectF place = picture->frame.in(frame_);
+    if (!place.intersects(all)) return;
+    if (std::abs(place.width() - picture->image.width()) < 0.5) {
+      painter.drawImage(place.topLeft().toPoint(), picture->image);
+      return;
+    }
+    // No more of it than what is in view.
+    const QRectF shown = place.intersected(all.adjusted(-1, -1, 1, 1));
+    const double scale = picture->image.width() / place.width();
+    const QRectF source((shown.topLeft() - place.topLeft()) * scale, shown.size() * scale);
+    painter.drawImage(shown, picture->image, source);
+  };
+  const bool isFineUsable =
+      fine_ && fine_->frame.metresPerPixel * devicePixelRatio() < kTooCoarse * frame_.metresPerPixel;
+  const bool isFineAll = isFineUsable && covers(fine_);
+  const bool isCoarseAll = covers(coarse_);
+  if (!isFineAll && !isCoarseAll) draw(base_);
+  if (!isFineAll) draw(coarse_);
+  if (isFineUsable) draw(fine_);
+  if (!fine_ && !coarse_) draw(base_);
+}
+
+void MapCanvas::paintHeldText(QPainter& painter) {
+  if (!grasp_) return;
+  const QString fault = grasp_->fault();
+  const QString text = fault.isEmpty() ? grasp_->text() : fault;
+  if (text.isEmpty()) return;
+  const double half = painter.fontMetrics().horizontalAdvance(text) / 2.0 + 8;
+  const QPointF middle(std::clamp(last_.x(), half, std::max(half, width() - half)),
+                       std::max(20.0, last_.y() - 24));
+  paintBadge(painter, middle, text, fault.isEmpty() ? QColor(0x30, 0x30, 0x30) : QColor(0xD3, 0x1C, 0x1C));
+}
+
+void MapCanvas::resizeEvent(QResizeEvent*) {
+  frame_.size = size();
+  if (isFitted_) {
+    fit();
+  } else {
+    requestTerrain();
+  }
+  if (!base_) requestBase();
+}
+
+bool MapCanvas::event(QEvent* event) {
+  if (event->type() == QEvent::ToolTip) {
+    const auto* help = static_cast<QHelpEvent*>(event);
+    const QString tip = tipAt(help->pos());
+    if (tip.isEmpty()) {
+      QToolTip::hideText();
+    } else {
+      QToolTip::showText(help->globalPos(), tip, this);
+    }
+    return true;
+  }
+  return QWidget::event(event);
+}
+
+QString MapCanvas::tipAt(QPointF at) const {
+  const MapHit hit = drawing_.hit(frame_, at);
+  QStringList lines;
+  if (const MapFeature* feature = hit.feature ? drawing_.feature(*hit.feature) : nullptr) {
+    lines << tr("%1 %2").arg(kindName(feature->id.kind)).arg(feature->id.number);
+    const QString drive = driveName(feature->drive);
+    if (!drive.isEmpty()) lines.back() += ": " + drive;
+    if (!feature->fault.empty()) lines << QString::fromStdString(feature->fault);
+  } else if (const MapArea* area = hit.isBorder ? scene().area(hit.area) : nullptr) {
+    lines << tr("Area %1: %2 x %3 points").arg(area->number).arg(area->nx).arg(area->ny);
+    if (area->offBy && *area->offBy >= 0.01)
+      lines << tr("its file's own coordinates are %1 m from here").arg(*area->offBy, 0, 'f', 2);
+    if (!area->fault.empty()) lines << QString::fromStdString(area->fault);
+  }
+  return lines.join('\n');
+}
+
+QString MapCanvas::textAt(MapPoint place) const {
+  if (editor_ == nullptr) return {};
+  QString text = tr("E %1  N %2").arg(place.east, 0, 'f', 1).arg(place.north, 0, 'f', 1);
+  if (const auto geographic = editor_->geographic(place))
+    text += tr("   lon %1°  lat %2°").arg((*geographic)[0], 0, 'f', 5).arg((*geographic)[1], 0, 'f', 5);
+  const std::optional<MapPick> pick = editor_->pick(place);
+  const MapArea* area = pick ? scene().area(pick->area) : nullptr;
+  if (area == nullptr) return text;
+  text += tr("   area %1 %2").arg(area->number).arg(QString::fromStdString(pointText(pick->point)));
+  const std::optional<float> value = store_.valueAt(*area, pick->point);
+  if (!value) return text + tr("   no value");
+  text += tr("   %1 m").arg(*value);
+  return *value >= area->landValue ? text + tr(" (land)") : text;
+}
+
+}  // namespace gridbay::shell

@@ -1,0 +1,145 @@
+#pragma once
+
+#include <QPointer>
+#include <QWidget>
+#include <functional>
+#include <memory>
+
+#include "shell/map/map_drawing.h"
+#include "shell/map/map_grasps.h"
+#include "shell/map/terrain_store.h"
+#include "shell/map/terrain_worker.h"
+
+namespace gridbay::shell {
+
+// What a click or a drag on the map does.
+enum class MapTool {
+  select,
+  nestedArea,
+  source,
+  pair,
+  boundary,
+  massBudget,
+  dike,
+  weir,
+  culvert,
+  outputPoint,
+  outputLine,
+  outputArea,
+  pick
+};
+
+// The map: terrain below what the setup places. A click selects, a drag moves what is held or else the map,
+// the wheel zooms. The last picture of the terrain is shown in its place at once while a finer one is made.
+//
+// Points of what is selected, numbers and borders of areas are dragged; a double click on a line puts a point
+// in; Delete takes the chosen point out, or the feature. Esc drops what is held. Arrows, +, - and Home move
+// the map.
+class MapCanvas final : public QWidget {
+  Q_OBJECT
+ public:
+  explicit MapCanvas(QWidget* parent);
+
+  // Shows the map of a document, or none; the frame is that of the whole map unless one is given.
+  void showMap(MapEditor* editor, const std::optional<MapFrame>& frame = {});
+  // Takes the scene anew: the setup has changed.
+  void refresh();
+  void fit();
+  void zoom(double factor);
+  // Lights up, with no more ado, what a row of a page tells of.
+  void selectFeature(const std::optional<MapFeatureId>& id, std::int32_t area = 0);
+
+  void setTool(MapTool tool);
+  MapTool tool() const { return tool_; }
+  void setLayer(MapLayer layer, bool on);
+  void setStyle(const TerrainStyle& style);
+  const TerrainStyle& terrainStyle() const { return style_; }
+  // The scale that colours have now; nothing before the first picture.
+  const std::optional<TerrainScale>& scale() const { return scale_; }
+
+  const MapFrame& frame() const { return frame_; }
+  void setFrame(const MapFrame& frame);
+  // Whether the whole map stays in view while the window changes its size.
+  bool isFitted() const { return isFitted_; }
+  const MapDrawing& drawing() const { return drawing_; }
+  const MapScene& scene() const { return drawing_.scene(); }
+  MapEditor* editor() const { return editor_; }
+  const std::vector<TerrainArea>& terrain() const { return terrain_; }
+  // Whether the picture is of this frame, in full.
+  bool isSettled() const;
+  bool isHolding() const { return grasp_ != nullptr; }
+  // What is said of a place.
+  QString textAt(MapPoint place) const;
+  // Why something at a place can't be, and what it is.
+  QString tipAt(QPointF at) const;
+
+  QSize sizeHint() const override { return {480, 420}; }
+  QSize minimumSizeHint() const override { return {200, 160}; }
+
+ signals:
+  void featureChosen(const gridbay::MapFeature& feature);
+  void areaChosen(int number);
+  void pointed(const QString& text);
+  void picked(gridbay::MapPoint place);
+  void nestedAreaWanted(gridbay::MapPoint corner, gridbay::MapPoint opposite);
+  // An edit is about to be made: what is typed and not entered comes before it.
+  void editing();
+  void edited();
+  void failed(const QString& text);
+  void toolChanged();
+  void scaleChanged();
+
+ protected:
+  bool event(QEvent* event) override;
+  void paintEvent(QPaintEvent* event) override;
+  void resizeEvent(QResizeEvent* event) override;
+  void mousePressEvent(QMouseEvent* event) override;
+  void mouseMoveEvent(QMouseEvent* event) override;
+  void mouseReleaseEvent(QMouseEvent* event) override;
+  void mouseDoubleClickEvent(QMouseEvent* event) override;
+  void wheelEvent(QWheelEvent* event) override;
+  void keyPressEvent(QKeyEvent* event) override;
+  void contextMenuEvent(QContextMenuEvent* event) override;
+  void leaveEvent(QEvent* event) override;
+
+ private:
+  void paintTerrain(QPainter& painter);
+  void paintHeldText(QPainter& painter);
+  void requestTerrain();
+  void requestBase();
+  void takePicture(const TerrainPicture& picture);
+  void showCursor(QPointF at);
+  void startDrag(QPointF at);
+  void click(QPointF at);
+  void chooseAt(QPointF at);
+  void complete();
+  void chooseLast(MapKind kind);
+  void drop();
+  void edit(const std::function<std::string()>& change);
+  void removeChosen();
+  bool isPolyline(const MapFeature& feature) const;
+
+  MapEditor* editor_ = nullptr;
+  MapDrawing drawing_;
+  MapFrame frame_;
+  bool isFitted_ = true;
+  MapTool tool_ = MapTool::select;
+  std::unique_ptr<MapGrasp> grasp_;
+  QPointF pressed_;
+  QPointF last_;
+  bool isPressed_ = false;
+  bool isPanning_ = false;
+  bool isDragged_ = false;
+
+  TerrainStyle style_;
+  TerrainStore store_;
+  std::vector<TerrainArea> terrain_;
+  std::optional<TerrainScale> scale_;
+  int version_ = 0;  // of what the pictures are made of
+  std::optional<TerrainPicture> base_;
+  std::optional<TerrainPicture> coarse_;
+  std::optional<TerrainPicture> fine_;
+  TerrainWorker* worker_;
+};
+
+}  // namespace gridbay::shell

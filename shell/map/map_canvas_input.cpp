@@ -1,0 +1,324 @@
+// What the user does on the map.
+
+#include <QContextMenuEvent>
+#include <QKeyEvent>
+#include <QMenu>
+#include <QMouseEvent>
+#include <cmath>
+
+#include "shell/map/map_canvas.h"
+
+namespace gridbay::shell {
+namespace {
+
+constexpr double kDragged = 4;  // pixels that a click may slip
+constexpr double kWheelStep = 1.2;
+constexpr double kKeyZoom = 1.5;
+constexpr double kKeyPan = 60;  // pixels
+
+// What a tool makes by clicks.
+struct Clicks {
+  MapKind kind;
+  std::size_t least;
+  std::size_t most;
+};
+std::optional<Clicks> clicksOf(MapTool tool) {
+  constexpr std::size_t kAny = 1'000'000;
+  switch (tool) {
+    case MapTool::source:
+      return Clicks{MapKind::source, 1, 1};
+    case MapTool::pair:
+      return Clicks{MapKind::source, 2, 2};
+    case MapTool::boundary:
+      return Clicks{MapKind::boundary, 2, 2};
+    case MapTool::massBudget:
+      return Clicks{MapKind::massBudget, 3, kAny};
+    case MapTool::dike:
+      return Clicks{MapKind::dike, 2, kAny};
+    case MapTool::weir:
+      return Clicks{MapKind::weir, 2, kAny};
+    case MapTool::culvert:
+      return Clicks{MapKind::culvert, 2, kAny};
+    case MapTool::outputPoint:
+      return Clicks{MapKind::outputPoints, 1, 1};
+    case MapTool::outputLine:
+      return Clicks{MapKind::outputLine, 2, 2};
+    default:
+      return std::nullopt;
+  }
+}
+
+}  // namespace
+
+void MapCanvas::setTool(MapTool tool) {
+  drop();
+  if (tool_ == tool) return;
+  tool_ = tool;
+  setCursor(tool == MapTool::select ? Qt::ArrowCursor : Qt::CrossCursor);
+  emit toolChanged();
+}
+
+void MapCanvas::drop() {
+  grasp_.reset();
+  isPressed_ = false;
+  isPanning_ = false;
+  isDragged_ = false;
+  update();
+}
+
+void MapCanvas::mousePressEvent(QMouseEvent* event) {
+  last_ = event->position();
+  if (editor_ == nullptr) return;
+  if (event->button() != Qt::LeftButton && event->button() != Qt::MiddleButton) return;
+  pressed_ = event->position();
+  isPressed_ = true;
+  isDragged_ = false;
+  isPanning_ = event->button() == Qt::MiddleButton;
+  if (!isPanning_) startDrag(event->position());
+}
+
+// What is under the pointer is held from now on, where it can be dragged.
+void MapCanvas::startDrag(QPointF at) {
+  const MapPoint place = frame_.toMap(at);
+  if (tool_ == MapTool::nestedArea) {
+    grasp_ = graspNestedArea(*editor_, place, [this](MapPoint corner, MapPoint opposite) {
+      emit nestedAreaWanted(corner, opposite);
+    });
+  } else if (tool_ == MapTool::outputArea) {
+    grasp_ = graspRectangle(*editor_, MapKind::outputMap, place);
+  } else if (tool_ == MapTool::select) {
+    const MapHit hit = drawing_.hit(frame_, at);
+    if (hit.feature && hit.vertex && hit.feature == drawing_.selection.feature) {
+      drawing_.selection.vertex = hit.vertex;
+      grasp_ = graspVertex(*editor_, *drawing_.feature(*hit.feature), *hit.vertex);
+    } else if (!hit.feature && hit.isBorder && hit.area > 1) {
+      grasp_ = graspArea(*editor_, *scene().area(hit.area), place);
+    }
+  }
+  update();
+}
+
+void MapCanvas::mouseMoveEvent(QMouseEvent* event) {
+  const QPointF at = event->position();
+  const QPointF way = at - last_;
+  last_ = at;
+  emit pointed(textAt(frame_.toMap(at)));
+  if (isPressed_ && !isDragged_) isDragged_ = (at - pressed_).manhattanLength() > kDragged;
+  const bool isByClicks = clicksOf(tool_).has_value();
+  if (grasp_ && !isPanning_ && (isDragged_ || isByClicks)) {
+    if (!isPressed_ || !isByClicks) {
+      grasp_->moveTo(frame_.toMap(at));
+      return update();
+    }
+  }
+  if (!isPressed_) return showCursor(at);
+  if (!isDragged_) return;
+  if (!isPanning_) frame_.pan(at - pressed_ - way);
+  isPanning_ = true;
+  isFitted_ = false;
+  frame_.pan(way);
+  setCursor(Qt::ClosedHandCursor);
+  requestTerrain();
+  update();
+}
+
+void MapCanvas::showCursor(QPointF at) {
+  if (tool_ != MapTool::select || editor_ == nullptr) return;
+  const MapHit hit = drawing_.hit(frame_, at);
+  const bool isHeld = (hit.vertex && hit.feature == drawing_.selection.feature) ||
+                      (!hit.feature && hit.isBorder && hit.area > 1);
+  setCursor(isHeld ? Qt::SizeAllCursor : hit.feature ? Qt::PointingHandCursor : Qt::ArrowCursor);
+}
+
+void MapCanvas::mouseReleaseEvent(QMouseEvent* event) {
+  if (!isPressed_) return;
+  const bool wasPanning = isPanning_;
+  const bool wasDragged = isDragged_;
+  isPressed_ = false;
+  isPanning_ = false;
+  isDragged_ = false;
+  setCursor(tool_ == MapTool::select ? Qt::ArrowCursor : Qt::CrossCursor);
+  if (wasPanning) return update();
+  if (grasp_ && !clicksOf(tool_)) {
+    if (wasDragged) {
+      grasp_->moveTo(frame_.toMap(event->position()));
+      return complete();
+    }
+    grasp_.reset();
+  }
+  click(event->position());
+}
+
+void MapCanvas::click(QPointF at) {
+  const MapPoint place = frame_.toMap(at);
+  if (tool_ == MapTool::select) return chooseAt(at);
+  if (tool_ == MapTool::pick) {
+    setTool(MapTool::select);
+    emit picked(place);
+    return;
+  }
+  const std::optional<Clicks> clicks = clicksOf(tool_);
+  if (!clicks) return;
+  if (!grasp_) grasp_ = graspNewFeature(*editor_, clicks->kind, clicks->least, clicks->most);
+  if (grasp_->click(place)) complete();
+  update();
+}
+
+// Lights up what lies there, and leads to its page.
+void MapCanvas::chooseAt(QPointF at) {
+  const MapHit hit = drawing_.hit(frame_, at);
+  update();
+  if (const MapFeature* feature = hit.feature ? drawing_.feature(*hit.feature) : nullptr) {
+    drawing_.selection = {hit.feature, hit.vertex, 0};
+    // The signal may bring another scene.
+    const MapFeature chosen = *feature;
+    emit featureChosen(chosen);
+    return;
+  }
+  const std::int32_t area = hit.isBorder ? hit.area : 0;
+  drawing_.selection = {std::nullopt, std::nullopt, area};
+  if (area > 0) emit areaChosen(area);
+}
+
+void MapCanvas::complete() {
+  const std::unique_ptr<MapGrasp> grasp = std::move(grasp_);
+  const std::optional<Clicks> clicks = clicksOf(tool_);
+  const bool isNew = clicks || tool_ == MapTool::outputArea;
+  edit([&grasp] { return grasp->commit(); });
+  if (isNew) chooseLast(clicks ? clicks->kind : MapKind::outputMap);
+}
+
+// The new one is the last of its kind.
+void MapCanvas::chooseLast(MapKind kind) {
+  const MapFeature* last = nullptr;
+  for (const MapFeature& feature : scene().features) {
+    if (feature.id.kind == kind && (last == nullptr || feature.id.number >= last->id.number)) last = &feature;
+  }
+  if (last == nullptr) return;
+  const MapFeature chosen = *last;
+  selectFeature(chosen.id);
+  emit featureChosen(chosen);
+}
+
+void MapCanvas::edit(const std::function<std::string()>& change) {
+  emit editing();
+  const std::string fault = change();
+  if (!fault.empty()) emit failed(QString::fromStdString(fault));
+  emit edited();
+  refresh();
+}
+
+bool MapCanvas::isPolyline(const MapFeature& feature) const {
+  switch (feature.id.kind) {
+    case MapKind::massBudget:
+    case MapKind::dike:
+    case MapKind::weir:
+    case MapKind::culvert:
+    case MapKind::outputPoints:
+      return true;
+    default:
+      return false;
+  }
+}
+
+void MapCanvas::mouseDoubleClickEvent(QMouseEvent* event) {
+  if (editor_ == nullptr || event->button() != Qt::LeftButton) return;
+  if (clicksOf(tool_)) {
+    if (grasp_ && grasp_->finish()) complete();
+    return;
+  }
+  const MapHit hit = drawing_.hit(frame_, event->position());
+  const MapFeature* feature = hit.feature ? drawing_.feature(*hit.feature) : nullptr;
+  if (tool_ != MapTool::select || feature == nullptr || !isPolyline(*feature) || hit.vertex || !hit.segment)
+    return;
+  const MapPoint place = frame_.toMap(event->position());
+  edit([&, id = feature->id] { return editor_->insertVertex(id, *hit.segment + 1, place); });
+  drawing_.selection.vertex = *hit.segment + 1;
+}
+
+void MapCanvas::wheelEvent(QWheelEvent* event) {
+  constexpr double kNotch = 120;
+  if (editor_ == nullptr || event->angleDelta().y() == 0) return;
+  MapFrame frame = frame_;
+  frame.zoom(std::pow(kWheelStep, event->angleDelta().y() / kNotch), event->position());
+  setFrame(frame);
+  event->accept();
+}
+
+void MapCanvas::keyPressEvent(QKeyEvent* event) {
+  MapFrame frame = frame_;
+  switch (event->key()) {
+    case Qt::Key_Escape:
+      if (grasp_) {
+        drop();
+      } else {
+        setTool(MapTool::select);
+      }
+      return;
+    case Qt::Key_Return:
+    case Qt::Key_Enter:
+      if (grasp_ && clicksOf(tool_) && grasp_->finish()) complete();
+      return;
+    case Qt::Key_Backspace:
+      if (grasp_ && clicksOf(tool_)) {
+        if (!grasp_->stepBack()) grasp_.reset();
+        return update();
+      }
+      [[fallthrough]];
+    case Qt::Key_Delete:
+      return removeChosen();
+    case Qt::Key_Plus:
+    case Qt::Key_Equal:
+      return zoom(kKeyZoom);
+    case Qt::Key_Minus:
+      return zoom(1 / kKeyZoom);
+    case Qt::Key_Home:
+      return fit();
+    case Qt::Key_Left:
+      frame.pan({kKeyPan, 0});
+      break;
+    case Qt::Key_Right:
+      frame.pan({-kKeyPan, 0});
+      break;
+    case Qt::Key_Up:
+      frame.pan({0, kKeyPan});
+      break;
+    case Qt::Key_Down:
+      frame.pan({0, -kKeyPan});
+      break;
+    default:
+      return QWidget::keyPressEvent(event);
+  }
+  setFrame(frame);
+}
+
+void MapCanvas::removeChosen() {
+  const MapSelection chosen = drawing_.selection;
+  const MapFeature* feature = chosen.feature ? drawing_.feature(*chosen.feature) : nullptr;
+  if (editor_ == nullptr || feature == nullptr) return;
+  const bool isPoint = chosen.vertex && isPolyline(*feature);
+  drawing_.selection.vertex.reset();
+  edit([&] {
+    return isPoint ? editor_->removeVertex(*chosen.feature, *chosen.vertex)
+                   : editor_->removeFeature(*chosen.feature);
+  });
+}
+
+void MapCanvas::contextMenuEvent(QContextMenuEvent* event) {
+  if (editor_ == nullptr || grasp_) return;
+  chooseAt(event->pos());
+  QMenu menu(this);
+  menu.addAction(tr("Whole map"), this, &MapCanvas::fit);
+  if (drawing_.selection.feature) {
+    const MapFeature* feature = drawing_.feature(*drawing_.selection.feature);
+    const bool isPoint = drawing_.selection.vertex && feature != nullptr && isPolyline(*feature);
+    menu.addAction(isPoint ? tr("Remove point") : tr("Remove"), this, &MapCanvas::removeChosen);
+  }
+  menu.exec(event->globalPos());
+}
+
+void MapCanvas::leaveEvent(QEvent*) {
+  emit pointed({});
+}
+
+}  // namespace gridbay::shell

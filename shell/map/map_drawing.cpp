@@ -1,0 +1,398 @@
+#include "shell/map/map_drawing.h"
+
+#include <QFontMetricsF>
+#include <QPainterPath>
+#include <algorithm>
+#include <cmath>
+#include <limits>
+
+namespace gridbay::shell {
+namespace {
+
+const QColor kFault(0xD3, 0x1C, 0x1C);
+const QColor kLit(0xFF, 0xC4, 0x00);
+const QColor kHalo(255, 255, 255, 200);
+constexpr double kNear = 7;       // pixels
+constexpr double kLeastCell = 8;  // pixels, from where on the cells of a grid are told apart
+constexpr std::size_t kLongLine = 256;
+
+double distance(QPointF a, QPointF b) {
+  return std::hypot(a.x() - b.x(), a.y() - b.y());
+}
+
+double distanceToSegment(QPointF at, QPointF a, QPointF b) {
+  const QPointF along = b - a;
+  const double length = QPointF::dotProduct(along, along);
+  const double part = length > 0 ? std::clamp(QPointF::dotProduct(at - a, along) / length, 0.0, 1.0) : 0;
+  return distance(at, a + part * along);
+}
+
+QRectF coverOf(const std::vector<MapPoint>& points) {
+  double west = std::numeric_limits<double>::max();
+  double south = west;
+  double east = std::numeric_limits<double>::lowest();
+  double north = east;
+  for (const MapPoint& point : points) {
+    west = std::min(west, point.east);
+    east = std::max(east, point.east);
+    south = std::min(south, point.north);
+    north = std::max(north, point.north);
+  }
+  return {west, south, east - west, north - south};
+}
+
+// An arrow's head at the end of a line.
+QPolygonF arrowHead(QPointF from, QPointF to, double size) {
+  const QPointF way = to - from;
+  const double length = std::hypot(way.x(), way.y());
+  if (length < 1) return {};
+  const QPointF ahead = way / length * size;
+  const QPointF aside(-ahead.y() * 0.45, ahead.x() * 0.45);
+  return {{to, to - ahead + aside, to - ahead - aside}};
+}
+
+// A round length of about a fifth of the picture: 1, 2 or 5 with noughts.
+double roundLength(double metres) {
+  const double power = std::pow(10, std::floor(std::log10(metres)));
+  const double digit = metres / power;
+  return (digit >= 5 ? 5 : digit >= 2 ? 2 : 1) * power;
+}
+
+QString lengthText(double metres) {
+  return metres >= 1000 ? QString("%1 km").arg(metres / 1000) : QString("%1 m").arg(metres);
+}
+
+void paintLegendText(QPainter& painter, QPointF at, const QString& text, Qt::Alignment alignment) {
+  const QFontMetricsF metrics(painter.font());
+  const double width = metrics.horizontalAdvance(text);
+  QRectF box(at.x(), at.y() - metrics.height() / 2, width, metrics.height());
+  if (alignment & Qt::AlignRight) box.translate(-width, 0);
+  if (alignment & Qt::AlignHCenter) box.translate(-width / 2, 0);
+  painter.setPen(Qt::NoPen);
+  painter.setBrush(kHalo);
+  painter.drawRoundedRect(box.adjusted(-3, -1, 3, 1), 3, 3);
+  painter.setPen(Qt::black);
+  painter.drawText(box, Qt::AlignCenter | Qt::TextDontClip, text);
+}
+
+}  // namespace
+
+QPolygonF onScreen(const MapFrame& frame, const std::vector<MapPoint>& points) {
+  QPolygonF line;
+  if (points.size() <= kLongLine) line.reserve(static_cast<qsizetype>(points.size()));
+  for (std::size_t i = 0; i < points.size(); ++i) {
+    const QPointF at = frame.toScreen(points[i]);
+    const bool isInner = points.size() > kLongLine && i > 0 && i + 1 < points.size();
+    if (isInner && (at - line.back()).manhattanLength() < 1) continue;
+    line << at;
+  }
+  return line;
+}
+
+QPolygonF outlineOf(const MapFrame& frame, const std::array<MapPoint, 4>& corners) {
+  QPolygonF line;
+  for (const MapPoint& corner : corners) line << frame.toScreen(corner);
+  return line;
+}
+
+void paintBadge(QPainter& painter, QPointF middle, const QString& text, const QColor& ground) {
+  const QFontMetricsF metrics(painter.font());
+  const double height = metrics.height() + 2;
+  const double width = std::max(height, metrics.horizontalAdvance(text) + 8);
+  const QRectF box(middle.x() - width / 2, middle.y() - height / 2, width, height);
+  painter.setPen(QPen(Qt::white, 1));
+  painter.setBrush(ground);
+  painter.drawRoundedRect(box, height / 2, height / 2);
+  painter.drawText(box, Qt::AlignCenter | Qt::TextDontClip, text);
+}
+
+QPointF badgeOf(const QPolygonF& outline) {
+  QPointF corner = outline.front();
+  for (const QPointF& each : outline) {
+    if (each.x() + each.y() < corner.x() + corner.y()) corner = each;
+  }
+  return corner + QPointF(16, 14);
+}
+
+void MapDrawing::setScene(MapScene scene) {
+  scene_ = std::move(scene);
+  placed_.clear();
+  for (const MapFeature& feature : scene_.features) placed_.push_back({&feature, coverOf(*feature.points)});
+  std::ranges::stable_sort(placed_, {}, [](const Placed& each) { return layerOf(each.feature->id.kind); });
+  if (selection.feature && feature(*selection.feature) == nullptr) selection = {};
+}
+
+const MapFeature* MapDrawing::feature(const MapFeatureId& id) const {
+  const auto found = std::ranges::find(scene_.features, id, &MapFeature::id);
+  return found == scene_.features.end() ? nullptr : &*found;
+}
+
+void MapDrawing::paint(QPainter& painter, const MapFrame& frame) const {
+  painter.setRenderHint(QPainter::Antialiasing);
+  if (shows(MapLayer::gridLines)) paintGridLines(painter, frame);
+  if (shows(MapLayer::outlines)) paintAreas(painter, frame);
+  const MapPoint low = frame.toMap({-40, frame.size.height() + 40});
+  const MapPoint high = frame.toMap({frame.size.width() + 40, -40});
+  const auto isInView = [&](const QRectF& cover) {
+    return cover.left() <= high.east && cover.right() >= low.east && cover.top() <= high.north &&
+           cover.bottom() >= low.north;
+  };
+  const MapFeature* lit = nullptr;
+  for (const auto& [feature, cover] : placed_) {
+    if (feature->points->empty() || !shows(layerOf(feature->id.kind)) || !isInView(cover)) continue;
+    if (selection.feature == feature->id) {
+      lit = feature;
+    } else {
+      paintFeature(painter, frame, *feature);
+    }
+  }
+  if (lit != nullptr) paintFeature(painter, frame, *lit);
+}
+
+void MapDrawing::paintAreas(QPainter& painter, const MapFrame& frame) const {
+  for (const MapArea& area : scene_.areas) {
+    if (!area.isPlaced) continue;
+    const QPolygonF outline = outlineOf(frame, area.corners);
+    const bool isLit = selection.area == area.number;
+    const bool isWrong = !area.fault.empty();
+    painter.setBrush(Qt::NoBrush);
+    painter.setPen(QPen(isLit ? kLit : kHalo, isLit ? 6 : 4));
+    painter.drawPolygon(outline);
+    painter.setPen(QPen(isWrong ? kFault : layerColour(MapLayer::outlines), isLit ? 2.5 : 1.5,
+                        isWrong ? Qt::DashLine : Qt::SolidLine));
+    painter.drawPolygon(outline);
+    paintBadge(painter, badgeOf(outline), QString::number(area.number),
+               isWrong ? kFault : layerColour(MapLayer::outlines));
+  }
+}
+
+// The borders of the cells, of the grid that is on top.
+void MapDrawing::paintGridLines(QPainter& painter, const MapFrame& frame) const {
+  for (const MapArea& area : scene_.areas) {
+    if (!area.isPlaced) continue;
+    const double cell = std::min(std::hypot(area.grid.stepJ.east, area.grid.stepJ.north),
+                                 std::hypot(area.grid.stepK.east, area.grid.stepK.north));
+    if (cell / frame.metresPerPixel < kLeastCell) continue;
+    std::array<double, 2> low{static_cast<double>(area.nx), static_cast<double>(area.ny)};
+    std::array<double, 2> high{0, 0};
+    for (const QPointF& corner :
+         {QPointF(0, 0), QPointF(frame.size.width(), 0), QPointF(0, frame.size.height()),
+          QPointF(frame.size.width(), frame.size.height())}) {
+      const auto point = area.grid.pointOf(frame.toMap(corner));
+      for (std::size_t i = 0; i < 2; ++i) {
+        low[i] = std::min(low[i], std::floor(point[i]));
+        high[i] = std::max(high[i], std::ceil(point[i]) + 1);
+      }
+    }
+    low = {std::max(low[0], 0.0), std::max(low[1], 0.0)};
+    high = {std::min(high[0], static_cast<double>(area.nx)), std::min(high[1], static_cast<double>(area.ny))};
+    if (low[0] > high[0] || low[1] > high[1]) continue;
+    QPainterPath free;
+    free.addRect(QRectF({0, 0}, frame.size));
+    for (const MapArea& inner : scene_.areas) {
+      if (!inner.isPlaced || inner.level <= area.level) continue;
+      QPainterPath covered;
+      covered.addPolygon(outlineOf(frame, inner.corners));
+      free -= covered;
+    }
+    painter.save();
+    painter.setClipPath(free);
+    painter.setRenderHint(QPainter::Antialiasing, false);
+    painter.setPen(QColor(0, 0, 0, 70));
+    for (double j = low[0]; j <= high[0]; ++j)
+      painter.drawLine(frame.toScreen(area.grid.at(j - 0.5, low[1] - 0.5)),
+                       frame.toScreen(area.grid.at(j - 0.5, high[1] - 0.5)));
+    for (double k = low[1]; k <= high[1]; ++k)
+      painter.drawLine(frame.toScreen(area.grid.at(low[0] - 0.5, k - 0.5)),
+                       frame.toScreen(area.grid.at(high[0] - 0.5, k - 0.5)));
+    painter.restore();
+  }
+}
+
+void MapDrawing::paintFeature(QPainter& painter, const MapFrame& frame, const MapFeature& feature) const {
+  const QPolygonF line = onScreen(frame, *feature.points);
+  const bool isLit = selection.feature == feature.id;
+  const bool isWrong = !feature.fault.empty();
+  const QColor colour = isWrong ? kFault : featureColour(feature);
+  const double width = feature.id.kind == MapKind::boundary ? 5 : 2;
+  const auto drawLine = [&] {
+    painter.setBrush(Qt::NoBrush);
+    feature.closed ? painter.drawPolygon(line) : painter.drawPolyline(line);
+  };
+  if (feature.joined && line.size() > 1) {
+    painter.setPen(QPen(isLit ? kLit : kHalo, width + (isLit ? 5 : 2), Qt::SolidLine, Qt::RoundCap));
+    drawLine();
+    if (feature.closed) {
+      QColor inside = colour;
+      inside.setAlpha(36);
+      painter.setPen(Qt::NoPen);
+      painter.setBrush(inside);
+      painter.drawPolygon(line);
+    }
+    painter.setPen(QPen(colour, width, isWrong ? Qt::DashLine : Qt::SolidLine, Qt::FlatCap));
+    drawLine();
+  }
+  paintMarks(painter, feature, line, colour);
+  if (isLit) paintHandles(painter, onScreen(frame, *feature.points));
+}
+
+// The marks of points and arrows, and the label.
+void MapDrawing::paintMarks(QPainter& painter, const MapFeature& feature, const QPolygonF& line,
+                            const QColor& colour) const {
+  constexpr double kRadius = 4.5;
+  constexpr double kArrow = 9;
+  const bool isLit = selection.feature == feature.id;
+  painter.setPen(QPen(isLit ? kLit : Qt::white, isLit ? 3 : 1.5));
+  painter.setBrush(colour);
+  switch (feature.id.kind) {
+    case MapKind::source: {
+      // Into the water from above, and out of it upwards.
+      const auto arrow = [&](QPointF point, bool isSink) {
+        const QPointF above = point - QPointF(0, 3 * kArrow);
+        const QPointF from = isSink ? point - QPointF(0, kRadius) : above;
+        const QPointF to = isSink ? above : point - QPointF(0, kRadius);
+        painter.drawEllipse(point, kRadius, kRadius);
+        painter.save();
+        painter.setPen(QPen(colour, 2.5));
+        painter.drawLine(from, to);
+        painter.drawPolygon(arrowHead(from, to, kArrow));
+        painter.restore();
+      };
+      arrow(line.front(), feature.drive == MapDrive::sink);
+      if (line.size() > 1) {
+        arrow(line.back(), true);
+        painter.drawPolygon(arrowHead(line.back(), (line.front() + line.back()) / 2, kArrow));
+      }
+      break;
+    }
+    case MapKind::outputPoints:
+      for (const QPointF& point : line) painter.drawRect(QRectF(point.x() - 4, point.y() - 4, 8, 8));
+      break;
+    case MapKind::culvert:
+      for (const QPointF& point : {line.front(), line.back()})
+        painter.drawRect(QRectF(point.x() - 3, point.y() - 3, 6, 6));
+      break;
+    default:
+      if (line.size() == 1 || !feature.joined)
+        for (const QPointF& point : line) painter.drawEllipse(point, 3, 3);
+  }
+  const bool isWide = line.boundingRect().width() + line.boundingRect().height() > 24;
+  if (feature.label.empty() || !(isWide || isLit || line.size() == 1)) return;
+  QPointF middle = line.size() == 2 ? (line.front() + line.back()) / 2 : line[line.size() / 2];
+  if (feature.id.kind == MapKind::source || feature.id.kind == MapKind::outputPoints)
+    middle = line.front() + QPointF(14, 0);
+  if (feature.closed) middle = line.boundingRect().center();
+  paintBadge(painter, middle, QString::fromStdString(feature.label), colour);
+}
+
+// What can be grasped of the feature that is lit up; of a long one only a point that is chosen.
+void MapDrawing::paintHandles(QPainter& painter, const QPolygonF& line) const {
+  for (qsizetype i = 0; i < line.size(); ++i) {
+    const bool isChosen = selection.vertex == static_cast<std::size_t>(i);
+    painter.setPen(QPen(Qt::black, 1));
+    painter.setBrush(isChosen ? kLit : QColor(Qt::white));
+    painter.drawRect(QRectF(line[i].x() - 3.5, line[i].y() - 3.5, 7, 7));
+  }
+}
+
+void MapDrawing::paintLegend(QPainter& painter, const MapFrame& frame, const TerrainStyle& style,
+                             const std::optional<TerrainScale>& scale) const {
+  if (!shows(MapLayer::legend)) return;
+  constexpr double kMargin = 14;
+  const double right = frame.size.width() - kMargin;
+  const double bottom = frame.size.height() - kMargin;
+  painter.setRenderHint(QPainter::Antialiasing);
+
+  const double metres = roundLength(frame.size.width() / 4 * frame.metresPerPixel);
+  const double length = metres / frame.metresPerPixel;
+  painter.setPen(QPen(kHalo, 6, Qt::SolidLine, Qt::FlatCap));
+  painter.drawLine(QPointF(kMargin, bottom), QPointF(kMargin + length, bottom));
+  painter.setPen(QPen(Qt::black, 3, Qt::SolidLine, Qt::FlatCap));
+  painter.drawLine(QPointF(kMargin, bottom), QPointF(kMargin + length, bottom));
+  paintLegendText(painter, {kMargin + length / 2, bottom - 14}, lengthText(metres), Qt::AlignHCenter);
+  paintLegendText(painter, {right, bottom}, QString::fromStdString(scene_.projection), Qt::AlignRight);
+
+  const QPointF top(right - 10, kMargin);
+  painter.setPen(QPen(Qt::white, 1));
+  painter.setBrush(Qt::black);
+  painter.drawPolygon(QPolygonF{{top, top + QPointF(8, 28), top + QPointF(0, 21), top + QPointF(-8, 28)}});
+  paintLegendText(painter, top + QPointF(0, 38), "N", Qt::AlignHCenter);
+
+  if (!scale || !shows(MapLayer::terrain)) return;
+  constexpr int kBar = 130;
+  const QRectF bar(right - 14, kMargin + 64, 14, kBar);
+  if (bar.bottom() > bottom - 30) return;
+  for (int y = 0; y < kBar; ++y)
+    painter.fillRect(QRectF(bar.left(), bar.top() + y, bar.width(), 1.5),
+                     QColor(terrainColour(style.colours, 1 - y / (kBar - 1.0))));
+  painter.setPen(Qt::black);
+  painter.setBrush(Qt::NoBrush);
+  painter.drawRect(bar);
+  constexpr int kTicks = 4;
+  for (int i = 0; i <= kTicks; ++i) {
+    const double value = scale->greatest + (scale->least - scale->greatest) * i / kTicks;
+    paintLegendText(painter, {bar.left() - 6, bar.top() + bar.height() * i / kTicks},
+                    QString::number(value, 'g', 4), Qt::AlignRight);
+  }
+}
+
+MapHit MapDrawing::hit(const MapFrame& frame, QPointF at) const {
+  MapHit hit;
+  const auto nearestVertex = [&](const MapFeature& feature) {
+    std::optional<std::size_t> nearest;
+    double least = kNear;
+    for (std::size_t i = 0; i < feature.points->size(); ++i) {
+      const double far = distance(at, frame.toScreen((*feature.points)[i]));
+      if (far <= least) nearest = i;
+      least = std::min(least, far);
+    }
+    return nearest;
+  };
+  const auto nearestSegment = [&](const MapFeature& feature) {
+    std::optional<std::size_t> nearest;
+    double least = kNear;
+    const std::vector<MapPoint>& points = *feature.points;
+    const std::size_t segments =
+        feature.joined && points.size() > 1 ? points.size() - (feature.closed ? 0 : 1) : 0;
+    for (std::size_t i = 0; i < segments; ++i) {
+      const double far =
+          distanceToSegment(at, frame.toScreen(points[i]), frame.toScreen(points[(i + 1) % points.size()]));
+      if (far <= least) nearest = i;
+      least = std::min(least, far);
+    }
+    return nearest;
+  };
+  const auto find = [&](const MapFeature& feature) {
+    if (!shows(layerOf(feature.id.kind))) return false;
+    hit.vertex = nearestVertex(feature);
+    hit.segment = nearestSegment(feature);
+    if (!hit.vertex && !hit.segment) return false;
+    hit.feature = feature.id;
+    return true;
+  };
+  for (const MapArea& area : scene_.areas) {
+    if (area.isPlaced && outlineOf(frame, area.corners).containsPoint(at, Qt::OddEvenFill) &&
+        (hit.area == 0 || area.level >= scene_.area(hit.area)->level))
+      hit.area = area.number;
+  }
+  const MapFeature* lit = selection.feature ? feature(*selection.feature) : nullptr;
+  if (lit != nullptr && find(*lit)) return hit;
+  for (auto each = placed_.rbegin(); each != placed_.rend(); ++each) {
+    if (find(*each->feature)) return hit;
+  }
+  if (!shows(MapLayer::outlines)) return hit;
+  for (auto area = scene_.areas.rbegin(); area != scene_.areas.rend(); ++area) {
+    if (!area->isPlaced) continue;
+    const QPolygonF outline = outlineOf(frame, area->corners);
+    bool isNear = distance(at, badgeOf(outline)) < 2 * kNear;
+    for (qsizetype i = 0; i < outline.size(); ++i)
+      isNear = isNear || distanceToSegment(at, outline[i], outline[(i + 1) % outline.size()]) < kNear;
+    if (!isNear) continue;
+    hit.area = area->number;
+    hit.isBorder = true;
+    return hit;
+  }
+  return hit;
+}
+
+}  // namespace gridbay::shell

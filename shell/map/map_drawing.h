@@ -1,0 +1,75 @@
+#pragma once
+
+#include <QPainter>
+#include <optional>
+#include <vector>
+
+#include "shell/map/map_frame.h"
+#include "shell/map/map_layers.h"
+#include "shell/map/terrain_picture.h"
+
+namespace gridbay::shell {
+
+// What is lit up: a feature, with one of its points perhaps, or an area; 0 for none.
+struct MapSelection {
+  std::optional<MapFeatureId> feature;
+  std::optional<std::size_t> vertex;
+  std::int32_t area = 0;
+
+  bool operator==(const MapSelection&) const = default;
+};
+
+// What lies at a place of the picture.
+struct MapHit {
+  std::optional<MapFeatureId> feature;
+  std::optional<std::size_t> vertex;   // of the feature: the point itself
+  std::optional<std::size_t> segment;  // from this point to the next one
+  std::int32_t area = 0;               // the finest one there, or the one whose border is hit
+  bool isBorder = false;               // its outline or number
+};
+
+// Draws what a scene places over the terrain, for the screen as for paper, and finds it again under the
+// pointer.
+class MapDrawing {
+ public:
+  void setScene(MapScene scene);
+  const MapScene& scene() const { return scene_; }
+  const MapFeature* feature(const MapFeatureId& id) const;
+
+  MapLayers layers = MapLayers().set();
+  MapSelection selection;
+
+  void paint(QPainter& painter, const MapFrame& frame) const;
+  // Scale bar, north arrow, colour scale and the name of the projection.
+  void paintLegend(QPainter& painter, const MapFrame& frame, const TerrainStyle& style,
+                   const std::optional<TerrainScale>& scale) const;
+  // The selected feature comes first, then the others from the top, then the borders of areas.
+  MapHit hit(const MapFrame& frame, QPointF at) const;
+
+ private:
+  // A feature with what it covers on the map.
+  struct Placed {
+    const MapFeature* feature;
+    QRectF cover;
+  };
+  bool shows(MapLayer layer) const { return layers.test(placeOf(layer)); }
+  void paintAreas(QPainter& painter, const MapFrame& frame) const;
+  void paintGridLines(QPainter& painter, const MapFrame& frame) const;
+  void paintFeature(QPainter& painter, const MapFrame& frame, const MapFeature& feature) const;
+  void paintMarks(QPainter& painter, const MapFeature& feature, const QPolygonF& line,
+                  const QColor& colour) const;
+  void paintHandles(QPainter& painter, const QPolygonF& line) const;
+
+  MapScene scene_;
+  std::vector<Placed> placed_;
+};
+
+// A line of the map on the screen; points that fall on one pixel are left out of long ones.
+QPolygonF onScreen(const MapFrame& frame, const std::vector<MapPoint>& points);
+QPolygonF outlineOf(const MapFrame& frame, const std::array<MapPoint, 4>& corners);
+// A text on a ground of its own, that is read on any terrain.
+void paintBadge(QPainter& painter, QPointF middle, const QString& text, const QColor& ground);
+// The middle of an area's number on the screen.
+QPointF badgeOf(const QPolygonF& outline);
+
+}  // namespace gridbay::shell
