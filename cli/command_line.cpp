@@ -81,6 +81,7 @@ int runCommandLine(int argc, const char* const* argv, std::ostream& out, std::os
   addArea(tool, action);
   addExport(tool, action);
   addValidate(tool, action);
+  addFix(tool, action);
   addRun(tool, action);
   addEnsemble(tool, action);
   addCompletion(tool, action);

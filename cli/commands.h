@@ -27,6 +27,7 @@ void addBoundaries(CLI::App& tool, Action& action);
 void addArea(CLI::App& tool, Action& action);
 void addExport(CLI::App& tool, Action& action);
 void addValidate(CLI::App& tool, Action& action);
+void addFix(CLI::App& tool, Action& action);
 void addRun(CLI::App& tool, Action& action);
 void addEnsemble(CLI::App& tool, Action& action);
 void addCompletion(CLI::App& tool, Action& action);

@@ -1,5 +1,9 @@
 #include "plugin/setup_editor.h"
 
+#include <chrono>
+#include <stdexcept>
+
+#include "advice/advisor.h"
 #include "map/document_map.h"
 #include "plugin/cover_pages.h"
 #include "setup/graphical_view.h"
@@ -79,6 +83,25 @@ class Editor final : public SetupEditor {
                                                           : missingPage(pages.GetCaption(id));
   }
 
+  std::vector<Advice> advice() override { return advisor_.look(document_.root(), document_.path()); }
+  bool isAdviceWhole() const override { return advisor_.isComplete(); }
+  bool readForAdvice(int milliseconds) override {
+    return advisor_.read(std::chrono::milliseconds(milliseconds));
+  }
+  bool makeFix(const Advice& advice) override {
+    if (!advice.fix) return false;
+    const bool isMade = document_.Attempt([this, &fix = *advice.fix] {
+      if (const Outcome made = gridbay::makeFix(document_.root(), fix, document_.path()); !made)
+        throw std::runtime_error(made.error());
+    });
+    if (!isMade) return false;
+    document_.Touch(advice.place.page);
+    document_.SetModifiedFlag();
+    document_.RecordEdit(advice.place.page, advice.fix->name);
+    document_.UpdateAllViews(nullptr);
+    return true;
+  }
+
   std::vector<Command> commands() const override {
     std::vector<Command> commands;
     commands.reserve(CGridbayDoc::kCommands.size());
@@ -118,6 +141,7 @@ class Editor final : public SetupEditor {
   CGridbayDoc document_;
   std::unique_ptr<MapEditor> map_ = makeMapEditor(document_);
   CNavigationView tree_;
+  Advisor advisor_;
   std::unique_ptr<CV27SetupFormView> page_;
   std::function<void()> changed_;
 };

@@ -7,6 +7,7 @@
 #include <string>
 #include <vector>
 
+#include "advice/advice.h"
 #include "core/message.h"
 #include "map/map_editor.h"
 #include "pages/form.h"
@@ -88,6 +89,16 @@ class SetupEditor {
   virtual Cover cover(std::int32_t id) const = 0;
   // The number of an item's help topic; 0 for one that has no page.
   virtual std::int32_t helpTopic(std::int32_t id) const = 0;
+
+  // What is doubtful in the setup as it is now, by what is known of its data files.
+  virtual std::vector<Advice> advice() = 0;
+  // Whether the last advice knew all that it asked for. Else reads in data files about so long; true once
+  // there is nothing more to read, when the next advice knows all.
+  virtual bool isAdviceWhole() const = 0;
+  virtual bool readForAdvice(int milliseconds) = 0;
+  // Makes the fix of an advice as one step, after which the open page's form shows the model anew. False
+  // where it can't be made, which has been said.
+  virtual bool makeFix(const Advice& advice) = 0;
 
   virtual std::vector<Command> commands() const = 0;
   // Does a command, after which the open page's form shows the model anew.

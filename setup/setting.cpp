@@ -22,14 +22,20 @@ Outcome setOption(SetupFile& setup, const Setting& setting) {
 }
 
 Outcome setMember(SetupFile& setup, const Setting& setting, const std::string& documentPath) {
-  Result<MemberKeyword> keyword = findKeyword(setup.model(), setting.path, documentPath);
-  if (!keyword) {
-    const KvsHandle effective = setup.tree(documentPath);
-    const Result<const Node*> found = findPath(*effective, setting.path);
-    return found && (*found)->isSection()
-               ? Failure{fmt::format("\"{}\" is a section; name a keyword in it", setting.path)}
-               : Failure{found ? keyword.error() : found.error()};
-  }
+  const Result<MemberKeyword> keyword = findKeyword(setup.model(), setting.path, documentPath);
+  if (keyword) return applySetting(setup.model(), setting, documentPath);
+  const KvsHandle effective = setup.tree(documentPath);
+  const Result<const Node*> found = findPath(*effective, setting.path);
+  return found && (*found)->isSection()
+             ? Failure{fmt::format("\"{}\" is a section; name a keyword in it", setting.path)}
+             : Failure{found ? keyword.error() : found.error()};
+}
+
+}  // namespace
+
+Outcome applySetting(CGlobalKvs& model, const Setting& setting, const std::string& documentPath) {
+  Result<MemberKeyword> keyword = findKeyword(model, setting.path, documentPath);
+  if (!keyword) return Failure{keyword.error()};
   ParameterTree keeper;
   const Result<std::vector<Value>> values =
       valuesOfText(keyword->node(), setting.value, keyword->takesAnyNumber(), keeper);
@@ -38,8 +44,6 @@ Outcome setMember(SetupFile& setup, const Setting& setting, const std::string& d
   return Failure{fmt::format("{} cannot be {} here: it stays {}", setting.path, setting.value,
                              shownValues(keyword->node()))};
 }
-
-}  // namespace
 
 Result<Setting> settingOf(const std::string& text) {
   const std::size_t equals = text.find('=');

@@ -3,15 +3,10 @@
 #include <string>
 
 #include "platform/result.h"
+#include "setup/path_setting.h"
 #include "setup/setup_file.h"
 
 namespace gridbay {
-
-// A keyword by its path with the text of its values, as the command line and scripts give them.
-struct Setting {
-  std::string path;
-  std::string value;
-};
 
 // A text of the form PATH=VALUE.
 Result<Setting> settingOf(const std::string& text);
@@ -20,5 +15,7 @@ Result<Setting> settingOf(const std::string& text);
 // engine that its file has. An error names the path, what was given and what is allowed, and leaves the
 // keyword as it was.
 Outcome applySetting(SetupFile& setup, const Setting& setting, const std::string& documentPath);
+// The same for a keyword that the model holds, without the file that it came from.
+Outcome applySetting(CGlobalKvs& model, const Setting& setting, const std::string& documentPath);
 
 }  // namespace gridbay

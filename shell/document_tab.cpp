@@ -7,11 +7,15 @@
 #include <QVBoxLayout>
 #include <algorithm>
 
+#include "shell/tool_icons.h"
+
 namespace gridbay::shell {
 namespace {
 
 constexpr int kIdRole = Qt::UserRole;
 constexpr const char* kUntitled = "Untitled";
+constexpr int kAdviceDelay = 400;  // milliseconds after an edit
+constexpr int kAdvicePiece = 15;   // milliseconds of reading at a time
 
 }  // namespace
 
@@ -43,22 +47,37 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
   pane_ = new PagePane(main);
   cover_ = new CoverView(main);
   summary_ = new SummaryView(main);
+  adviceStrip_ = new AdviceStrip(main);
   mainLayout->addWidget(notice_);
   mainLayout->addWidget(pane_, 1);
   mainLayout->addWidget(cover_, 1);
   mainLayout->addWidget(summary_, 1);
+  // Below the page, which stays where it is when advice comes and goes.
+  mainLayout->addWidget(adviceStrip_);
   addWidget(side);
   addWidget(main);
   setStretchFactor(1, 1);
   setSizes({260, 700});
 
   editor_ = make(*this);
+  adviceTimer_.setSingleShot(true);
+  adviceTimer_.setInterval(kAdviceDelay);
+  readingTimer_.setInterval(0);
+  connect(&adviceTimer_, &QTimer::timeout, this, &DocumentTab::lookForAdvice);
+  connect(&readingTimer_, &QTimer::timeout, this, &DocumentTab::readForAdvice);
+  connect(adviceStrip_, &AdviceStrip::chosen, this,
+          [this](int place) { goToAdvice(static_cast<std::size_t>(place)); });
+  connect(adviceStrip_, &AdviceStrip::fixWanted, this,
+          [this](int place) { fixAdvice(static_cast<std::size_t>(place)); });
+
   editor_->onChange([this] {
+    adviceTimer_.start();
     applyVisibility();
     showSummary();
     emit documentChanged();
   });
   editor_->onSave([this] {
+    adviceTimer_.start();
     watch();
     showSummary();
     emit documentChanged();
@@ -200,6 +219,7 @@ void DocumentTab::showFirstView() {
   pane_->show();
   summary_->show();
   showSummary();
+  showAdvice();
 }
 
 // The model's lines, and one for its check.
@@ -234,6 +254,61 @@ void DocumentTab::showCurrentPage() {
   cover_->setVisible(form == nullptr);
   pane_->setVisible(form != nullptr);
   emit rowChosen(0);
+  showAdvice();
+}
+
+void DocumentTab::lookForAdvice() {
+  readingTimer_.stop();
+  std::vector<Advice> found = editor_->advice();
+  if (found != advice_) {
+    advice_ = std::move(found);
+    showAdvice();
+  }
+  if (!editor_->isAdviceWhole()) readingTimer_.start();
+}
+
+void DocumentTab::readForAdvice() {
+  if (!editor_->readForAdvice(kAdvicePiece)) return;
+  lookForAdvice();
+}
+
+// Marks on the items of the tree, and the open page's own advice below it.
+void DocumentTab::showAdvice() {
+  QHash<std::int32_t, QStringList> tips;
+  std::vector<int> here;
+  for (std::size_t i = 0; i < advice_.size(); ++i) {
+    const auto page = static_cast<std::int32_t>(advice_[i].place.page);
+    tips[page] << adviceTip(advice_[i]);
+    if (page == currentPage() && page != 0) here.push_back(static_cast<int>(i));
+  }
+  for (auto item = itemsById_.cbegin(); item != itemsById_.cend(); ++item) {
+    const QString tip = tips.value(item.key()).join("\n\n");
+    if (item.value()->toolTip(0) == tip) continue;
+    item.value()->setToolTip(0, tip);
+    item.value()->setIcon(0, tip.isEmpty() ? QIcon() : toolIcon(Tool::advice));
+  }
+  adviceStrip_->showAdvice(advice_, here);
+  emit advised();
+}
+
+bool DocumentTab::goToAdvice(std::size_t place) {
+  if (place >= advice_.size()) return false;
+  const AdvicePlace at = advice_[place].place;
+  if (!goToPage(static_cast<std::int32_t>(at.page))) return false;
+  pane_->focusOn(QString::fromStdString(at.field), at.fieldNumber, at.item, at.itemCount);
+  return true;
+}
+
+void DocumentTab::fixAdvice(std::size_t place) {
+  if (place >= advice_.size()) return;
+  const Advice wanted = advice_[place];
+  commit();
+  if (!editor_->makeFix(wanted)) return;
+  editor_->refreshPage();
+  pane_->refresh();
+  goToPage(static_cast<std::int32_t>(wanted.place.page));
+  // What the fix has mended is seen to be gone at once.
+  lookForAdvice();
 }
 
 QString DocumentTab::name() const {
@@ -285,10 +360,13 @@ bool DocumentTab::replaceSetup(const std::function<bool()>& load) {
     check_.reset();
     fillTree();
     watch();
+    advice_.clear();
+    adviceTimer_.start();
   }
   if (page == 0 || !goToPage(page)) showFirstView();
   showCurrentPage();
   if (loaded) {
+    showAdvice();
     emit documentChanged();
     emit checked();
   }

@@ -4,12 +4,14 @@
 #include <QHash>
 #include <QLineEdit>
 #include <QSplitter>
+#include <QTimer>
 #include <QTreeWidget>
 #include <functional>
 #include <memory>
 #include <optional>
 
 #include "plugin/setup_editor.h"
+#include "shell/advice_strip.h"
 #include "shell/cover_view.h"
 #include "shell/page_pane.h"
 #include "shell/summary_view.h"
@@ -56,6 +58,14 @@ class DocumentTab final : public QSplitter, public SetupHost {
   // The last check of this setup since it was opened, and whether it is of the model as it is now.
   const std::optional<Check>& check() const { return check_; }
   bool isCheckCurrent() const { return check_ && check_->state == editor_->modelState(); }
+
+  // What is doubtful in the setup: of the model a moment after its last edit.
+  const std::vector<Advice>& advice() const { return advice_; }
+  AdviceStrip& adviceStrip() { return *adviceStrip_; }
+  // Goes to the page, and the field or entry, that an advice speaks of; false when the page does not apply.
+  // Makes its fix, and goes to its page.
+  bool goToAdvice(std::size_t place);
+  void fixAdvice(std::size_t place);
 
   // Does a command of the editor, with what is typed and not yet entered, and shows the model anew.
   bool runCommand(int id);
@@ -112,8 +122,13 @@ class DocumentTab final : public QSplitter, public SetupHost {
   // The setup was checked, or there is another one whose check is not known.
   void checked();
   void saved();
+  // There is other advice.
+  void advised();
 
  private:
+  void lookForAdvice();
+  void readForAdvice();
+  void showAdvice();
   void fillTree();
   void applyVisibility();
   void showCurrentPage();
@@ -146,6 +161,10 @@ class DocumentTab final : public QSplitter, public SetupHost {
   static Stamp stampOf(const QString& path);
   Stamp stamp_;
   std::optional<Check> check_;
+  AdviceStrip* adviceStrip_;
+  QTimer adviceTimer_;   // runs from an edit to the look at what it has made
+  QTimer readingTimer_;  // runs while data files are read for it
+  std::vector<Advice> advice_;
   std::unique_ptr<SetupEditor> editor_;
 };
 

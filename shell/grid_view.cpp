@@ -426,6 +426,21 @@ void GridView::goTo(int row, int column) {
   scrollTo(currentIndex());
 }
 
+// An entry may have several rows, and there may be rows of headers above the first.
+void GridView::goToItem(int item, int count) {
+  const int rows = model_->rowCount();
+  int first = 0;
+  while (first < rows && model_->style(model_->index(first, 0)).isHeader) ++first;
+  const int each = count > 0 ? std::max((rows - first) / count, 1) : 1;
+  const int row = first + (item - 1) * each;
+  if (row < 0 || row >= rows || model_->columnCount() == 0) return;
+  const bool outer = std::exchange(movingByKeys_, true);
+  selectionModel()->setCurrentIndex(model_->index(row, 0), QItemSelectionModel::ClearAndSelect);
+  scrollTo(model_->index(row, 0));
+  movingByKeys_ = outer;
+  setFocus(Qt::OtherFocusReason);
+}
+
 // To come here by Tab makes a cell the current one, and opens none. The focus that a closed editor gives back
 // makes none current where the grid has none.
 void GridView::focusInEvent(QFocusEvent* event) {

@@ -25,6 +25,8 @@ class GridView final : public QTableView {
   void goTo(int row, int column);
   // Hands over what is typed in a cell and not yet entered.
   void commitEdit();
+  // Makes the entry `item` of `count`, from 1, the current one, and opens no editor.
+  void goToItem(int item, int count);
 
   QSize sizeHint() const override;
   QSize minimumSizeHint() const override;

@@ -79,6 +79,15 @@ void MainWindow::buildDocks() {
       statusBar()->showMessage(tr("The page %1 is not shown now.").arg(tab->caption(page)));
   });
 
+  connect(messages_, &MessagesDock::adviceChosen, this, [this](int place) {
+    DocumentTab* tab = currentDocument();
+    if (tab != nullptr && !tab->goToAdvice(static_cast<std::size_t>(place)))
+      statusBar()->showMessage(tr("The page of this advice is not shown now."));
+  });
+  connect(messages_, &MessagesDock::fixWanted, this, [this](int place) {
+    if (DocumentTab* tab = currentDocument()) tab->fixAdvice(static_cast<std::size_t>(place));
+  });
+
   run_ = new RunDock(this);
   addDockWidget(Qt::BottomDockWidgetArea, run_);
   tabifyDockWidget(messages_, run_);
@@ -115,6 +124,9 @@ DocumentTab* MainWindow::newDocument(std::size_t library) {
   const int index = tabs_->addTab(tab, tab->title());
   connect(tab, &DocumentTab::documentChanged, this, [this, tab] { documentChanged(tab); });
   connect(tab, &DocumentTab::checked, this, [this, tab] { showMessages(tab); });
+  connect(tab, &DocumentTab::advised, this, [this, tab] {
+    if (tab == currentDocument()) messages_->showAdvice();
+  });
   connect(tab, &DocumentTab::saved, this,
           [this, tab] { remember(QString::fromStdString(tab->editor().path())); });
   tabs_->setCurrentIndex(index);

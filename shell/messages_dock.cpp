@@ -1,14 +1,20 @@
 #include "shell/messages_dock.h"
 
 #include <QEvent>
+#include <QHeaderView>
 #include <QStyle>
 #include <QVBoxLayout>
+
+#include "shell/tool_icons.h"
 
 namespace gridbay::shell {
 namespace {
 
 constexpr int kPageRole = Qt::UserRole;
-constexpr int kMessageWidth = 700;
+constexpr int kAdviceType = QTreeWidgetItem::UserType;  // of an item with an advice
+constexpr int kPlaceRole = Qt::UserRole + 1;            // of an advice in its list
+constexpr int kPageColumn = 1;
+constexpr int kFixColumn = 2;
 
 }  // namespace
 
@@ -16,14 +22,17 @@ MessagesDock::MessagesDock(QAction* check, QWidget* parent)
     : QDockWidget(tr("Messages"), parent),
       note_(new QLabel(this)),
       check_(new QToolButton(this)),
-      list_(new QTreeWidget(this)) {
+      list_(new QTreeWidget(this)),
+      fix_(new QAction(tr("&Fix"), this)) {
   setObjectName("messages");
   check_->setDefaultAction(check);
   check_->setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
   check_->setFocusPolicy(Qt::StrongFocus);
-  list_->setHeaderLabels({tr("Message"), tr("Page")});
+  list_->setHeaderLabels({tr("Message"), tr("Page"), QString()});
   list_->setRootIsDecorated(false);
-  list_->setColumnWidth(0, kMessageWidth);
+  list_->header()->setStretchLastSection(false);
+  list_->header()->setSectionResizeMode(QHeaderView::ResizeToContents);
+  list_->header()->setSectionResizeMode(0, QHeaderView::Stretch);
   list_->setAccessibleName(tr("Messages"));
 
   auto* content = new QWidget(this);
@@ -36,8 +45,25 @@ MessagesDock::MessagesDock(QAction* check, QWidget* parent)
   layout->addWidget(list_);
   setWidget(content);
   QWidget::setTabOrder(list_, check_);
-  connect(list_, &QTreeWidget::itemActivated, this,
-          [this](const QTreeWidgetItem* item) { emit pageChosen(item->data(0, kPageRole).toInt()); });
+  connect(list_, &QTreeWidget::itemActivated, this, [this](const QTreeWidgetItem* item) {
+    if (const int place = adviceAt(item); place >= 0) {
+      emit adviceChosen(place);
+    } else {
+      emit pageChosen(item->data(0, kPageRole).toInt());
+    }
+  });
+  fix_->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_Period));
+  fix_->setShortcutContext(Qt::WidgetWithChildrenShortcut);
+  list_->addAction(fix_);
+  list_->setContextMenuPolicy(Qt::ActionsContextMenu);
+  connect(list_, &QTreeWidget::currentItemChanged, this, [this](const QTreeWidgetItem* item) {
+    const int place = adviceAt(item);
+    fix_->setEnabled(place >= 0 && tab_->advice()[static_cast<std::size_t>(place)].fix.has_value());
+  });
+  connect(fix_, &QAction::triggered, this, [this] {
+    if (const int place = adviceAt(list_->currentItem()); place >= 0) emit fixWanted(place);
+  });
+  fix_->setEnabled(false);
   mark();
 }
 
@@ -57,7 +83,50 @@ void MessagesDock::showCheckOf(DocumentTab* tab) {
       item->setToolTip(0, item->text(0));
     }
   }
+  showAdvice();
   mark();
+}
+
+int MessagesDock::adviceAt(const QTreeWidgetItem* item) const {
+  if (tab_ == nullptr || item == nullptr || item->type() != kAdviceType) return -1;
+  const int place = item->data(0, kPlaceRole).toInt();
+  return place < static_cast<int>(tab_->advice().size()) ? place : -1;
+}
+
+int MessagesDock::messageCount() const {
+  int count = list_->topLevelItemCount();
+  while (count > 0 && list_->topLevelItem(count - 1)->type() == kAdviceType) --count;
+  return count;
+}
+
+void MessagesDock::showAdvice() {
+  const int current = adviceAt(list_->currentItem());
+  for (int count = list_->topLevelItemCount(); count > messageCount(); --count)
+    delete list_->takeTopLevelItem(count - 1);
+  if (tab_ == nullptr) return;
+  for (std::size_t i = 0; i < tab_->advice().size(); ++i) addAdvice(tab_->advice()[i], static_cast<int>(i));
+  if (current >= 0 && messageCount() + current < list_->topLevelItemCount())
+    list_->setCurrentItem(list_->topLevelItem(messageCount() + current));
+}
+
+void MessagesDock::addAdvice(const Advice& advice, int place) {
+  auto* item = new QTreeWidgetItem(list_, kAdviceType);
+  item->setText(0, QString::fromStdString(advice.doubt));
+  const QString page = tab_->caption(static_cast<std::int32_t>(advice.place.page));
+  item->setText(kPageColumn,
+                advice.place.thing.empty() ? page : page + ", " + QString::fromStdString(advice.place.thing));
+  item->setData(0, kPlaceRole, place);
+  item->setIcon(0, toolIcon(Tool::advice));
+  item->setToolTip(0, adviceTip(advice));
+  if (!advice.fix) return;
+  auto* button = new QToolButton(list_);
+  button->setText(tr("Fix"));
+  button->setToolTip(QString::fromStdString(advice.fix->name));
+  button->setAutoRaise(true);
+  list_->setItemWidget(item, kFixColumn, button);
+  // Not at once: the button goes with the list that the fix changes.
+  connect(
+      button, &QToolButton::clicked, this, [this, place] { emit fixWanted(place); }, Qt::QueuedConnection);
 }
 
 void MessagesDock::mark() {
@@ -77,7 +146,7 @@ void MessagesDock::mark() {
   note_->setText(text);
   check_->setVisible(tab_ != nullptr && !holds);
   const QBrush brush = palette().brush(holds ? QPalette::Active : QPalette::Disabled, QPalette::Text);
-  for (int i = 0; i < list_->topLevelItemCount(); ++i) {
+  for (int i = 0; i < messageCount(); ++i) {
     for (int column = 0; column < list_->columnCount(); ++column)
       list_->topLevelItem(i)->setForeground(column, brush);
   }

@@ -5,6 +5,7 @@
 #include <QScreen>
 #include <QStyle>
 #include <QVBoxLayout>
+#include <algorithm>
 #include <unordered_map>
 #include <unordered_set>
 
@@ -289,6 +290,21 @@ QWidget* PagePane::widgetOf(const QString& label, int n) const {
     if (QString::fromStdString(part.control->label) == label && --n == 0) return part.widget;
   }
   return nullptr;
+}
+
+bool PagePane::focusOn(const QString& label, int n, int item, int itemCount) {
+  if (!label.isEmpty()) {
+    QWidget* input = widgetOf(label, n);
+    if (input == nullptr) return false;
+    input->setFocus(Qt::OtherFocusReason);
+    ensureWidgetVisible(input);
+    return true;
+  }
+  const auto table = std::ranges::find_if(parts_, [](const Part& part) { return part.grid != nullptr; });
+  if (item < 1 || table == parts_.end()) return false;
+  table->grid->goToItem(item, itemCount);
+  ensureWidgetVisible(table->grid);
+  return true;
 }
 
 }  // namespace gridbay::shell

@@ -43,6 +43,9 @@ class PagePane final : public QScrollArea {
   int currentRow() const;
   // The cell that is at work, where it holds a point of a grid and takes another one.
   std::optional<QModelIndex> pointCell() const;
+  // Puts the focus on the n-th control of a label, or on an entry of the first table where there is no label;
+  // false when the page has no such thing.
+  bool focusOn(const QString& label, int n, int item, int itemCount);
 
   // The whole page, as far as the screen has the room.
   QSize sizeHint() const override;

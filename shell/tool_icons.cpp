@@ -103,6 +103,18 @@ Drawing help() {
   return drawing;
 }
 
+// A lamp.
+Drawing advice() {
+  Drawing drawing{lines({{9.5, 18.5}, {14.5, 18.5}}), {}};
+  drawing.strokes.addPath(lines({{10.5, 21.5}, {13.5, 21.5}}));
+  drawing.accent.moveTo(9.5, 15.5);
+  drawing.accent.cubicTo(9.5, 13, 5.5, 12, 5.5, 8.5);
+  drawing.accent.cubicTo(5.5, 0.5, 18.5, 0.5, 18.5, 8.5);
+  drawing.accent.cubicTo(18.5, 12, 14.5, 13, 14.5, 15.5);
+  drawing.accent.closeSubpath();
+  return drawing;
+}
+
 struct Entry {
   const char* themeName;
   Drawing (*draw)();
@@ -119,6 +131,7 @@ constexpr Entry kEntries[] = {
     {"media-playback-start", start},
     {"measure", units},
     {"help-contents", help},
+    {"dialog-information", advice},
 };
 
 class Engine final : public QIconEngine {

@@ -53,6 +53,7 @@ TEST_F(Tool, HelpOnEveryCommand) {
                                                        {"set"},
                                                        {"boundaries"},
                                                        {"validate"},
+                                                       {"fix"},
                                                        {"run"},
                                                        {"ensemble"}};
   for (std::vector<std::string> words : commands) {
@@ -596,6 +597,49 @@ TEST_F(RunEngine, IsEndedWhenTheToolIsToldToStop) {
   EXPECT_EQ(WEXITSTATUS(status), 9);
   EXPECT_EQ(textOf(folder.file("ended")), "ended\n");
   EXPECT_NE(::kill(std::stoi(started), 0), 0);
+}
+
+TEST_F(Tool, AdviceIsTakenByItsNumber) {
+  makeSetup();
+  ASSERT_EQ(runTool({"set", setup, "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD/Time_Step_Interval=3"}).status, 0);
+  ProgramRun run = runTool({"validate", setup, "--advice"});
+  EXPECT_EQ(run.status, 0) << run.err;
+  EXPECT_EQ(run.out, "0 faults\nno advice\n");
+  const std::string depth = "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Flooding_Depth";
+  ASSERT_EQ(runTool({"set", setup, depth + "=0.5"}).status, 0);
+  EXPECT_EQ(runTool({"validate", setup}).out, "0 faults\n");
+  run = runTool({"validate", setup, "--advice"});
+  EXPECT_EQ(run.status, 0);
+  EXPECT_THAT(run.out,
+              HasSubstr("0 faults\nadvice 1, page 26 (Flood and Dry): The flooding depth of 0.5 m is 25 "
+                        "times the drying depth of 0.02 m."));
+  EXPECT_THAT(run.out, HasSubstr("\n  fix: Flooding depth (" +
+                                 std::string(theEdition.wetlandSweepKit ? "v27setup-wsk" : "v27setup") +
+                                 " fix '" + setup + "' 1)\n"));
+  const nlohmann::json report = nlohmann::json::parse(runTool({"validate", setup, "--advice", "--json"}).out);
+  EXPECT_EQ(report["faults"], 0);
+  ASSERT_EQ(report["advice"].size(), 1U);
+  EXPECT_EQ(report["advice"][0]["kind"], "flood-and-dry");
+  EXPECT_EQ(report["advice"][0]["pageName"], "Flood and Dry");
+  EXPECT_EQ(report["advice"][0]["fix"]["settings"][0]["path"], depth);
+  EXPECT_FALSE(nlohmann::json::parse(runTool({"validate", setup, "--json"}).out).contains("advice"));
+
+  EXPECT_EQ(runTool({"fix", setup, "0"}).status, 2);
+  EXPECT_EQ(runTool({"fix", setup, "2"}).status, 2);
+  run = runTool({"fix", setup, "1"});
+  EXPECT_EQ(run.status, 0) << run.err;
+  EXPECT_EQ(run.out, "Flooding depth\n  " + depth + ": 0.5 -> 0.04\n");
+  EXPECT_EQ(get(depth), "0.04\n");
+  EXPECT_EQ(runTool({"validate", setup, "--advice"}).out, "0 faults\nno advice\n");
+
+  // Faults keep their status, and name their pages beside advice.
+  ASSERT_EQ(
+      runTool({"set", setup, "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.3", depth + "=0.2"}).status,
+      0);
+  run = runTool({"validate", setup, "--advice"});
+  EXPECT_EQ(run.status, 1);
+  EXPECT_THAT(run.out, HasSubstr("page 26 (Flood and Dry), severity 1: "));
+  EXPECT_THAT(runTool({"validate", setup}).out, HasSubstr("page 26, severity 1: "));
 }
 
 }  // namespace

@@ -246,7 +246,7 @@ class DesktopTest : public DesktopFixture {
     QVERIFY(tab->goToPage(39));
     type("Time step interval:", "0");
     QVERIFY(tab->editor().command(46019));
-    QCOMPARE(window_->messages().topLevelItemCount(), 1);
+    QCOMPARE(window_->messagesDock().messageCount(), 1);
     QVERIFY(tab->goToPage(1));
     emit window_->messages().itemActivated(window_->messages().topLevelItem(0), 0);
     QCOMPARE(tab->tree().currentItem()->text(0), QString("Simulation Period"));

@@ -9,6 +9,7 @@
 #include <QStatusBar>
 
 #include "shell/appearance.h"
+#include "shell/grid_view.h"
 #include "shell/tool_icons.h"
 #include "tests/shell/desktop_fixture.h"
 
@@ -29,6 +30,16 @@ class WindowTest final : public DesktopFixture {
   bool messagesStandBack() {
     return messages().list().topLevelItem(0)->foreground(0).color() ==
            messages().palette().color(QPalette::Disabled, QPalette::Text);
+  }
+  // The place of the first advice with a text in the list; -1 for none.
+  int adviceOf(const QString& text) {
+    for (std::size_t i = 0; i < tab().advice().size(); ++i) {
+      if (QString::fromStdString(tab().advice()[i].doubt).contains(text)) return static_cast<int>(i);
+    }
+    return -1;
+  }
+  QTreeWidgetItem* adviceItem(const QString& text) {
+    return messages().list().topLevelItem(messages().messageCount() + adviceOf(text));
   }
   // By its key, which differs with the desktop.
   void closeTab() { QTest::keySequence(window_.get(), QKeySequence(QKeySequence::Close)); }
@@ -118,7 +129,7 @@ class WindowTest final : public DesktopFixture {
       }
       return inked > 60 ? least : -1;
     };
-    for (int tool = 0; tool <= static_cast<int>(Tool::help); ++tool) {
+    for (int tool = 0; tool <= static_cast<int>(Tool::advice); ++tool) {
       const Tool each = static_cast<Tool>(tool);
       setAppearance(Appearance::light);
       const QImage light = drawn(each, QIcon::Normal);
@@ -369,11 +380,11 @@ class WindowTest final : public DesktopFixture {
     QVERIFY(tab().goToPage(39));
     enter("Time step interval:", "0");
     QTest::keyClick(window_.get(), Qt::Key_F7);
-    QCOMPARE(messages().list().topLevelItemCount(), 1);
+    QCOMPARE(messages().messageCount(), 1);
     QCOMPARE(messages().note().text(), QString("s.v27: 1 fault"));
     QVERIFY(!messagesStandBack());
     enter("Time step interval:", "2");
-    QCOMPARE(messages().list().topLevelItemCount(), 1);  // still there to work down
+    QCOMPARE(messages().messageCount(), 1);  // still there to work down
     QVERIFY(messagesStandBack());
     QCOMPARE(messages().note().text(),
              QString("s.v27: 1 fault before the last edit. Check again to see what holds now."));
@@ -393,7 +404,7 @@ class WindowTest final : public DesktopFixture {
     }
     QVERIFY(again->isVisible());
     QTest::mouseClick(again, Qt::LeftButton);
-    QCOMPARE(messages().list().topLevelItemCount(), 0);
+    QCOMPARE(messages().messageCount(), 0);
     QCOMPARE(messages().note().text(), QString("s.v27: no faults"));
     QVERIFY(!again->isVisible());
   }
@@ -405,24 +416,92 @@ class WindowTest final : public DesktopFixture {
     QTest::keyClick(window_.get(), Qt::Key_F7);
     DocumentTab* first = &tab();
     window_->newDocument(0);
-    QCOMPARE(messages().list().topLevelItemCount(), 0);
+    QCOMPARE(messages().messageCount(), 0);
     QCOMPARE(messages().note().text(), QString("Untitled has not been checked yet."));
     window_->openDocument(file("s.v27"));
     QCOMPARE(&tab(), first);
-    QCOMPARE(messages().list().topLevelItemCount(), 1);
+    QCOMPARE(messages().messageCount(), 1);
     // A setup that is read anew has not been checked.
     QVERIFY(window_->saveDocument());
     run("v27setup", {"set", "s.v27", "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD/Time_Step_Interval=5"});
     QTRY_VERIFY(tab().notice().isVisible());
     tab().notice().findChild<QPushButton*>("reload")->click();
-    QCOMPARE(messages().list().topLevelItemCount(), 0);
+    QCOMPARE(messages().messageCount(), 0);
     QCOMPARE(messages().note().text(), QString("s.v27 has not been checked yet."));
     QTest::keyClick(window_.get(), Qt::Key_F7);
     closeTab();
     closeTab();
     QCOMPARE(tabCount(), 0);
     QCOMPARE(messages().note().text(), QString("No setup is open."));
-    QCOMPARE(messages().list().topLevelItemCount(), 0);
+    QCOMPARE(messages().messageCount(), 0);
+  }
+
+  void adviceComesAMomentAfterAnEdit() {
+    QVERIFY(open());
+    QVERIFY(tab().goToPage(26));
+    QVERIFY(adviceOf("flooding depth") < 0);
+    enter("Flooding depth:", "0.5");
+    QVERIFY(adviceOf("flooding depth") < 0);  // not in the middle of the work
+    QTRY_VERIFY(adviceOf("flooding depth") >= 0);
+    const QTreeWidgetItem* line = adviceItem("flooding depth");
+    QCOMPARE(line->text(1), QString("Flood and Dry"));
+    QVERIFY(!line->icon(0).isNull());
+    // It is counted among no faults, and comes behind them.
+    QCOMPARE(messages().messageCount(), 0);
+    QTest::keyClick(window_.get(), Qt::Key_F7);
+    QCOMPARE(messages().note().text(), QString("s.v27: no faults"));
+    QVERIFY(adviceOf("flooding depth") >= 0);
+    // It marks the item of the tree and the page, and leads to its field.
+    QTreeWidgetItem* item = tab().tree().currentItem();
+    QVERIFY(!item->icon(0).isNull());
+    QVERIFY(item->toolTip(0).contains("flooding depth"));
+    QVERIFY(tab().adviceStrip().isVisible());
+    QVERIFY(tab().goToPage(1));
+    QVERIFY(!tab().adviceStrip().isVisible());
+    emit messages().list().itemActivated(adviceItem("flooding depth"), 0);
+    QCOMPARE(tab().currentPage(), 26);
+    QVERIFY(edit("Flooding depth:").hasFocus());
+    // Its fix is one step.
+    QTest::mouseClick(tab().adviceStrip().findChild<QToolButton*>("fix"), Qt::LeftButton);
+    QCOMPARE(edit("Flooding depth:").text(), QString("0.04"));
+    QVERIFY(adviceOf("flooding depth") < 0);
+    QVERIFY(item->icon(0).isNull());
+    QVERIFY(!tab().adviceStrip().isVisible());
+    QCOMPARE(window_->undoAction()->toolTip(), QString("Undo Flooding depth (Ctrl+Z)"));
+    window_->undoAction()->trigger();
+    QCOMPARE(edit("Flooding depth:").text(), QString("0.5"));
+    QTRY_VERIFY(adviceOf("flooding depth") >= 0);
+  }
+
+  void adviceLeadsToItsRowAndIsFixedFromTheList() {
+    run("v27setup", {"set", "s.v27", "NESTED_MODEL_GLOBALS/BATHYMETRY_SELECTION/AREA_2/Origin=35,33",
+                     "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD/Time_Step_Interval=3"});
+    QVERIFY(open());
+    QTRY_COMPARE(adviceOf("it belongs at (36,33)"), 0);  // once the grids are read
+    QCOMPARE(tab().advice().size(), std::size_t{1});
+    QCOMPARE(adviceItem("it belongs at")->text(1), QString("Bathymetry, area 2"));
+    emit messages().list().itemActivated(adviceItem("it belongs at"), 0);
+    QCOMPARE(tab().currentPage(), 27);
+    auto* grid = tab().pane().findChild<GridView*>();
+    QVERIFY(grid->hasFocus());
+    QCOMPARE(grid->currentIndex().row(), 1);
+    const auto origin = [grid] {
+      return grid->model()->index(1, 2).data().toString().remove('(').remove(')');
+    };
+    QCOMPARE(origin(), QString("35,33"));
+    auto* fix = qobject_cast<QToolButton*>(messages().list().itemWidget(adviceItem("it belongs at"), 2));
+    QVERIFY(fix != nullptr);
+    QTest::mouseClick(fix, Qt::LeftButton);
+    QTRY_COMPARE(origin(), QString("36,33"));
+    QVERIFY(tab().advice().empty());
+    window_->undoAction()->trigger();
+    QCOMPARE(origin(), QString("35,33"));
+    QTRY_COMPARE(tab().advice().size(), std::size_t{1});
+    // The same by keys.
+    messages().list().setFocus();
+    messages().list().setCurrentItem(adviceItem("it belongs at"));
+    QTest::keyClick(&messages().list(), Qt::Key_Period, Qt::ControlModifier);
+    QCOMPARE(origin(), QString("36,33"));
   }
 
   void aSearchEndsWhereItHidesThePage() {

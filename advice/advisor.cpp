@@ -1,0 +1,171 @@
+#include "advice/advisor.h"
+
+#include <fmt/format.h>
+
+#include <exception>
+#include <filesystem>
+
+#include "advice/rules.h"
+#include "basic/bathymetry.h"
+#include "setup/setting.h"
+#include "structures/dike.h"
+
+namespace gridbay {
+namespace {
+
+constexpr AdviceRule kRules[] = {
+    {"area-position", adviseAreaPositions},
+    {"projection", adviseProjections},
+    {"land-value", adviseLandValues},
+    {"courant", adviseCourant},
+    {"flood-and-dry", adviseThresholds},
+    {"warm-up", adviseWarmUp},
+    {"engine", adviseCodes},
+    {"boundary", adviseBoundaries},
+    {"source", adviseSources},
+    {"structure", adviseStructures},
+    {"series", adviseSeries},
+    {"file-name", adviseFileNames},
+    {"output-size", adviseOutputSize},
+};
+
+std::optional<double> freeOnDisk(const std::string& folder) {
+  std::error_code error;
+  const std::filesystem::space_info space = std::filesystem::space(folder, error);
+  if (error) return std::nullopt;
+  constexpr double kMegabyte = 1024.0 * 1024.0;
+  return static_cast<double>(space.available) / kMegabyte;
+}
+
+}  // namespace
+
+std::span<const AdviceRule> adviceRules() {
+  return kRules;
+}
+
+std::string thingOf(std::string_view what, int number) {
+  return fmt::format("{} {}", what, number);
+}
+
+const GridFacts* AdviceContext::grid(int number) {
+  const auto [at, isNew] = grids_.try_emplace(number, nullptr);
+  const CBathymetryObjectKvs* area = model.bathymetry->GetArea(number);
+  if (isNew && area != nullptr && !area->fileName.empty()) {
+    constexpr std::size_t kOfHotStart = 2;
+    at->second = files.grid(area->fileName.absolute(), model.bathymetry->hotStart == 1 ? kOfHotStart : 1);
+  }
+  return at->second;
+}
+
+// Longitude and latitude are what counts: a projection may be without a zone.
+std::optional<GridPlace> AdviceContext::placeOf(int number) {
+  const GridFacts* facts = grid(number);
+  if (facts == nullptr || !facts->file.geography) return std::nullopt;
+  const TsbGeography& on = *facts->file.geography;
+  const CVdMapProjection& projection = files.projection(on.projection);
+  GridPlace place{on.projection, 0, 0, on.rotation};
+  if (projection.IsLocal() ||
+      !projection.Geo2Proj(on.longitude, on.latitude, &place.easting, &place.northing))
+    return std::nullopt;
+  return place;
+}
+
+bool AdviceContext::isSameProjection(const std::string& a, const std::string& b) {
+  return a == b || files.fullText(a) == files.fullText(b);
+}
+
+std::optional<std::vector<GridSpot>> AdviceContext::spotsOn(int number, const std::string& projection,
+                                                            std::span<const AdviceSite::MapPoint> points) {
+  const GridFacts* facts = grid(number);
+  const std::optional<GridPlace> place = placeOf(number);
+  if (!place) return std::nullopt;
+  const bool isSame = isSameProjection(projection, place->projection);
+  const CVdMapProjection& from = files.projection(projection);
+  const CVdMapProjection& to = files.projection(place->projection);
+  const CVdCartography cartography({}, place->easting, place->northing, place->rotation);
+  std::vector<GridSpot> spots;
+  spots.reserve(points.size());
+  for (auto [easting, northing] : points) {
+    double longitude = 0;
+    double latitude = 0;
+    if (!isSame && !(from.Proj2Geo(easting, northing, &longitude, &latitude) &&
+                     to.Geo2Proj(longitude, latitude, &easting, &northing)))
+      return std::nullopt;
+    GridSpot& spot = spots.emplace_back();
+    cartography.Proj2Xy(easting, northing, &spot.j, &spot.k);
+    spot.j /= facts->dx;
+    spot.k /= facts->dy;
+  }
+  return spots;
+}
+
+const KvsFile* AdviceContext::written() {
+  if (!isWritten_) {
+    isWritten_ = true;
+    try {
+      CGlobalKvs copy;
+      copy.AssignState(model);
+      for (int number = 1; number <= copy.nhdDike->GetCount(); ++number)
+        copy.nhdDike->GetItem(number)->points.clear();
+      KvsHandle file = kvsCreate();
+      copy.Save(*file, documentPath);
+      file->tree();
+      written_ = std::move(file);
+    } catch (const std::exception&) {
+      // Why it can't be written is told by a save.
+    }
+  }
+  return written_.get();
+}
+
+Advisor::Advisor() : files_(std::make_unique<DataFileFacts>()), freeMegabytes_(freeOnDisk) {}
+Advisor::~Advisor() = default;
+
+std::vector<Advice> Advisor::look(CGlobalKvs& model, const std::string& documentPath, const KvsFile* source) {
+  AdviceContext context(model, documentPath, source, *files_);
+  context.freeMegabytes = freeMegabytes_;
+  for (const AdviceRule& rule : kRules) {
+    context.kind = rule.kind;
+    rule.look(context);
+  }
+  files_->forgetUnused();
+  return std::move(context.found);
+}
+
+bool Advisor::read(std::chrono::milliseconds time) {
+  return files_->read(time);
+}
+
+bool Advisor::isComplete() const {
+  return files_->isComplete();
+}
+
+std::vector<Advice> Advisor::lookThoroughly(CGlobalKvs& model, const std::string& documentPath,
+                                            const KvsFile* source) {
+  constexpr std::chrono::milliseconds kPiece{100};
+  std::vector<Advice> found = look(model, documentPath, source);
+  while (!isComplete()) {
+    while (!read(kPiece)) {
+    }
+    found = look(model, documentPath, source);
+  }
+  return found;
+}
+
+void Advisor::setFreeMegabytes(std::function<std::optional<double>(const std::string& folder)> free) {
+  freeMegabytes_ = std::move(free);
+}
+
+Outcome makeFix(CGlobalKvs& model, const AdviceFix& fix, const std::string& documentPath) {
+  CGlobalKvs before;
+  before.AssignState(model);
+  for (const Setting& setting : fix.settings) {
+    if (const Outcome done = applySetting(model, setting, documentPath); !done) {
+      model.AssignState(before);
+      return done;
+    }
+  }
+  return {};
+}
+
+}  // namespace gridbay

@@ -1,0 +1,247 @@
+// Doubts about areas: where they lie, their projections, and what is land.
+
+#include <fmt/format.h>
+
+#include <cmath>
+
+#include "advice/rules.h"
+#include "basic/bathymetry.h"
+#include "basic/module_selection.h"
+#include "basic/nesting.h"
+#include "structures/culvert.h"
+#include "structures/dike.h"
+#include "structures/weir.h"
+
+namespace gridbay {
+namespace {
+
+constexpr std::string_view kSection = "NESTED_MODEL_GLOBALS/BATHYMETRY_SELECTION";
+constexpr double kNear = 0.25;  // of a spacing: what lies nearer than this lies on the point
+
+AdvicePlace placeOfArea(AdviceContext& context, int number, std::string_view keyword) {
+  return {PageId::bathymetry,
+          thingOf("area", number),
+          fmt::format("{}/AREA_{}/{}", kSection, number, keyword),
+          {},
+          number,
+          context.model.bathymetry->GetCount()};
+}
+
+// The corners of a grid that lies in another one with its first point at `origin`.
+std::vector<GridPoint> cornersOf(const GridFacts& inner, GridPoint origin) {
+  const GridPoint last{origin.j + (inner.noJ - 1) / kNestingRatio,
+                       origin.k + (inner.noK - 1) / kNestingRatio};
+  return {origin, {last.j, origin.k}, last, {origin.j, last.k}};
+}
+
+// Where the first point of a grid lies on the grid around it, by the coordinates of both; nothing where these
+// do not tell.
+std::optional<GridSpot> spotByCoordinates(AdviceContext& context, int inner, int outer) {
+  const GridFacts& grid = *context.grid(inner);
+  const GridFacts& around = *context.grid(outer);
+  if (const std::optional<GridPlace> place = context.placeOf(inner)) {
+    const AdviceSite::MapPoint first{place->easting, place->northing};
+    const auto spots = context.spotsOn(outer, place->projection, std::span(&first, 1));
+    return spots ? std::optional(spots->front()) : std::nullopt;
+  }
+  // In coordinates of their own a grid at 0, 0 says nothing of its place.
+  const bool isLocal = !grid.file.geography && !around.file.geography;
+  const double x = grid.file.axes[0].first;
+  const double y = grid.file.axes[1].first;
+  if (!isLocal || (x == 0 && y == 0)) return std::nullopt;
+  return GridSpot{(x - around.file.axes[0].first) / around.dx, (y - around.file.axes[1].first) / around.dy};
+}
+
+bool nests(const GridFacts& inner, const GridFacts& outer, GridPoint origin) {
+  const GridPoint last = cornersOf(inner, origin)[2];
+  return origin.j >= 1 && origin.k >= 1 && last.j <= outer.noJ - 2 && last.k <= outer.noK - 2;
+}
+
+void advisePosition(AdviceContext& context, int number) {
+  const CBathymetryObjectKvs& area = *context.model.bathymetry->GetArea(number);
+  const GridFacts* inner = context.grid(number);
+  const GridFacts* outer = area.enclosingArea == number ? nullptr : context.grid(area.enclosingArea);
+  if (inner == nullptr || outer == nullptr) return;
+  const std::optional<GridSpot> spot = spotByCoordinates(context, number, area.enclosingArea);
+  constexpr double kMostSpacings = 1e6;  // further off it is in another world
+  if (!spot || !(std::abs(spot->j) < kMostSpacings) || !(std::abs(spot->k) < kMostSpacings)) return;
+  const GridPoint snapped{static_cast<int>(std::lround(spot->j)), static_cast<int>(std::lround(spot->k))};
+  const auto metres = [&](GridPoint point) {
+    return std::hypot((spot->j - point.j) * outer->dx, (spot->k - point.k) * outer->dy);
+  };
+  const double off = metres(area.origin);
+  const double residue = metres(snapped);
+  if (off <= kNear * std::min(inner->dx, inner->dy)) return;
+  Advice advice{{},
+                {},
+                "Water passes between the two grids at points that are not the same place.",
+                placeOfArea(context, number, "Origin"),
+                {.area = area.enclosingArea, .points = cornersOf(*inner, area.origin)}};
+  if (snapped == area.origin) {
+    advice.doubt = fmt::format(
+        "Area {} lies at {} of area {}, the nearest point to where its file's coordinates put it, and yet "
+        "{:.3g} m "
+        "off: its points are not those of area {}.",
+        number, pointText(area.origin), area.enclosingArea, off, area.enclosingArea);
+  } else {
+    advice.doubt = fmt::format(
+        "Area {} lies at {} of area {}; by its file's coordinates it belongs at {}, {:.6g} m away.", number,
+        pointText(area.origin), area.enclosingArea, pointText(snapped), off);
+    if (residue > kNear * std::min(inner->dx, inner->dy))
+      advice.doubt += fmt::format(" That is the nearest point, {:.3g} m off.", residue);
+    if (!nests(*inner, *outer, snapped)) {
+      advice.doubt += fmt::format(" There it does not lie inside area {}.", area.enclosingArea);
+    } else if (context.model.bathymetry->hotStart != 1) {
+      advice.fix = {{fmt::format("Move area {} to {}", number, pointText(snapped)),
+                     {{advice.place.keyword, fmt::format("{},{}", snapped.j, snapped.k)}}}};
+    }
+  }
+  context.add(std::move(advice));
+}
+
+constexpr std::string_view kElsewhere =
+    "What is placed by its coordinates, as structures, comes to lie elsewhere.";
+
+// The projection of the setup against that of Area 1's file.
+void adviseOwnProjection(AdviceContext& context) {
+  const std::string& own = context.model.bathymetry->projection;
+  AdvicePlace place{PageId::bathymetry, {}, fmt::format("{}/Projection", kSection), "Map projection:"};
+  const GridFacts* grid = context.grid(1);
+  // A projection without a zone is completed from the longitude.
+  const bool fileKnows = grid != nullptr && grid->file.geography &&
+                         grid->file.geography->projection != "UTM" &&
+                         context.files.projection(grid->file.geography->projection).IsValid();
+  const auto fix = [&]() -> std::optional<AdviceFix> {
+    if (!fileKnows) return std::nullopt;
+    return AdviceFix{"Projection of area 1", {{place.keyword, grid->file.geography->projection}}};
+  };
+  if (!context.files.projection(own).IsValid()) {
+    return context.add({{},
+                        fmt::format("There is no projection \"{}\".", own),
+                        "Nothing can be placed by its coordinates.",
+                        place,
+                        {},
+                        fix()});
+  }
+  if (own.empty() || !fileKnows || context.isSameProjection(own, grid->file.geography->projection)) return;
+  context.add(
+      {{},
+       fmt::format("The setup is in {}, the file of area 1 in {}.", context.files.projection(own).Name(),
+                   context.files.projection(grid->file.geography->projection).Name()),
+       std::string(kElsewhere),
+       place,
+       {},
+       fix()});
+}
+
+void adviseFileProjection(AdviceContext& context, int number) {
+  const GridFacts* grid = context.grid(number);
+  if (grid == nullptr) return;
+  const auto add = [&](std::string doubt, std::string_view reason) {
+    context.add(
+        {{}, std::move(doubt), std::string(reason), placeOfArea(context, number, "DATA_FILE/FILE_NAME")});
+  };
+  const GridFacts* first = context.grid(1);
+  const auto nameOf = [&](const GridFacts& facts) {
+    return facts.file.geography ? context.files.projection(facts.file.geography->projection).Name()
+                                : std::string("local coordinates");
+  };
+  if (grid->file.geography && grid->file.geography->projection != "UTM" &&
+      !context.files.projection(grid->file.geography->projection).IsValid()) {
+    return add(fmt::format("The file of area {} names a projection that there is not: \"{}\".", number,
+                           grid->file.geography->projection),
+               "Nothing can be placed by its coordinates.");
+  }
+  if (number > 1 && first != nullptr) {
+    const bool differ =
+        grid->file.geography.has_value() != first->file.geography.has_value() ||
+        (grid->file.geography &&
+         !context.isSameProjection(grid->file.geography->projection, first->file.geography->projection));
+    if (differ) {
+      add(fmt::format("The file of area {} is in {}, that of area 1 in {}.", number, nameOf(*grid),
+                      nameOf(*first)),
+          "Their grids do not run in the same directions, and their points do not fall together.");
+    }
+  }
+  // Axes that begin at 0 are the grid's own.
+  const TsbGridAxis& x = grid->file.axes[0];
+  const TsbGridAxis& y = grid->file.axes[1];
+  const std::optional<GridPlace> place = context.placeOf(number);
+  if (!place || grid->file.geography->isTurned() || (x.first == 0 && y.first == 0)) return;
+  const double off = std::hypot(place->easting - x.first, place->northing - y.first);
+  if (off <= std::min(grid->dx, grid->dy) / 2) return;
+  add(fmt::format(
+          "The axes of area {}'s file begin at {:.8g}, {:.8g}; its longitude and latitude lie at {:.8g}, "
+          "{:.8g} in {}, {:.6g} m away.",
+          number, x.first, y.first, place->easting, place->northing, nameOf(*grid), off),
+      "One of the two is wrong, and other programs may go by the other one.");
+}
+
+void adviseStructureProjection(AdviceContext& context, PageId page, const std::string& thing, int number,
+                               int count, const std::string& keyword, const std::string& projection) {
+  if (context.files.projection(projection).IsValid()) return;
+  const std::string& own = context.model.bathymetry->projection;
+  std::optional<AdviceFix> fix;
+  if (!own.empty() && context.files.projection(own).IsValid())
+    fix = AdviceFix{"Projection of " + thing, {{keyword, own}}};
+  context.add({{},
+               fmt::format("There is no projection \"{}\", in which {} is given.", projection, thing),
+               "The engine can't place it on the grid.",
+               {page, thing, keyword, {}, number, count},
+               {},
+               std::move(fix)});
+}
+
+}  // namespace
+
+void adviseAreaPositions(AdviceContext& context) {
+  for (int number = 2; number <= context.model.bathymetry->GetCount(); ++number)
+    advisePosition(context, number);
+}
+
+void adviseProjections(AdviceContext& context) {
+  adviseOwnProjection(context);
+  for (int number = 1; number <= context.model.bathymetry->GetCount(); ++number)
+    adviseFileProjection(context, number);
+  const auto all = [&](PageId page, auto& list, std::string_view what, std::string_view path) {
+    for (int number = 1; number <= list.GetCount(); ++number) {
+      adviseStructureProjection(context, page, thingOf(what, number), number, list.GetCount(),
+                                fmt::format(fmt::runtime(path), number),
+                                list.GetItem(number)->coordinateType);
+    }
+  };
+  all(PageId::weirs, *context.model.nhdWeir, "weir",
+      "HYDRODYNAMIC_MODULE/STRUCTURE_MODULE/WEIR/weir_data[{}]/coordinate_type");
+  all(PageId::culverts, *context.model.nhdCulvert, "culvert",
+      "HYDRODYNAMIC_MODULE/STRUCTURE_MODULE/CULVERTS/Culvert_data[{}]/coordinate_type");
+  all(PageId::dikes, *context.model.nhdDike, "dike",
+      "HYDRODYNAMIC_MODULE/STRUCTURES/DIKES/DIKE_{}/coordinate_type");
+}
+
+void adviseLandValues(AdviceContext& context) {
+  for (int number = 1; number <= context.model.bathymetry->GetCount(); ++number) {
+    const GridFacts* grid = context.grid(number);
+    if (grid == nullptr || grid->landValue < 0 || !std::isfinite(grid->lowest)) continue;
+    const auto add = [&](std::string doubt, std::string_view reason) {
+      context.add(
+          {{}, std::move(doubt), std::string(reason), placeOfArea(context, number, "DATA_FILE/FILE_NAME")});
+    };
+    if (grid->lowest >= grid->landValue) {
+      add(fmt::format("No point of area {} lies below its land value of {:.6g} m: all of it is land.", number,
+                      grid->landValue),
+          "There is nothing to calculate in it. Make its file again with a higher land value.");
+    } else if (number == 1 && grid->highest > 0 && grid->highest < grid->landValue &&
+               context.model.moduleSelection->hydrodynamicFeatures != 0) {
+      // Of an area that is all sea, or is to be flooded whole, that is meant.
+      add(fmt::format(
+              "The highest point of area 1 lies at {:.6g} m, below its land value of {:.6g} m: none of it "
+              "is land.",
+              grid->highest, grid->landValue),
+          "All of its border is open, the high ground too. Make its file again with a lower land value, "
+          "unless all "
+          "of it is to be flooded.");
+    }
+  }
+}
+
+}  // namespace gridbay

@@ -1,0 +1,270 @@
+#include "advice/data_file_facts.h"
+
+#include <sys/stat.h>
+
+#include <algorithm>
+#include <cmath>
+
+#include "core/name_bytes.h"
+#include "platform/tsb/tsb_file.h"
+#include "platform/units/units.h"
+
+namespace gridbay {
+namespace {
+
+constexpr std::size_t kSeries = 0;  // in the place of an item: all of them
+constexpr std::size_t kMostBlocks = 1'000'000;
+constexpr std::size_t kPiece = 1 << 18;  // values that are read at a time
+constexpr std::size_t kMostSeriesValues = 16'000'000;
+constexpr std::size_t kMostProjections = 64;
+
+// Tells the states of a file apart.
+using Stamp = std::array<std::int64_t, 5>;
+
+Stamp stampOf(const std::string& path) {
+  struct stat info {};
+  if (path.empty() || ::stat(path.c_str(), &info) != 0) return {};
+  return {static_cast<std::int64_t>(info.st_ino), static_cast<std::int64_t>(info.st_size),
+          info.st_mtim.tv_sec, info.st_mtim.tv_nsec,
+          info.st_ctim.tv_sec * 1'000'000'000 + info.st_ctim.tv_nsec};
+}
+
+bool isMissing(float value, const TsbItem& item) {
+  return !std::isfinite(value) || value == static_cast<float>(item.deleteValue);
+}
+
+float landValueOf(const TsbDefinition& file) {
+  constexpr std::size_t kLandPlace = 3;
+  constexpr float kNone = -999;
+  for (const TsbCustomBlock& block : file.customBlocks) {
+    if (names::same(block.name, "V27_Misc"))
+      return block.values.size() > kLandPlace ? block.values[kLandPlace] : kNone;
+  }
+  return kNone;
+}
+
+}  // namespace
+
+bool GridFacts::isWaterAtBorder(int j, int k) const {
+  const auto at = [this](const std::vector<float>& edge, int i) {
+    return edge[static_cast<std::size_t>(i)] < landValue;
+  };
+  if (!contains(j, k)) return false;
+  if (j == 0) return at(west, k);
+  if (j == noJ - 1) return at(east, k);
+  if (k == 0) return at(south, j);
+  return k == noK - 1 && at(north, j);
+}
+
+std::optional<bool> GridFacts::isWater(int j, int k) const {
+  if (!contains(j, k)) return false;
+  if (isOnBorder(j, k)) return isWaterAtBorder(j, k);
+  if (blockSize != 1) return std::nullopt;
+  return lowestOfBlocks(j, k) < landValue;
+}
+
+struct DataFileFacts::Entry {
+  Stamp stamp;
+  std::string path;
+  std::size_t item;
+  bool isUsed = true;
+  bool isDone = false;
+  std::optional<TsbFile> file;  // while it is read
+  std::size_t next = 0;         // row of a grid; value of a series, item by item
+  std::optional<GridFacts> grid;
+  std::optional<SeriesFacts> series;
+  float last = 0;  // of the series
+  bool hasLast = false;
+
+  void open();
+  void readOn();
+  void startGrid();
+  void readRows();
+  void readSteps();
+  void fail() {
+    grid.reset();
+    series.reset();
+    finish();
+  }
+  void finish() {
+    isDone = true;
+    file.reset();
+  }
+};
+
+void DataFileFacts::Entry::open() {
+  Result<TsbFile> opened = TsbFile::open(path);
+  if (!opened) return finish();
+  file.emplace(std::move(*opened));
+  if (item != kSeries) return startGrid();
+  series.emplace();
+  series->file = file->definition();
+  const TsbDefinition& definition = series->file;
+  const std::size_t values = definition.pointCount() * definition.time.count * definition.items.size();
+  series->hasValues = definition.axes.size() < 2 && values > 0 && values <= kMostSeriesValues;
+  series->items.resize(definition.items.size());
+  if (!series->hasValues) finish();
+}
+
+void DataFileFacts::Entry::startGrid() {
+  const TsbDefinition& definition = file->definition();
+  if (definition.axes.size() != 2 || item > definition.items.size() || definition.time.count == 0)
+    return fail();
+  grid.emplace();
+  grid->file = definition;
+  const TsbGridAxis& x = definition.axes[0];
+  const TsbGridAxis& y = definition.axes[1];
+  grid->landValue = landValueOf(definition);
+  grid->dx = x.spacing;
+  grid->dy = y.spacing;
+  if (x.points < 2 || y.points < 2 || !(x.spacing > 0) || !(y.spacing > 0)) return fail();
+  grid->noJ = static_cast<int>(x.points);
+  grid->noK = static_cast<int>(y.points);
+  const auto blocks = [&](std::size_t points) {
+    return (points + static_cast<std::size_t>(grid->blockSize) - 1) /
+           static_cast<std::size_t>(grid->blockSize);
+  };
+  while (blocks(x.points) * blocks(y.points) > kMostBlocks) ++grid->blockSize;
+  grid->lowestOfBlocks =
+      CVdArray2D<float>(static_cast<int>(blocks(x.points)), static_cast<int>(blocks(y.points)));
+  std::ranges::fill(grid->lowestOfBlocks.values(), INFINITY);
+  grid->lowest = INFINITY;
+  grid->highest = -INFINITY;
+}
+
+void DataFileFacts::Entry::readRows() {
+  const auto columns = static_cast<std::size_t>(grid->noJ);
+  const auto rows =
+      std::min(std::max<std::size_t>(kPiece / columns, 1), static_cast<std::size_t>(grid->noK) - next);
+  std::vector<float> values(rows * columns);
+  if (!file->readRows(item, 0, next, std::span(values))) return fail();
+  const TsbItem& kind = grid->file.items[item - 1];
+  const std::span<float> lowest = grid->lowestOfBlocks.values();
+  const auto blockColumns = static_cast<std::size_t>(grid->lowestOfBlocks.endJ());
+  const auto size = static_cast<std::size_t>(grid->blockSize);
+  for (std::size_t row = 0; row < rows; ++row) {
+    const std::span<const float> line = std::span(values).subspan(row * columns, columns);
+    float* blocks = &lowest[(next + row) / size * blockColumns];
+    for (std::size_t j = 0; j < columns; ++j) {
+      if (isMissing(line[j], kind)) continue;
+      blocks[j / size] = std::min(blocks[j / size], line[j]);
+      grid->lowest = std::min(grid->lowest, line[j]);
+      grid->highest = std::max(grid->highest, line[j]);
+    }
+    grid->west.push_back(line.front());
+    grid->east.push_back(line.back());
+    if (next + row == 0) grid->south.assign(line.begin(), line.end());
+    if (next + row + 1 == static_cast<std::size_t>(grid->noK)) grid->north.assign(line.begin(), line.end());
+  }
+  next += rows;
+  if (next == static_cast<std::size_t>(grid->noK)) finish();
+}
+
+// Of a profile the jump is that of its first point; missing values are looked for in all.
+void DataFileFacts::Entry::readSteps() {
+  const TsbDefinition& definition = series->file;
+  const std::size_t points = definition.pointCount();
+  const std::size_t number = next / definition.time.count;
+  const std::size_t first = next % definition.time.count;
+  const std::size_t steps =
+      std::min(std::max<std::size_t>(kPiece / points, 1), definition.time.count - first);
+  std::vector<float> values(steps * points);
+  if (!file->readSteps(number + 1, first, std::span(values))) return fail();
+  SeriesFacts::Item& facts = series->items[number];
+  const TsbItem& kind = definition.items[number];
+  if (first == 0) {
+    facts.lowest = INFINITY;
+    facts.highest = -INFINITY;
+    hasLast = false;
+  }
+  for (std::size_t i = 0; i < values.size(); ++i) {
+    const std::size_t step = first + i / points;
+    const float value = values[i];
+    if (isMissing(value, kind)) {
+      if (facts.missing++ == 0) facts.firstMissing = step;
+      continue;
+    }
+    if (i % points != 0) continue;
+    facts.lowest = std::min(facts.lowest, value);
+    facts.highest = std::max(facts.highest, value);
+    if (hasLast && std::abs(value - last) > facts.greatestJump) {
+      facts.greatestJump = std::abs(value - last);
+      facts.jumpStep = step;
+      facts.before = last;
+      facts.after = value;
+    }
+    last = value;
+    hasLast = true;
+  }
+  next += steps;
+  if (next == definition.time.count * definition.items.size()) finish();
+}
+
+void DataFileFacts::Entry::readOn() {
+  if (!file) {
+    open();
+  } else if (grid) {
+    readRows();
+  } else {
+    readSteps();
+  }
+}
+
+DataFileFacts::DataFileFacts() = default;
+DataFileFacts::~DataFileFacts() = default;
+
+DataFileFacts::Entry& DataFileFacts::entry(const std::string& path, std::size_t item) {
+  std::unique_ptr<Entry>& found = entries_[{path, item}];
+  const Stamp stamp = stampOf(path);
+  if (found == nullptr || found->stamp != stamp) {
+    found = std::make_unique<Entry>();
+    found->stamp = stamp;
+    found->path = path;
+    found->item = item;
+    found->isDone = stamp == Stamp{};
+  }
+  found->isUsed = true;
+  return *found;
+}
+
+const GridFacts* DataFileFacts::grid(const std::string& path, std::size_t item) {
+  const Entry& known = entry(path, item);
+  return known.isDone && known.grid ? &*known.grid : nullptr;
+}
+
+const SeriesFacts* DataFileFacts::series(const std::string& path) {
+  const Entry& known = entry(path, kSeries);
+  return known.isDone && known.series ? &*known.series : nullptr;
+}
+
+const DataFileFacts::KnownProjection& DataFileFacts::known(const std::string& text) {
+  if (const auto found = projections_.find(text); found != projections_.end()) return found->second;
+  CVdMapProjection projection(text);
+  std::string fullText = projection.GetProjectionString();
+  return projections_.emplace(text, KnownProjection{std::move(projection), std::move(fullText)})
+      .first->second;
+}
+
+bool DataFileFacts::read(std::chrono::milliseconds time) {
+  using Clock = std::chrono::steady_clock;
+  const Clock::time_point end = Clock::now() + time;
+  for (const auto& [key, known] : entries_) {
+    while (!known->isDone) {
+      known->readOn();
+      if (Clock::now() >= end) return isComplete();
+    }
+  }
+  return true;
+}
+
+bool DataFileFacts::isComplete() const {
+  return std::ranges::all_of(entries_, [](const auto& each) { return each.second->isDone; });
+}
+
+void DataFileFacts::forgetUnused() {
+  std::erase_if(entries_, [](const auto& each) { return !each.second->isUsed; });
+  for (const auto& [key, known] : entries_) known->isUsed = false;
+  if (projections_.size() > kMostProjections) projections_.clear();
+}
+
+}  // namespace gridbay

@@ -1,0 +1,95 @@
+#pragma once
+
+#include <array>
+#include <chrono>
+#include <cstddef>
+#include <cstdint>
+#include <map>
+#include <memory>
+#include <optional>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "core/array2d.h"
+#include "platform/cartography/cartography.h"
+#include "platform/tsb/tsb_types.h"
+
+namespace gridbay {
+
+// What advice has to know of a grid file. Elevations in metres.
+struct GridFacts {
+  TsbDefinition file;
+  int noJ = 0;
+  int noK = 0;
+  double dx = 0;  // metres
+  double dy = 0;
+  float landValue = 0;  // below 0 where the file has none
+  float lowest = 0;
+  float highest = 0;
+  // The border, by rising J or K.
+  std::vector<float> west, east, south, north;
+  // The lowest value of each square block of points: of each point, unless the grid is large.
+  int blockSize = 1;
+  CVdArray2D<float> lowestOfBlocks;
+
+  // Whether a point of the border is water.
+  bool isWaterAtBorder(int j, int k) const;
+  bool isOnBorder(int j, int k) const { return j == 0 || k == 0 || j == noJ - 1 || k == noK - 1; }
+  bool contains(int j, int k) const { return j >= 0 && k >= 0 && j < noJ && k < noK; }
+  // Whether a point is water; nothing where only its block is known.
+  std::optional<bool> isWater(int j, int k) const;
+};
+
+// What advice has to know of a file whose values go on in time.
+struct SeriesFacts {
+  struct Item {
+    std::size_t missing = 0;
+    std::size_t firstMissing = 0;  // its time step
+    float lowest = 0;
+    float highest = 0;
+    float greatestJump = 0;       // between time steps that follow each other
+    std::size_t jumpStep = 0;     // the later one of them
+    float before = 0, after = 0;  // the values there
+  };
+
+  TsbDefinition file;
+  bool hasValues = false;  // false for a file with too many values to look at
+  std::vector<Item> items;
+};
+
+// The facts of data files and projections, each read once for as long as its file is as it was. A fact that
+// is not known yet is null, and is read by the next calls of `read`, a piece at a time.
+class DataFileFacts {
+ public:
+  DataFileFacts();
+  ~DataFileFacts();
+
+  // The item (from 1) of a grid file, and all items of a file of series; null while it is unknown, and for
+  // good where the file can't be read.
+  const GridFacts* grid(const std::string& path, std::size_t item);
+  const SeriesFacts* series(const std::string& path);
+  const CVdMapProjection& projection(const std::string& text) { return known(text).projection; }
+  // Its full text, by which projections are told apart; empty where there is no such projection.
+  const std::string& fullText(const std::string& text) { return known(text).fullText; }
+
+  // Reads what was asked for and is not known yet, until that is done, which is true, or the time is over.
+  bool read(std::chrono::milliseconds time);
+  bool isComplete() const;
+  // Forgets what was not asked for since the last call; what was given before it holds no longer.
+  void forgetUnused();
+
+ private:
+  struct Entry;
+  struct KnownProjection {
+    CVdMapProjection projection;
+    std::string fullText;
+  };
+  const KnownProjection& known(const std::string& text);
+  Entry& entry(const std::string& path, std::size_t item);
+
+  std::map<std::pair<std::string, std::size_t>, std::unique_ptr<Entry>> entries_;
+  std::map<std::string, KnownProjection> projections_;
+};
+
+}  // namespace gridbay

@@ -1,0 +1,105 @@
+#pragma once
+
+#include <functional>
+#include <map>
+#include <optional>
+#include <span>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+#include "advice/advice.h"
+#include "advice/data_file_facts.h"
+#include "setup/global_kvs.h"
+
+namespace gridbay {
+
+// A grid's place on a map: its projection, the easting and northing of its first point (metres), and its
+// turn.
+struct GridPlace {
+  std::string projection;
+  double easting = 0;
+  double northing = 0;
+  double rotation = 0;
+};
+
+// A place on a grid, in spacings from its first point.
+struct GridSpot {
+  double j = 0;
+  double k = 0;
+};
+
+// What the rules look at, and where they leave what they find.
+class AdviceContext {
+ public:
+  AdviceContext(CGlobalKvs& root, const std::string& path, const KvsFile* onDisk, DataFileFacts& dataFiles)
+      : model(root), documentPath(path), source(onDisk), files(dataFiles) {}
+
+  CGlobalKvs& model;
+  const std::string& documentPath;  // empty for a setup that was never saved
+  const KvsFile* source;            // the file as it stands on disk; null where that is not known
+  DataFileFacts& files;
+  std::function<std::optional<double>(const std::string& folder)> freeMegabytes;
+
+  // The grid of area n, from 1; null where there is none, or as long as it is not known.
+  const GridFacts* grid(int number);
+  // Where it lies; nothing without a projection.
+  std::optional<GridPlace> placeOf(int number);
+  // Whether two texts name one projection.
+  bool isSameProjection(const std::string& a, const std::string& b);
+  // Points of a projection in grid spacings of area n from its first point; nothing where either has no place
+  // on the earth, or the area's grid is not known.
+  std::optional<std::vector<GridSpot>> spotsOn(int number, const std::string& projection,
+                                               std::span<const AdviceSite::MapPoint> points);
+  // The setup as a save would write it, but for the points of dikes, of which there may be very many; null
+  // where it can't be written.
+  const KvsFile* written();
+
+  void add(Advice advice) {
+    advice.kind = kind;
+    found.push_back(std::move(advice));
+  }
+
+  std::string_view kind;  // of the rule that looks now
+  std::vector<Advice> found;
+
+ private:
+  std::map<int, const GridFacts*> grids_;
+  KvsHandle written_;
+  bool isWritten_ = false;
+};
+
+struct AdviceRule {
+  std::string_view kind;
+  void (*look)(AdviceContext& context);
+};
+// All rules, in the order of their advice.
+std::span<const AdviceRule> adviceRules();
+
+// "area 2"
+std::string thingOf(std::string_view what, int number);
+
+// Tells each keyword of a setup's target with its path, in the order of the file.
+void eachKeyword(const KvsFile& file,
+                 const std::function<void(const std::string& path, const Node& keyword)>& tell);
+
+// Of areas and their grids.
+void adviseAreaPositions(AdviceContext& context);
+void adviseProjections(AdviceContext& context);
+void adviseLandValues(AdviceContext& context);
+// Of time, depths, and what an engine takes.
+void adviseCourant(AdviceContext& context);
+void adviseThresholds(AdviceContext& context);
+void adviseWarmUp(AdviceContext& context);
+void adviseCodes(AdviceContext& context);
+// Of what is placed in the areas.
+void adviseBoundaries(AdviceContext& context);
+void adviseSources(AdviceContext& context);
+void adviseStructures(AdviceContext& context);
+// Of what is read and written.
+void adviseSeries(AdviceContext& context);
+void adviseFileNames(AdviceContext& context);
+void adviseOutputSize(AdviceContext& context);
+
+}  // namespace gridbay

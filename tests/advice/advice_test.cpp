@@ -1,0 +1,621 @@
+// Each rule where it speaks, with its fix, and near that where it must be silent.
+
+#include <fmt/format.h>
+#include <gmock/gmock.h>
+
+#include <cmath>
+#include <filesystem>
+#include <functional>
+#include <set>
+
+#include "advice/advisor.h"
+#include "advice/rules.h"
+#include "basic/area_description.h"
+#include "basic/bathymetry.h"
+#include "basic/boundary.h"
+#include "basic/module_selection.h"
+#include "basic/simulation_period.h"
+#include "basic/source_sink.h"
+#include "core/edition.h"
+#include "hydrodynamic/boundary.h"
+#include "hydrodynamic/result.h"
+#include "platform/cartography/cartography.h"
+#include "platform/tsb/tsb_writer.h"
+#include "setup/dlg_enumerator.h"
+#include "structures/culvert.h"
+#include "structures/dike.h"
+#include "structures/weir.h"
+#include "tests/support/grids.h"
+#include "tests/support/model.h"
+#include "tests/support/programs.h"
+#include "tests/support/temporary_folder.h"
+
+namespace gridbay {
+namespace {
+
+using ::testing::HasSubstr;
+
+// A sea in the west and land in the east, with a finer area of sea at point (6,6).
+class AdviceTest : public ::testing::Test {
+ protected:
+  struct Area {
+    std::string file;
+    int points = 31;
+    double spacing = 90;
+    double easting = 480000;
+    double northing = 6100000;
+    std::string projection = "UTM-32";
+    double axesOff = 0;
+    float land = 6;
+  };
+  static constexpr double kInner = 480000 + 6 * 90;
+  static constexpr double kInnerNorth = 6100000 + 6 * 90;
+
+  static float coast(int j, int) { return j < 15 ? -5.0F : 8.0F; }
+  static float sea(int, int) { return -5.0F; }
+
+  void write(const Area& area, const test::Surface& surface) const {
+    TsbDefinition file = test::definitionOf(
+        {.noJ = area.points, .noK = area.points, .dx = area.spacing, .dy = area.spacing, .land = area.land});
+    file.axes[0].first = area.easting + area.axesOff;
+    file.axes[1].first = area.northing;
+    file.geography = TsbGeography{area.projection, 0, 0, 0};
+    CVdMapProjection(area.projection)
+        .Proj2Geo(area.easting, area.northing, &file.geography->longitude, &file.geography->latitude);
+    std::vector<float> values;
+    for (int k = 0; k < area.points; ++k)
+      for (int j = 0; j < area.points; ++j) values.push_back(surface(j, k));
+    Result<TsbWriter> writer = TsbWriter::create(folder.file(area.file), file);
+    ASSERT_TRUE(writer) << writer.error();
+    ASSERT_TRUE(writer->write(1, 0, std::span<const float>(values)));
+    ASSERT_TRUE(writer->commit());
+    areFilesClean = false;
+  }
+  Area inner() const { return {"inner.tsb2", 10, 30, kInner, kInnerNorth}; }
+
+  // A water level (m) every ten minutes from the start of the run.
+  void writeTide(const std::vector<float>& values, const DateTime& start) const {
+    TsbDefinition file;
+    file.time.start = *start.parts();
+    file.time.unit = "min";
+    file.time.step = 10;
+    file.time.count = values.size();
+    file.items.push_back({"Tide", 100000, "m"});
+    Result<TsbWriter> writer = TsbWriter::create(folder.file("tide.tsb0"), file);
+    ASSERT_TRUE(writer) << writer.error();
+    for (std::size_t step = 0; step < values.size(); ++step)
+      ASSERT_TRUE(writer->write(1, step, std::span<const float>(&values[step], 1)));
+    ASSERT_TRUE(writer->commit());
+    model->nhdBoundary->GetItem(1)->SetDataFormat(CNhdBoundaryObjectKvs::kType0File);
+    model->nhdBoundary->GetItem(1)->dataFile.fileName = folder.file("tide.tsb0");
+  }
+  static std::vector<float> smooth(std::size_t count) {
+    std::vector<float> values;
+    for (std::size_t i = 0; i < count; ++i) values.push_back(std::sin(static_cast<float>(i) / 12));
+    return values;
+  }
+  DateTime start() const { return model->simulationPeriod->start; }
+
+  void SetUp() override { clean(); }
+
+  // A setup on which there is no advice.
+  void clean() {
+    model = std::make_unique<CGlobalKvs>();
+    if (!areFilesClean) {
+      write({"outer.tsb2"}, coast);
+      write(inner(), sea);
+      areFilesClean = true;
+    }
+    CBathymetryKvs& areas = *model->bathymetry;
+    areas.SetNoAreas(2);
+    areas.projection = "UTM-32";
+    areas.GetArea(1)->fileName = folder.file("outer.tsb2");
+    areas.GetArea(2)->fileName = folder.file("inner.tsb2");
+    areas.GetArea(2)->origin = {6, 6};
+    model->boundary->defaultPosition = 0;
+    model->boundary->SetNoBoundaries(1);
+    model->boundary->GetItem(1)->Set(0, 0, 0, 30);
+    model->simulationPeriod->timeStepInterval = 20;
+    model->simulationPeriod->noPointsInTime = 361;  // two hours
+    model->sourceSink->SetNoSources(1);
+    model->sourceSink->GetItem(1)->source = {12, 12};
+  }
+  std::vector<Advice> look() { return advisor.lookThoroughly(*model, path); }
+
+  CNhdWeirObjectKvs& weir(std::vector<double> x, std::vector<double> y) {
+    model->nhdWeir->SetCount(1);
+    CNhdWeirObjectKvs& made = *model->nhdWeir->GetItem(1);
+    made.coordinateType = "UTM-32";
+    made.x = std::move(x);
+    made.y = std::move(y);
+    return made;
+  }
+  CNhdDikeObjectKvs& dike(const std::vector<DikePoint>& points) {
+    model->nhdDike->SetCount(1);
+    CNhdDikeObjectKvs& made = *model->nhdDike->GetItem(1);
+    for (const DikePoint& point : points) made.points.push_back(point);
+    return made;
+  }
+
+  struct Speaks {
+    std::string_view kind;
+    std::string doubt;
+    std::string fix;  // its name; empty where there is none
+    std::function<void()> edit;
+  };
+  // Each case has one advice, whose fix mends it.
+  void speaks(const std::vector<Speaks>& cases) {
+    for (const Speaks& each : cases) {
+      SCOPED_TRACE(each.doubt);
+      clean();
+      each.edit();
+      const std::vector<Advice> found = look();
+      std::string all;
+      for (const Advice& advice : found) all += fmt::format("{}: {}\n", advice.kind, advice.doubt);
+      ASSERT_EQ(found.size(), 1U) << all;
+      const Advice& advice = found[0];
+      EXPECT_EQ(advice.kind, each.kind);
+      EXPECT_THAT(advice.doubt, HasSubstr(each.doubt));
+      EXPECT_FALSE(advice.reason.empty());
+      EXPECT_NE(CDlgEnumerator().GetCaption(static_cast<std::int32_t>(advice.place.page)), "");
+      EXPECT_EQ(advice.fix ? advice.fix->name : "", each.fix);
+      if (!advice.fix || theEdition.wetlandSweepKit) continue;
+      const Outcome made = makeFix(*model, *advice.fix, path);
+      ASSERT_TRUE(made) << made.error();
+      for (const Advice& left : look()) ADD_FAILURE() << left.kind << ": " << left.doubt;
+    }
+  }
+  void isSilent(const std::vector<std::function<void()>>& edits) {
+    for (std::size_t i = 0; i < edits.size(); ++i) {
+      SCOPED_TRACE(i);
+      clean();
+      edits[i]();
+      for (const Advice& advice : look()) ADD_FAILURE() << advice.kind << ": " << advice.doubt;
+    }
+  }
+
+  test::TemporaryFolder folder;
+  std::string path = folder.file("setup.v27");
+  std::unique_ptr<CGlobalKvs> model;
+  Advisor advisor;
+  mutable bool areFilesClean = false;
+};
+
+TEST_F(AdviceTest, OnANewOrCleanSetupThereIsNone) {
+  EXPECT_TRUE(look().empty());
+  CGlobalKvs fresh;
+  EXPECT_TRUE(advisor.lookThoroughly(fresh, "").empty());
+}
+
+TEST_F(AdviceTest, EachRuleHasANameOfItsOwn) {
+  std::set<std::string_view> kinds;
+  for (const AdviceRule& rule : adviceRules()) EXPECT_TRUE(kinds.insert(rule.kind).second) << rule.kind;
+  EXPECT_EQ(kinds.size(), 13U);
+}
+
+TEST_F(AdviceTest, AreasAndTheirFiles) {
+  const auto moved = [this](double by, double axesOff = 0) {
+    Area area = inner();
+    area.easting += by;
+    area.axesOff = axesOff;
+    write(area, sea);
+  };
+  const auto own = [this](const char* projection) { model->bathymetry->projection = projection; };
+  const auto zone33 = [this] {
+    Area area = inner();
+    double longitude = 0;
+    double latitude = 0;
+    CVdMapProjection("UTM-32").Proj2Geo(area.easting, area.northing, &longitude, &latitude);
+    area.projection = "UTM-33";
+    CVdMapProjection("UTM-33").Geo2Proj(longitude, latitude, &area.easting, &area.northing);
+    write(area, sea);
+  };
+  speaks({
+      {"area-position",
+       "Area 2 lies at (5,6) of area 1; by its file's coordinates it belongs at (6,6), 90 m away.",
+       "Move area 2 to (6,6)",
+       [this] {
+         model->bathymetry->GetArea(2)->origin = {5, 6};
+       }},
+      {"area-position", "the nearest point to where its file's coordinates put it, and yet 15 m off", "",
+       [=] { moved(15); }},
+      {"area-position", "it belongs at (-45,6), 4590 m away. There it does not lie inside area 1.", "",
+       [=] { moved(-51 * 90); }},
+      {"projection", "There is no projection \"UTM-99\".", "Projection of area 1", [=] { own("UTM-99"); }},
+      {"projection", "The setup is in WGS 84 / UTM zone 33N, the file of area 1 in WGS 84 / UTM zone 32N.",
+       "Projection of area 1", [=] { own("UTM-33"); }},
+      {"projection",
+       "The file of area 2 is in WGS 84 / UTM zone 33N, that of area 1 in WGS 84 / UTM zone 32N.", "",
+       zone33},
+      {"projection", "The axes of area 2's file begin at 480840, 6100540", "", [=] { moved(0, 300); }},
+      {"projection", "There is no projection \"UTM-0\", in which weir 1 is given.", "Projection of weir 1",
+       [this] {
+         weir({480100, 480200}, {6100100, 6100200}).coordinateType = "UTM-0";
+       }},
+      {"land-value", "No point of area 1 lies below its land value of 6 m", "",
+       [this] {
+         model->boundary->SetNoBoundaries(0);
+         write({"outer.tsb2"}, [](int, int) { return 8.0F; });
+       }},
+      {"land-value", "The highest point of area 1 lies at 3 m, below its land value of 6 m", "",
+       [this] { write({"outer.tsb2"}, [](int j, int) { return j < 15 ? -5.0F : 3.0F; }); }},
+  });
+  isSilent({
+      [=] { moved(5); }, [=] { own("EPSG:32632"); }, [=] { own(""); }, [=] { moved(0, 10); },
+      [this] { write({"outer.tsb2"}, sea); },
+      [this] {
+        model->moduleSelection->hydrodynamicFeatures = 0;  // all of it may be flooded
+        write({"outer.tsb2"}, [](int j, int) { return j < 15 ? -5.0F : 3.0F; });
+      },
+      [this] { model->bathymetry->GetArea(2)->fileName = folder.file("none.tsb2"); },  // a fault
+  });
+}
+
+TEST_F(AdviceTest, TheRun) {
+  const auto depths = [this](float drying, float flooding) {
+    model->areaDescription->dryingDepth = drying;
+    model->areaDescription->floodingDepth = flooding;
+  };
+  const auto step = [this](float seconds) { model->simulationPeriod->timeStepInterval = seconds; };
+  const auto flow = [this]() -> CNhdBoundaryObjectKvs& { return *model->nhdBoundary->GetItem(1); };
+  speaks({
+      {"courant",
+       "The Courant number is 70.1 in area 2, 5 m deep; beyond 5 a run is often unstable. A time step of 20 "
+       "s would do.",
+       "Time step of 20 s", [=] { step(300); }},
+      {"flood-and-dry", "The flooding depth of 0.2 m is 20 times the drying depth of 0.01 m.",
+       "Flooding depth", [=] { depths(0.01F, 0.2F); }},
+      {"warm-up", "The warm-up ends at time step 400, the run at 360.",
+       "Warm-up in the first tenth of the run", [this] { model->simulationPeriod->warmUpPeriod = 400; }},
+      {"engine", "The time step is 0 s.", "Time step of 15 s", [=] { step(0); }},
+      {"engine", "The simulation has 0 time steps.", "100 time steps",
+       [this] { model->simulationPeriod->noPointsInTime = 1; }},
+      {"engine", "The code of the scheme is 4, which is none of 1, 5, -5, -1.", "Code of the scheme of 1",
+       [this] { model->moduleSelection->adScheme = 4; }},
+      {"engine", "The formulation of boundary 1 is 7, which is none of 1, 2.", "Formulation of 1",
+       [=] { flow().formulation = 7; }},
+      {"engine", "The data format of boundary 1 is 6", "Data format of 1", [=] { flow().dataFormat = 6; }},
+      {"engine", "The type of output 1 is 9", "Type of 2",
+       [this] {
+         model->nhdResult->outputs.SetCount(1);
+         model->nhdResult->outputs.GetItem(1)->type = 9;
+       }},
+      {"engine", "There are 19 outputs.", "", [this] { model->nhdResult->outputs.SetCount(19); }},
+  });
+  isSilent({
+      [=] { step(21); },
+      [=] { depths(0.05F, 0.2F); },
+      [=, this] {
+        depths(0.01F, 0.2F);
+        model->areaDescription->enableFloodAndDryChecking = 0;
+      },
+      [this] { model->simulationPeriod->warmUpPeriod = 360; },
+      [this] { model->simulationPeriod->noPointsInTime = 2; },
+      [=] { flow().formulation = CNhdBoundaryObjectKvs::kFlux; },
+      [this] { model->nhdResult->outputs.SetCount(18); },
+  });
+}
+
+TEST_F(AdviceTest, AShorterTimeStepKeepsThePeriod) {
+  if (theEdition.wetlandSweepKit) GTEST_SKIP() << "its file has one area";
+  CSimulationPeriodKvs& period = *model->simulationPeriod;
+  period.timeStepInterval = 300;
+  period.noPointsInTime = 25;
+  period.warmUpPeriod = 6;
+  model->nhdResult->outputs.SetCount(1);
+  USubLine& steps = model->nhdResult->outputs.GetItem(1)->steps;
+  steps = {0, 24, 2};
+  const DateTime end = period.End();
+  const std::vector<Advice> found = look();
+  ASSERT_EQ(found.size(), 1U);
+  ASSERT_TRUE(found[0].fix);
+  EXPECT_EQ(found[0].site.area, 2);
+  ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
+  EXPECT_FLOAT_EQ(period.timeStepInterval, 20);
+  EXPECT_EQ(period.noPointsInTime, 24 * 15 + 1);
+  EXPECT_EQ(period.warmUpPeriod, 90);
+  EXPECT_EQ(steps, (USubLine{0, 360, 30}));
+  EXPECT_NEAR(period.End().linear(), end.linear(), 1e-9);
+}
+
+TEST_F(AdviceTest, WhatIsPlaced) {
+  const auto boundary = [this](int n, int firstJ, int firstK, int lastJ, int lastK) {
+    if (model->boundary->GetCount() < n) model->boundary->SetNoBoundaries(n);
+    model->boundary->GetItem(n)->Set(firstJ, firstK, lastJ, lastK);
+  };
+  const auto source = [this](GridPoint point) { model->sourceSink->GetItem(1)->source = point; };
+  speaks({
+      {"boundary", "Boundary 1 from (0,0) to (0,40) goes beyond area 1, whose last point is (30,30).",
+       "Boundary 1 from (0,0) to (0,30)", [=] { boundary(1, 0, 0, 0, 40); }},
+      {"boundary", "Boundary 1 is a single point, (0,4).", "", [=] { boundary(1, 0, 4, 0, 4); }},
+      {"boundary", "Boundary 1 from (5,0) to (5,30) does not lie on the border of area 1.", "",
+       [=] { boundary(1, 5, 0, 5, 30); }},
+      {"boundary", "Boundary 1 from (30,0) to (30,30) lies wholly on land.", "",
+       [=] { boundary(1, 30, 0, 30, 30); }},
+      {"boundary", "Boundary 1 from (20,0) to (0,0) ends on land: 6 of its 21 points are land.",
+       "Boundary 1 from (14,0) to (0,0)", [=] { boundary(1, 20, 0, 0, 0); }},
+      {"boundary", "Boundaries 1 and 2 have 11 points in common.", "Boundary 2 from (0,30) to (0,21)",
+       [=] {
+         boundary(1, 0, 0, 0, 20);
+         boundary(2, 0, 30, 0, 10);
+       }},
+      {"source", "Source 1 at (5,0) lies on the edge of area 1.", "Move source 1 to (5,1)",
+       [=] {
+         source({5, 0});
+       }},
+      {"source", "Source 1 at (0,10) lies in boundary 1.", "Move source 1 to (1,10)",
+       [=] {
+         source({0, 10});
+       }},
+      {"source", "Sink 1 at (9,3) lies on the edge of area 2.", "Move sink 1 to (8,3)",
+       [this] {
+         CSourceSinkObjectKvs& pair = *model->sourceSink->GetItem(1);
+         pair.type = CSourceSinkObjectKvs::kPair;
+         pair.sink = {9, 3};
+         pair.sinkArea = 2;
+       }},
+      {"structure", "Weir 1 lies outside of all areas.", "",
+       [this] {
+         weir({400000, 400100}, {6100100, 6100200});
+       }},
+      {"structure", "Points 2 and 3 of weir 1 are equal.", "Point 3 of weir 1 out",
+       [this] {
+         weir({480100, 480200, 480200, 480300}, {6100100, 6100200, 6100200, 6100200});
+       }},
+      {"structure", "Weir 1 has 1 point.", "", [this] { weir({480100}, {6100100}); }},
+      {"structure", "Points 1 and 2 of dike 1 are equal.", "Point 2 of dike 1 out",
+       [this] {
+         dike({{480100, 6100100, 1}, {480100, 6100100, 2}, {480300, 6100100, 3}});
+       }},
+      {"structure", "Dike 1 lies outside of all areas.", "",
+       [this] {
+         dike({{480100, 5100100, 1}, {480300, 5100100, 3}});
+       }},
+  });
+  isSilent({
+      [=] {
+        boundary(2, 0, 0, 14, 0);  // they meet in a corner
+      },
+      [=] {
+        boundary(1, 0, 0, 0, 10);
+        boundary(2, 0, 11, 0, 30);
+      },
+      [=] {
+        source({1, 1});
+      },
+      [this] {
+        CSourceSinkObjectKvs& sink = *model->sourceSink->GetItem(1);
+        sink.type = CSourceSinkObjectKvs::kIsolatedSink;
+        sink.sink = {3, 3};
+        sink.source = {0, 0};  // not in use
+      },
+      [this] {
+        weir({470000, 490000}, {6100100, 6100200});
+      },  // through the area
+      [this] {
+        dike({{480100, 6100100, 1}, {480300, 6100100, 3}});
+      },
+      [this] {
+        dike({{480100, 5100100, 1}, {480300, 5100100, 3}}).include = 0;
+      },
+      [this] {
+        double x = 0, y = 0, longitude = 0, latitude = 0;
+        CVdMapProjection("UTM-32").Proj2Geo(480500, 6100500, &longitude, &latitude);
+        CVdMapProjection("UTM-33").Geo2Proj(longitude, latitude, &x, &y);
+        weir({x, x + 100}, {y, y + 100}).coordinateType = "UTM-33";
+      },
+  });
+}
+
+TEST_F(AdviceTest, TheEqualPointOfADikeGoesWithItsLevel) {
+  CNhdDikeObjectKvs& made = dike({{480100, 6100100, 1}, {480100, 6100100, 2}, {480300, 6100100, 3}});
+  const std::vector<Advice> found = look();
+  ASSERT_EQ(found.size(), 1U);
+  EXPECT_EQ(found[0].site.mapPoints.size(), 3U);
+  ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
+  ASSERT_EQ(made.points.size(), 2U);
+  EXPECT_EQ(std::as_const(made.points)[0].z, 1);
+  EXPECT_EQ(std::as_const(made.points)[1].x, 480300);
+  EXPECT_EQ(std::as_const(made.points)[1].z, 3);
+}
+
+TEST_F(AdviceTest, Series) {
+  const auto with = [](std::vector<float> values, std::size_t at, float value) {
+    values[at] = value;
+    return values;
+  };
+  constexpr std::size_t kWhole = 13;  // two hours
+  speaks({
+      {"series", "tide.tsb0 ends at 1990-01-01 13:30:00, in the run, which ends at 1990-01-01 14:00:00.",
+       "End with the series", [=, this] { writeTide(smooth(10), start()); }},
+      {"series", "tide.tsb0 begins at 1990-01-01 12:10:00, after the run does at 1990-01-01 12:00:00.", "",
+       [=, this] { writeTide(smooth(kWhole), start().plusDays(10.0 / 1440)); }},
+      {"series", "\"Tide\" of", "", [=, this] { writeTide(with(smooth(kWhole), 4, -1e-35F), start()); }},
+      {"series", "jumps from", "", [=, this] { writeTide(with(smooth(30), 6, 9.0F), start()); }},
+  });
+  isSilent({
+      [=, this] { writeTide(smooth(kWhole), start()); },
+      [=, this] { writeTide(smooth(30), start().plusDays(-0.01)); },
+      [=, this] {
+        writeTide(smooth(5), start());
+        model->nhdBoundary->GetItem(1)->dataFormat = CNhdBoundaryObjectKvs::kConstant;  // not in use
+      },
+  });
+  writeTide(with(with(smooth(kWhole), 4, -1e-35F), 5, -1e-35F), start());
+  const std::vector<Advice> found = look();
+  ASSERT_EQ(found.size(), 1U);
+  EXPECT_THAT(found[0].doubt, HasSubstr("has 2 missing values, the first at 1990-01-01 12:40:00."));
+  EXPECT_EQ(found[0].place.thing, "boundary 1");
+
+  // A shorter run takes what is written with it.
+  clean();
+  writeTide(smooth(10), start());
+  model->nhdResult->outputs.SetCount(2);
+  model->nhdResult->outputs.GetItem(1)->steps = {0, 360, 10};
+  model->nhdResult->outputs.GetItem(2)->steps = {0, 100, 10};
+  ASSERT_TRUE(makeFix(*model, *look().at(0).fix, path));
+  EXPECT_EQ(model->simulationPeriod->LastTimeStep(), 270);
+  EXPECT_EQ(model->nhdResult->outputs.GetItem(1)->steps, (USubLine{0, 270, 10}));
+  EXPECT_EQ(model->nhdResult->outputs.GetItem(2)->steps, (USubLine{0, 100, 10}));
+}
+
+TEST_F(AdviceTest, NamesOfFiles) {
+  const std::string beside = folder.file("fine.tsb2");
+  speaks({
+      {"file-name", "/elsewhere/fine.tsb2 is named absolutely, and lies outside of the setup's folder.", "",
+       [this] { model->bathymetry->overlandFile = "/elsewhere/fine.tsb2"; }},
+      {"file-name", "../fine.tsb2 lies outside of the setup's folder.", "",
+       [this] { model->bathymetry->overlandFile = folder.path().parent_path().string() + "/fine.tsb2"; }},
+  });
+  clean();
+  test::writeGrid(beside);
+  model->bathymetry->overlandFile = "/elsewhere/fine.tsb2";
+  std::vector<Advice> found = look();
+  ASSERT_EQ(found.size(), 1U);
+  ASSERT_TRUE(found[0].fix);
+  EXPECT_EQ(found[0].fix->name, "Take fine.tsb2");
+  ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
+  EXPECT_EQ(model->bathymetry->overlandFile.absolute(), beside);
+  EXPECT_TRUE(look().empty());
+  // A setup that was never saved has no folder.
+  model->bathymetry->overlandFile = "/elsewhere/fine.tsb2";
+  EXPECT_TRUE(advisor.lookThoroughly(*model, "").empty());
+
+  // A name in the folder that is absolute on disk.
+  clean();
+  const KvsHandle source = test::fileOf(
+      "VANE27_NESTED_MODEL {\n    NESTED_MODEL_GLOBALS {\n        BATHYMETRY_SELECTION {\n            "
+      "Overland_Filename (file)\"" +
+      beside + "\"\n        }\n    }\n}\n");
+  found = advisor.lookThoroughly(*model, path, source.get());
+  ASSERT_EQ(found.size(), 1U);
+  EXPECT_EQ(found[0].doubt, beside + " is named absolutely.");
+  ASSERT_TRUE(found[0].fix);
+  EXPECT_EQ(
+      found[0].fix->settings,
+      (std::vector<Setting>{{"NESTED_MODEL_GLOBALS/BATHYMETRY_SELECTION/Overland_Filename", "fine.tsb2"}}));
+}
+
+TEST_F(AdviceTest, OutputsLargerThanTheDisk) {
+  const auto big = [this] {
+    model->nhdResult->outputs.SetCount(1);
+    CNhdResultObjectKvs& output = *model->nhdResult->outputs.GetItem(1);
+    output.part = {{0, 999, 1}, {0, 999, 1}};
+    output.steps = {0, 360, 1};
+  };
+  big();
+  const double size = model->nhdResult->TotalSizeMB();
+  ASSERT_GT(size, 1000);
+  advisor.setFreeMegabytes([=, this](const std::string& where) {
+    EXPECT_EQ(where, folder.path().string());
+    return size / 3;
+  });
+  speaks({{"output-size", "the disk has room for", "Write less often", big}});
+  advisor.setFreeMegabytes([size](const std::string&) { return size; });
+  isSilent({big});
+  advisor.setFreeMegabytes([](const std::string&) { return std::nullopt; });
+  isSilent({big});
+}
+
+TEST_F(AdviceTest, AFileThatIsWrittenAnewIsReadAnew) {
+  EXPECT_TRUE(look().empty());
+  Area area = inner();
+  area.easting += 90;
+  write(area, sea);
+  ASSERT_EQ(look().size(), 1U);
+  write(inner(), sea);
+  EXPECT_TRUE(look().empty());
+}
+
+TEST_F(AdviceTest, WhatIsNotReadYetIsNotSpokenOf) {
+  model->bathymetry->GetArea(2)->origin = {5, 6};
+  EXPECT_TRUE(advisor.look(*model, path).empty());
+  EXPECT_FALSE(advisor.isComplete());
+  int pieces = 0;
+  while (!advisor.read(std::chrono::milliseconds(0)) && pieces < 100) ++pieces;
+  EXPECT_GE(pieces, 2);  // a file at a time at most
+  EXPECT_TRUE(advisor.isComplete());
+  EXPECT_EQ(advisor.look(*model, path).size(), 1U);
+  EXPECT_TRUE(advisor.isComplete());
+}
+
+TEST_F(AdviceTest, DamagedAndMissingFilesAreLeftToTheCheck) {
+  folder.write("outer.tsb2", "no data file");
+  folder.write("tide.tsb0", "");
+  model->nhdBoundary->GetItem(1)->SetDataFormat(CNhdBoundaryObjectKvs::kType0File);
+  model->nhdBoundary->GetItem(1)->dataFile.fileName = folder.file("tide.tsb0");
+  EXPECT_TRUE(look().empty());
+  test::writeSeries(folder.file("outer.tsb2"), {}, 100000, "m");  // of another shape
+  EXPECT_TRUE(look().empty());
+  model->boundary->GetItem(1)->Set(-2147483647, 2147483647, 0, 0);
+  model->bathymetry->GetArea(2)->origin = {2147483647, -2147483647};
+  write({"outer.tsb2"}, coast);
+  EXPECT_FALSE(look().empty());
+}
+
+TEST_F(AdviceTest, AFixIsMadeWholeOrNotAtAll) {
+  const AdviceFix fix{
+      "Both",
+      {{"NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth", "0.03"}, {"NESTED_MODEL_GLOBALS/NONE", "1"}}};
+  const Outcome made = makeFix(*model, fix, path);
+  ASSERT_FALSE(made);
+  EXPECT_THAT(made.error(), HasSubstr("NESTED_MODEL_GLOBALS/NONE"));
+  EXPECT_FLOAT_EQ(model->areaDescription->dryingDepth, 0.02F);
+}
+
+TEST_F(AdviceTest, OfALargeGridBlocksAreKept) {
+  const auto deepAt = [](int j, int k) { return j == 1000 && k == 700 ? -80.0F : -5.0F; };
+  Area large{"outer.tsb2", 1201, 90};
+  write(large, deepAt);
+  model->bathymetry->SetNoAreas(1);
+  model->boundary->SetNoBoundaries(0);
+  model->sourceSink->SetNoSources(0);
+  model->simulationPeriod->timeStepInterval = 20;
+  EXPECT_EQ(look().size(), 1U);
+  EXPECT_THAT(look()[0].doubt, HasSubstr("in area 1, 80 m deep"));
+}
+
+TEST_F(AdviceTest, TheShippedExamplesAreFreeOfIt) {
+  if (theEdition.wetlandSweepKit) GTEST_SKIP() << "they have two areas";
+  const std::string examples = std::string(GRIDBAY_TESTS) + "/../examples";
+  const auto run = [](const test::ProgramRun& done) { ASSERT_EQ(done.status, 0) << done.out << done.err; };
+  const auto tool = [&](const std::vector<std::string>& words) { run(test::runTool(words)); };
+  const auto file = [this](const std::string& name) { return folder.file(name); };
+  run(test::runProgram(test::programPath("make_estuary"), {folder.path().string()}));
+  for (const std::string area : {"estuary", "inlet"}) {
+    tool({"convert", "raster", file(area + ".asc"), file(area + ".tsb2"), "--land", "5", "--crs", "UTM-32"});
+    tool({"convert", "raster", file(area + "_roughness.asc"), file(area + "_roughness.tsb2"), "--item-type",
+          "Manning number", "--crs", "UTM-32"});
+  }
+  const std::string begin = "2026-03-21 06:00:00";
+  for (const auto& [name, type] : {std::pair<std::string, std::string>{"tide", "Water level"},
+                                   {"river", "Discharge"},
+                                   {"rain", "Rainfall rate"},
+                                   {"sea", "Concentration"}})
+    tool({"convert", "series", file(name + ".csv"), file(name + ".tsb0"), "--item-type", type, "--start",
+          begin, "--time-unit", "min", "--skip-lines", "1"});
+  const std::string setup = file("estuary.v27");
+  tool({"new", setup, "--area", file("estuary.tsb2"), "--area", file("inlet.tsb2") + "@36,33", "--start",
+        begin, "--step", "3", "--steps", "14400"});
+  tool({"boundaries", setup, "--detect"});
+  run(test::runProgram(examples + "/estuary/flood", {test::toolPath(), setup}));
+  EXPECT_EQ(test::runTool({"validate", "--advice", setup}).out, "0 faults\nno advice\n");
+  std::filesystem::copy(examples + "/ecology/oxygen.biorig", folder.path());
+  for (const std::string name : {"salinity", "mud", "oxygen"}) {
+    const std::string carrying = file(name + ".v27");
+    std::filesystem::copy(setup, carrying);
+    run(test::runProgram(examples + "/estuary/" + name, {test::toolPath(), carrying}));
+    EXPECT_EQ(test::runTool({"validate", "--advice", carrying}).out, "0 faults\nno advice\n") << name;
+  }
+  // A point off is told, and mended.
+  const std::string origin = "NESTED_MODEL_GLOBALS/BATHYMETRY_SELECTION/AREA_2/Origin";
+  tool({"set", setup, origin + "=35,33"});
+  EXPECT_THAT(test::runTool({"validate", "--advice", setup}).out,
+              HasSubstr("by its file's coordinates it belongs at (36,33), 90 m away."));
+  EXPECT_EQ(test::runTool({"fix", setup, "1"}).out,
+            "Move area 2 to (36,33)\n  " + origin + ": 35 33 -> 36 33\n");
+  EXPECT_EQ(test::runTool({"validate", "--advice", setup}).out, "0 faults\nno advice\n");
+}
+
+}  // namespace
+}  // namespace gridbay
