@@ -9,6 +9,8 @@
 #include <filesystem>
 #include <fstream>
 
+#include "basic/area_description.h"
+
 namespace gridbay {
 namespace {
 

@@ -115,8 +115,8 @@ struct MapFeature {
   MapLine points{};
   bool closed = false;  // the last point is joined to the first
   bool joined = true;   // a line leads from each point to the next; else they stand alone
-  // The cell that leads to it on its page, from 1, in the first grid with that many rows and columns; 0 for
-  // any.
+  // The cell that leads to it on its page, from 1, in the first grid with that many rows and columns; rows of
+  // headers do not count. 0 for any.
   std::int32_t row = 0;
   std::int32_t column = 0;
   std::string fault{};

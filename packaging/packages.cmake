@@ -41,40 +41,33 @@ set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS ON)
 set(CPACK_DEBIAN_PACKAGE_CONTROL_STRICT_PERMISSION ON)
 set(CPACK_DEBIAN_COMPRESSION_TYPE xz)
 
-set(about " of a flow model on nested grids")
 set(CPACK_DEBIAN_GRIDBAY-SETUP_PACKAGE_NAME gridbay-setup)
 set(CPACK_DEBIAN_GRIDBAY-SETUP_PACKAGE_SECTION science)
 set(CPACK_DEBIAN_GRIDBAY-SETUP_DESCRIPTION
-    "Setup editor${about}
- Prepares the input of a two-dimensional free-surface flow model: the grids
- and how they nest, open boundaries, sources, rain and wind, resistance,
- structures, what is written, and where wanted the transport of dissolved
- components, mud, or an ecological model. It checks all of that and keeps it
- in one readable text file.
- .
- This package has the command-line tools v27setup and v27setup-wsk and the
- desktop vanedeck-shell.")
+    "Prepares the input of a two-dimensional free-surface flow model: the grids
+and how they nest, open boundaries, sources, rain and wind, resistance,
+structures, what is written, and where wanted the transport of dissolved
+components, mud, or an ecological model. It checks all of that and keeps it
+in one readable text file.
+.
+This package has the command-line tools v27setup and v27setup-wsk and the
+desktop vanedeck-shell.")
 set(CPACK_DEBIAN_GRIDBAY-SETUP_PACKAGE_RECOMMENDS "proj-data, hicolor-icon-theme, shared-mime-info")
 set(CPACK_DEBIAN_GRIDBAY-SETUP_PACKAGE_SUGGESTS "libgridbay-setup-dev, python3-gridbay-setup, qt6-wayland")
 
 set(CPACK_DEBIAN_LIBGRIDBAY-SETUP-DEV_PACKAGE_NAME libgridbay-setup-dev)
 set(CPACK_DEBIAN_LIBGRIDBAY-SETUP-DEV_PACKAGE_SECTION libdevel)
 set(CPACK_DEBIAN_LIBGRIDBAY-SETUP-DEV_DESCRIPTION
-    "Setups${about} from programs (C++)
- The libraries by which other programs make, fill and check setups, one for
- each edition of the model, with their header, a CMake package and a file for
- pkg-config.")
+    "The libraries by which other programs make, fill and check setups, one for
+each edition of the model, with their header, a CMake package and a file for
+pkg-config.")
 set(CPACK_DEBIAN_LIBGRIDBAY-SETUP-DEV_PACKAGE_RECOMMENDS "gridbay-setup (= ${PROJECT_VERSION})")
-# The loader learns of the libraries.
-file(WRITE ${CMAKE_CURRENT_BINARY_DIR}/triggers "activate-noawait ldconfig\n")
-set(CPACK_DEBIAN_LIBGRIDBAY-SETUP-DEV_PACKAGE_CONTROL_EXTRA ${CMAKE_CURRENT_BINARY_DIR}/triggers)
 
 set(CPACK_DEBIAN_PYTHON3-GRIDBAY-SETUP_PACKAGE_NAME python3-gridbay-setup)
 set(CPACK_DEBIAN_PYTHON3-GRIDBAY-SETUP_PACKAGE_SECTION python)
 set(CPACK_DEBIAN_PYTHON3-GRIDBAY-SETUP_DESCRIPTION
-    "Setups${about} from programs (Python)
- A module to make, fill, check and walk through setups, to convert rasters and
- series, and to reach the values of grids as arrays.")
+    "A module to make, fill, check and walk through setups, to convert rasters and
+series, and to reach the values of grids as arrays.")
 # The raster reader and the templates are in the package of the programs.
 set(CPACK_DEBIAN_PYTHON3-GRIDBAY-SETUP_PACKAGE_DEPENDS
     "python3 (>= 3.11), python3 (<< 3.12), python3-numpy, gridbay-setup (= ${PROJECT_VERSION})")

@@ -141,7 +141,12 @@ bool start(const SideBySide& task, Shared& shared, std::list<Copy>& copies) {
   FileDescriptor results(ends[0]);
   const FileDescriptor end(ends[1]);
   const pid_t process = ::fork();
-  if (process == 0) workOn(task, shared, end.get());
+  if (process == 0) {
+    // Else it, or another one, would not see that nobody reads what it writes any more.
+    ::close(results.release());
+    for (const Copy& copy : copies) ::close(copy.results());
+    workOn(task, shared, end.get());
+  }
   if (process > 0) copies.emplace_back(process, std::move(results));
   return process > 0;
 }
@@ -155,7 +160,7 @@ std::size_t coreCount() {
 }
 
 Outcome SideBySide::run() const {
-  if (count == 0) return {};
+  if (count == 0 || isStopped()) return {};
   const SharedHandle shared = makeShared();
   if (shared == nullptr) return Failure{systemError("cannot start work on", "all cores")};
   std::list<Copy> copies;

@@ -8,8 +8,8 @@
 
 #include "conversion/history.h"
 #include "conversion/item_types.h"
-#include "platform/files/may_write.h"
 #include "platform/cartography/cartography.h"
+#include "platform/files/may_write.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_writer.h"
 #include "platform/units/units.h"

@@ -190,7 +190,7 @@ bool DocumentTab::goToPage(std::int32_t id) {
 
 void DocumentTab::goToRow(std::int32_t page, int row, int column) {
   if (currentPage() != page && !goToPage(page)) return;
-  if (row > 0) pane_->showCell(row, column);
+  if (row > 0 || column > 0) pane_->showCell(std::max(row, 1), column);
 }
 
 void DocumentTab::goToNeighbour(int direction) {
@@ -279,6 +279,11 @@ void DocumentTab::showAdvice() {
   for (std::size_t i = 0; i < advice_.size(); ++i) {
     const auto page = static_cast<std::int32_t>(advice_[i].place.page);
     tips[page] << adviceTip(advice_[i]);
+    // An item that is folded in is marked on what it is folded into; the roots stay open.
+    QTreeWidgetItem* item = itemOf(page);
+    for (item = item == nullptr ? nullptr : item->parent(); item != nullptr && item->parent() != nullptr;
+         item = item->parent())
+      tips[item->data(0, kIdRole).toInt()] << adviceTip(advice_[i]);
     if (page == currentPage() && page != 0) here.push_back(static_cast<int>(i));
   }
   for (auto item = itemsById_.cbegin(); item != itemsById_.cend(); ++item) {

@@ -74,9 +74,9 @@ class DocumentTab final : public QSplitter, public SetupHost {
   // Selects the tree item of a page, and ends a search that hides it; false when the page does not apply.
   bool goToPage(std::int32_t id);
   void goToNeighbour(int direction);
-  // A page, and a cell (from 1; column 0 for any) of its first table that has it; row 0 for the page alone.
+  // A page, and a cell (from 1, without headers; 0 for any) of its first table that has it.
   void goToRow(std::int32_t page, int row, int column);
-  // The row (from 1) of the page that is at work; 0 for none.
+  // The row (from 1, without headers) of the page that is at work; 0 for none.
   int currentRow() const { return pane_->currentRow(); }
   // The item that is selected; 0 for none.
   std::int32_t currentPage() const;

@@ -54,6 +54,13 @@ class Picture final : public QLabel {
   QPixmap picture_;
 };
 
+// Further rows of headers, above those that can be chosen.
+int headerRows(const GridModel& cells) {
+  int rows = 0;
+  while (rows < cells.rowCount() && cells.style(cells.index(rows, 0)).isHeader) ++rows;
+  return rows;
+}
+
 }  // namespace
 
 PagePane::PagePane(QWidget* parent) : QScrollArea(parent) {
@@ -140,7 +147,7 @@ PagePane::Part PagePane::makePart(Control& control, QWidget* parent, bool hasBod
     connect(grid, &GridView::edited, this, &PagePane::refresh);
     connect(grid, &GridView::rowChosen, this, [this, grid](int row) {
       lastGrid_ = grid;
-      emit rowChosen(row);
+      emit rowChosen(std::max(row - headerRows(grid->cells()), 0));
     });
     return {&control, grid, nullptr, grid};
   }
@@ -254,12 +261,13 @@ void PagePane::refreshGroup(const Part& part, bool isShown) {
 
 bool PagePane::showCell(int row, int column) {
   for (const Part& part : parts_) {
-    if (part.grid == nullptr || row < 1 || row > part.grid->cells().rowCount() ||
-        column > part.grid->cells().columnCount())
-      continue;
+    if (part.grid == nullptr || row < 1) continue;
+    const GridModel& cells = part.grid->cells();
+    const int place = row + headerRows(cells);
+    if (place > cells.rowCount() || column > cells.columnCount()) continue;
     const QModelIndex now = part.grid->currentIndex();
     const int any = now.isValid() ? now.column() : 0;
-    part.grid->goTo(row - 1, column > 0 ? column - 1 : any);
+    part.grid->goTo(place - 1, column > 0 ? column - 1 : any);
     ensureWidgetVisible(part.grid);
     return true;
   }
@@ -267,8 +275,8 @@ bool PagePane::showCell(int row, int column) {
 }
 
 int PagePane::currentRow() const {
-  return lastGrid_ != nullptr && lastGrid_->currentIndex().isValid() ? lastGrid_->currentIndex().row() + 1
-                                                                     : 0;
+  if (lastGrid_ == nullptr || !lastGrid_->currentIndex().isValid()) return 0;
+  return std::max(lastGrid_->currentIndex().row() + 1 - headerRows(lastGrid_->cells()), 0);
 }
 
 std::optional<QModelIndex> PagePane::pointCell() const {

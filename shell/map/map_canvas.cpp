@@ -2,6 +2,7 @@
 
 #include "shell/map/map_canvas.h"
 
+#include <QElapsedTimer>
 #include <QHelpEvent>
 #include <QPainter>
 #include <QToolTip>
@@ -42,6 +43,39 @@ MapCanvas::MapCanvas(QWidget* parent) : QWidget(parent), worker_(new TerrainWork
   setAttribute(Qt::WA_OpaquePaintEvent);
   frame_.size = size();
   connect(worker_, &TerrainWorker::painted, this, &MapCanvas::takePicture);
+  constexpr int kMoment = 80;  // milliseconds
+  standStill_.setSingleShot(true);
+  standStill_.setInterval(kMoment);
+  connect(&standStill_, &QTimer::timeout, this, qOverload<>(&QWidget::update));
+}
+
+void MapCanvas::forgetPlaced() {
+  placed_ = QPixmap();
+  update();
+}
+
+void MapCanvas::paintPlaced(QPainter& painter) {
+  constexpr double kSlow = 8;  // milliseconds
+  const bool isCurrent = !placed_.isNull() && placedFrame_ == frame_;
+  const bool isMoving = !placed_.isNull() && placedCost_ > kSlow && standStill_.isActive();
+  if (!isCurrent && !isMoving) {
+    QElapsedTimer timer;
+    timer.start();
+    placed_ = QPixmap(size() * devicePixelRatio());
+    placed_.setDevicePixelRatio(devicePixelRatio());
+    placed_.fill(Qt::transparent);
+    QPainter onPicture(&placed_);
+    drawing_.paint(onPicture, frame_);
+    placedFrame_ = frame_;
+    placedCost_ = static_cast<double>(timer.nsecsElapsed()) * 1e-6;
+  }
+  if (placedFrame_ == frame_) {
+    painter.drawPixmap(0, 0, placed_);
+  } else if (placedFrame_.metresPerPixel == frame_.metresPerPixel) {
+    painter.drawPixmap(placedFrame_.in(frame_).topLeft().toPoint(), placed_);
+  } else {
+    painter.drawPixmap(placedFrame_.in(frame_), placed_, QRectF(placed_.rect()));
+  }
 }
 
 void MapCanvas::showMap(MapEditor* editor, const std::optional<MapFrame>& frame) {
@@ -66,7 +100,8 @@ void MapCanvas::showMap(MapEditor* editor, const std::optional<MapFrame>& frame)
 
 void MapCanvas::refresh() {
   if (isPressed_) drop();
-  if (editor_ == nullptr) return update();
+  forgetPlaced();
+  if (editor_ == nullptr) return;
   drawing_.setScene(editor_->scene());
   std::vector<TerrainArea> terrain = store_.open(scene());
   if (isFitted_) {
@@ -98,6 +133,7 @@ void MapCanvas::setFrame(const MapFrame& frame) {
   isFitted_ = false;
   frame_ = frame;
   frame_.size = size();
+  standStill_.start();
   requestTerrain();
   update();
 }
@@ -105,13 +141,16 @@ void MapCanvas::setFrame(const MapFrame& frame) {
 void MapCanvas::selectFeature(const std::optional<MapFeatureId>& id, std::int32_t area) {
   const std::optional<std::size_t> vertex =
       id && drawing_.selection.feature == id ? drawing_.selection.vertex : std::nullopt;
-  drawing_.selection = {id, vertex, area};
-  update();
+  const MapSelection chosen{id, vertex, area};
+  if (chosen == drawing_.selection) return;
+  drawing_.selection = chosen;
+  forgetPlaced();
 }
 
 void MapCanvas::setLayer(MapLayer layer, bool on) {
   drawing_.layers.set(placeOf(layer), on);
-  update();
+  forgetPlaced();
+  requestTerrain();
 }
 
 void MapCanvas::setStyle(const TerrainStyle& style) {
@@ -183,7 +222,7 @@ void MapCanvas::paintEvent(QPaintEvent*) {
     return;
   }
   if (drawing_.layers.test(placeOf(MapLayer::terrain))) paintTerrain(painter);
-  drawing_.paint(painter, frame_);
+  paintPlaced(painter);
   if (grasp_) grasp_->paint(painter, frame_);
   drawing_.paintLegend(painter, frame_, style_, terrain_.empty() ? std::nullopt : scale_);
   paintHeldText(painter);

@@ -1,6 +1,8 @@
 #pragma once
 
+#include <QPixmap>
 #include <QPointer>
+#include <QTimer>
 #include <QWidget>
 #include <functional>
 #include <memory>
@@ -104,7 +106,9 @@ class MapCanvas final : public QWidget {
 
  private:
   void paintTerrain(QPainter& painter);
+  void paintPlaced(QPainter& painter);
   void paintHeldText(QPainter& painter);
+  void forgetPlaced();
   void requestTerrain();
   void requestBase();
   void takePicture(const TerrainPicture& picture);
@@ -140,6 +144,13 @@ class MapCanvas final : public QWidget {
   std::optional<TerrainPicture> coarse_;
   std::optional<TerrainPicture> fine_;
   TerrainWorker* worker_;
+
+  // What is placed, as it was last drawn. Where that takes long it moves along with the map as a picture, and
+  // is drawn anew once the map stands still.
+  QPixmap placed_;
+  MapFrame placedFrame_;
+  double placedCost_ = 0;  // milliseconds
+  QTimer standStill_;
 };
 
 }  // namespace gridbay::shell

@@ -90,6 +90,7 @@ void MapCanvas::startDrag(QPointF at) {
     const MapHit hit = drawing_.hit(frame_, at);
     if (hit.feature && hit.vertex && hit.feature == drawing_.selection.feature) {
       drawing_.selection.vertex = hit.vertex;
+      forgetPlaced();
       grasp_ = graspVertex(*editor_, *drawing_.feature(*hit.feature), *hit.vertex);
     } else if (!hit.feature && hit.isBorder && hit.area > 1) {
       grasp_ = graspArea(*editor_, *scene().area(hit.area), place);
@@ -117,6 +118,7 @@ void MapCanvas::mouseMoveEvent(QMouseEvent* event) {
   isPanning_ = true;
   isFitted_ = false;
   frame_.pan(way);
+  standStill_.start();
   setCursor(Qt::ClosedHandCursor);
   requestTerrain();
   update();
@@ -167,7 +169,7 @@ void MapCanvas::click(QPointF at) {
 // Lights up what lies there, and leads to its page.
 void MapCanvas::chooseAt(QPointF at) {
   const MapHit hit = drawing_.hit(frame_, at);
-  update();
+  forgetPlaced();
   if (const MapFeature* feature = hit.feature ? drawing_.feature(*hit.feature) : nullptr) {
     drawing_.selection = {hit.feature, hit.vertex, 0};
     // The signal may bring another scene.
@@ -234,6 +236,7 @@ void MapCanvas::mouseDoubleClickEvent(QMouseEvent* event) {
   const MapPoint place = frame_.toMap(event->position());
   edit([&, id = feature->id] { return editor_->insertVertex(id, *hit.segment + 1, place); });
   drawing_.selection.vertex = *hit.segment + 1;
+  forgetPlaced();
 }
 
 void MapCanvas::wheelEvent(QWheelEvent* event) {

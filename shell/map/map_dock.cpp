@@ -280,7 +280,7 @@ void MapDock::startPick() {
   follow();
   pickCell_ = *cell;
   const std::int32_t page = tab_->currentPage();
-  const int row = cell->row() + 1;
+  const int row = tab_->currentRow();
   // A point counts in the area that its row's feature stands on.
   pickArea_ = 1;
   for (const MapFeature& feature : canvas_->scene().features) {

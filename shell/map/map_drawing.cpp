@@ -276,7 +276,8 @@ void MapDrawing::paintMarks(QPainter& painter, const MapFeature& feature, const 
       if (line.size() == 1 || !feature.joined)
         for (const QPointF& point : line) painter.drawEllipse(point, 3, 3);
   }
-  const bool isWide = line.boundingRect().width() + line.boundingRect().height() > 24;
+  constexpr double kLabelled = 40;  // pixels
+  const bool isWide = line.boundingRect().width() + line.boundingRect().height() > kLabelled;
   if (feature.label.empty() || !(isWide || isLit || line.size() == 1)) return;
   QPointF middle = line.size() == 2 ? (line.front() + line.back()) / 2 : line[line.size() / 2];
   if (feature.id.kind == MapKind::source || feature.id.kind == MapKind::outputPoints)

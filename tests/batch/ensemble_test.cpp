@@ -189,7 +189,8 @@ TEST_F(EnsembleMaking, TheReportsSayWhatAValidationOfEachFileSays) {
       EXPECT_EQ(json[i]["messages"][m]["text"], messages[m].text);
       all += (m == 0 ? "" : "; ") + std::string("page ") +
              std::to_string(static_cast<int>(messages[m].page)) + ", severity " +
-             std::to_string(static_cast<int>(messages[m].severity)) + ": " + messages[m].text;
+             std::to_string(static_cast<int>(messages[m].severity)) + ": ";
+      for (const char c : messages[m].text) all += c == '"' ? std::string("\"\"") : std::string(1, c);
     }
     csv += "\"" + member.name + "\",\"" + member.file + "\",\"" + std::to_string(faults) + "\",\"" + all +
            "\"\n";
@@ -311,7 +312,7 @@ TEST(CheckSetups, ReportsEachFileInItsPlace) {
   const test::TemporaryFolder folder;
   test::writeGrid(folder.file("a.tsb2"));
   SetupFile setup(nullptr);
-  setup.model().bathymetry->GetArea(1)->fileName.Set("a.tsb2", folder.file("x"));
+  ASSERT_TRUE(applySetting(setup, {kGrid, "a.tsb2"}, folder.file("x")));
   std::vector<std::string> files;
   for (const char* name : {"one", "two"}) {
     files.push_back(folder.file(name + kKind));

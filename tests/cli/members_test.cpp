@@ -7,6 +7,7 @@
 #include <unistd.h>
 
 #include <chrono>
+#include <cstdio>
 #include <filesystem>
 #include <thread>
 
@@ -38,8 +39,9 @@ class Started {
     std::vector<char*> argv;
     for (std::string& word : words) argv.push_back(word.data());
     argv.push_back(nullptr);
-    ::close(STDERR_FILENO);
-    ::close(STDOUT_FILENO);
+    if (std::freopen("/dev/null", "w", stdout) == nullptr ||
+        std::freopen("/dev/null", "w", stderr) == nullptr)
+      ::_exit(97);
     ::execv(argv[0], argv.data());
     ::_exit(98);
   }
@@ -71,7 +73,7 @@ class Members : public ::testing::Test {
     std::string text = "name," + kDrying + "\n";
     std::vector<std::string> files;
     for (const std::string& name : names) {
-      text += name + ",0.1\n";
+      text += name + ",0.01\n";
       files.push_back(out + "/" + name + kKind);
     }
     const ProgramRun run = runTool({"ensemble", table(text), base, out});
@@ -98,24 +100,23 @@ class Members : public ::testing::Test {
 };
 
 TEST_F(Members, AnEnsembleIsMadeAndReported) {
-  ProgramRun run = runTool({"ensemble", table("name," + kDrying + "\nwell,0.1\ndry,-1\n"), base, out});
+  ProgramRun run = runTool({"ensemble", table("name," + kDrying + "\nwell,0.01\ndry,-1\n"), base, out});
   EXPECT_EQ(run.status, 1);
-  EXPECT_EQ(run.err, "");
   EXPECT_EQ(run.out, out + ": 2 members, 1 with faults; see " + out + "/report.csv\n");
   EXPECT_EQ(textOf(out + "/report.csv"),
             "\"member\",\"file\",\"faults\",\"messages\"\n\"well\",\"" + out + "/well" + kKind +
                 "\",\"0\",\"\"\n\"dry\",\"" + out + "/dry" + kKind +
                 "\",\"1\",\"page 26, severity 1: Drying depth must be positive\"\n");
-  EXPECT_EQ(runTool({"get", out + "/well" + kKind, kDrying}).out, "0.1\n");
+  EXPECT_EQ(runTool({"get", out + "/well" + kKind, kDrying}).out, "0.01\n");
   EXPECT_EQ(runTool({"validate", out + "/well" + kKind}).status, 0);
 
-  run = runTool({"ensemble", table("name," + kDrying + "\nwell,0.2\n"), base, out});
+  run = runTool({"ensemble", table("name," + kDrying + "\nwell,0.02\n"), base, out});
   EXPECT_EQ(run.status, 2);
   EXPECT_THAT(run.err, HasSubstr("is there already; --force replaces it"));
-  run = runTool({"ensemble", table("name," + kDrying + "\nwell,0.2\n"), base, out, "--force"});
+  run = runTool({"ensemble", table("name," + kDrying + "\nwell,0.02\n"), base, out, "--force"});
   EXPECT_EQ(run.status, 0);
   EXPECT_EQ(run.out, out + ": 1 member, 0 with faults; see " + out + "/report.csv\n");
-  EXPECT_EQ(runTool({"get", out + "/well" + kKind, kDrying}).out, "0.2\n");
+  EXPECT_EQ(runTool({"get", out + "/well" + kKind, kDrying}).out, "0.02\n");
 }
 
 TEST_F(Members, AnEnsembleThatCannotBe) {
@@ -132,7 +133,7 @@ TEST_F(Members, AnEnsembleThatCannotBe) {
 
 TEST_F(Members, AnEnsembleThatIsStoppedHasWholeFilesAndAReport) {
   std::string text = kDrying + "\n";
-  for (int i = 0; i < 20000; ++i) text += "0.1\n";
+  for (int i = 0; i < 20000; ++i) text += "0.01\n";
   Started tool({"ensemble", table(text), base, out});
   waitFor([&] { return fs::exists(out) && !fs::is_empty(out); });
   EXPECT_EQ(tool.endWith(SIGINT), 2);
@@ -187,9 +188,10 @@ TEST_F(Members, NoneIsStartedWithFaultsUnasked) {
   ProgramRun ran = run({"--engine", program}, files);
   EXPECT_EQ(ran.status, 1);
   EXPECT_EQ(ran.out, "");
-  EXPECT_EQ(ran.err, files[1] +
-                         ": page 26, severity 1: Drying depth must be positive\n"
-                         "1 setup with faults: none is started; --force starts all nevertheless\n");
+  EXPECT_THAT(ran.err,
+              ::testing::EndsWith(files[1] +
+                                  ": page 26, severity 1: Drying depth must be positive\n"
+                                  "1 setup with faults: none is started; --force starts all nevertheless\n"));
   EXPECT_FALSE(fs::exists(out + "/run-1"));
   ran = run({"--engine", program, "--force"}, files);
   EXPECT_EQ(ran.status, 0);

@@ -256,8 +256,8 @@ TEST_F(WqsDefinitionPages, Constants) {
   EXPECT_EQ(widths()[4], 60);
   EXPECT_EQ(grid().GetRowCount(), 9);
   const std::string unit(qunBaseUnit(100006)->symbol);
-  EXPECT_EQ(rowOf(grid(), 1), (Labels{"a", "About a", "Constant", "2.500000", unit, "", "...", "View..."}));
-  EXPECT_EQ(rowOf(grid(), 4), (Labels{"b", "", "Built-in", "0.500000", "1/d", "", "...", "View..."}));
+  EXPECT_EQ(rowOf(grid(), 1), (Labels{"a", "About a", "Constant", "2.500000", unit, "", "", ""}));
+  EXPECT_EQ(rowOf(grid(), 4), (Labels{"b", "", "Built-in", "0.500000", "1/d", "", "", ""}));
   EXPECT_EQ(rowOf(grid(), 9), (Labels{"Area 2", "", "", "", "", "", "...", "View..."}));
   EXPECT_EQ((Labels{grid().GetRowHeader(1), grid().GetRowHeader(2), grid().GetRowHeader(7)}),
             (Labels{"1", "", "3"}));

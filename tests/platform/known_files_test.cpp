@@ -7,6 +7,8 @@
 #include <filesystem>
 #include <vector>
 
+#include "platform/tsb/tsb_file.h"
+#include "tests/support/grids.h"
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
@@ -77,6 +79,44 @@ TEST_F(Known, OfSeveralFilesThoseNotKnownAreCheckedAtOnce) {
 
 TEST_F(Known, AMissingFileIsLeftToTheCheck) {
   EXPECT_TRUE(isAsked(folder.file("none"), false));
+}
+
+TEST_F(Known, AFileIsKnownInOneState) {
+  EXPECT_FALSE(files.known(path));
+  waitAMoment();
+  EXPECT_FALSE(files.known(path));
+  EXPECT_TRUE(isAsked(path));
+  EXPECT_TRUE(files.known(path));
+  EXPECT_EQ(files.known(path), files.known((folder.path() / "." / "a").string()));
+  folder.write("a", "tend");
+  EXPECT_FALSE(files.known(path));
+  EXPECT_FALSE(files.known(folder.file("none")));
+}
+
+TEST_F(Known, ADataFileIsReadAnewOnceItIsWrittenTo) {
+  const std::string grid = folder.file("g.tsb2");
+  test::writeGrid(grid, {.noJ = 10});
+  waitAMoment();
+  for (int i = 0; i < 3; ++i) {
+    const Result<TsbFile> file = TsbFile::open(grid);
+    ASSERT_TRUE(file) << file.error();
+    EXPECT_EQ(file->definition().pointCount(), 80U);
+    std::vector<float> values(80);
+    EXPECT_TRUE(file->read(1, 0, std::span(values)));
+    EXPECT_EQ(values[79], -5.0F);
+  }
+  const Result<TsbFile> before = TsbFile::open(grid);
+  test::writeGrid(grid, {.noJ = 12}, [](int, int) { return -7.0F; });
+  std::vector<float> values(80);
+  const Outcome read = before->read(1, 0, std::span(values));
+  ASSERT_FALSE(read);
+  EXPECT_EQ(read.error(), "cannot read \"" + grid + "\": it has been written to since it was opened");
+  for (int i = 0; i < 3; ++i) {
+    const Result<TsbFile> file = TsbFile::open(grid);
+    ASSERT_TRUE(file) << file.error();
+    EXPECT_EQ(file->definition().pointCount(), 96U);
+    if (i == 0) waitAMoment();
+  }
 }
 
 }  // namespace

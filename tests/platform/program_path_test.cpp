@@ -43,7 +43,8 @@ TEST_F(Installed, AProgramLooksBelowItsPrefix) {
   const std::string raster = folder.write("a.asc",
                                           "ncols 2\nnrows 2\nxllcorner 0\nyllcorner 0\ncellsize 1\n"
                                           "1 2\n3 4\n");
-  const std::vector<std::string> words{"convert", "raster", raster, folder.file("a.tsb2"), "--crs", "UTM-32"};
+  const std::vector<std::string> words{
+      "convert", "raster", raster, folder.file("a.tsb2"), "--crs", "UTM-32", "--land", "9", "--force"};
   const test::ProgramRun without = test::runProgram(tool, words);
   EXPECT_EQ(without.status, 2);
   EXPECT_THAT(without.err, HasSubstr((prefix / GRIDBAY_PLUGIN_FOLDER / "v27raster.so").string()));

@@ -252,3 +252,67 @@ def test_objects_in_two_threads(tmp_path, grid):
     for thread in threads:
         thread.join()
     assert faults == []
+
+
+def test_a_boundary_that_has_a_series_keeps_its_fab_type(urban, tmp_path):
+    urban.setNoOfBndCondition(2)
+    urban.setBndCondition_File(1, 0, 0, 0, 9, 1, "a.tsb0", 1)
+    setup, _ = saved(urban, tmp_path)
+    boundary = setup.hydrodynamic.open_boundary.boundaries[1]
+    assert (boundary.data_format, boundary.fab_type) == (3, 12)
+    boundary.fab_type = 0
+    setup.save()
+    urban.LoadFile(setup.file)
+    urban.setBndCondition_File(1, 0, 0, 0, 9, 1, "b.tsb0", 2)
+    urban.setBndCondition_File(2, 0, 0, 0, 9, 1, "c.tsb1", 2)
+    boundaries = saved(urban, tmp_path)[0].hydrodynamic.open_boundary.boundaries
+    assert boundaries[1].fab_type == 0 and boundaries[1].item_numbers == [2]
+    assert (boundaries[2].data_format, boundaries[2].fab_type) == (4, 12)
+
+
+def test_air_temperature_has_one_component(grid, tmp_path):
+    setup = gridbay_setup.new(areas=[grid], start=START)
+    setup.nested_model_globals.module_selection.simulation_type = 2
+    components = setup.advection_dispersion.component_specifications.components
+    components.resize(2)
+    components[2].component_description = -2
+    path = tmp_path / "t.v27"
+
+    def opened():
+        setup.save(path)
+        climate = CClimateChange_V27()
+        assert climate.OpenFile(str(path)) == 1
+        return climate
+
+    climate = opened()
+    assert climate.GetNoTempValues() == 1 and climate.GetTempValues(1) == (1, 20.0)
+    assert climate.SetTempValues(2, 5) == 1 and climate.GetTempValues(1) == (1, 20.0)
+    assert climate.SetTempValues(1, 5) == 1 and climate.GetTempValues(1) == (1, 5.0)
+    assert climate.SetTempFile(1, "x.tsb0") == 0
+    setup.advection_dispersion.heat_exchange.air_format = 0
+    climate = opened()
+    assert (climate.GetNoTempValues(), climate.GetNoTempTimeSeries(), climate.GetNoTempGridSeries()) == (0, 1, 0)
+    assert climate.SetTempValues(1, 7) == 1 and climate.GetTempValues(1) == (0, None)
+    assert climate.SetTempFile(1, "air.tsb0") == 1 and climate.GetTempFileItem(1)[0] == 1
+    components[1].component_description = -2
+    climate = opened()
+    assert (climate.GetNoTempTimeSeries(), climate.SetTempValues(1, 7)) == (0, 0)
+
+
+def test_water_levels_from_files(flood, tmp_path):
+    flood.setNoOfBndCondition(3)
+    flood.setHDBndCondition_Value(1, 0, 1, 0, 2, 2, 7.5)  # a flux, which does not count
+    flood.setHDBndCondition_File(2, 1, 2, 3, 4, 1, 3, "tide.tsb0", 4)
+    flood.setHDBndCondition_File(3, 5, 6, 7, 8, 1, 4, "line.tsb1", 2)
+    setup, _ = saved(flood, tmp_path)
+    climate = CClimateChange_V27()
+    assert climate.OpenFile(setup.file) == 1
+    counts = (climate.GetNoWLValue(), climate.GetNoWLTimeSeries(), climate.GetNoWLLineSeries())
+    assert counts == (0, 1, 1)
+    assert climate.GetWLTSIDLocation(1) == (1, 2, "(1,2) - (3,4)")
+    assert climate.GetWLLineIDLocation(1) == (1, 3, "(5,6) - (7,8)")
+    assert climate.GetWLTSIDLocation(2) == (0, None, None)
+    assert climate.GetWLFileItem(1)[2] == 4
+    assert climate.SetWLFile(1, "new.tsb0") == 1 and climate.GetWLFileItem(1)[2] == 1
+    assert climate.SetWLLineFile(1, "new.tsb1", 0) == 0 and climate.GetWLLineFileItem(1)[2] == 2
+    assert climate.SetWLLineFile(1, "new.tsb1", 5) == 1 and climate.GetWLLineFileItem(1)[2] == 5

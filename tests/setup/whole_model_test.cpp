@@ -18,6 +18,7 @@
 #include "setup/dlg_enumerator.h"
 #include "setup/navigation_tree.h"
 #include "tests/support/grids.h"
+#include "tests/support/model.h"
 #include "tests/support/pages.h"
 #include "tests/support/temporary_folder.h"
 
@@ -157,7 +158,7 @@ class WholeModel : public ::testing::TestWithParam<Setup> {
     path = folder.file(GetParam().name);
     std::filesystem::copy_file(std::string(GRIDBAY_TESTS) + "/main_job/setups/" + GetParam().name, path);
     ASSERT_TRUE(document.OnOpenDocument(path));
-    root().moduleSelection->simulationType = GetParam().module;
+    if (!theEdition.wetlandSweepKit) root().moduleSelection->simulationType = GetParam().module;
     document.RecordEdit(PageId::none, "module");
     tree.OnInitialUpdate(&root());
   }
@@ -240,6 +241,7 @@ class WholeModel : public ::testing::TestWithParam<Setup> {
       for (int col = 1; col <= columns; ++col) {
         CellStyle style;
         if (grid.GetStyleRowCol(row, col, style) != 1) continue;
+        if (style.kind == CellKind::dropDown && style.choices.size() < 2) continue;
         const Act cell{.control = control, .row = row, .col = col};
         if (style.kind == CellKind::button ? style.enabled : style.editable()) {
           all.insert(cell);
@@ -389,6 +391,8 @@ INSTANTIATE_TEST_SUITE_P(Of, WholeModel, ::testing::ValuesIn(kSetups));
 TEST_P(WholeModel, ComesBackInItsExactState) {
   const std::string again = folder.file("again.v27");
   ASSERT_TRUE(document.OnSaveDocument(again));
+  // An edition that keeps less has done so now.
+  if (theEdition.wetlandSweepKit) ASSERT_TRUE(document.OnOpenDocument(again));
   CV27SetupDoc second(host);
   ASSERT_TRUE(second.OnOpenDocument(again));
   // The ecological model's own file has been read twice: what it declares is compared as text below.

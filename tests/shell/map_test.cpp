@@ -300,22 +300,25 @@ class MapTest : public DesktopFixture {
     for (auto* button : tab().pane().findChildren<QRadioButton*>()) {
       if (button->text().remove('&') == "User specified") button->click();
     }
+    QCoreApplication::processEvents();
+    int number = 1;  // of the new one, after those that were found
+    while (feature(MapKind::boundary, number) != nullptr) ++number;
     window_->map().toolAction(MapTool::boundary)->trigger();
     click(screenOf(1, 0, 10));
     click(screenOf(1, 0, 40));
-    const MapFeature* boundary = feature(MapKind::boundary);
-    QVERIFY(boundary != nullptr);
+    QVERIFY(feature(MapKind::boundary, number) != nullptr);
     QCOMPARE(undoName(), QString("New boundary"));
     window_->map().toolAction(MapTool::select)->trigger();
     // Off the border, and it slides along it all the same.
     drag(screenOf(1, 0, 40), screenOf(1, 6, 55));
-    const MapPoint end = feature(MapKind::boundary)->points->back();
+    const MapPoint end = feature(MapKind::boundary, number)->points->back();
     QVERIFY(std::abs(end.east - area(1).grid.at(0, 55).east) < 0.01);
     QVERIFY(std::abs(end.north - area(1).grid.at(0, 55).north) < 0.01);
-    QCOMPARE(undoName(), QString("Boundary 1, Last point"));
+    QCOMPARE(undoName(), QString("Boundary %1, Last point").arg(number));
     tab().undo();
     QCoreApplication::processEvents();
-    QVERIFY(std::abs(feature(MapKind::boundary)->points->back().north - area(1).grid.at(0, 40).north) < 0.01);
+    const MapPoint back = feature(MapKind::boundary, number)->points->back();
+    QVERIFY(std::abs(back.north - area(1).grid.at(0, 40).north) < 0.01);
   }
 
   void aDikeIsDrawnAndEditedPointByPoint() {
