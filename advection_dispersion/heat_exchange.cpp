@@ -2,6 +2,7 @@
 
 #include "advection_dispersion/advection_dispersion_parts.h"
 #include "advection_dispersion/component.h"
+#include "core/table_code.h"
 #include "families/data_files.h"
 #include "platform/units/units.h"
 

@@ -1,6 +1,7 @@
 #include "basic/area_description.h"
 
 #include "basic/texts.h"
+#include "core/table_code.h"
 
 namespace gridbay {
 

@@ -3,6 +3,7 @@
 #include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
 #include "basic/boundary_detection.h"
+#include "core/table_code.h"
 
 namespace gridbay {
 

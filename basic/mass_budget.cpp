@@ -4,6 +4,7 @@
 
 #include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
+#include "core/table_code.h"
 
 namespace gridbay {
 namespace {

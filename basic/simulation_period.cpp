@@ -6,6 +6,7 @@
 #include "basic/basic_parts.h"
 #include "basic/bathymetry.h"
 #include "basic/texts.h"
+#include "core/table_code.h"
 #include "platform/units/units.h"
 
 namespace gridbay {

@@ -8,6 +8,7 @@
 #include "basic/area_description.h"
 #include "core/kdl_reader.h"
 #include "core/list_kvs.h"
+#include "core/table_code.h"
 #include "setup/edit_history.h"
 
 namespace gridbay {

@@ -1,10 +1,10 @@
 #include <fmt/format.h>
 
 #include "cli/commands.h"
-#include "conversion/output_file.h"
 #include "conversion/vector_writer.h"
 #include "map/gis_export.h"
 #include "map/setup_map.h"
+#include "platform/files/may_write.h"
 
 namespace gridbay::cli {
 namespace {

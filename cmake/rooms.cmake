@@ -5,7 +5,7 @@
 function(room name)
   cmake_parse_arguments(ROOM "" "" "USES;SOURCES;LIBRARIES" ${ARGN})
   if(GRIDBAY_FUZZ)  # opens no page
-    list(FILTER ROOM_SOURCES EXCLUDE REGEX "_(page|pages|dialog|factory|doc|tree)\\.cpp$")
+    list(FILTER ROOM_SOURCES EXCLUDE REGEX "_(page|pages|dialog|factory|doc)\\.cpp$|navigation_tree")
   endif()
   add_library(gridbay_${name} STATIC ${ROOM_SOURCES})
   foreach(used ${ROOM_USES})

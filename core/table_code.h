@@ -4,8 +4,8 @@
 
 #include "core/table_kvs.h"
 
-// What follows from the tables of objects. Included where objects are made, and nowhere else: so each table's
-// code is compiled once.
+// What follows from the tables of objects. Included by the source that holds the first function of a class,
+// or by the one that makes the objects of a room, and nowhere else: so each table's code is compiled once.
 
 namespace gridbay {
 

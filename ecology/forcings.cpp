@@ -1,5 +1,6 @@
 #include "ecology/forcings.h"
 
+#include "core/table_code.h"
 #include "ecology/texts.h"
 #include "ecology/transported.h"
 

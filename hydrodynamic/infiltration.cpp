@@ -1,5 +1,6 @@
 #include "hydrodynamic/infiltration.h"
 
+#include "core/table_code.h"
 #include "families/data_files.h"
 #include "hydrodynamic/texts.h"
 #include "platform/units/units.h"

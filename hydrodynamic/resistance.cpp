@@ -4,6 +4,7 @@
 #include <limits>
 
 #include "basic/simulation_period.h"
+#include "core/table_code.h"
 #include "families/data_files.h"
 #include "platform/units/units.h"
 

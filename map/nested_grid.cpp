@@ -9,9 +9,9 @@
 
 #include "basic/grid_file.h"
 #include "conversion/history.h"
-#include "conversion/output_file.h"
 #include "conversion/raster_reader.h"
 #include "conversion/tsb_raster.h"
+#include "platform/files/may_write.h"
 #include "platform/tsb/tsb_writer.h"
 #include "platform/units/units.h"
 

@@ -1,5 +1,6 @@
 #include "mud_transport/wave_data.h"
 
+#include "core/table_code.h"
 #include "families/data_files.h"
 #include "mud_transport/texts.h"
 

@@ -2,6 +2,7 @@
 
 #include <numeric>
 
+#include "core/table_code.h"
 #include "mud_transport_expanded/mud_transport_expanded_parts.h"
 #include "mud_transport_expanded/texts.h"
 #include "mud_transport_expanded/transported.h"

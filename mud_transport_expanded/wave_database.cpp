@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <vector>
 
+#include "core/table_code.h"
 #include "families/data_files.h"
 #include "mud_transport_expanded/texts.h"
 #include "mud_transport_expanded/waves.h"

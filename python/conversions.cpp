@@ -84,7 +84,8 @@ void addConversions(py::module_& module) {
       "convert_raster",
       [](Path in, Path out, std::optional<float> land, std::optional<std::string> itemType,
          std::optional<int> band, std::optional<int> subdataset, std::optional<float> nodataAs,
-         std::string crs, std::optional<double> originX, std::optional<double> originY, int coarsen,
+         std::string crs, std::string reproject, std::optional<double> resample,
+         std::optional<double> originX, std::optional<double> originY, int coarsen,
          std::optional<std::array<int, 4>> window, bool force, std::string history,
          const py::object& progress) {
         return raster({.in = std::move(in),
@@ -95,6 +96,8 @@ void addConversions(py::module_& module) {
                        .subdataset = subdataset.value_or(0),
                        .missingAs = nodataAs,
                        .crs = std::move(crs),
+                       .reproject = std::move(reproject),
+                       .resample = resample,
                        .originX = originX,
                        .originY = originY,
                        .coarsen = coarsen,
@@ -104,9 +107,9 @@ void addConversions(py::module_& module) {
                       progress);
       },
       py::arg("source"), py::arg("target"), py::kw_only(), py::arg("land"), py::arg("item_type"),
-      py::arg("band"), py::arg("subdataset"), py::arg("nodata_as"), py::arg("crs"), py::arg("origin_x"),
-      py::arg("origin_y"), py::arg("coarsen"), py::arg("window"), py::arg("force"), py::arg("history"),
-      py::arg("progress"), "Makes a map from a raster.");
+      py::arg("band"), py::arg("subdataset"), py::arg("nodata_as"), py::arg("crs"), py::arg("reproject"),
+      py::arg("resample"), py::arg("origin_x"), py::arg("origin_y"), py::arg("coarsen"), py::arg("window"),
+      py::arg("force"), py::arg("history"), py::arg("progress"), "Makes a map from a raster.");
   module.def(
       "convert_series",
       [](Path in, Path out, std::vector<std::string> itemTypes, std::string start, std::string timeUnit,

@@ -68,6 +68,7 @@ void takeScreenshots(MainWindow& window, const QStringList& paths, const QString
     if (!item.visible || !window.currentDocument()->goToPage(item.id)) continue;
     take(QString("page-%1").arg(item.id));
   }
+  takeMaps(window, take);
   if (QString error; window.help().showTopic(0, "Overview", &error)) {
     take("help");
   } else {
@@ -77,7 +78,6 @@ void takeScreenshots(MainWindow& window, const QStringList& paths, const QString
     QApplication::processEvents();
     data->grab().save(QString("%1/data-%2.png").arg(folder, data->windowTitle()));
   }
-  takeMaps(window, take);
 }
 
 }  // namespace

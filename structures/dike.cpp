@@ -1,5 +1,6 @@
 #include "structures/dike.h"
 
+#include "core/table_code.h"
 #include "families/data_files.h"
 #include "platform/files/paths.h"
 #include "platform/units/units.h"

@@ -78,6 +78,8 @@ def convert_raster(
     subdataset: Optional[int] = None,
     nodata_as: Optional[float] = None,
     crs: str = "",
+    reproject: str = "",
+    resample: Optional[float] = None,
     origin_x: Optional[float] = None,
     origin_y: Optional[float] = None,
     coarsen: int = 1,
@@ -90,13 +92,14 @@ def convert_raster(
     land: points at or above it are land (unit of the values, at least 0); a bathymetry needs it. item_type: code,
     name or beginning of a name; else as the file says, or Bathymetry. band, subdataset: which raster to take, from
     1. nodata_as: what stands for missing values, else the land value. crs: as EPSG:28356, UTM-32 or a full text,
-    else the raster's own. origin_x, origin_y: easting and northing of the first point (m), else as it lies.
+    else the raster's own. reproject: the projection to bring it to. resample: the spacing to bring it to (m).
+    origin_x, origin_y: easting and northing of the first point (m), else as it lies.
     coarsen: every so many points. window: j0, k0, j1, k1, from 0, both ends counted, K from the south. force:
     replaces a file that is there.
     """
     converted = _native.convert_raster(
         os.fspath(source), os.fspath(target), land=land, item_type=None if item_type is None else str(item_type),
-        band=band, subdataset=subdataset, nodata_as=nodata_as, crs=crs, origin_x=origin_x, origin_y=origin_y,
+        band=band, subdataset=subdataset, nodata_as=nodata_as, crs=crs, reproject=reproject, resample=resample, origin_x=origin_x, origin_y=origin_y,
         coarsen=coarsen, window=window, force=force, progress=progress,
         history=f"gridbay_setup.convert_raster({os.fspath(source)!r})",
     )  # fmt: skip

@@ -48,7 +48,8 @@ class NewGrid:
     def save(self, path: str, title: str, history: str, force: bool) -> None: ...
 
 def convert_raster(source: str, target: str, *, land: Optional[float], item_type: Optional[str], band: Optional[int],
-                   subdataset: Optional[int], nodata_as: Optional[float], crs: str, origin_x: Optional[float],
+                   subdataset: Optional[int], nodata_as: Optional[float], crs: str, reproject: str,
+                   resample: Optional[float], origin_x: Optional[float],
                    origin_y: Optional[float], coarsen: int, window: Optional[tuple[int, int, int, int]], force: bool,
                    history: str, progress: Optional[Callable[[int, int], Optional[bool]]]) -> dict[str, Any]: ...
 def convert_series(source: str, target: str, *, item_types: list[str], start: str, time_unit: str, skip_lines: int,

@@ -5,7 +5,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_box_summation_page_test {
 
 class AdBoxSummationPage : public test::ShapeTest {
  protected:
@@ -56,5 +56,5 @@ TEST_F(AdBoxSummationPage, ItemsInADialog) {
   EXPECT_EQ(list.GetItem(1)->entries, EntryFlags{0});
 }
 
-}  // namespace
+}  // namespace advection_dispersion_box_summation_page_test
 }  // namespace gridbay

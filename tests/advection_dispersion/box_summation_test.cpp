@@ -8,7 +8,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_box_summation_test {
 
 using test::load;
 using test::Model;
@@ -106,5 +106,5 @@ TEST_F(AdBoxSummation, MoreThanTenAreToldOnTheResultPage) {
                 {PageId::adResult, "Illegal number of box summation boxes, should be between 0 and 10"}}));
 }
 
-}  // namespace
+}  // namespace advection_dispersion_box_summation_test
 }  // namespace gridbay

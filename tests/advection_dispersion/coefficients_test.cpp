@@ -14,7 +14,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_coefficients_test {
 
 using test::savedText;
 using Texts = std::vector<std::string>;
@@ -278,5 +278,5 @@ TEST_F(Coefficients, AComponentThatDecaysAgainHasWhatItHad) {
   EXPECT_EQ(root.nadHeatDissipation->MeantCount(), 0);
 }
 
-}  // namespace
+}  // namespace advection_dispersion_coefficients_test
 }  // namespace gridbay

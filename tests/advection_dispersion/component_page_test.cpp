@@ -8,7 +8,7 @@
 #include "tests/support/pages.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_component_page_test {
 
 class ComponentPage : public test::PageTest {
  protected:
@@ -145,5 +145,5 @@ TEST_F(ComponentPage, AnEditCanBeTakenBack) {
   EXPECT_EQ(cell(2, 1), "Component 2");
 }
 
-}  // namespace
+}  // namespace advection_dispersion_component_page_test
 }  // namespace gridbay

@@ -7,7 +7,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_component_test {
 
 using test::Model;
 using test::savedText;
@@ -263,5 +263,5 @@ TEST_F(Components, AreReadWithTheirModuleOnly) {
   EXPECT_EQ(countFor("0"), 1);
 }
 
-}  // namespace
+}  // namespace advection_dispersion_component_test
 }  // namespace gridbay

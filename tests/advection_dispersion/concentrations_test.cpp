@@ -19,7 +19,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_concentrations_test {
 
 using test::savedText;
 using Texts = std::vector<std::string>;
@@ -322,5 +322,5 @@ TEST_F(Concentrations, OfEvaporationAndInfiltrationAreAskedForWhereWaterEvaporat
   }
 }
 
-}  // namespace
+}  // namespace advection_dispersion_concentrations_test
 }  // namespace gridbay

@@ -7,7 +7,7 @@
 #include "tests/support/pages.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_feedback_page_test {
 
 class FeedbackPage : public test::PageTest {
  protected:
@@ -102,5 +102,5 @@ TEST_F(FeedbackPage, TheListFollowsTheComponentsAndANumberBeyondItStays) {
   EXPECT_EQ(control("Varying", 1).choices, Labels{});
 }
 
-}  // namespace
+}  // namespace advection_dispersion_feedback_page_test
 }  // namespace gridbay

@@ -6,7 +6,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_feedback_test {
 
 using test::Model;
 using test::savedText;
@@ -118,5 +118,5 @@ TEST_F(Feedback, AComponentThatIsGoneIsAFaultAndStays) {
   EXPECT_EQ(faults(), Texts{kTemperature});
 }
 
-}  // namespace
+}  // namespace advection_dispersion_feedback_test
 }  // namespace gridbay

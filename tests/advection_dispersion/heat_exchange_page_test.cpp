@@ -7,7 +7,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_heat_exchange_page_test {
 
 class HeatExchangePage : public test::PageTest {
  protected:
@@ -184,5 +184,5 @@ TEST_F(HeatExchangePage, FilesAreChosenByTheirKind) {
   EXPECT_FALSE(control("View...", 3).enabled);
 }
 
-}  // namespace
+}  // namespace advection_dispersion_heat_exchange_page_test
 }  // namespace gridbay

@@ -9,7 +9,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_heat_exchange_test {
 
 using test::Model;
 using test::savedText;
@@ -258,5 +258,5 @@ TEST_F(HeatExchange, Requests) {
   EXPECT_EQ(describe(clearness), "Clearness coefficient");
 }
 
-}  // namespace
+}  // namespace advection_dispersion_heat_exchange_test
 }  // namespace gridbay

@@ -8,7 +8,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_line_discharge_page_test {
 
 class AdLineDischargePage : public test::ShapeTest {
  protected:
@@ -122,5 +122,5 @@ TEST_F(AdLineDischargePage, ItemsInADialog) {
   EXPECT_EQ(line().entries, (EntryFlags{0, 1}));
 }
 
-}  // namespace
+}  // namespace advection_dispersion_line_discharge_page_test
 }  // namespace gridbay

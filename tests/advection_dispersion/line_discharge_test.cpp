@@ -8,7 +8,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_line_discharge_test {
 
 using test::load;
 using test::Model;
@@ -297,5 +297,5 @@ TEST_F(AdLineDischargeChecks, MoreThanTenAreToldOnTheResultPage) {
   EXPECT_EQ(test::messagesOf(list).size(), 2U);  // line 11 has no file
 }
 
-}  // namespace
+}  // namespace advection_dispersion_line_discharge_test
 }  // namespace gridbay

@@ -7,7 +7,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_mass_budget_page_test {
 
 class AdMassBudgetPage : public test::ShapeTest {
  protected:
@@ -73,5 +73,5 @@ TEST_F(AdMassBudgetPage, ItemsInADialog) {
   EXPECT_EQ(item().entries, (EntryFlags{1, 0, 1}));
 }
 
-}  // namespace
+}  // namespace advection_dispersion_mass_budget_page_test
 }  // namespace gridbay

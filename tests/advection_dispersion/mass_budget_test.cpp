@@ -8,7 +8,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_mass_budget_test {
 
 using test::load;
 using test::Model;
@@ -195,5 +195,5 @@ TEST_F(AdMassBudgetChecks, TheModelAsksForThemWithTwoSchemesOnly) {
   EXPECT_FALSE(isAsked(0, 1));
 }
 
-}  // namespace
+}  // namespace advection_dispersion_mass_budget_test
 }  // namespace gridbay

@@ -21,7 +21,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_pages_test {
 
 class AdPages : public test::ShapeTest {
  protected:
@@ -322,5 +322,5 @@ TEST_F(AdPages, RainEvaporationAndInfiltration) {
   EXPECT_EQ(page->pageId(), PageId::adInfiltration);
 }
 
-}  // namespace
+}  // namespace advection_dispersion_pages_test
 }  // namespace gridbay

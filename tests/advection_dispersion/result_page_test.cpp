@@ -8,7 +8,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_result_page_test {
 
 class AdResultPage : public test::ShapeTest {
  protected:
@@ -117,5 +117,5 @@ TEST_F(AdResultPage, HotStartFiles) {
   EXPECT_EQ(results.hotStarts.at(1).title, "begin");
 }
 
-}  // namespace
+}  // namespace advection_dispersion_result_page_test
 }  // namespace gridbay

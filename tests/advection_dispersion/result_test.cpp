@@ -9,7 +9,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_result_test {
 
 using test::load;
 using test::Model;
@@ -292,5 +292,5 @@ TEST_F(AdResultChecks, HotStartFilesAreCheckedWhereTheyAreWritten) {
   EXPECT_EQ(faults(), (Texts{"Wrong dimension of output file", "Filename:  is not valid"}));
 }
 
-}  // namespace
+}  // namespace advection_dispersion_result_test
 }  // namespace gridbay

@@ -8,7 +8,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_starting_conditions_page_test {
 
 class AdStartPage : public test::PageTest {
  protected:
@@ -101,5 +101,5 @@ TEST_F(AdStartPage, TheTypeCanBeTakenBack) {
   EXPECT_FALSE(start().hotStart);
 }
 
-}  // namespace
+}  // namespace advection_dispersion_starting_conditions_page_test
 }  // namespace gridbay

@@ -9,7 +9,7 @@
 #include "tests/support/starting_conditions.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_starting_conditions_test {
 
 using test::hotSpec;
 using test::Model;
@@ -333,5 +333,5 @@ TEST_F(AdHotStartInADocument, TheNewListIsShownAndIsAStepOfItsOwn) {
   EXPECT_EQ(document.UndoStep()->name, "before");  // a check that changes nothing is no step
 }
 
-}  // namespace
+}  // namespace advection_dispersion_starting_conditions_test
 }  // namespace gridbay

@@ -12,7 +12,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace advection_dispersion_values_by_area_test {
 
 using test::savedText;
 using Texts = std::vector<std::string>;
@@ -259,5 +259,5 @@ TEST_F(ValuesByArea, AnEditInADeepListIsFoundAndTakenBack) {
   EXPECT_EQ(root.nadDepositionConcentration->soil.at(2).at(1).value, 0);
 }
 
-}  // namespace
+}  // namespace advection_dispersion_values_by_area_test
 }  // namespace gridbay

@@ -31,7 +31,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace advice_advice_test {
 
 using ::testing::HasSubstr;
 
@@ -617,5 +617,5 @@ TEST_F(AdviceTest, TheShippedExamplesAreFreeOfIt) {
   EXPECT_EQ(test::runTool({"validate", "--advice", setup}).out, "0 faults\nno advice\n");
 }
 
-}  // namespace
+}  // namespace advice_advice_test
 }  // namespace gridbay

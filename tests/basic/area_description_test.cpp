@@ -5,7 +5,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace basic_area_description_test {
 
 using test::load;
 using test::messagesOf;
@@ -62,5 +62,5 @@ TEST(AreaDescription, LoadsAndCopies) {
   EXPECT_EQ(savedText(copy), savedText(area));
 }
 
-}  // namespace
+}  // namespace basic_area_description_test
 }  // namespace gridbay

@@ -13,7 +13,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace basic_bathymetry_test {
 
 using test::GridSpec;
 using test::load;
@@ -429,5 +429,5 @@ TEST_F(Overland, TheFirstRuleThatFailsIsTheMessage) {
             "expected");
 }
 
-}  // namespace
+}  // namespace basic_bathymetry_test
 }  // namespace gridbay

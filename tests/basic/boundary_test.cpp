@@ -9,7 +9,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace basic_boundary_test {
 
 using test::load;
 using test::Model;
@@ -179,5 +179,5 @@ TEST(Boundary, RecalculationReadsTheGridAndLosesTheOldOnes) {
   EXPECT_EQ(list.GetCount(), 0);
 }
 
-}  // namespace
+}  // namespace basic_boundary_test
 }  // namespace gridbay

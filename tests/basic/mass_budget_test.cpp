@@ -7,7 +7,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace basic_mass_budget_test {
 
 using test::load;
 using test::Model;
@@ -127,5 +127,5 @@ TEST_F(MassBudgetChecks, PolygonsAreCheckedOnlyDeep) {
   EXPECT_TRUE(test::messagesOf(list, 0).empty());
 }
 
-}  // namespace
+}  // namespace basic_mass_budget_test
 }  // namespace gridbay

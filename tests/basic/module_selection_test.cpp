@@ -6,7 +6,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace basic_module_selection_test {
 
 using test::load;
 using test::savedText;
@@ -78,5 +78,5 @@ TEST(Edition, StringsOfTheDocument) {
   EXPECT_EQ(theEdition.fileKind, theEdition.wetlandSweepKit ? "v27wsk" : "v27");
 }
 
-}  // namespace
+}  // namespace basic_module_selection_test
 }  // namespace gridbay

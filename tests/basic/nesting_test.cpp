@@ -7,7 +7,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace basic_nesting_test {
 
 constexpr float kLand = 10;
 
@@ -193,5 +193,5 @@ TEST_F(Overlap, OnlyWithinOneEnclosingAreaAndBetweenTwoAreas) {
   EXPECT_EQ(CheckOverlap(a, a, messages), 0U);
 }
 
-}  // namespace
+}  // namespace basic_nesting_test
 }  // namespace gridbay

@@ -19,7 +19,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace basic_pages_test {
 
 using test::PageTest;
 
@@ -683,5 +683,5 @@ TEST_F(MassBudgetPage, IsAvailableForTransportWithTwoSchemes) {
   EXPECT_EQ(list().GetCount(), 300);
 }
 
-}  // namespace
+}  // namespace basic_pages_test
 }  // namespace gridbay

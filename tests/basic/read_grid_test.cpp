@@ -11,7 +11,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace basic_read_grid_test {
 
 using test::GridSpec;
 using test::Model;
@@ -199,5 +199,5 @@ TEST_F(ReadGridTest, AColdStartTakesAnyDataTypeAndLeavesThePlace) {
   EXPECT_EQ(area().origin, (GridPoint{8, 9}));
 }
 
-}  // namespace
+}  // namespace basic_read_grid_test
 }  // namespace gridbay

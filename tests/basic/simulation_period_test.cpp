@@ -10,7 +10,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace basic_simulation_period_test {
 
 using test::load;
 using test::messagesOf;
@@ -151,5 +151,5 @@ TEST(SimulationPeriod, RequiresFilesToCoverIt) {
   EXPECT_EQ(errorFor(time), "");
 }
 
-}  // namespace
+}  // namespace basic_simulation_period_test
 }  // namespace gridbay

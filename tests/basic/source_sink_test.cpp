@@ -6,7 +6,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace basic_source_sink_test {
 
 using test::load;
 using test::Model;
@@ -147,5 +147,5 @@ TEST(SourceSink, TheCountAndTheTextThatSpeaksOfAnother) {
                              Severity::dependedUpon}}));
 }
 
-}  // namespace
+}  // namespace basic_source_sink_test
 }  // namespace gridbay

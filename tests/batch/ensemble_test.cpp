@@ -13,7 +13,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace batch_ensemble_test {
 
 namespace fs = std::filesystem;
 using test::textOf;
@@ -348,5 +348,5 @@ TEST(MemberReport, ComesThroughAsItIs) {
   EXPECT_EQ(other.messages, report.messages);
 }
 
-}  // namespace
+}  // namespace batch_ensemble_test
 }  // namespace gridbay

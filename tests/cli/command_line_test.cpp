@@ -17,7 +17,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace cli_command_line_test {
 
 namespace fs = std::filesystem;
 using test::ProgramRun;
@@ -642,5 +642,5 @@ TEST_F(Tool, AdviceIsTakenByItsNumber) {
   EXPECT_THAT(runTool({"validate", setup}).out, HasSubstr("page 26, severity 1: "));
 }
 
-}  // namespace
+}  // namespace cli_command_line_test
 }  // namespace gridbay

@@ -8,7 +8,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace cli_completion_test {
 
 using test::runTool;
 using ::testing::HasSubstr;
@@ -45,7 +45,7 @@ TEST_F(Completion, Commands) {
 }
 
 TEST_F(Completion, OptionsAndTheirValues) {
-  EXPECT_EQ(of({"validate", "--"}), "--help\n--json\n");
+  EXPECT_EQ(of({"validate", "--"}), "--help\n--json\n--advice\n");
   EXPECT_EQ(of({"convert", "raster", "a.asc", "--no"}), "--nodata-as\n");
   EXPECT_EQ(of({"convert", "raster", "--item-type", "mann"}), "Manning number\n");
   EXPECT_EQ(of({"convert", "raster", "--crs", ""}), "");
@@ -105,5 +105,5 @@ TEST_F(Completion, AShellThatIsNone) {
   EXPECT_THAT(run.err, HasSubstr("csh"));
 }
 
-}  // namespace
+}  // namespace cli_completion_test
 }  // namespace gridbay

@@ -19,7 +19,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace cli_convert_test {
 
 namespace fs = std::filesystem;
 using test::ProgramRun;
@@ -604,5 +604,5 @@ TEST_F(ConvertSeries, WhatCannotBeDone) {
   EXPECT_FALSE(fs::exists(out));
 }
 
-}  // namespace
+}  // namespace cli_convert_test
 }  // namespace gridbay

@@ -9,7 +9,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace cli_info_hydrodynamic_test {
 
 using test::runTool;
 using ::testing::EndsWith;
@@ -233,5 +233,5 @@ TEST_F(InfoConditions, WindAndViscosityOfTheFlowModel) {
                                        : "Eddy viscosity   Smagorinsky formula, 0.5 in area 1\n"));
 }
 
-}  // namespace
+}  // namespace cli_info_hydrodynamic_test
 }  // namespace gridbay

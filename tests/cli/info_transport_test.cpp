@@ -9,7 +9,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace cli_info_transport_test {
 
 using test::runTool;
 
@@ -182,5 +182,5 @@ TEST_F(InfoTransport, Ecology) {
               ::testing::HasSubstr("From source 1    OXY 3 g/m3, BOD 60 g/m3, NH4 12 g/m3, NO3 0.5 g/m3\n"));
 }
 
-}  // namespace
+}  // namespace cli_info_transport_test
 }  // namespace gridbay

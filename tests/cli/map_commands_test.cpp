@@ -13,7 +13,7 @@
 #include "tests/support/programs.h"
 
 namespace gridbay {
-namespace {
+namespace cli_map_commands_test {
 
 namespace fs = std::filesystem;
 using test::ProgramRun;
@@ -185,5 +185,5 @@ TEST_F(MapCommands, ExportsThatCanNotBe) {
   EXPECT_TRUE(fs::exists(out));
 }
 
-}  // namespace
+}  // namespace cli_map_commands_test
 }  // namespace gridbay

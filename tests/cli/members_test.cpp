@@ -18,7 +18,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace cli_members_test {
 
 namespace fs = std::filesystem;
 using test::ProgramRun;
@@ -303,5 +303,5 @@ TEST_F(BySlurm, AJobThatSlurmRefusesIsToldAndNothingRuns) {
   EXPECT_THAT(ran.err, HasSubstr("invalid partition specified: nowhere"));
 }
 
-}  // namespace
+}  // namespace cli_members_test
 }  // namespace gridbay

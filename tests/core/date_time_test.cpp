@@ -5,7 +5,7 @@
 #include <random>
 
 namespace gridbay {
-namespace {
+namespace core_date_time_test {
 
 TEST(DateTime, DayNumbers) {
   EXPECT_EQ(DateTime::of({1899, 12, 30, 0, 0, 0}).day, 0);
@@ -58,5 +58,5 @@ TEST(DateTime, Texts) {
   }
 }
 
-}  // namespace
+}  // namespace core_date_time_test
 }  // namespace gridbay

@@ -6,7 +6,7 @@
 #include "core/selections.h"
 
 namespace gridbay {
-namespace {
+namespace core_file_name_test {
 
 UFileName loaded(const std::string& name, const std::string& documentPath) {
   KvsHandle file = kvsCreate();
@@ -102,5 +102,5 @@ TEST(Selection, AreasAndLines) {
   EXPECT_EQ(lineCopy, line);
 }
 
-}  // namespace
+}  // namespace core_file_name_test
 }  // namespace gridbay

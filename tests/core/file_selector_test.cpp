@@ -6,7 +6,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace core_file_selector_test {
 
 using ::testing::HasSubstr;
 
@@ -201,5 +201,5 @@ TEST_F(FileSelector, TheUserChoosesThroughTheHost) {
   EXPECT_EQ(selector.GetSelectedItems(), std::vector<std::uint32_t>{3});
 }
 
-}  // namespace
+}  // namespace core_file_selector_test
 }  // namespace gridbay

@@ -18,7 +18,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace core_hostile_test {
 
 using ::testing::HasSubstr;
 using ::testing::SizeIs;
@@ -214,5 +214,5 @@ TEST(HostileModel, AMillionSectionsThatNothingCountsAreNotTaken) {
   EXPECT_EQ(setup->model().boundary->GetCount(), 2);
 }
 
-}  // namespace
+}  // namespace core_hostile_test
 }  // namespace gridbay

@@ -5,7 +5,7 @@
 #include "core/kdl_writer.h"
 
 namespace gridbay {
-namespace {
+namespace core_kdl_reader_test {
 
 using ::testing::HasSubstr;
 
@@ -142,5 +142,5 @@ TEST(KdlWriter, ATextThatIsNotUtf8IsNotWritten) {
   EXPECT_EQ(text.error(), "a name or text of \"Name\" is not UTF-8");
 }
 
-}  // namespace
+}  // namespace core_kdl_reader_test
 }  // namespace gridbay

@@ -10,7 +10,7 @@
 #include "platform/files/read_file.h"
 
 namespace gridbay {
-namespace {
+namespace core_kdl_suite_test {
 
 namespace fs = std::filesystem;
 
@@ -90,5 +90,5 @@ TEST(KdlSuite, ReadsWhatASetupCanHoldAndRefusesTheRest) {
   EXPECT_GT(refused, 50);
 }
 
-}  // namespace
+}  // namespace core_kdl_suite_test
 }  // namespace gridbay

@@ -7,7 +7,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace core_kvs_base_test {
 
 using test::Model;
 
@@ -85,5 +85,5 @@ TEST(Message, TheSelectorsBufferJoinsItsLines) {
   EXPECT_EQ(buffer.text(), "one\ntwo\nthree");
 }
 
-}  // namespace
+}  // namespace core_kvs_base_test
 }  // namespace gridbay

@@ -12,7 +12,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace core_kvs_test {
 
 using test::TemporaryFolder;
 using test::textOf;
@@ -360,5 +360,5 @@ TEST(Kvs, AWriteThatFailsLeavesTheOldFile) {
   EXPECT_EQ(std::distance(std::filesystem::directory_iterator(folder.path()), {}), 1);
 }
 
-}  // namespace
+}  // namespace core_kvs_test
 }  // namespace gridbay

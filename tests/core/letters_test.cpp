@@ -5,7 +5,7 @@
 #include "setup/setup_doc.h"
 
 namespace gridbay {
-namespace {
+namespace core_letters_test {
 
 TEST(Letters, AreNotCut) {
   const std::string_view text = "aäø€𝄞";  // of 1, 2, 2, 3 and 4 bytes
@@ -42,5 +42,5 @@ TEST(Letters, ATipCutsNoLetter) {
   EXPECT_EQ(CV27SetupDoc::GetToolTipsString(std::string(101, 'x')), std::string(100, 'x') + "\nx");
 }
 
-}  // namespace
+}  // namespace core_letters_test
 }  // namespace gridbay

@@ -6,10 +6,11 @@
 #include "basic/boundary.h"
 #include "basic/mass_budget.h"
 #include "basic/source_sink.h"
+#include "core/table_code.h"
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace core_list_kvs_test {
 
 using test::load;
 using test::savedText;
@@ -175,5 +176,5 @@ TEST_F(ListKvsTest, CopyingRebuildsTheList) {
   EXPECT_EQ(savedText(copy), savedText(list));
 }
 
-}  // namespace
+}  // namespace core_list_kvs_test
 }  // namespace gridbay

@@ -6,7 +6,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace core_message_test {
 
 using Texts = std::vector<std::string>;
 
@@ -56,5 +56,5 @@ TEST(SetupFile, WithoutItsTargetIsNoSetup) {
   EXPECT_EQ(host.texts, Texts{});
 }
 
-}  // namespace
+}  // namespace core_message_test
 }  // namespace gridbay

@@ -9,7 +9,7 @@
 #include <random>
 
 namespace gridbay {
-namespace {
+namespace core_number_text_test {
 
 TEST(NumberText, ShortestTextsAlwaysTellRealsFromIntegers) {
   EXPECT_EQ(numberText(std::int64_t{0}), "0");
@@ -69,5 +69,5 @@ TEST(NumberText, Integers) {
   EXPECT_EQ(int32OfText(""), std::nullopt);
 }
 
-}  // namespace
+}  // namespace core_number_text_test
 }  // namespace gridbay

@@ -6,10 +6,11 @@
 
 #include "core/keyword_rows.h"
 #include "core/list_kvs.h"
+#include "core/table_code.h"
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace core_repeated_items_test {
 
 using test::savedText;
 
@@ -116,5 +117,5 @@ TEST(RepeatedItems, ANumberThatIsNoneIsTheSameAsItself) {
   EXPECT_EQ(gate.TakeChange(other), nullptr);
 }
 
-}  // namespace
+}  // namespace core_repeated_items_test
 }  // namespace gridbay

@@ -19,7 +19,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace core_round_trip_test {
 
 class Chance {
  public:
@@ -215,5 +215,5 @@ TEST(RoundTrip, AnyModelSavedLoadedAndSavedIsTheSameText) {
   }
 }
 
-}  // namespace
+}  // namespace core_round_trip_test
 }  // namespace gridbay

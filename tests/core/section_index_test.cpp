@@ -9,7 +9,7 @@
 #include "core/kvs.h"
 
 namespace gridbay {
-namespace {
+namespace core_section_index_test {
 
 const Node* walk(const Node& section, std::string_view name, std::uint32_t occurrence, bool wantSection) {
   for (const Node* node = section.first(); node != nullptr; node = node->next()) {
@@ -170,5 +170,5 @@ TEST(Values, MoreOfThemThanOnePieceHolds) {
   for (int i = 0; i < kCount; ++i) ASSERT_EQ(kvsGetInt(&values[static_cast<std::size_t>(i)]), i);
 }
 
-}  // namespace
+}  // namespace core_section_index_test
 }  // namespace gridbay

@@ -5,7 +5,7 @@
 #include <limits>
 
 namespace gridbay {
-namespace {
+namespace core_shared_array_test {
 
 using Numbers = SharedArray<double>;
 constexpr std::size_t kBlock = Numbers::kBlock;
@@ -112,5 +112,5 @@ TEST(SharedArray, IsEqualToTheLastBit) {
   EXPECT_EQ(a, b);
 }
 
-}  // namespace
+}  // namespace core_shared_array_test
 }  // namespace gridbay

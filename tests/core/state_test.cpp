@@ -5,10 +5,11 @@
 #include <limits>
 
 #include "core/list_kvs.h"
+#include "core/table_code.h"
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace core_state_test {
 
 class Layer final : public TableKvs<Layer> {
  public:
@@ -385,5 +386,5 @@ TEST(SelectionFileName, BothKindsAreReadAndTheKindIsKept) {
   EXPECT_EQ(holder.selection.fileName.text(), "f.tsb2");
 }
 
-}  // namespace
+}  // namespace core_state_test
 }  // namespace gridbay

@@ -15,7 +15,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace ecology_definition_pages_test {
 
 using ::testing::ElementsAre;
 using ::testing::HasSubstr;
@@ -361,5 +361,5 @@ TEST_F(WqsDefinitionPages, StartingConditions) {
   EXPECT_EQ(root().wqsStartingConditions->at(2).file.text(), *host.chosenFile);
 }
 
-}  // namespace
+}  // namespace ecology_definition_pages_test
 }  // namespace gridbay

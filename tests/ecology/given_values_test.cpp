@@ -18,7 +18,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace ecology_given_values_test {
 
 using test::savedText;
 using ::testing::ElementsAre;
@@ -452,5 +452,5 @@ TEST_F(GivenValues, WhatIsSetByItsPath) {
   EXPECT_FALSE(root.KnowsSection("BIO_RIG_MODULE/CONSTANTS/CONSTANT_1"));
 }
 
-}  // namespace
+}  // namespace ecology_given_values_test
 }  // namespace gridbay

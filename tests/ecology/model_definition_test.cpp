@@ -17,7 +17,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace ecology_model_definition_test {
 
 using test::savedText;
 using ::testing::ElementsAre;
@@ -433,5 +433,5 @@ TEST_F(DefinitionFile, TheProgramComesWithAModel) {
     EXPECT_NE(variable.expression, "") << variable.symbol;
 }
 
-}  // namespace
+}  // namespace ecology_model_definition_test
 }  // namespace gridbay

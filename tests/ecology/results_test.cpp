@@ -8,7 +8,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace ecology_results_test {
 
 using test::load;
 using test::savedText;
@@ -337,5 +337,5 @@ TEST_F(WqsResults, ByPath) {
   EXPECT_FALSE(set("OUTPUT_SPECIFICATION/ADDITIONAL_OPTIONAL_OUTPUT/No_Of_Items", "No_Of_Items 9"));
 }
 
-}  // namespace
+}  // namespace ecology_results_test
 }  // namespace gridbay

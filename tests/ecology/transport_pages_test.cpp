@@ -20,7 +20,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace ecology_transport_pages_test {
 
 class WqsPages : public test::ShapeTest {
  protected:
@@ -297,5 +297,5 @@ TEST_F(WqsResultsPage, TheHotStartNeedsThatOfTheFlow) {
   EXPECT_FALSE(results.generateHotStart);
 }
 
-}  // namespace
+}  // namespace ecology_transport_pages_test
 }  // namespace gridbay

@@ -21,7 +21,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace ecology_transport_test {
 
 using test::load;
 using test::savedText;
@@ -513,5 +513,5 @@ TEST_F(WqsTransport, MassFilesAreChecked) {
       (Texts{"Invalid polygon", "TRange is out of range", "No item selected", "No output file specified"}));
 }
 
-}  // namespace
+}  // namespace ecology_transport_test
 }  // namespace gridbay

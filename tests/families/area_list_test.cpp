@@ -5,7 +5,7 @@
 #include "tests/hydrodynamic/area_fixture.h"
 
 namespace gridbay {
-namespace {
+namespace families_area_list_test {
 
 using test::savedText;
 using ::testing::ElementsAre;
@@ -125,5 +125,5 @@ TEST_F(AreaLists, WithoutTheirSectionNothingIsReadOrTold) {
   EXPECT_THAT(model.host.texts, IsEmpty());
 }
 
-}  // namespace
+}  // namespace families_area_list_test
 }  // namespace gridbay

@@ -7,7 +7,7 @@
 #include "tests/support/pages.h"
 
 namespace gridbay {
-namespace {
+namespace families_points_dialog_test {
 
 using Points = std::vector<double>;
 using ::testing::IsEmpty;
@@ -178,5 +178,5 @@ TEST_F(PointsDialog, ListsOfUnequalLengthHaveThePointsOfTheShorter) {
   EXPECT_EQ(points.j(), Points{1});
 }
 
-}  // namespace
+}  // namespace families_points_dialog_test
 }  // namespace gridbay

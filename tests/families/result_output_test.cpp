@@ -12,7 +12,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace families_result_output_test {
 
 TEST(ResultOutput, ExtentByTheSpans) {
   const USubLine one{3, 3, 1};
@@ -69,5 +69,5 @@ TEST(ResultOutput, TheCaptionOfHotStarts) {
   EXPECT_EQ(hotStartCaption("Generate", true, 1.5), "Generate (size of output: 1.50 MB)");
 }
 
-}  // namespace
+}  // namespace families_result_output_test
 }  // namespace gridbay

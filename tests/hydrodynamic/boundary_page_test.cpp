@@ -8,7 +8,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_boundary_page_test {
 
 using ::testing::HasSubstr;
 
@@ -220,5 +220,5 @@ TEST_F(HdBoundaryPage, AStoredFabType3ShowsAsTheFourthChoice) {
   EXPECT_EQ(object().fabType, 1);
 }
 
-}  // namespace
+}  // namespace hydrodynamic_boundary_page_test
 }  // namespace gridbay

@@ -9,7 +9,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_boundary_test {
 
 using test::Model;
 using test::savedText;
@@ -289,5 +289,5 @@ TEST_F(HdBoundary, FlowDirections) {
   }
 }
 
-}  // namespace
+}  // namespace hydrodynamic_boundary_test
 }  // namespace gridbay

@@ -8,7 +8,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_eddy_viscosity_page_test {
 
 class EddyViscosityPage : public test::ShapeTest {
  protected:
@@ -108,5 +108,5 @@ TEST_F(EddyViscosityPage, EveryGridFollowsTheAreas) {
     EXPECT_EQ(grid(label).GetRowCount(), 4) << label;
 }
 
-}  // namespace
+}  // namespace hydrodynamic_eddy_viscosity_page_test
 }  // namespace gridbay

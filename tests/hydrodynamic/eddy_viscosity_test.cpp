@@ -6,7 +6,7 @@
 #include "tests/hydrodynamic/area_fixture.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_eddy_viscosity_test {
 
 using test::savedText;
 using ::testing::ElementsAre;
@@ -112,5 +112,5 @@ TEST_F(EddyViscosity, TheRequest) {
   EXPECT_FALSE(selector.pluginEnabled());
 }
 
-}  // namespace
+}  // namespace hydrodynamic_eddy_viscosity_test
 }  // namespace gridbay

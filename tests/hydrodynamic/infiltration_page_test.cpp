@@ -7,7 +7,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_infiltration_page_test {
 
 class InfiltrationPage : public test::PageTest {
  protected:
@@ -98,5 +98,5 @@ TEST_F(InfiltrationPage, ATypeThatIsNone) {
   EXPECT_EQ(state(), "x.-.....---");
 }
 
-}  // namespace
+}  // namespace hydrodynamic_infiltration_page_test
 }  // namespace gridbay

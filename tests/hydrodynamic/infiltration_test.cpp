@@ -8,7 +8,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_infiltration_test {
 
 using test::Model;
 using test::savedText;
@@ -220,5 +220,5 @@ TEST_F(InfiltrationRequests, ACapacity) {
   EXPECT_THAT(fault(), HasSubstr("The file has 4 items; at least 5 are expected"));
 }
 
-}  // namespace
+}  // namespace hydrodynamic_infiltration_test
 }  // namespace gridbay

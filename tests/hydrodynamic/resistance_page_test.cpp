@@ -8,7 +8,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_resistance_page_test {
 
 class ResistancePage : public test::ShapeTest {
  protected:
@@ -233,5 +233,5 @@ TEST_F(WavePage, TheFileIsChosenByItsFormat) {
                                   "Time series (*.tsb0;*.tb0)|*.tsb0; *.tb0|All Files (*.*)|*.*||"}));
 }
 
-}  // namespace
+}  // namespace hydrodynamic_resistance_page_test
 }  // namespace gridbay

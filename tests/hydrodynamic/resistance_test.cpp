@@ -8,7 +8,7 @@
 #include "tests/hydrodynamic/area_fixture.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_resistance_test {
 
 using test::savedText;
 using ::testing::ElementsAre;
@@ -374,5 +374,5 @@ TEST_F(HdResistance, PathsLeadToTheWavesWithAndWithoutTheBlank) {
   EXPECT_TRUE(list().AccessPath("RESISTANCE/AREA_2 /PIER/Item_Numbers", look));
 }
 
-}  // namespace
+}  // namespace hydrodynamic_resistance_test
 }  // namespace gridbay

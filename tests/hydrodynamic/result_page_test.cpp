@@ -12,7 +12,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_result_page_test {
 
 using Points = std::vector<double>;
 using Items = std::vector<std::int32_t>;
@@ -383,5 +383,5 @@ TEST_F(ResultPage, InundationStatistics) {
   EXPECT_EQ(usable(), "......");
 }
 
-}  // namespace
+}  // namespace hydrodynamic_result_page_test
 }  // namespace gridbay

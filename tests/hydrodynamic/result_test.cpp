@@ -16,7 +16,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_result_test {
 
 using test::Model;
 using test::savedText;
@@ -673,5 +673,5 @@ TEST(TotalSize, HasWhatTheModuleBesideWrites) {
   EXPECT_DOUBLE_EQ(root.nhdResult->HotStartSizeMB(), 8 * one);
 }
 
-}  // namespace
+}  // namespace hydrodynamic_result_test
 }  // namespace gridbay

@@ -9,7 +9,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_source_sink_page_test {
 
 constexpr std::string_view kSeries = "Time Series (*.tsb0;*.tb0)|*.tsb0; *.tb0|All Files (*.*)|*.*||";
 
@@ -222,5 +222,5 @@ TEST_F(HdSourceSinkPage, ADialogThatIsLeftChangesNothing) {
   EXPECT_EQ(entry(2).dataFile.items, (std::vector<std::uint32_t>{1, 2}));
 }
 
-}  // namespace
+}  // namespace hydrodynamic_source_sink_page_test
 }  // namespace gridbay

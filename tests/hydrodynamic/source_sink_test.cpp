@@ -10,7 +10,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_source_sink_test {
 
 using test::Model;
 using test::savedText;
@@ -425,5 +425,5 @@ TEST_F(HdSourceSink, RainAndEvaporationAreOn) {
   EXPECT_TRUE(flows().HasEvaporation());
 }
 
-}  // namespace
+}  // namespace hydrodynamic_source_sink_test
 }  // namespace gridbay

@@ -8,7 +8,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_surface_elevation_page_test {
 
 class SurfaceElevationPage : public test::ShapeTest {
  protected:
@@ -73,5 +73,5 @@ TEST_F(SurfaceElevationPage, AMapIsChosen) {
   EXPECT_EQ(usableOf(cells(), 2), "x.xx.");
 }
 
-}  // namespace
+}  // namespace hydrodynamic_surface_elevation_page_test
 }  // namespace gridbay

@@ -5,7 +5,7 @@
 #include "tests/hydrodynamic/area_fixture.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_surface_elevation_test {
 
 using test::savedText;
 using ::testing::ElementsAre;
@@ -113,5 +113,5 @@ TEST_F(SurfaceElevation, TheRequest) {
   EXPECT_FALSE(selector.pluginEnabled());
 }
 
-}  // namespace
+}  // namespace hydrodynamic_surface_elevation_test
 }  // namespace gridbay

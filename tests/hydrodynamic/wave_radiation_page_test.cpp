@@ -8,7 +8,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_wave_radiation_page_test {
 
 class WaveRadiationPage : public test::ShapeTest {
  protected:
@@ -53,5 +53,5 @@ TEST_F(WaveRadiationPage, AFileIsChosenAndLookedAt) {
   EXPECT_EQ(host.opened, Labels{*host.chosenFile});
 }
 
-}  // namespace
+}  // namespace hydrodynamic_wave_radiation_page_test
 }  // namespace gridbay

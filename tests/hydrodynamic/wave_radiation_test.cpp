@@ -6,7 +6,7 @@
 #include "tests/hydrodynamic/area_fixture.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_wave_radiation_test {
 
 using test::savedText;
 using ::testing::ElementsAre;
@@ -96,5 +96,5 @@ TEST_F(WaveRadiation, WhatAFileMustBe) {
   EXPECT_TRUE(isValid({.items = items, .axes = innerAxes(), .dataType = 930}));
 }
 
-}  // namespace
+}  // namespace hydrodynamic_wave_radiation_test
 }  // namespace gridbay

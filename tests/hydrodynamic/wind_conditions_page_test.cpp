@@ -7,7 +7,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_wind_conditions_page_test {
 
 class WindPage : public test::PageTest {
  protected:
@@ -100,5 +100,5 @@ TEST_F(WindPage, TheFileHasTheItemsOfItsType) {
   EXPECT_EQ(host.opened, Labels{*host.chosenFile});
 }
 
-}  // namespace
+}  // namespace hydrodynamic_wind_conditions_page_test
 }  // namespace gridbay

@@ -6,7 +6,7 @@
 #include "tests/hydrodynamic/area_fixture.h"
 
 namespace gridbay {
-namespace {
+namespace hydrodynamic_wind_conditions_test {
 
 using test::savedText;
 using ::testing::ElementsAre;
@@ -173,5 +173,5 @@ TEST_F(WindConditions, TheRequests) {
   EXPECT_THAT(requested(3), ElementsAre("Air Pressure", "Wind X-component", "Wind Y-component"));
 }
 
-}  // namespace
+}  // namespace hydrodynamic_wind_conditions_test
 }  // namespace gridbay

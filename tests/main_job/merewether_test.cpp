@@ -12,7 +12,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace main_job_merewether_test {
 
 using test::runTool;
 using ::testing::HasSubstr;
@@ -178,5 +178,5 @@ TEST_F(MerewetherPair, EachNestingRuleBrokenInTurn) {
   EXPECT_EQ(faults(), "0 faults\n");
 }
 
-}  // namespace
+}  // namespace main_job_merewether_test
 }  // namespace gridbay

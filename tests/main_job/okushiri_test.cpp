@@ -11,7 +11,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace main_job_okushiri_test {
 
 using test::runTool;
 using ::testing::HasSubstr;
@@ -57,5 +57,5 @@ TEST(Okushiri, FromRasterAndSeriesToACheckedSetup) {
               1e-6);
 }
 
-}  // namespace
+}  // namespace main_job_okushiri_test
 }  // namespace gridbay

@@ -11,7 +11,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace main_job_whole_setups_test {
 
 std::string pathOf(const std::string& name) {
   return std::string(GRIDBAY_TESTS) + "/main_job/setups/" + name;
@@ -54,5 +54,5 @@ TEST(WholeSetup, OfTheWetlandSweepKit) {
   EXPECT_EQ(savedAgain("flood.v27wsk"), textIn("flood.v27wsk"));
 }
 
-}  // namespace
+}  // namespace main_job_whole_setups_test
 }  // namespace gridbay

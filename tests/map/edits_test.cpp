@@ -16,7 +16,7 @@
 #include "tests/support/programs.h"
 
 namespace gridbay {
-namespace {
+namespace map_edits_test {
 
 using ::testing::AllOf;
 using ::testing::Each;
@@ -336,5 +336,5 @@ TEST_F(MapEdits, LinesOfStructuresPointByPoint) {
   EXPECT_EQ(root().nhdDike->GetCount(), number + 1);
 }
 
-}  // namespace
+}  // namespace map_edits_test
 }  // namespace gridbay

@@ -13,7 +13,7 @@
 #include "tests/map/map_fixture.h"
 
 namespace gridbay {
-namespace {
+namespace map_scene_test {
 
 using ::testing::DoubleNear;
 using ::testing::HasSubstr;
@@ -312,5 +312,5 @@ TEST_F(MapSceneTest, ASetupWithoutAreasHasNothingToPlace) {
   EXPECT_FALSE(map.pick({0, 0}, 5).has_value());
 }
 
-}  // namespace
+}  // namespace map_scene_test
 }  // namespace gridbay

@@ -17,7 +17,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_bed_pages_test {
 
 using ::testing::StartsWith;
 
@@ -406,5 +406,5 @@ TEST_F(BedPages, OfTheWaves) {
   EXPECT_TRUE(control("View...").usable());
 }
 
-}  // namespace
+}  // namespace mud_transport_bed_pages_test
 }  // namespace gridbay

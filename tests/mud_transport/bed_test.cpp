@@ -19,7 +19,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_bed_test {
 
 using test::savedText;
 using Texts = std::vector<std::string>;
@@ -557,5 +557,5 @@ TEST_F(MudBed, TheFileOfWavesIsCheckedWhereItIsUsed) {
   EXPECT_TRUE(faults(waves).empty());
 }
 
-}  // namespace
+}  // namespace mud_transport_bed_test
 }  // namespace gridbay

@@ -12,7 +12,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_layer_values_test {
 
 using test::savedText;
 using Texts = std::vector<std::string>;
@@ -276,5 +276,5 @@ TEST(ConstantSliding, HasConstantsOf64Bits) {
                                    "0.00012345678901\n"));
 }
 
-}  // namespace
+}  // namespace mud_transport_layer_values_test
 }  // namespace gridbay

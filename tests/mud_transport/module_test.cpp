@@ -26,7 +26,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_module_test {
 
 using test::savedText;
 
@@ -181,5 +181,5 @@ TEST_F(MudModule, TheHeadOfSalinityIsThatOfAllLists) {
   EXPECT_EQ(root.nmtSettlingAndDesposition->GetCount(), 3);
 }
 
-}  // namespace
+}  // namespace mud_transport_module_test
 }  // namespace gridbay

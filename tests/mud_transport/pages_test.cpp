@@ -17,7 +17,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_pages_test {
 
 class MudPages : public test::ShapeTest {
  protected:
@@ -292,5 +292,5 @@ TEST_F(MudPages, Results) {
   EXPECT_EQ(results.netSedimentationInMm, 1);
 }
 
-}  // namespace
+}  // namespace mud_transport_pages_test
 }  // namespace gridbay

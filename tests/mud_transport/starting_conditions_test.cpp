@@ -13,7 +13,7 @@
 #include "tests/support/starting_conditions.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_starting_conditions_test {
 
 using test::hotSpec;
 using test::Model;
@@ -229,5 +229,5 @@ TEST_F(MudHotStartInADocument, TheNewTaskIsAStepOfItsOwn) {
   EXPECT_EQ(document.UndoStep()->name, "before");
 }
 
-}  // namespace
+}  // namespace mud_transport_starting_conditions_test
 }  // namespace gridbay

@@ -18,7 +18,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_task_selection_test {
 
 using test::savedText;
 using Texts = std::vector<std::string>;
@@ -298,5 +298,5 @@ TEST_F(MudTask, AloneItHasNoModel) {
   EXPECT_TRUE(mudFractionNames(alone).empty());
 }
 
-}  // namespace
+}  // namespace mud_transport_task_selection_test
 }  // namespace gridbay

@@ -22,7 +22,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_water_test {
 
 using test::savedText;
 using Texts = std::vector<std::string>;
@@ -617,5 +617,5 @@ TEST_F(MudResult, Checks) {
                    "Filename:  is not valid"}));
 }
 
-}  // namespace
+}  // namespace mud_transport_water_test
 }  // namespace gridbay

@@ -10,7 +10,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_expanded_bed_pages_test {
 
 class ExpandedBedPages : public test::ShapeTest {
  protected:
@@ -342,5 +342,5 @@ TEST_F(ExpandedBedPages, Dredging) {
   EXPECT_EQ(grid().GetColCount(), 8 + 5);  // eight weights at most
 }
 
-}  // namespace
+}  // namespace mud_transport_expanded_bed_pages_test
 }  // namespace gridbay

@@ -9,7 +9,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_expanded_bed_test {
 
 using test::savedText;
 using Texts = std::vector<std::string>;
@@ -611,5 +611,5 @@ TEST_F(ExpandedDredging, FewerThanFourItemsAreNone) {
   EXPECT_EQ(types, (std::vector<int>{100183, 100183, 100504, 100505}));
 }
 
-}  // namespace
+}  // namespace mud_transport_expanded_bed_test
 }  // namespace gridbay

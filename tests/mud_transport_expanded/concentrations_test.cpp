@@ -15,7 +15,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_expanded_concentrations_test {
 
 using test::savedText;
 using ::testing::ElementsAre;
@@ -139,5 +139,5 @@ TEST_F(ExpandedConcentrations, Dispersion) {
             "to the number of sub domaines"});
 }
 
-}  // namespace
+}  // namespace mud_transport_expanded_concentrations_test
 }  // namespace gridbay

@@ -10,7 +10,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_expanded_initial_conditions_test {
 
 using test::savedText;
 using ::testing::IsEmpty;
@@ -221,5 +221,5 @@ TEST_F(ExpandedInitial, ValuesByTheirPaths) {
   EXPECT_FALSE(initial.AccessPath("INITIAL_CONCENTRATIONS/SEDIMENT_FRACTION_3/AREA_1/Constant_Value", look));
 }
 
-}  // namespace
+}  // namespace mud_transport_expanded_initial_conditions_test
 }  // namespace gridbay

@@ -23,7 +23,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_expanded_pages_test {
 
 class ExpandedMudPages : public test::ShapeTest {
  protected:
@@ -366,5 +366,5 @@ TEST_F(ExpandedMudPages, AnotherGridResetsTheDispersionUntilThatIsTheUsers) {
   EXPECT_EQ(dispersion.constantX, 5);
 }
 
-}  // namespace
+}  // namespace mud_transport_expanded_pages_test
 }  // namespace gridbay

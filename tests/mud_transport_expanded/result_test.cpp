@@ -14,7 +14,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_expanded_result_test {
 
 using test::savedText;
 using ::testing::ElementsAre;
@@ -328,5 +328,5 @@ TEST_F(ExpandedResult, AMassFileIsCheckedAndHasAnItem) {
             "specified"});
 }
 
-}  // namespace
+}  // namespace mud_transport_expanded_result_test
 }  // namespace gridbay

@@ -9,7 +9,7 @@
 #include "tests/support/starting_conditions.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_expanded_starting_conditions_test {
 
 using test::hotSpec;
 using test::savedText;
@@ -165,5 +165,5 @@ TEST_F(ExpandedStart, FilesOfOtherAreasBringNothing) {
   EXPECT_EQ(faults(), (Texts{notValid("none.tsb2"), notValid("")}));
 }
 
-}  // namespace
+}  // namespace mud_transport_expanded_starting_conditions_test
 }  // namespace gridbay

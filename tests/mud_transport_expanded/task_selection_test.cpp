@@ -15,7 +15,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_expanded_task_selection_test {
 
 using test::savedText;
 using ::testing::ElementsAre;
@@ -208,5 +208,5 @@ TEST_F(ExpandedCounts, ACopyTakesTheCountsAlone) {
   EXPECT_THAT(boundary(), SizeIs(1));
 }
 
-}  // namespace
+}  // namespace mud_transport_expanded_task_selection_test
 }  // namespace gridbay

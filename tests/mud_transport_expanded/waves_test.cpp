@@ -12,7 +12,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace mud_transport_expanded_waves_test {
 
 using test::savedText;
 using ::testing::IsEmpty;
@@ -244,5 +244,5 @@ TEST_F(ExpandedWaves, MapsHaveHeightDirectionAndPeriodOfArea1) {
   EXPECT_EQ(faultsWith({height, direction, period}, 11), invalid);
 }
 
-}  // namespace
+}  // namespace mud_transport_expanded_waves_test
 }  // namespace gridbay

@@ -5,7 +5,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace pages_banded_grid_test {
 
 struct Value {
   std::int32_t format = 0;  // 0 constant, 1 map
@@ -97,5 +97,5 @@ TEST_F(BandedPage, BandsGrowAndShrink) {
   EXPECT_EQ(store(1, 1, "Constant"), 0);
 }
 
-}  // namespace
+}  // namespace pages_banded_grid_test
 }  // namespace gridbay

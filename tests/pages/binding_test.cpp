@@ -11,7 +11,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace pages_binding_test {
 
 struct Thing {
   std::int32_t count = 3;
@@ -291,5 +291,5 @@ TEST_F(Bound, LeavingAPageIsAnEvent) {
   EXPECT_EQ(own.left, 1);
 }
 
-}  // namespace
+}  // namespace pages_binding_test
 }  // namespace gridbay

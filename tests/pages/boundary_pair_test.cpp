@@ -6,7 +6,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace pages_boundary_pair_test {
 
 struct Boundary {
   std::int32_t format = 0;
@@ -98,5 +98,5 @@ TEST_F(BoundaryPair, AFormatAboveDecidesBelow) {
   EXPECT_EQ(host.filters, Labels{"Profile (*.tsb1)|*.tsb1||"});
 }
 
-}  // namespace
+}  // namespace pages_boundary_pair_test
 }  // namespace gridbay

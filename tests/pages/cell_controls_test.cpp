@@ -14,7 +14,7 @@
 #include "tests/support/pages.h"
 
 namespace gridbay {
-namespace {
+namespace pages_cell_controls_test {
 
 using test::CellsOfAllKinds;
 using test::OnePage;
@@ -217,5 +217,5 @@ TEST_F(ResultSubset, WhatIsOutOfTheLimitsIsTold) {
   EXPECT_EQ(dialog.range(), range);
 }
 
-}  // namespace
+}  // namespace pages_cell_controls_test
 }  // namespace gridbay

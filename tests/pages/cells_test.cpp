@@ -5,7 +5,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace pages_cells_test {
 
 struct Dike {
   std::string name = "Dike 1";
@@ -98,5 +98,5 @@ TEST_F(CellKinds, CellsOfNoObjectAreBlankAndTakeNothing) {
   for (int col = 1; col <= 7; ++col) EXPECT_EQ(store(1, col, "1"), 0) << col;
 }
 
-}  // namespace
+}  // namespace pages_cells_test
 }  // namespace gridbay

@@ -7,7 +7,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace pages_dialog_test {
 
 using Points = std::vector<GridPoint>;
 
@@ -87,5 +87,5 @@ TEST_F(PointDialog, WhatIsWrongIsToldOnOK) {
   EXPECT_EQ(points.size(), 1U);
 }
 
-}  // namespace
+}  // namespace pages_dialog_test
 }  // namespace gridbay

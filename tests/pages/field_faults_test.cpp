@@ -7,7 +7,7 @@
 #include "tests/support/pages.h"
 
 namespace gridbay {
-namespace {
+namespace pages_field_faults_test {
 
 class FieldFault : public test::PageTest {
  protected:
@@ -87,5 +87,5 @@ TEST_F(FieldFault, ACellIsStoredAllTheSame) {
   EXPECT_EQ(text("Number of boundaries"), "2");
 }
 
-}  // namespace
+}  // namespace pages_field_faults_test
 }  // namespace gridbay

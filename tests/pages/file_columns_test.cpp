@@ -7,7 +7,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace pages_file_columns_test {
 
 struct Decay {
   std::int32_t format = 0;
@@ -116,5 +116,5 @@ TEST_F(FileRows, AGridThatDoesNotApplyIsGreyAsAWhole) {
   EXPECT_EQ(usableOf(cells, 1), "xx....");
 }
 
-}  // namespace
+}  // namespace pages_file_columns_test
 }  // namespace gridbay

@@ -5,7 +5,7 @@
 #include "tests/support/pages.h"
 
 namespace gridbay {
-namespace {
+namespace pages_form_view_test {
 
 class RadioPage final : public CV27SetupFormView {
  public:
@@ -40,5 +40,5 @@ TEST(FormView, ARadioGroupShowsNothingUntilThePageIsFilled) {
   EXPECT_EQ(page.form().find("Choice")->index, 1);
 }
 
-}  // namespace
+}  // namespace pages_form_view_test
 }  // namespace gridbay

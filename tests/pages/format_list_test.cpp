@@ -5,7 +5,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace pages_format_list_test {
 
 struct Rain {
   std::int32_t format = -1;
@@ -69,5 +69,5 @@ TEST_F(FormatList, TheFormatDecides) {
   EXPECT_EQ(textIn(constants, 2, 1), "5.000000");
 }
 
-}  // namespace
+}  // namespace pages_format_list_test
 }  // namespace gridbay

@@ -6,7 +6,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace pages_layer_family_test {
 
 struct Layer {
   std::int32_t format = 0;
@@ -92,5 +92,5 @@ TEST_F(LayerFamily, ALayerThatGoesTakesItsMapsWithIt) {
   EXPECT_EQ(maps.StoreStyleRowCol(1, 1, "m.tsb2"), 0);
 }
 
-}  // namespace
+}  // namespace pages_layer_family_test
 }  // namespace gridbay

@@ -6,7 +6,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace pages_master_detail_test {
 
 struct Point3 {
   double x = 0;
@@ -101,5 +101,5 @@ TEST_F(MasterDetail, AnEditAboveShowsAColumnBelow) {
   EXPECT_EQ(points.GetColWidth(2), 80);
 }
 
-}  // namespace
+}  // namespace pages_master_detail_test
 }  // namespace gridbay

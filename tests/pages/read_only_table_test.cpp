@@ -5,7 +5,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace pages_read_only_table_test {
 
 class StateGrid final : public ColumnGrid {
   void LayOut() override {
@@ -36,5 +36,5 @@ TEST_F(ReadOnlyTable, ShowsAndTakesNothing) {
   EXPECT_FALSE(document.IsModified());
 }
 
-}  // namespace
+}  // namespace pages_read_only_table_test
 }  // namespace gridbay

@@ -6,7 +6,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace pages_results_table_test {
 
 struct Output {
   std::int32_t type = 2;
@@ -104,5 +104,5 @@ TEST_F(ResultsTable, SeveralItemsAreTheSumOfTheirBits) {
   EXPECT_EQ(cells.outputs[0].items, 5);
 }
 
-}  // namespace
+}  // namespace pages_results_table_test
 }  // namespace gridbay

@@ -3,7 +3,7 @@
 #include <gtest/gtest.h>
 
 namespace gridbay {
-namespace {
+namespace pages_scan_test {
 
 TEST(Scan, AllWhiteSpaceIsTrimmed) {
   EXPECT_EQ(trimmed(" \t\r\n\f\va b\v\f\n\r\t "), "a b");
@@ -49,5 +49,5 @@ TEST(Scan, WhatIsReadIsSetAlsoWhereTheTextEndsEarly) {
   EXPECT_EQ(b, 3.0F);
 }
 
-}  // namespace
+}  // namespace pages_scan_test
 }  // namespace gridbay

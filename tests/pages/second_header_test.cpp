@@ -5,7 +5,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace pages_second_header_test {
 
 struct Weir {
   std::string name = "W";
@@ -70,5 +70,5 @@ TEST_F(SecondHeader, ACountOfNoneLeavesTheHeaders) {
   EXPECT_EQ(store(2, 1, "x"), 0);
 }
 
-}  // namespace
+}  // namespace pages_second_header_test
 }  // namespace gridbay

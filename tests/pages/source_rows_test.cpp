@@ -6,7 +6,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace pages_source_rows_test {
 
 struct Source {
   std::int32_t format = 0;
@@ -75,5 +75,5 @@ TEST_F(SourceRows, ColumnsFollowTheComponents) {
   EXPECT_EQ(headers(), (Labels{"Source Sink", "Given as", "File Name", "", ""}));
 }
 
-}  // namespace
+}  // namespace pages_source_rows_test
 }  // namespace gridbay

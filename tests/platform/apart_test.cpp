@@ -16,7 +16,7 @@
 #include "platform/large_memory.h"
 
 namespace gridbay {
-namespace {
+namespace platform_apart_test {
 
 TEST(Apart, TellsWhetherTheCheckHolds) {
   EXPECT_TRUE(holdsApart([] { return true; }, 10));
@@ -100,5 +100,5 @@ TEST(Apart, NothingThatTheCheckChangesOrSaysIsLeft) {
   EXPECT_EQ(number, 1);
 }
 
-}  // namespace
+}  // namespace platform_apart_test
 }  // namespace gridbay

@@ -7,7 +7,7 @@
 #include "platform/cartography/grid_mapping.h"
 
 namespace gridbay {
-namespace {
+namespace platform_cartography_test {
 
 using ::testing::HasSubstr;
 using ::testing::StartsWith;
@@ -120,5 +120,5 @@ TEST(Cartography, OriginAndRotation) {
   EXPECT_NEAR(east, 500000, 1e-3);
 }
 
-}  // namespace
+}  // namespace platform_cartography_test
 }  // namespace gridbay

@@ -18,7 +18,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace platform_crash_safety_test {
 
 namespace fs = std::filesystem;
 using test::Fault;
@@ -146,5 +146,5 @@ TEST(KilledAtRandom, AThousandTimes) {
               kTimes - older);
 }
 
-}  // namespace
+}  // namespace platform_crash_safety_test
 }  // namespace gridbay

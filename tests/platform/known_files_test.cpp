@@ -12,7 +12,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace platform_known_files_test {
 
 class Known : public ::testing::Test {
  protected:
@@ -119,5 +119,5 @@ TEST_F(Known, ADataFileIsReadAnewOnceItIsWrittenTo) {
   }
 }
 
-}  // namespace
+}  // namespace platform_known_files_test
 }  // namespace gridbay

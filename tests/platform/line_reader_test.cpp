@@ -8,7 +8,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace platform_line_reader_test {
 
 using ::testing::HasSubstr;
 using Lines = std::vector<std::string>;
@@ -89,5 +89,5 @@ TEST_F(LineReaderTest, OnlyFilesAreOpened) {
   EXPECT_THAT(LineReader::open(folder.file("pipe")).error(), HasSubstr("it is not a file"));
 }
 
-}  // namespace
+}  // namespace platform_line_reader_test
 }  // namespace gridbay

@@ -5,7 +5,7 @@
 #include <filesystem>
 
 namespace gridbay {
-namespace {
+namespace platform_paths_test {
 
 TEST(Paths, Absolute) {
   EXPECT_EQ(absolutePath("../a/b.x", "/c/d"), "/c/a/b.x");
@@ -28,5 +28,5 @@ TEST(Paths, ReadableFiles) {
   EXPECT_FALSE(isReadableFile("/etc/none"));
 }
 
-}  // namespace
+}  // namespace platform_paths_test
 }  // namespace gridbay

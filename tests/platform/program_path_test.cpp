@@ -11,7 +11,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace platform_program_path_test {
 
 namespace fs = std::filesystem;
 using ::testing::ElementsAre;
@@ -85,5 +85,5 @@ TEST_F(Installed, APlugInLooksBelowItsOwnPrefix) {
   ::dlclose(library);
 }
 
-}  // namespace
+}  // namespace platform_program_path_test
 }  // namespace gridbay

@@ -15,7 +15,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace platform_save_file_test {
 
 namespace fs = std::filesystem;
 using test::SmallDisk;
@@ -151,5 +151,5 @@ TEST(SaveFile, AReadOnlyFolderAndAReadOnlyFile) {
   EXPECT_EQ(textOf(path), "old");
 }
 
-}  // namespace
+}  // namespace platform_save_file_test
 }  // namespace gridbay

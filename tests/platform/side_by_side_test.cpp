@@ -9,7 +9,7 @@
 #include <stdexcept>
 
 namespace gridbay {
-namespace {
+namespace platform_side_by_side_test {
 
 using Results = std::map<std::size_t, std::optional<std::string>>;
 
@@ -97,5 +97,5 @@ TEST(SideBySide, ThereIsACoreAtLeast) {
   EXPECT_GE(coreCount(), 1U);
 }
 
-}  // namespace
+}  // namespace platform_side_by_side_test
 }  // namespace gridbay

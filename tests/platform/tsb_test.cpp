@@ -18,7 +18,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace platform_tsb_test {
 
 using ::testing::AllOf;
 using ::testing::AnyOf;
@@ -536,5 +536,5 @@ TEST_F(Tsb, OtherProgramsPlaceAGridThatIsTurned) {
   EXPECT_NEAR(transform[4], -10, 1e-6);
 }
 
-}  // namespace
+}  // namespace platform_tsb_test
 }  // namespace gridbay

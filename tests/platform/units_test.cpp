@@ -10,7 +10,7 @@
 #include "platform/units/edit_style.h"
 
 namespace gridbay {
-namespace {
+namespace platform_units_test {
 
 TEST(Units, EveryQuantityHasUnitsThatConvertThereAndBack) {
   EXPECT_TRUE(std::ranges::is_sorted(qunItems(), {}, &QunItem::code));
@@ -94,5 +94,5 @@ TEST(EditStyle, ShowsTheUnitThatTheUserHasChosen) {
   EXPECT_EQ(CVdEditStyle(choices).SetQunUnitBaseGroup(1).GetQunToolTipText(), "");
 }
 
-}  // namespace
+}  // namespace platform_units_test
 }  // namespace gridbay

@@ -17,7 +17,7 @@ std::ostream& operator<<(std::ostream& out, const SetupSummary::Line& line) {
   return out << line.page << " " << line.subject << ": " << line.text << (line.isKnown ? "" : " (not known)");
 }
 
-namespace {
+namespace plugin_editor_test {
 
 using ::testing::HasSubstr;
 using Line = SetupSummary::Line;
@@ -287,5 +287,5 @@ TEST(LaunchRecords, ATextThatIsTooLongIsCutToFit) {
   EXPECT_STREQ(launch.GetEngine(), "");
 }
 
-}  // namespace
+}  // namespace plugin_editor_test
 }  // namespace gridbay

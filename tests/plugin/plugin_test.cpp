@@ -12,7 +12,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace plugin_plugin_test {
 
 using ::testing::HasSubstr;
 
@@ -186,5 +186,5 @@ TEST(LaunchRecords, Accessors) {
   EXPECT_FALSE(CVdFileMonitor("x").IsActive());
 }
 
-}  // namespace
+}  // namespace plugin_plugin_test
 }  // namespace gridbay

@@ -23,7 +23,7 @@
 #include "tests/support/grids.h"
 
 namespace gridbay {
-namespace {
+namespace scripting_flood_model_test {
 
 using scripting::DateTime;
 using scripting::Flooding_V27FlowModel;
@@ -1000,5 +1000,5 @@ TEST_F(FloodModelTest, OneObjectInTwoThreads) {
   EXPECT_EQ(found, (std::array{0, kTimes, kTimes}));
 }
 
-}  // namespace
+}  // namespace scripting_flood_model_test
 }  // namespace gridbay

@@ -12,7 +12,7 @@
 #include "tests/support/grids.h"
 
 namespace gridbay {
-namespace {
+namespace scripting_urban_flooding_test {
 
 using scripting::DateTime;
 using scripting::OutputPosition;
@@ -212,5 +212,5 @@ TEST_F(UrbanFlooding, TheReaderIgnoresItsSecondArgument) {
   }
 }
 
-}  // namespace
+}  // namespace scripting_urban_flooding_test
 }  // namespace gridbay

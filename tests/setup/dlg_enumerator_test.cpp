@@ -7,7 +7,7 @@
 #include "core/edition.h"
 
 namespace gridbay {
-namespace {
+namespace setup_dlg_enumerator_test {
 
 struct Asked {
   std::string pageClass;
@@ -85,5 +85,5 @@ TEST(DlgEnumerator, HelpTopicNumbers) {
   EXPECT_EQ(enumerator.GetHelpTopicNumber(1), 0);
 }
 
-}  // namespace
+}  // namespace setup_dlg_enumerator_test
 }  // namespace gridbay

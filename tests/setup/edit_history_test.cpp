@@ -13,7 +13,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace setup_edit_history_test {
 
 class Undo : public test::PageTest {
  protected:
@@ -203,5 +203,5 @@ TEST_F(Undo, ARecoveredDocumentStartsUnsavedWithItsOwnPath) {
   EXPECT_THAT(nowhere.error(), ::testing::HasSubstr("no/1.setup"));
 }
 
-}  // namespace
+}  // namespace setup_edit_history_test
 }  // namespace gridbay

@@ -24,7 +24,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace setup_global_kvs_test {
 
 using test::Model;
 using test::savedText;
@@ -1114,5 +1114,5 @@ TEST(SetupFile, TellsWhatASaveLeavesOutUnawares) {
             (std::vector<std::string>{"NESTED_MODEL_GLOBALS/FUTURE", "HYDRODYNAMIC_MODULE/STRANGE"}));
 }
 
-}  // namespace
+}  // namespace setup_global_kvs_test
 }  // namespace gridbay

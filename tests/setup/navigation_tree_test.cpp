@@ -25,7 +25,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace setup_navigation_tree_test {
 
 class NavigationTree : public ::testing::Test {
  protected:
@@ -382,5 +382,5 @@ TEST_F(NavigationTree, TheTaskOfMudHasItsPages) {
   }
 }
 
-}  // namespace
+}  // namespace setup_navigation_tree_test
 }  // namespace gridbay

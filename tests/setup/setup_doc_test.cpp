@@ -12,7 +12,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace setup_setup_doc_test {
 
 using ::testing::HasSubstr;
 
@@ -168,5 +168,5 @@ TEST_F(SetupDoc, ReadingGridsIsNoEdit) {
   EXPECT_EQ(document.UndoStep(), nullptr);
 }
 
-}  // namespace
+}  // namespace setup_setup_doc_test
 }  // namespace gridbay

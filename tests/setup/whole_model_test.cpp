@@ -23,7 +23,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace setup_whole_model_test {
 
 using Texts = std::vector<std::string>;
 
@@ -429,5 +429,5 @@ TEST_P(WholeModel, EveryEditIsTakenBackAndDoneAgain) {
   EXPECT_THAT(host.texts, ::testing::Each(::testing::Not(::testing::HasSubstr("could not be made"))));
 }
 
-}  // namespace
+}  // namespace setup_whole_model_test
 }  // namespace gridbay

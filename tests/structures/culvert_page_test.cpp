@@ -6,7 +6,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace structures_culvert_page_test {
 
 using ::testing::ElementsAre;
 
@@ -148,5 +148,5 @@ TEST_F(CulvertPage, EachColumnOfTheSectionIsStored) {
   EXPECT_THAT(culvert().width, ElementsAre(0));
 }
 
-}  // namespace
+}  // namespace structures_culvert_page_test
 }  // namespace gridbay

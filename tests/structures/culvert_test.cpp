@@ -6,7 +6,7 @@
 #include "tests/support/model.h"
 
 namespace gridbay {
-namespace {
+namespace structures_culvert_test {
 
 using test::Model;
 using test::savedText;
@@ -177,5 +177,5 @@ TEST_F(Culverts, StandBesideTheWeirsInBothEditions) {
   EXPECT_LT(text.find("STRUCTURE_MODULE {"), weir);
 }
 
-}  // namespace
+}  // namespace structures_culvert_test
 }  // namespace gridbay

@@ -9,7 +9,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace structures_dialogs_test {
 
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
@@ -145,7 +145,7 @@ TEST_F(StructureDialogs, AreInTheUsersUnit) {
 }
 
 TEST_F(StructureDialogs, TheParametersOfWeirFormula3) {
-  CNhdWeirObjectKvs weir;
+  CNhdWeirObjectKvs weir(nullptr);
   host.fillForm = [](Form& form) {
     Labels labels;
     Labels texts;
@@ -159,9 +159,9 @@ TEST_F(StructureDialogs, TheParametersOfWeirFormula3) {
     EXPECT_EQ(texts[14], "C0 = a(h1/W)^p + b");
     EXPECT_EQ(texts[15], "C = C0 ( Al (h2/h1)^q + Be)");
     EXPECT_EQ(texts[16], "C = C0 ( Ga (h2/h1)^r + De)");
-    Control& width = *form.find("Width");
-    width.text = "12.5";
-    form.act(width);
+    Control& edited = *form.find("Width");
+    edited.text = "12.5";
+    form.act(edited);
     return true;
   };
   WeirFormula3Dialog dialog(document, weir.formula3);
@@ -172,5 +172,5 @@ TEST_F(StructureDialogs, TheParametersOfWeirFormula3) {
   EXPECT_THAT(weir.formula3, ElementsAre(12.5, 0, 0, 0.6, 1.02, 1.37, 1, 0.03, 1.018, 1, 0, 2.6, 1, 0.7));
 }
 
-}  // namespace
+}  // namespace structures_dialogs_test
 }  // namespace gridbay

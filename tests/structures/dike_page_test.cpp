@@ -9,7 +9,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace structures_dike_page_test {
 
 using ::testing::HasSubstr;
 
@@ -447,5 +447,5 @@ TEST_F(DikeImport, MoreThanCanBeTyped) {
   EXPECT_EQ(dike(2).points.size(), 1400U);
 }
 
-}  // namespace
+}  // namespace structures_dike_page_test
 }  // namespace gridbay

@@ -11,7 +11,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace structures_dike_test {
 
 using test::load;
 using test::Model;
@@ -357,5 +357,5 @@ TEST_F(Dikes, AnEditKeepsOneBlockOfPoints) {
   EXPECT_EQ(list.GetItem(3)->name, "Dike 3");
 }
 
-}  // namespace
+}  // namespace structures_dike_test
 }  // namespace gridbay

@@ -7,7 +7,7 @@
 #include "tests/support/shapes.h"
 
 namespace gridbay {
-namespace {
+namespace structures_weir_page_test {
 
 using ::testing::ElementsAre;
 using ::testing::HasSubstr;
@@ -248,5 +248,5 @@ TEST_F(WeirPage, EditsHaveTheNameOfTheirColumn) {
   EXPECT_EQ(document.UndoStep()->name, "Name, row 2");
 }
 
-}  // namespace
+}  // namespace structures_weir_page_test
 }  // namespace gridbay

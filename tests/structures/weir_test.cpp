@@ -9,7 +9,7 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
-namespace {
+namespace structures_weir_test {
 
 using test::Model;
 using test::savedText;
@@ -311,5 +311,5 @@ TEST_F(Weirs, PathsReachWhatAWeirHolds) {
   EXPECT_EQ(text("Geometry/Attributes"), "Attributes 0 0.0\n");
 }
 
-}  // namespace
+}  // namespace structures_weir_test
 }  // namespace gridbay

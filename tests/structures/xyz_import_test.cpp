@@ -22,7 +22,7 @@ static void PrintTo(const DikePoint& point, std::ostream* out) {
   *out << point.x << ' ' << point.y << ' ' << point.z;
 }
 
-namespace {
+namespace structures_xyz_import_test {
 
 using Points = std::vector<DikePoint>;
 
@@ -274,5 +274,5 @@ TEST_F(XyzPanel, AnotherUnitIsChosen) {
   EXPECT_EQ(dialog.DoModal(host), 0);
 }
 
-}  // namespace
+}  // namespace structures_xyz_import_test
 }  // namespace gridbay
