@@ -14,7 +14,8 @@ namespace {
 
 constexpr std::size_t kSeries = 0;  // in the place of an item: all of them
 constexpr std::size_t kMostBlocks = 1'000'000;
-constexpr std::size_t kPiece = 1 << 18;  // values that are read at a time
+constexpr std::size_t kMostAlongAxis = 10'000'000;  // points of a grid, whose border is kept
+constexpr std::size_t kPiece = 1 << 18;             // values that are read at a time
 constexpr std::size_t kMostSeriesValues = 16'000'000;
 constexpr std::size_t kMostProjections = 64;
 
@@ -118,6 +119,7 @@ void DataFileFacts::Entry::startGrid() {
   grid->dx = x.spacing;
   grid->dy = y.spacing;
   if (x.points < 2 || y.points < 2 || !(x.spacing > 0) || !(y.spacing > 0)) return fail();
+  if (x.points > kMostAlongAxis || y.points > kMostAlongAxis) return fail();
   grid->noJ = static_cast<int>(x.points);
   grid->noK = static_cast<int>(y.points);
   const auto blocks = [&](std::size_t points) {

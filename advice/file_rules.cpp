@@ -267,8 +267,9 @@ constexpr NamePage kNamePages[] = {
 };
 
 AdvicePlace placeOfName(CGlobalKvs& model, const std::string& path) {
-  const auto* row =
-      std::ranges::find_if(kNamePages, [&](const NamePage& each) { return path.starts_with(each.path); });
+  const auto* row = std::ranges::find_if(kNamePages, [&](const NamePage& each) {
+    return path.size() > each.path.size() && path.starts_with(each.path) && path[each.path.size()] == '/';
+  });
   if (row == std::end(kNamePages)) return {PageId::none, {}, path, {}};
   AdvicePlace place{row->page, {}, path, {}};
   const std::string rest = path.substr(row->path.size() + 1);
@@ -290,6 +291,7 @@ bool isFileName(const Node& keyword) {
 struct NamedFile {
   std::string path;
   std::vector<std::string> further;
+  bool isResult = false;
 };
 
 void adviseName(AdviceContext& context, const std::string& name, const NamedFile& named, std::string doubt,
@@ -352,8 +354,9 @@ void adviseFileNames(AdviceContext& context) {
   std::map<std::string, NamedFile> outside;
   std::map<std::string, NamedFile> absolute;
   const auto note = [](std::map<std::string, NamedFile>& files, const std::string& name,
-                       const std::string& path) {
+                       const std::string& path, const Node& keyword) {
     NamedFile& file = files[name];
+    file.isResult |= keyword.values()[0].kind() == ValueKind::resultFileName;
     if (file.path.empty()) {
       file.path = path;
     } else {
@@ -364,7 +367,7 @@ void adviseFileNames(AdviceContext& context) {
     eachKeyword(*written, [&](const std::string& path, const Node& keyword) {
       if (!isFileName(keyword)) return;
       const std::string name(keyword.values()[0].text());
-      if (name.starts_with('/') || name.starts_with("../")) note(outside, name, path);
+      if (name.starts_with('/') || name.starts_with("../")) note(outside, name, path, keyword);
     });
   }
   if (context.source != nullptr) {
@@ -372,13 +375,13 @@ void adviseFileNames(AdviceContext& context) {
       if (!isFileName(keyword) || isOption(path)) return;
       const std::string name(keyword.values()[0].text());
       if (name.starts_with('/') && !outside.contains(name) && !pathOnFile(name, folder).starts_with("../"))
-        note(absolute, name, path);
+        note(absolute, name, path, keyword);
     });
   }
   for (const auto& [name, named] : outside) {
-    // One of that name beside the setup is likely the one that is meant.
+    // One of that name beside the setup is likely the one that is meant. A result would be written over it.
     const std::string plain = std::filesystem::path(name).filename().string();
-    const bool isBeside = !plain.empty() && isReadableFile(absolutePath(plain, folder));
+    const bool isBeside = !named.isResult && !plain.empty() && isReadableFile(absolutePath(plain, folder));
     adviseName(context, name, named,
                name.starts_with('/') ? "is named absolutely, and lies outside of the setup's folder."
                                      : "lies outside of the setup's folder.",

@@ -36,7 +36,7 @@ Result<std::vector<MemberReport>> checkSetups(const std::vector<std::string>& fi
     reports.push_back(std::move(report));
   }
   // The look at the first one's data files serves the others that have the same.
-  if (!files.empty() && files.size() > 1) static_cast<void>(checkFile(files.front()));
+  if (files.size() > 1) static_cast<void>(checkFile(files.front()));
   std::size_t done = 0;
   const Outcome ran = SideBySide{.count = files.size(),
                                  .work = [&](std::size_t i) { return packed(checkFile(files[i])); },

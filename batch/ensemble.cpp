@@ -260,7 +260,9 @@ Result<EnsembleResult> makeEnsemble(const Ensemble& ensemble, MessageHost& host,
                                        if (text)
                                          unpack(*text, report);
                                        else
-                                         report.error = "the check ended by a crash";
+                                         report.error = std::filesystem::exists(ensemble.fileOf(members[i]))
+                                                            ? "the check ended by a crash"
+                                                            : "it was not made: its process ended by a crash";
                                        if (text && !report.error.empty()) {
                                          if (error.empty()) error = report.error;
                                          return;

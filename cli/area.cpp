@@ -36,6 +36,16 @@ std::string placeText(const CBathymetryObjectKvs& area, int number) {
   return fmt::format("Area {} lies in area {} from {}", number, area.enclosingArea, pointText(area.origin));
 }
 
+// Whether an area lies in another one, or in one that does.
+bool liesWithin(CBathymetryKvs& areas, int number, int other) {
+  // No further up than there are areas: a faulty setup may have them in a circle.
+  for (int up = 0; up < areas.GetCount() && number > 1 && number <= areas.GetCount(); ++up) {
+    number = areas.at(number).enclosingArea;
+    if (number == other) return true;
+  }
+  return false;
+}
+
 // Gives the area its position, and says how it goes with the coordinates of the grids.
 Outcome place(SetupMap& map, CGlobalKvs& root, int number, const std::optional<GridPoint>& at, bool snap,
               const Console& console) {
@@ -116,6 +126,9 @@ int move(const Options& options, const Console& console) {
   if (options.enclosing &&
       (*options.enclosing < 1 || *options.enclosing > count || *options.enclosing == options.number))
     return console.fail(fmt::format("Area {} can't lie in area {}", options.number, *options.enclosing));
+  if (options.enclosing && liesWithin(*root.bathymetry, *options.enclosing, options.number))
+    return console.fail(
+        fmt::format("Area {} can't lie in area {}, which lies in it", options.number, *options.enclosing));
   if (options.enclosing) root.bathymetry->at(options.number).enclosingArea = *options.enclosing;
   SetupMap map;
   // A position that is not given is the one that the setup has.
@@ -140,6 +153,13 @@ int remove(const Options& options, const Console& console) {
         fmt::format("Area {} can't be removed before those behind it: all that is set up for them stands by "
                     "their numbers",
                     options.number));
+  std::string inside;
+  for (int other = 1; other <= count; ++other) {
+    if (other != options.number && root.bathymetry->at(other).enclosingArea == options.number)
+      inside += fmt::format("{}{}", inside.empty() ? "" : ", ", other);
+  }
+  if (!inside.empty())
+    return console.fail(fmt::format("Area {} can't be removed: it encloses area {}", options.number, inside));
   SetupMap map;
   for (const MapFeature& feature : map.scene(root).features) {
     if (feature.area == options.number)

@@ -68,6 +68,8 @@ int spawn(const ProcessStart& start, const Streams& streams, const sigset_t& mas
   ::posix_spawnattr_setsigdefault(&attributes, &defaults);
   posix_spawn_file_actions_t files;
   ::posix_spawn_file_actions_init(&files);
+  // Several at once can't read what is typed.
+  if (streams.out >= 0) ::posix_spawn_file_actions_addopen(&files, STDIN_FILENO, "/dev/null", O_RDONLY, 0);
   if (streams.out >= 0) ::posix_spawn_file_actions_adddup2(&files, streams.out, STDOUT_FILENO);
   if (streams.err >= 0) ::posix_spawn_file_actions_adddup2(&files, streams.err, STDERR_FILENO);
   const int error = ::posix_spawn(&child, start.program.c_str(), &files, &attributes, argv.data(), environ);

@@ -1,7 +1,11 @@
 #include <fmt/format.h>
 
+#include <filesystem>
+
+#include "basic/bathymetry.h"
 #include "cli/commands.h"
 #include "conversion/vector_writer.h"
+#include "core/parameter_tree.h"
 #include "map/gis_export.h"
 #include "map/setup_map.h"
 #include "platform/files/may_write.h"
@@ -16,10 +20,16 @@ struct Options {
 };
 
 int exportGis(const Options& options, const Console& console) {
+  if (!sameName(std::filesystem::path(options.out).extension().string(), ".gpkg"))
+    return console.fail(fmt::format("\"{}\" must end in .gpkg", options.out));
   ConsoleMessageHost host(console);
   Result<SetupFile> setup = SetupFile::open(options.setup, &host);
   if (!setup) return console.fail(setup.error());
-  if (const Outcome free = mayWrite(options.out, options.force, {&options.setup, 1}, "--force"); !free)
+  std::vector<std::string> inputs{options.setup};
+  CBathymetryKvs& areas = *setup->model().bathymetry;
+  for (int number = 1; number <= areas.GetCount(); ++number)
+    inputs.push_back(areas.at(number).fileName.absolute());
+  if (const Outcome free = mayWrite(options.out, options.force, inputs, "--force"); !free)
     return console.fail(free.error());
   SetupMap map;
   const MapScene& scene = map.scene(setup->model());

@@ -67,9 +67,17 @@ Outcome submit(RunFolder& folder, const std::string& engine) {
   const Result<std::string> job = outputOf(
       findProgram("sbatch"), {"--parsable", fmt::format("--array=1-{}", tasks), "--job-name=gridbay",
                               "--output=/dev/null", script, folder.path(), engine, std::to_string(tasks)});
-  if (!job) return Failure{job.error()};
+  if (!job) {
+    std::error_code ignored;
+    std::filesystem::remove_all(folder.path(), ignored);
+    return Failure{job.error()};
+  }
   // A cluster's name may stand behind the number.
-  return folder.setJob(std::string(trimmed(std::string_view(*job).substr(0, job->find(';')))));
+  const std::string number(trimmed(std::string_view(*job).substr(0, job->find(';'))));
+  if (const Outcome kept = folder.setJob(number); !kept)
+    return Failure{
+        fmt::format("Job {} is queued, but its folder does not know it: {}", number, kept.error())};
+  return {};
 }
 
 Result<std::map<std::size_t, std::string>> tasksOf(const std::string& job) {

@@ -36,10 +36,10 @@ const char* subdatasetEntry(GDALDatasetH dataset, int number, const char* what) 
   return CSLFetchNameValue(GDALGetMetadata(dataset, "SUBDATASETS"), key.c_str());
 }
 
-class GdalRaster : public Raster {
+class GdalRaster final : public Raster {
  public:
-  GdalRaster(Dataset dataset, std::vector<std::string> subdatasets)
-      : dataset_(std::move(dataset)), subdatasets_(std::move(subdatasets)) {
+  GdalRaster(Dataset dataset, std::vector<std::string> subdatasets, Dataset source = nullptr)
+      : source_(std::move(source)), dataset_(std::move(dataset)), subdatasets_(std::move(subdatasets)) {
     hasPlace_ = GDALGetGeoTransform(dataset_.get(), transform_) == CE_None;
     if (bands() > 0) choose(1);
   }
@@ -54,8 +54,9 @@ class GdalRaster : public Raster {
   }
   std::vector<std::string> subdatasets() const override { return subdatasets_; }
   std::vector<std::string> files() const override {
-    const std::unique_ptr<char*, FreeTexts> list(GDALGetFileList(dataset_.get()));
-    std::vector<std::string> names{GDALGetDescription(dataset_.get())};
+    const GDALDatasetH read = source_ ? source_.get() : dataset_.get();
+    const std::unique_ptr<char*, FreeTexts> list(GDALGetFileList(read));
+    std::vector<std::string> names{GDALGetDescription(read)};
     for (char** name = list.get(); name != nullptr && *name != nullptr; ++name) names.emplace_back(*name);
     return names;
   }
@@ -109,6 +110,7 @@ class GdalRaster : public Raster {
   }
 
  private:
+  Dataset source_;  // that a data set worked out from it reads, up to its own end; else null
   Dataset dataset_;
   std::vector<std::string> subdatasets_;
   GDALRasterBandH band_ = nullptr;
@@ -271,23 +273,6 @@ class Warp {
   }
 };
 
-// A raster that was brought to another grid, with the file that it reads.
-class WarpedRaster final : public GdalRaster {
- public:
-  WarpedRaster(Dataset warped, Opened source)
-      : GdalRaster(std::move(warped), source.subdatasets), source_(std::move(source.dataset)) {}
-
-  std::vector<std::string> files() const override {
-    const std::unique_ptr<char*, FreeTexts> list(GDALGetFileList(source_.get()));
-    std::vector<std::string> names{GDALGetDescription(source_.get())};
-    for (char** name = list.get(); name != nullptr && *name != nullptr; ++name) names.emplace_back(*name);
-    return names;
-  }
-
- private:
-  Dataset source_;
-};
-
 }  // namespace
 }  // namespace gridbay
 
@@ -308,5 +293,7 @@ extern "C" gridbay::Raster* gridbayOpenWarped(const char* path, int subdataset,
   }
   gridbay::Dataset warped = gridbay::Warp::of(file.dataset.get(), *target, error);
   if (!warped) return nullptr;
-  return std::make_unique<gridbay::WarpedRaster>(std::move(warped), std::move(file)).release();
+  return std::make_unique<gridbay::GdalRaster>(std::move(warped), std::move(file.subdatasets),
+                                               std::move(file.dataset))
+      .release();
 }

@@ -119,7 +119,7 @@ TsbTimeAxis timeAxisOf(const Table& table, const SeriesConversion& options, cons
   // The mean step may have picked up the last digit of a time; a step of few digits that fits as well is
   // meant.
   axis.step = axis.count > 1 ? (table.times.back() - table.times.front()) / intervals : 1;
-  const double plain = std::stod(fmt::format("{:.6g}", axis.step));
+  const double plain = doubleOfText(fmt::format("{:.6g}", axis.step)).value_or(axis.step);
   if (std::abs(plain - axis.step) * intervals <= kEvenTolerance * axis.step) axis.step = plain;
   for (std::size_t i = 0; i < axis.count; ++i) {
     if (std::abs(table.times[i] - axis.at(i)) <= kEvenTolerance * axis.step) continue;

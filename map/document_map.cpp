@@ -13,10 +13,7 @@ class DocumentMap final : public MapEditor {
   explicit DocumentMap(CV27SetupDoc& document) : document_(document) {}
 
   const MapScene& scene() override { return map_.scene(root()); }
-  std::optional<MapPick> pick(MapPoint place, std::int32_t area) override {
-    map_.scene(root());
-    return map_.pick(place, area);
-  }
+  std::optional<MapPick> pick(MapPoint place, std::int32_t area) override { return map_.pick(place, area); }
   std::optional<std::array<double, 2>> geographic(MapPoint place) override { return map_.geographic(place); }
 
   AreaPlace previewMoveArea(std::int32_t number, MapPoint first) override {
@@ -33,7 +30,9 @@ class DocumentMap final : public MapEditor {
     if (std::string fault = SetupMap::noMoreAreas(root()); !fault.empty()) return fault;
     const AreaPlace place = map_.previewNestedArea(root(), corner, opposite);
     if (!place.fault.empty()) return place.fault;
-    const Outcome cut = cutNestedGrid(map_, map_.scene(root()), place, raster, file, progress);
+    // A copy, as the progress may bring another scene.
+    const MapScene scene = map_.scene(root());
+    const Outcome cut = cutNestedGrid(map_, scene, place, raster, file, progress);
     if (!cut) return cut.error();
     return record([&] { return map_.addArea(root(), place.enclosing, place.origin, file); });
   }

@@ -150,6 +150,29 @@ std::int32_t whole(double number) {
   return std::abs(number) < kMost ? static_cast<std::int32_t>(std::lround(number)) : -1;
 }
 
+// Points before and after those that differ stay as they are, whole or not.
+void givePoints(HdOutput& output, const std::vector<GridPoint>& points) {
+  const auto count = static_cast<std::size_t>(output.PointCount());
+  const auto isSame = [&](std::size_t old, std::size_t now) {
+    return GridPoint{whole(output.pointsJ[old]), whole(output.pointsK[old])} == points[now];
+  };
+  const std::size_t both = std::min(count, points.size());
+  std::size_t before = 0;
+  while (before < both && isSame(before, before)) ++before;
+  std::size_t after = 0;
+  while (before + after < both && isSame(count - 1 - after, points.size() - 1 - after)) ++after;
+  std::vector<double> j(points.size());
+  std::vector<double> k(points.size());
+  for (std::size_t i = 0; i < points.size(); ++i) {
+    const bool isKept = i < before || i >= points.size() - after;
+    const std::size_t old = i < before ? i : i + count - points.size();
+    j[i] = isKept ? output.pointsJ[old] : points[i].j;
+    k[i] = isKept ? output.pointsK[old] : points[i].k;
+  }
+  output.pointsJ = std::move(j);
+  output.pointsK = std::move(k);
+}
+
 std::string titleOr(const std::string& title, std::string_view what, int number) {
   return title.empty() ? fmt::format("{} {}", what, number) : title;
 }
@@ -269,12 +292,7 @@ void giveShape(CGlobalKvs& root, MapFeatureId id, const GridShape& shape) {
     case MapKind::outputLine:
     case MapKind::outputPoints:
       if (HdOutput* output = flowOutput(root, id); output != nullptr && output->type == HdOutput::kPoints) {
-        output->pointsJ.clear();
-        output->pointsK.clear();
-        for (const GridPoint& point : points) {
-          output->pointsJ.push_back(point.j);
-          output->pointsK.push_back(point.k);
-        }
+        givePoints(*output, points);
       } else if (output != nullptr) {
         givePart(output->part, points);
       } else if (TransportOutput* other = moduleOutput(root, id)) {

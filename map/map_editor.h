@@ -41,7 +41,7 @@ class MapEditor {
   virtual const MapScene& scene() = 0;
 
   // The point of a grid at a place on the map: of the finest area there, or of one by its number. Nothing
-  // where there is none.
+  // where there is none. In the last scene, as `geographic` is.
   virtual std::optional<MapPick> pick(MapPoint place, std::int32_t area = 0) = 0;
   // Longitude and latitude (degrees) of a place on the map; nothing in local coordinates.
   virtual std::optional<std::array<double, 2>> geographic(MapPoint place) = 0;

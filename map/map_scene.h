@@ -110,11 +110,13 @@ struct MapFeature {
   MapFeatureId id{};
   std::string label{};
   MapDrive drive = MapDrive::none;
-  std::int32_t area = 0;  // whose points it stands on; 0 where it has coordinates of its own
+  std::int32_t area = 0;      // whose points it stands on; 0 where it has coordinates of its own
+  std::int32_t lastArea = 0;  // of its last point: of a pair, that of the sink
   // Places on the map; without those that have none there.
   MapLine points{};
-  bool closed = false;  // the last point is joined to the first
-  bool joined = true;   // a line leads from each point to the next; else they stand alone
+  bool isComplete = true;  // none is left out, so that its points can be told by their numbers
+  bool closed = false;     // the last point is joined to the first
+  bool joined = true;      // a line leads from each point to the next; else they stand alone
   // The cell that leads to it on its page, from 1, in the first grid with that many rows and columns; rows of
   // headers do not count. 0 for any.
   std::int32_t row = 0;

@@ -18,6 +18,8 @@
 namespace gridbay {
 namespace {
 
+constexpr const char* kPlacedByHotStart = "A hot start file says itself where its area lies";
+
 MapFeatureId idOf(MapKind kind, int number, PageId page) {
   return {kind, number, static_cast<std::int32_t>(page)};
 }
@@ -88,6 +90,10 @@ std::string faultOf(const GridShape& shape, MapKind kind, const std::vector<MapA
   return {};
 }
 
+bool isFinite(MapPoint point) {
+  return std::isfinite(point.east) && std::isfinite(point.north);
+}
+
 constexpr std::array kOutputs{MapKind::outputMap, MapKind::outputLine, MapKind::outputPoints};
 
 bool isOutput(MapKind kind) {
@@ -143,6 +149,7 @@ void SetupMap::appendOnGrids(CGlobalKvs& root) {
     feature.row = listed.row;
     feature.column = listed.column;
     feature.area = shape->area();
+    feature.lastArea = shape->areas.empty() ? 0 : shape->areas.back();
     feature.closed = shape->closed;
     feature.joined = shape->joined;
     feature.fault = faultOf(*shape, listed.id.kind, scene_.areas);
@@ -152,6 +159,7 @@ void SetupMap::appendOnGrids(CGlobalKvs& root) {
       if (area != nullptr && area->isPlaced)
         points->push_back(area->grid.at(shape->points[i].j, shape->points[i].k));
     }
+    feature.isComplete = points->size() == shape->points.size();
     feature.points = std::move(points);
     scene_.features.push_back(std::move(feature));
   }
@@ -180,7 +188,7 @@ AreaPlace SetupMap::previewMoveArea(CGlobalKvs& root, std::int32_t number, MapPo
 MapEdit SetupMap::moveArea(CGlobalKvs& root, std::int32_t number, MapPoint first) {
   const AreaPlace place = previewMoveArea(root, number, first);
   if (place.nx == 0) return refused(place.fault);
-  if (root.bathymetry->hotStart == 1) return refused("A hot start file says itself where its area lies");
+  if (root.bathymetry->hotStart == 1) return refused(kPlacedByHotStart);
   root.bathymetry->at(number).origin = place.origin;
   return {.page = PageId::bathymetry, .name = fmt::format("Area {}, Origin", number)};
 }
@@ -223,6 +231,7 @@ AreaPlace SetupMap::previewNestedArea(CGlobalKvs& root, MapPoint corner, MapPoin
 std::string SetupMap::noMoreAreas(const CGlobalKvs& root) {
   if (theEdition.wetlandSweepKit) return "This edition has one area";
   if (root.bathymetry->overlandSolver) return "With the overland solver there is one area";
+  if (root.bathymetry->hotStart == 1) return kPlacedByHotStart;
   if (root.bathymetry->GetCount() < CBathymetryKvs::kMostAreas) return {};
   return fmt::format("A setup has no more than {} areas", CBathymetryKvs::kMostAreas);
 }
@@ -312,6 +321,8 @@ MapEdit SetupMap::moveVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t
     std::vector<MapPoint> own{place};
     if (const std::string fault = coordinates_.fromMap(line.projection, own); !fault.empty())
       return refused(fmt::format("\"{}\" {}", line.name, fault));
+    if (!isFinite(own.front()))
+      return refused(fmt::format("The projection of \"{}\" does not reach there", line.name));
     moveStructurePoint(root, feature.kind, feature.number, vertex, own.front());
     return made(feature, pointName(feature, vertex));
   }
@@ -340,6 +351,8 @@ MapEdit SetupMap::insertPoint(CGlobalKvs& root, MapFeatureId feature, std::size_
     std::vector<MapPoint> own{place};
     if (const std::string fault = coordinates_.fromMap(line.projection, own); !fault.empty())
       return refused(fmt::format("\"{}\" {}", line.name, fault));
+    if (!isFinite(own.front()))
+      return refused(fmt::format("The projection of \"{}\" does not reach there", line.name));
     insertStructurePoint(root, feature.kind, feature.number, vertex, own.front());
     return made(feature, "new point");
   }

@@ -183,10 +183,12 @@ void StructureLines::append(CGlobalKvs& root, MapCoordinates& coordinates, const
       MapFeature feature;
       feature.id = {kind, number, static_cast<std::int32_t>(pageOfStructure(kind))};
       feature.row = number;
+      std::size_t pointsOfOwn = 0;
       withStructure(
           root, kind, number,
           [&](const LineStructure& line) {
             feature.label = line.name;
+            pointsOfOwn = pointCount(line);
             if (known.line && known.projection == line.coordinateType && known.x == line.x &&
                 known.y == line.y)
               return;
@@ -195,6 +197,7 @@ void StructureLines::append(CGlobalKvs& root, MapCoordinates& coordinates, const
           },
           [&](const CNhdDikeObjectKvs& dike) {
             feature.label = dike.name;
+            pointsOfOwn = dike.points.size();
             if (dike.include == 0) feature.drive = MapDrive::off;
             if (known.line && known.projection == dike.coordinateType && known.dike == dike.points) return;
             known = {.projection = dike.coordinateType, .dike = dike.points};
@@ -202,6 +205,7 @@ void StructureLines::append(CGlobalKvs& root, MapCoordinates& coordinates, const
           });
       check(known, areas);
       feature.points = known.line;
+      feature.isComplete = feature.points->size() == pointsOfOwn;
       if (!known.fault.empty()) feature.fault = fmt::format("\"{}\" {}", feature.label, known.fault);
       features.push_back(std::move(feature));
     }

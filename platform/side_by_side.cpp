@@ -163,6 +163,13 @@ Outcome SideBySide::run() const {
   if (count == 0 || isStopped()) return {};
   const SharedHandle shared = makeShared();
   if (shared == nullptr) return Failure{systemError("cannot start work on", "all cores")};
+  // A copy that ends between taking a piece and beginning it leaves no word of it.
+  std::vector<bool> isTold(count);
+  SideBySide task = *this;
+  task.took = [&](std::size_t piece, std::optional<std::string> text) {
+    isTold.at(piece) = true;
+    took(piece, std::move(text));
+  };
   std::list<Copy> copies;
   // Not before the copies have ended does this function, also by an exception of `took`.
   struct Stop {
@@ -171,9 +178,10 @@ Outcome SideBySide::run() const {
   };
   const Stop atEnd{*shared};
   while (copies.size() < std::clamp<std::size_t>(processes, 1, count)) {
-    if (!start(*this, *shared, copies)) break;
+    if (!start(task, *shared, copies)) break;
   }
   if (copies.empty()) return Failure{systemError("cannot start work on", "all cores")};
+  std::size_t restarts = 0;
   while (!copies.empty()) {
     if (isStopped()) shared->isStopped = true;
     std::vector<pollfd> waits;
@@ -182,14 +190,18 @@ Outcome SideBySide::run() const {
     auto copy = copies.begin();
     for (const pollfd& wait : waits) {
       const auto at = copy++;
-      if (wait.revents == 0 || at->read(*this)) continue;
+      if (wait.revents == 0 || at->read(task)) continue;
       const std::uint64_t lost = at->piece();
       copies.erase(at);
-      if (lost == kNone) continue;
-      took(lost, std::nullopt);
-      if (shared->next < count && !shared->isStopped && !start(*this, *shared, copies) && copies.empty())
-        return Failure{systemError("cannot go on with work on", "all cores")};
+      if (lost != kNone) task.took(lost, std::nullopt);
+      if (shared->next >= count || shared->isStopped) continue;
+      // One for each piece at most, lest copies that come to none are made for ever.
+      const bool isStarted = restarts++ < count && start(task, *shared, copies);
+      if (!isStarted && copies.empty()) return Failure{systemError("cannot go on with work on", "all cores")};
     }
+  }
+  for (std::size_t piece = 0; piece < std::min<std::uint64_t>(shared->next, count); ++piece) {
+    if (!isTold[piece]) task.took(piece, std::nullopt);
   }
   return {};
 }

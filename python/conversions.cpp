@@ -2,6 +2,7 @@
 #include <pybind11/stl.h>
 
 #include <algorithm>
+#include <filesystem>
 
 #include "conversion/raster_conversion.h"
 #include "conversion/series_conversion.h"
@@ -47,7 +48,12 @@ py::dict convert(Result<Converted> (*work)(const Conversion&, ConversionHost&), 
   const Result<Converted> converted = work(conversion, host);
   if (!converted) {
     const bool stopped = converted.error() == kConversionStopped;
-    throw Refusal{stopped ? kStopped : kWrongValue, converted.error(), conversion.in};
+    const bool isOfFiles = !std::filesystem::exists(conversion.in) ||
+                           (!conversion.force && std::filesystem::exists(conversion.out));
+    throw Refusal{stopped     ? kStopped
+                  : isOfFiles ? kFileError
+                              : kWrongValue,
+                  converted.error(), conversion.in};
   }
   py::dict result;
   result["summary"] = converted->summary;

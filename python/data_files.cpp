@@ -36,8 +36,10 @@ std::vector<py::ssize_t> shapeOf(const TsbDefinition& definition, std::size_t st
 template <class Real>
 py::array arrayOver(std::unique_ptr<std::vector<Real>> values, std::vector<py::ssize_t> shape) {
   Real* data = values->data();
-  const py::capsule keeper(values.release(),
-                           [](void* held) { delete static_cast<std::vector<Real>*>(held); });
+  const py::capsule keeper(values.get(), [](void* held) {
+    std::default_delete<std::vector<Real>>()(static_cast<std::vector<Real>*>(held));
+  });
+  static_cast<void>(values.release());
   return py::array_t<Real>(std::move(shape), data, keeper);
 }
 

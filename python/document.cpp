@@ -11,6 +11,7 @@
 #include "basic/boundary.h"
 #include "core/edition.h"
 #include "core/kdl_writer.h"
+#include "platform/files/paths.h"
 #include "python/keyword_list.h"
 #include "python/refusal.h"
 #include "python/values.h"
@@ -54,7 +55,7 @@ class Document {
     Result<SetupFile> opened = SetupFile::open(path, &document->said_);
     if (!opened) throw Refusal{kFileError, opened.error(), path};
     document->setup_ = std::move(*opened);
-    document->path_ = path;
+    document->path_ = absolutePath(path, {});
     return document;
   }
 
@@ -63,6 +64,7 @@ class Document {
     other->setup_.model().AssignState(setup_.model());
     other->setup_.replaceSource(withValues(setup_.source(), nullptr, {}));
     other->path_ = path_;
+    other->said_.texts = said_.texts;
     return other;
   }
 
@@ -73,7 +75,7 @@ class Document {
 
   void save(const std::string& path) {
     if (const Outcome saved = setup_.save(path); !saved) throw Refusal{kFileError, saved.error(), path};
-    path_ = path;
+    path_ = absolutePath(path, {});
   }
 
   // Page, its caption, severity and text of each message.
@@ -229,8 +231,8 @@ void addDocument(py::module_& module) {
 void addKeywordList(py::module_& module) {
   module.def(
       "keyword_list",
-      [] {
-        const KeywordList list = collectKeywords();
+      [](const std::string& definition) {
+        const KeywordList list = collectKeywords(definition);
         const auto kindOf = [](ValueKind kind) { return static_cast<int>(kind); };
         py::list keywords;
         for (const KeywordNote& note : list.keywords) {

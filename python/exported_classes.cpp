@@ -89,9 +89,10 @@ struct Output {
   std::string title;
   std::vector<int> items;
 
-  py::tuple tuple(const OutputPosition& next) const {
-    return py::make_tuple(next, type, useSubArea, firstJ, firstK, lastJ, lastK, pointsJ, pointsK, usePeriod,
-                          firstDate, lastDate, frequency, fileName, title, items);
+  py::tuple tuple(const OutputPosition& next) const { return py::make_tuple(next, type) + withoutType(); }
+  py::tuple withoutType() const {
+    return py::make_tuple(useSubArea, firstJ, firstK, lastJ, lastK, pointsJ, pointsK, usePeriod, firstDate,
+                          lastDate, frequency, fileName, title, items);
   }
 };
 
@@ -106,35 +107,44 @@ py::class_<Model> addFloodModel(py::module_& module, const char* name, const cha
             ShowMessagesWith(static_cast<FloodModel&>(model), std::move(show));
           },
           py::arg("show"), kTexts)
-      .def("LoadFile", &Model::LoadFile, py::arg("file_name"))
-      .def("SaveFile", &Model::SaveFile, py::arg("file_name"))
-      .def("GetFileExtension", &Model::GetFileExtension)
+      .def("LoadFile", &Model::LoadFile, py::arg("file_name"),
+           "Reads a setup. A syntax error is shown and leaves the model as it was; any other fault does so "
+           "silently.")
+      .def("SaveFile", &Model::SaveFile, py::arg("file_name"),
+           "Shows what validation finds, if anything, and writes the setup all the same.")
+      .def("GetFileExtension", &Model::GetFileExtension, "\".v27\", in both editions.")
       .def("SetSimulationPeriod", &Model::SetSimulationPeriod, py::arg("start"), py::arg("end"),
            py::arg("time_step"), "Time step in s.")
       .def("setDryingFloodingDepth", &Model::setDryingFloodingDepth, py::arg("drying_depth"),
            py::arg("flooding_depth"), "Metres of water.")
-      .def("setCoarseBathymetryFile", &Model::setCoarseBathymetryFile, py::arg("file_name"))
-      .def("getCoarseBathymetryFile", &Model::getCoarseBathymetryFile)
-      .def("setFineBathymetryFile", &Model::setFineBathymetryFile, py::arg("file_name"))
-      .def("getFineBathymetryFile", &Model::getFineBathymetryFile)
-      .def("setOverlandSolverOption", &Model::setOverlandSolverOption, py::arg("option"))
+      .def("setCoarseBathymetryFile", &Model::setCoarseBathymetryFile, py::arg("file_name"),
+           "The grid of the area, with its projection where none is set yet.")
+      .def("getCoarseBathymetryFile", &Model::getCoarseBathymetryFile, "The grid of the area.")
+      .def("setFineBathymetryFile", &Model::setFineBathymetryFile, py::arg("file_name"),
+           "The grid of the overland solver, which is not looked at.")
+      .def("getFineBathymetryFile", &Model::getFineBathymetryFile, "The grid of the overland solver.")
+      .def("setOverlandSolverOption", &Model::setOverlandSolverOption, py::arg("option"),
+           "1 turns the solver on, any other number off.")
       .def("setResistance_Value", &Model::setResistance_Value, py::arg("value"), "Manning number.")
-      .def("setResistance_File", &Model::setResistance_File, py::arg("file_name"), py::arg("item"))
+      .def("setResistance_File", &Model::setResistance_File, py::arg("file_name"), py::arg("item"),
+           "A map of Manning numbers; items count from 1.")
       .def("setInitialCondition_Value", &Model::setInitialCondition_Value, py::arg("value"), "Metres.")
       .def("setInitialCondition_File", &Model::setInitialCondition_File, py::arg("file_name"),
-           py::arg("item"))
-      .def("setNoOfBndCondition", &Model::setNoOfBndCondition, py::arg("count"))
-      .def("setEddyViscosity_IncludedWithDefaultValue", &Model::setEddyViscosity_IncludedWithDefaultValue)
-      .def("setEddyViscosity_NotIncluded", &Model::setEddyViscosity_NotIncluded)
+           py::arg("item"), "A map of water levels; items count from 1.")
+      .def("setNoOfBndCondition", &Model::setNoOfBndCondition, py::arg("count"),
+           "Boundaries are user specified from now on; a negative count leaves them as many as they are.")
+      .def("setEddyViscosity_IncludedWithDefaultValue", &Model::setEddyViscosity_IncludedWithDefaultValue,
+           "Flux based, 0.02 dx dy / dt: when grid and period are set.")
+      .def("setEddyViscosity_NotIncluded", &Model::setEddyViscosity_NotIncluded, "No eddy viscosity.")
       .def("setEddyViscosity_Value", &Model::setEddyViscosity_Value, py::arg("value"), py::arg("formulation"),
            "Square metres per second.")
       .def("setRain_Value", &Model::setRain_Value, py::arg("value"), "Millimetres per day.")
       .def("setRain_File", &Model::setRain_File, py::arg("file_name"), py::arg("precipitation_type"),
-           py::arg("item"))
+           py::arg("item"), "Net precipitation from a file. Type: 1 a time series, 2 maps in time.")
       .def("setOutput_MaximumFloodDepthAndExtend", &Model::setOutput_MaximumFloodDepthAndExtend,
-           py::arg("file_name"), py::arg("store_step"))
-      .def("GetOutputsListHeadPos", &Model::GetOutputsListHeadPos)
-      .def("ClearHDResultOutputs", &Model::ClearHDResultOutputs);
+           py::arg("file_name"), py::arg("store_step"), "The store step is in time steps.")
+      .def("GetOutputsListHeadPos", &Model::GetOutputsListHeadPos, "Where a walk through the outputs begins.")
+      .def("ClearHDResultOutputs", &Model::ClearHDResultOutputs, "Takes all outputs out.");
   return flood;
 }
 
@@ -148,11 +158,14 @@ void addFloodModels(py::module_& module) {
   addFloodModel<Flood>(module, "Flooding_V27FlowModel",
                        "A flood model by grid points and numbers of data formats.")
       .def("setHDBndCondition_Value", &Flood::setHDBndCondition_Value, py::arg("index"), py::arg("first_j"),
-           py::arg("first_k"), py::arg("last_j"), py::arg("last_k"), py::arg("formulation"), py::arg("value"))
+           py::arg("first_k"), py::arg("last_j"), py::arg("last_k"), py::arg("formulation"), py::arg("value"),
+           "Formulation 1 is a level in m, 2 a flux in m3/s. A boundary that is not there is passed over.")
       .def("setHDBndCondition_File", &Flood::setHDBndCondition_File, py::arg("index"), py::arg("first_j"),
            py::arg("first_k"), py::arg("last_j"), py::arg("last_k"), py::arg("formulation"),
-           py::arg("data_format"), py::arg("file_name"), py::arg("item"))
-      .def("getNoOfBndConditions", &Flood::getNoOfBndConditions)
+           py::arg("data_format"), py::arg("file_name"), py::arg("item"),
+           "Data format: 3 a series in time, 4 one along the line, 5 transfer data (which has no item: "
+           "ValueError), 7 a rating curve.")
+      .def("getNoOfBndConditions", &Flood::getNoOfBndConditions, "How many boundaries there are.")
       .def(
           "getHDBndCondition",
           [](Flood& model, int index) -> py::object {
@@ -166,18 +179,21 @@ void addFloodModels(py::module_& module) {
             return py::make_tuple(j1, k1, j2, k2, formulation, format, value, file, item);
           },
           py::arg("index"), "None for a boundary that is not there.")
-      .def("setNoOfSourceSink", &Flood::setNoOfSourceSink, py::arg("count"))
-      .def("getNoOfSourceSink", &Flood::getNoOfSourceSink)
+      .def("setNoOfSourceSink", &Flood::setNoOfSourceSink, py::arg("count"), "A negative count does nothing.")
+      .def("getNoOfSourceSink", &Flood::getNoOfSourceSink, "How many sources there are.")
       .def("setHDSourceSink_Value", &Flood::setHDSourceSink_Value, py::arg("index"), py::arg("type"),
            py::arg("source_j"), py::arg("source_k"), py::arg("sink_j"), py::arg("sink_k"),
-           py::arg("magnitude"), py::arg("velocity"), py::arg("outlet_direction"))
+           py::arg("magnitude"), py::arg("velocity"), py::arg("outlet_direction"),
+           "Type: 0 source, 1 sink, 2 a pair. Magnitude in m3/s, velocity in m/s, direction in degrees. A "
+           "source that is not there is passed over.")
       .def("setHDSourceSink_File", &Flood::setHDSourceSink_File, py::arg("index"), py::arg("type"),
            py::arg("source_j"), py::arg("source_k"), py::arg("sink_j"), py::arg("sink_k"),
            py::arg("file_name"), py::arg("outlet_direction"), py::arg("magnitude_item"),
-           py::arg("velocity_item"))
+           py::arg("velocity_item"), "Only the items are stored: the file of the source stays what it was.")
       .def("setHDSourceSink_FileEx", &Flood::setHDSourceSink_FileEx, py::arg("index"), py::arg("type"),
            py::arg("source_j"), py::arg("source_k"), py::arg("sink_j"), py::arg("sink_k"),
-           py::arg("file_name"), py::arg("item_1"), py::arg("item_2"), py::arg("item_3"))
+           py::arg("file_name"), py::arg("item_1"), py::arg("item_2"), py::arg("item_3"),
+           "With three items, in data format 2; only the items are stored.")
       .def(
           "getHDSourceSink",
           [](Flood& model, int index) -> py::object {
@@ -197,7 +213,9 @@ void addFloodModels(py::module_& module) {
            py::arg("use_sub_area"), py::arg("first_j"), py::arg("first_k"), py::arg("last_j"),
            py::arg("last_k"), py::arg("points_j"), py::arg("points_k"), py::arg("use_period"),
            py::arg("first_date"), py::arg("last_date"), py::arg("time_step_frequency"), py::arg("file_name"),
-           py::arg("title"), py::arg("items"))
+           py::arg("title"), py::arg("items"),
+           "Type: 0 a map, 1 points, which need both lists. Frequency in time steps. Items: 1 water depth, 2 "
+           "and 3 fluxes, 4 surface elevation, 5 and 6 velocities.")
       .def(
           "GetNextOutputs_MapsJKAndTS",
           [](Flood& model, OutputPosition position) {
@@ -220,10 +238,13 @@ void addFloodModels(py::module_& module) {
   addFloodModel<Urban>(module, "UrbanFlooding_V27Flowmodel",
                        "A flood model by map coordinates and extensions of files.")
       .def("setBndCondition_Value", &Urban::setBndCondition_Value, py::arg("index"), py::arg("first_j"),
-           py::arg("first_k"), py::arg("last_j"), py::arg("last_k"), py::arg("formulation"), py::arg("value"))
+           py::arg("first_k"), py::arg("last_j"), py::arg("last_k"), py::arg("formulation"), py::arg("value"),
+           "Formulation 1 is a level in m, 2 a flux in m3/s. A boundary that is not there is passed over.")
       .def("setBndCondition_File", &Urban::setBndCondition_File, py::arg("index"), py::arg("first_j"),
            py::arg("first_k"), py::arg("last_j"), py::arg("last_k"), py::arg("formulation"),
-           py::arg("file_name"), py::arg("item"))
+           py::arg("file_name"), py::arg("item"),
+           "The extension says what the file is: .tsb0 or .tb0 a series in time, .tsb1 or .tb1 one along the "
+           "line; of others nothing is stored.")
       .def(
           "as_flow_model", [](const Urban& model) { return Flood(model); },
           "An object of the other interface that drives the same model.")
@@ -231,7 +252,8 @@ void addFloodModels(py::module_& module) {
            py::arg("use_sub_area"), py::arg("first_x"), py::arg("first_y"), py::arg("last_x"),
            py::arg("last_y"), py::arg("use_period"), py::arg("first_date"), py::arg("last_date"),
            py::arg("number_of_steps"), py::arg("file_name"), py::arg("title"), py::arg("water_depth"),
-           py::arg("surface_elevation"), py::arg("velocities"), py::arg("fluxes"))
+           py::arg("surface_elevation"), py::arg("velocities"), py::arg("fluxes"),
+           "A part of the map between two corners in m. Coordinates of a point output have no effect.")
       .def(
           "GetNextOutputs_MapsJKAndTS",
           [](Urban& model, OutputPosition position, int ignored) {
@@ -239,7 +261,7 @@ void addFloodModels(py::module_& module) {
             model.GetNextOutputs_MapsJKAndTS(position, ignored, it.useSubArea, it.firstJ, it.firstK, it.lastJ,
                                              it.lastK, it.pointsJ, it.pointsK, it.usePeriod, it.firstDate,
                                              it.lastDate, it.frequency, it.fileName, it.title, it.items);
-            return it.tuple(position);
+            return py::tuple(py::make_tuple(position) + it.withoutType());
           },
           py::arg("position"), py::arg("ignored") = 0,
           "The next position and the output at this one, whose type is not given.");
@@ -257,8 +279,8 @@ void addClimateChange(py::module_& module) {
             ShowMessagesWith(model, std::move(show));
           },
           py::arg("show"), kTexts)
-      .def("OpenFile", &Climate::OpenFile, py::arg("file_name"))
-      .def("SaveFile", &Climate::SaveFile, py::arg("file_name"))
+      .def("OpenFile", &Climate::OpenFile, py::arg("file_name"), "1 where the file was read.")
+      .def("SaveFile", &Climate::SaveFile, py::arg("file_name"), "Always 1; nothing is checked.")
       .def("GetSimulationPeriod",
            [](Climate& model) {
              scripting::DateTime start;
@@ -273,7 +295,8 @@ void addClimateChange(py::module_& module) {
              const int result = model.GetLongLat(longitude, latitude);
              return py::make_tuple(result, longitude, latitude);
            })
-      .def("ResultOutputsHasAbsolutePath", &Climate::ResultOutputsHasAbsolutePath);
+      .def("ResultOutputsHasAbsolutePath", &Climate::ResultOutputsHasAbsolutePath,
+           "1 where the name of an output has a folder.");
   const auto index = py::arg("index");
   const auto file = py::arg("file_name");
   const auto number = py::arg("value");

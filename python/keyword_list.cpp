@@ -11,8 +11,10 @@
 
 #include "basic/module_selection.h"
 #include "core/edition.h"
+#include "core/file_name.h"
 #include "core/nearest.h"
 #include "core/number_text.h"
+#include "ecology/model_definition.h"
 #include "pages/form_view.h"
 #include "pages/grid_wnd.h"
 #include "setup/gridbay_doc.h"
@@ -117,7 +119,8 @@ bool looksLikeACount(const Keyword& keyword) {
 
 class Collector {
  public:
-  KeywordList collect() {
+  // The lists of the ecological model follow a definition.
+  KeywordList collect(const std::string& definition) {
     constexpr std::array kModules{module::kHydrodynamic, module::kAdvectionDispersion, module::kMudTransport,
                                   module::kMudTransportExpanded, module::kEcological};
     for (const std::int32_t code : kModules) {
@@ -126,6 +129,11 @@ class Collector {
       root().moduleSelection->simulationType = code;
       take(snapshot());
       module_ = code;
+      if (code == module::kEcological) {
+        UFileName file;
+        file = definition;
+        root().wqsModelDefinition->Choose(file);
+      }
       fill();
       // The task of a module, which is chosen by a keyword, decides which pages apply.
       for (const Keyword& keyword : snapshot().keywords) {
@@ -417,8 +425,8 @@ class Collector {
 
 }  // namespace
 
-KeywordList collectKeywords() {
-  return Collector().collect();
+KeywordList collectKeywords(const std::string& definition) {
+  return Collector().collect(definition);
 }
 
 }  // namespace gridbay::python

@@ -36,7 +36,8 @@ struct KeywordList {
 
 // All keywords of the edition, found by trying: a new setup of each module has its lists filled, and each
 // control of each page is used, once for each of its choices; what a save would write then has the keywords,
-// and what has changed in it is what the control edits. Takes some seconds.
-KeywordList collectKeywords();
+// and what has changed in it is what the control edits. The ecological model is that of a definition file.
+// Takes some seconds.
+KeywordList collectKeywords(const std::string& definition);
 
 }  // namespace gridbay::python

@@ -190,10 +190,10 @@ def number_first(choice):
 
 
 def main():
-    folder = Path(sys.argv[1])
+    folder, definition = Path(sys.argv[1]), sys.argv[2]
     maker = Maker()
     for name in ("_flow_model", "_wetland_sweep_kit"):
-        maker.take(*load(folder, name).keyword_list())
+        maker.take(*load(folder, name).keyword_list(definition))
     text = HEADER + maker.text()
     (folder / "model.py").write_text(text.rstrip() + "\n", encoding="utf-8")
 

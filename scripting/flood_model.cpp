@@ -1,3 +1,4 @@
+#include <exception>
 #include <stdexcept>
 
 #include "basic/area_description.h"
@@ -55,8 +56,15 @@ void FloodModel::LoadFile(std::string fileName) {
 void FloodModel::SaveFile(std::string fileName) {
   const auto guard = model_->lock();
   const std::string errors = _GetErrorTexts();
-  if (!errors.empty()) model_->show(errors);
+  // A message box that throws does not keep the setup from being written.
+  std::exception_ptr thrown;
+  try {
+    if (!errors.empty()) model_->show(errors);
+  } catch (...) {
+    thrown = std::current_exception();
+  }
   if (!model_->write(fileName)) model_->show(kvsGetErrorText());
+  if (thrown) std::rethrow_exception(thrown);
 }
 
 std::string FloodModel::GetFileExtension() {
@@ -369,6 +377,7 @@ void FloodModel::AddOutput_MapsAndTimeSeriesJK(int type, int useSubArea, int fir
   appendOutput(*model_, {type, useSubArea, firstJ, firstK, lastJ, lastK, std::move(pointsJ),
                          std::move(pointsK), usePeriod, modelTime(firstDate), modelTime(lastDate),
                          timeStepFrequency, std::move(fileName), std::move(title), std::move(items)});
+  tellUnsupported(*model_, type);
 }
 
 OutputPosition FloodModel::GetOutputsListHeadPos() {

@@ -48,6 +48,10 @@ std::int32_t wholeSteps(double seconds, double timeStep) {
   return wholePart((seconds + kSlack) / timeStep);
 }
 
+void tellUnsupported(ScriptedModel& model, int type) {
+  if (type != kMapType && type != kPointsType) model.show(kUnsupportedType);
+}
+
 CNhdResultObjectKvs& appendOutput(ScriptedModel& model, const FloodOutput& given) {
   CSimulationPeriodKvs& simulation = *model.root.simulationPeriod;
   auto& outputs = model.root.nhdResult->outputs;
@@ -57,8 +61,6 @@ CNhdResultObjectKvs& appendOutput(ScriptedModel& model, const FloodOutput& given
     output.type = CNhdResultObjectKvs::kMap;
   } else if (given.type == kPointsType) {
     output.type = CNhdResultObjectKvs::kPoints;
-  } else {
-    model.show(kUnsupportedType);
   }
   model.setFileName(output.file, given.fileName);
   output.title = given.title;
@@ -104,21 +106,23 @@ void readOutput(ScriptedModel& model, scripting::OutputPosition& position, Flood
       given.firstK = output.part.y.first;
       given.lastK = output.part.y.last;
     }
-  } else {
-    model.show(kUnsupportedType);
   }
+  const bool isSupported =
+      output.type == CNhdResultObjectKvs::kPoints || output.type == CNhdResultObjectKvs::kMap;
 
   const bool isAllSteps =
       output.steps.first == 0 && output.steps.last == simulation.LastTimeStep() && output.steps.interval == 1;
   given.usePeriod = isAllSteps ? 0 : 1;
-  if (isAllSteps) return;
-  const auto momentOf = [&simulation](std::int32_t step) {
-    const float seconds = static_cast<float>(step) * simulation.timeStepInterval;
-    return simulation.start.plusDays(std::trunc(double{seconds}) / kSecondsOfDay);
-  };
-  given.frequency = output.steps.interval;
-  given.firstDate = momentOf(output.steps.first);
-  given.lastDate = momentOf(output.steps.last);
+  if (!isAllSteps) {
+    const auto momentOf = [&simulation](std::int32_t step) {
+      const float seconds = static_cast<float>(step) * simulation.timeStepInterval;
+      return simulation.start.plusDays(std::trunc(double{seconds}) / kSecondsOfDay);
+    };
+    given.frequency = output.steps.interval;
+    given.firstDate = momentOf(output.steps.first);
+    given.lastDate = momentOf(output.steps.last);
+  }
+  if (!isSupported) model.show(kUnsupportedType);
 }
 
 }  // namespace gridbay

@@ -29,8 +29,10 @@ struct FloodOutput {
   std::vector<std::int32_t> items;
 };
 
-// Appends an output and returns it. A type that is none is shown, and taken for a map.
+// Appends an output and returns it. A type that is none is taken for a map.
 CNhdResultObjectKvs& appendOutput(ScriptedModel& model, const FloodOutput& output);
+// Shows that a type is none, as the last thing that a member does: the model is free for that time.
+void tellUnsupported(ScriptedModel& model, int type);
 
 // Gives the output at the position and steps on. What the output does not have keeps its value. Throws
 // std::invalid_argument where no output is at the position.

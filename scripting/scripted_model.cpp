@@ -22,9 +22,19 @@ std::unique_lock<std::mutex> ScriptedModel::lockDataFiles() {
   return std::unique_lock(dataFiles);
 }
 
-void ScriptedModel::show(const std::string& text) const {
-  if (show_) {
-    show_(text);
+void ScriptedModel::show(const std::string& text) {
+  const scripting::MessageBox box = show_;
+  struct Freed {
+    std::recursive_mutex& mutex;
+
+    explicit Freed(std::recursive_mutex& held) : mutex(held) { mutex.unlock(); }
+    Freed(const Freed&) = delete;
+    Freed& operator=(const Freed&) = delete;
+    ~Freed() { mutex.lock(); }
+  };
+  const Freed freed(mutex_);
+  if (box) {
+    box(text);
   } else {
     std::fprintf(stderr, "%s\n", text.c_str());
   }

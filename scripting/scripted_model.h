@@ -24,7 +24,9 @@ class ScriptedModel {
   static std::unique_lock<std::mutex> lockDataFiles();
 
   void setMessageBox(scripting::MessageBox show) { show_ = std::move(show); }
-  void show(const std::string& text) const;
+  // For as long as the message is shown the model is free for other threads: the one that reads it may use
+  // it. To be called under one lock.
+  void show(const std::string& text);
 
   // Reads a setup into the model: what it lacks keeps its value, but where another setup was read before, the
   // default. True unless the file can't be read. A syntax error is shown. Then the model is checked, so that

@@ -1,5 +1,5 @@
+#include <algorithm>
 #include <array>
-#include <filesystem>
 #include <string_view>
 
 #include "basic/bathymetry.h"
@@ -91,6 +91,7 @@ void UrbanFlooding_V27Flowmodel::AddOutput_MapsAndTimeSeries(
   USubLine& steps = appendOutput(*model_, output).steps;
   const double span = double{static_cast<double>(steps.last)} - steps.first;
   steps.interval = std::max(wholePart(span / numberOfSteps), 1);
+  tellUnsupported(*model_, type);
 }
 
 void UrbanFlooding_V27Flowmodel::GetNextOutputs_MapsJKAndTS(

@@ -27,6 +27,7 @@ std::optional<KnownFiles::State> KnownFiles::known(const std::string& path) cons
 void KnownFiles::keep(const State& state) {
   constexpr std::time_t kMoment = 2;
   if (std::time(nullptr) - state[3] < kMoment) return;
+  std::erase(known_, state);
   known_.insert(known_.begin(), state);
   known_.resize(std::min(known_.size(), kMostFiles));
 }

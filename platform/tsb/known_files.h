@@ -25,9 +25,10 @@ class KnownFiles {
   using State = std::array<std::int64_t, 5>;
   // That of a file which is known as it is now.
   std::optional<State> known(const std::string& path) const;
+  // That of any file as it is now; nothing where there is none.
+  static std::optional<State> stateOf(const std::string& path);
 
  private:
-  static std::optional<State> stateOf(const std::string& path);
   void keep(const State& state);
 
   std::vector<State> known_;

@@ -366,7 +366,7 @@ struct TsbFile::State {
 
   Outcome openFile() const {
     if (file) return {};
-    if (knownFiles().known(path) != knownAs) return fail("it has been written to since it was opened");
+    if (KnownFiles::stateOf(path) != knownAs) return fail("it has been written to since it was opened");
     if (std::optional<NetcdfFile> opened = NetcdfFile::open(path)) {
       file.emplace(*std::move(opened));
       return {};

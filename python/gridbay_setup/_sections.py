@@ -83,17 +83,34 @@ class Section:
             f"{'did you mean' if near else 'there are'} {allowed}",
             self._path, name, allowed)  # fmt: skip
 
+    @classmethod
+    def _numbered(cls, name: str) -> Optional[Keyword[Any, Any]]:
+        """The keyword of an attribute that is numbered higher than those of a new setup, as constant_value_7."""
+        stem, _, number = name.rpartition("_")
+        first = cls.fields().get(f"{stem}_1")
+        if not number.isdecimal() or not isinstance(first, Keyword) or not first.name.endswith("1"):
+            return None
+        return type(first)(first.name[:-1] + number, first.default, first.quantity, first.unit, first.label, first.page,
+                           first.choices, first.settable)  # fmt: skip
+
     if not TYPE_CHECKING:  # whose tools know what there is
 
         def __getattr__(self, name: str) -> Any:
             if name.startswith("__"):
                 raise AttributeError(name)
-            raise self._unknown(name, "to read")
+            numbered = self._numbered(name)
+            if numbered is None or not self._document.has(self._at(numbered.name), False):
+                raise self._unknown(name, "to read")
+            return numbered.__get__(self, type(self))
 
         def __setattr__(self, name: str, value: Any) -> None:
-            if not hasattr(type(self), name):
+            if hasattr(type(self), name):
+                object.__setattr__(self, name, value)
+                return
+            numbered = self._numbered(name)
+            if numbered is None or not self._document.has(self._at(numbered.name), False):
                 raise self._unknown(name, f"to be {value!r}")
-            object.__setattr__(self, name, value)
+            numbered.__set__(self, value)
 
     def __eq__(self, other: object) -> bool:
         return isinstance(other, Section) and (self._document, self._path) == (other._document, other._path)

@@ -88,6 +88,7 @@ void MapCanvas::showMap(MapEditor* editor, const std::optional<MapFrame>& frame)
   base_.reset();
   coarse_.reset();
   fine_.reset();
+  ++version_;
   isFitted_ = !frame;
   if (frame) {
     frame_ = *frame;
@@ -110,6 +111,10 @@ void MapCanvas::refresh() {
   if (!isSame(terrain, terrain_)) {
     terrain_ = std::move(terrain);
     ++version_;
+    if (terrain_.empty()) {
+      for (std::optional<TerrainPicture>* each : {&base_, &coarse_, &fine_}) each->reset();
+      scale_ = style_.scale;
+    }
     requestBase();
   }
   requestTerrain();

@@ -119,7 +119,10 @@ class MapCanvas final : public QWidget {
   void complete();
   void chooseLast(MapKind kind);
   void drop();
-  void edit(const std::function<std::string()>& change);
+  // Whether it was made.
+  bool edit(const std::function<std::string()>& change);
+  // Whether points of a feature can be edited one by one; says so where not.
+  bool hasAllPoints(const MapFeature& feature);
   void removeChosen();
   bool isPolyline(const MapFeature& feature) const;
 
@@ -132,6 +135,7 @@ class MapCanvas final : public QWidget {
   QPointF pressed_;
   QPointF last_;
   bool isPressed_ = false;
+  Qt::MouseButton button_ = Qt::NoButton;  // that is pressed
   bool isPanning_ = false;
   bool isDragged_ = false;
 

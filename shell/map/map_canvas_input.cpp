@@ -70,7 +70,10 @@ void MapCanvas::mousePressEvent(QMouseEvent* event) {
   last_ = event->position();
   if (editor_ == nullptr) return;
   if (event->button() != Qt::LeftButton && event->button() != Qt::MiddleButton) return;
+  // A second button does nothing while the first one is held.
+  if (isPressed_ && event->button() != button_ && event->buttons().testFlag(button_)) return;
   pressed_ = event->position();
+  button_ = event->button();
   isPressed_ = true;
   isDragged_ = false;
   isPanning_ = event->button() == Qt::MiddleButton;
@@ -80,6 +83,7 @@ void MapCanvas::mousePressEvent(QMouseEvent* event) {
 // What is under the pointer is held from now on, where it can be dragged.
 void MapCanvas::startDrag(QPointF at) {
   const MapPoint place = frame_.toMap(at);
+  if (!clicksOf(tool_)) grasp_.reset();
   if (tool_ == MapTool::nestedArea) {
     grasp_ = graspNestedArea(*editor_, place, [this](MapPoint corner, MapPoint opposite) {
       emit nestedAreaWanted(corner, opposite);
@@ -89,9 +93,10 @@ void MapCanvas::startDrag(QPointF at) {
   } else if (tool_ == MapTool::select) {
     const MapHit hit = drawing_.hit(frame_, at);
     if (hit.feature && hit.vertex && hit.feature == drawing_.selection.feature) {
+      const MapFeature& feature = *drawing_.feature(*hit.feature);
       drawing_.selection.vertex = hit.vertex;
       forgetPlaced();
-      grasp_ = graspVertex(*editor_, *drawing_.feature(*hit.feature), *hit.vertex);
+      if (feature.isComplete) grasp_ = graspVertex(*editor_, feature, *hit.vertex);
     } else if (!hit.feature && hit.isBorder && hit.area > 1) {
       grasp_ = graspArea(*editor_, *scene().area(hit.area), place);
     }
@@ -133,7 +138,7 @@ void MapCanvas::showCursor(QPointF at) {
 }
 
 void MapCanvas::mouseReleaseEvent(QMouseEvent* event) {
-  if (!isPressed_) return;
+  if (!isPressed_ || event->button() != button_) return;
   const bool wasPanning = isPanning_;
   const bool wasDragged = isDragged_;
   isPressed_ = false;
@@ -186,8 +191,8 @@ void MapCanvas::complete() {
   const std::unique_ptr<MapGrasp> grasp = std::move(grasp_);
   const std::optional<Clicks> clicks = clicksOf(tool_);
   const bool isNew = clicks || tool_ == MapTool::outputArea;
-  edit([&grasp] { return grasp->commit(); });
-  if (isNew) chooseLast(clicks ? clicks->kind : MapKind::outputMap);
+  const bool isMade = edit([&grasp] { return grasp->commit(); });
+  if (isNew && isMade) chooseLast(clicks ? clicks->kind : MapKind::outputMap);
 }
 
 // The new one is the last of its kind.
@@ -202,12 +207,18 @@ void MapCanvas::chooseLast(MapKind kind) {
   emit featureChosen(chosen);
 }
 
-void MapCanvas::edit(const std::function<std::string()>& change) {
+bool MapCanvas::edit(const std::function<std::string()>& change) {
   emit editing();
   const std::string fault = change();
   if (!fault.empty()) emit failed(QString::fromStdString(fault));
   emit edited();
   refresh();
+  return fault.empty();
+}
+
+bool MapCanvas::hasAllPoints(const MapFeature& feature) {
+  if (!feature.isComplete) emit failed(tr("Not all of its points have a place here: edit them on its page."));
+  return feature.isComplete;
 }
 
 bool MapCanvas::isPolyline(const MapFeature& feature) const {
@@ -233,8 +244,9 @@ void MapCanvas::mouseDoubleClickEvent(QMouseEvent* event) {
   const MapFeature* feature = hit.feature ? drawing_.feature(*hit.feature) : nullptr;
   if (tool_ != MapTool::select || feature == nullptr || !isPolyline(*feature) || hit.vertex || !hit.segment)
     return;
+  if (!hasAllPoints(*feature)) return;
   const MapPoint place = frame_.toMap(event->position());
-  edit([&, id = feature->id] { return editor_->insertVertex(id, *hit.segment + 1, place); });
+  if (!edit([&, id = feature->id] { return editor_->insertVertex(id, *hit.segment + 1, place); })) return;
   drawing_.selection.vertex = *hit.segment + 1;
   forgetPlaced();
 }
@@ -269,7 +281,8 @@ void MapCanvas::keyPressEvent(QKeyEvent* event) {
       }
       [[fallthrough]];
     case Qt::Key_Delete:
-      return removeChosen();
+      if (tool_ == MapTool::select) removeChosen();
+      return;
     case Qt::Key_Plus:
     case Qt::Key_Equal:
       return zoom(kKeyZoom);
@@ -300,6 +313,7 @@ void MapCanvas::removeChosen() {
   const MapFeature* feature = chosen.feature ? drawing_.feature(*chosen.feature) : nullptr;
   if (editor_ == nullptr || feature == nullptr) return;
   const bool isPoint = chosen.vertex && isPolyline(*feature);
+  if (isPoint && !hasAllPoints(*feature)) return;
   drawing_.selection.vertex.reset();
   edit([&] {
     return isPoint ? editor_->removeVertex(*chosen.feature, *chosen.vertex)

@@ -18,6 +18,8 @@ namespace gridbay::shell {
 namespace {
 
 constexpr auto kAreasPage = static_cast<std::int32_t>(PageId::bathymetry);
+constexpr auto kSourcesPage = static_cast<std::int32_t>(PageId::sourceAndSink);
+constexpr int kSinkColumn = 4;     // of that page, from 1
 constexpr double kFarthest = 1e5;  // metres above and below
 
 QIcon swatch(const QColor& colour) {
@@ -278,13 +280,18 @@ void MapDock::startPick() {
   if (!isVisible()) show();
   raise();
   follow();
+  if (tab_ == nullptr) return;
   pickCell_ = *cell;
   const std::int32_t page = tab_->currentPage();
   const int row = tab_->currentRow();
+  const int column = cell->column() + 1;
   // A point counts in the area that its row's feature stands on.
   pickArea_ = 1;
   for (const MapFeature& feature : canvas_->scene().features) {
-    if (feature.id.page == page && feature.row == row && feature.area > 0) pickArea_ = feature.area;
+    const bool isOf = feature.row > 0 ? feature.row == row : feature.column == column;
+    if (feature.id.page != page || !isOf || feature.area < 1) continue;
+    const bool isSink = page == kSourcesPage && column == kSinkColumn;
+    pickArea_ = isSink ? feature.lastArea : feature.area;
   }
   if (const MapArea* area = canvas_->scene().area(row); page == kAreasPage && area != nullptr && row > 1)
     pickArea_ = area->enclosing;
@@ -294,12 +301,13 @@ void MapDock::startPick() {
 }
 
 void MapDock::takePick(MapPoint place) {
-  if (tab_ == nullptr || !pickCell_.isValid()) return;
+  if (tab_ == nullptr || canvas_->editor() == nullptr || !pickCell_.isValid()) return;
   const std::optional<MapPick> pick = canvas_->editor()->pick(place, pickArea_);
   if (!pick) return emit failed(tr("There is no point of area %1.").arg(pickArea_));
   tab_->commit();
   const QModelIndex cell = pickCell_;
   pickCell_ = QPersistentModelIndex();
+  if (!cell.isValid()) return;
   const_cast<QAbstractItemModel*>(cell.model())
       ->setData(cell, QString::fromStdString(pointText(pick->point)), Qt::EditRole);
   tab_->pane().refresh();
@@ -307,10 +315,10 @@ void MapDock::takePick(MapPoint place) {
 }
 
 void MapDock::askNestedArea(MapPoint corner, MapPoint opposite) {
-  if (tab_ == nullptr) return;
+  if (tab_ == nullptr || canvas_->editor() == nullptr) return;
+  const QPointer<DocumentTab> tab = tab_;
   canvas_->setTool(MapTool::select);
-  MapEditor& editor = *canvas_->editor();
-  const AreaPlace place = editor.previewNestedArea(corner, opposite);
+  const AreaPlace place = canvas_->editor()->previewNestedArea(corner, opposite);
   const MapArea* enclosing = canvas_->scene().area(place.enclosing);
   const QString coarse = enclosing == nullptr ? QString() : QString::fromStdString(enclosing->file);
   QFileDialog open(this, tr("Raster that the area's grid is cut from"), QFileInfo(coarse).absolutePath());
@@ -322,7 +330,9 @@ void MapDock::askNestedArea(MapPoint corner, MapPoint opposite) {
   save.setAcceptMode(QFileDialog::AcceptSave);
   save.setDefaultSuffix("tsb2");
   if (save.exec() != QDialog::Accepted) return;
+  if (tab_ == nullptr || tab_ != tab || canvas_->editor() == nullptr) return;
   tab_->commit();
+  MapEditor& editor = *canvas_->editor();
   QProgressDialog progress(tr("Cutting the grid of the new area"), tr("Cancel"), 0, 100, this);
   progress.setWindowModality(Qt::WindowModal);
   const std::string fault =

@@ -110,6 +110,18 @@ TEST_F(AreaCommands, WhatCanNotBeDoneLeavesTheSetupAlone) {
   EXPECT_EQ(test::textOf(setup), before);
 }
 
+TEST_F(AreaCommands, AreasNeitherLieInACircleNorLoseTheirEnclosingArea) {
+  ASSERT_EQ(runTool({"area", "add", setup, folder.file("in.tsb2"), "--in", "2", "--at", "2,2"}).status, 0);
+  ProgramRun run = runTool({"area", "move", setup, "2", "--in", "3"});
+  EXPECT_EQ(run.status, 2);
+  EXPECT_THAT(run.err, HasSubstr("Area 2 can't lie in area 3, which lies in it"));
+  ASSERT_EQ(runTool({"area", "move", setup, "3", "--in", "1", "--at", "2,2"}).status, 0);
+  ASSERT_EQ(runTool({"area", "move", setup, "2", "--in", "3", "--at", "2,2"}).status, 0);
+  run = runTool({"area", "remove", setup, "3"});
+  EXPECT_EQ(run.status, 2);
+  EXPECT_THAT(run.err, HasSubstr("it encloses area 2"));
+}
+
 TEST_F(AreaCommands, RemovalTellsWhatStoodOnTheArea) {
   root().sourceSink->SetNoSources(1);
   root().sourceSink->at(1).sourceArea = 2;
@@ -172,7 +184,13 @@ TEST_F(MapCommands, ExportsThatCanNotBe) {
   ProgramRun run = runTool({"export", "gis", setup, folder.file("no/o.gpkg")});
   EXPECT_EQ(run.status, 2);
   EXPECT_THAT(run.err, HasSubstr("no/o.gpkg"));
-  EXPECT_EQ(runTool({"export", "gis", setup, setup, "--force"}).status, 2);
+  run = runTool({"export", "gis", setup, setup, "--force"});
+  EXPECT_EQ(run.status, 2);
+  EXPECT_THAT(run.err, HasSubstr("must end in .gpkg"));
+  fs::create_symlink(folder.file("a1.tsb2"), folder.file("a1.gpkg"));
+  run = runTool({"export", "gis", setup, folder.file("a1.gpkg"), "--force"});
+  EXPECT_EQ(run.status, 2);
+  EXPECT_THAT(run.err, HasSubstr("is a file that is read here"));
   fs::remove(folder.file("a1.tsb2"));
   run = runTool({"export", "gis", setup, out});
   EXPECT_EQ(run.status, 2);

@@ -301,6 +301,7 @@ TEST_F(BySlurm, AJobThatSlurmRefusesIsToldAndNothingRuns) {
   if (ran.status == kNoSlurm) GTEST_SKIP() << ran.err;
   EXPECT_EQ(ran.status, 2);
   EXPECT_THAT(ran.err, HasSubstr("invalid partition specified: nowhere"));
+  EXPECT_FALSE(fs::exists(out + "/run-1"));
 }
 
 }  // namespace cli_members_test

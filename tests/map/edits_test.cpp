@@ -77,6 +77,8 @@ TEST_F(MapEdits, AreasThatCanNotBeMoved) {
   document.Undo();
   root().bathymetry->hotStart = 1;
   EXPECT_THAT(map->moveArea(2, at(1, 1)), HasSubstr("hot start"));
+  if (!theEdition.wetlandSweepKit)
+    EXPECT_THAT(map->addNestedArea(at(11, 9), at(13, 10), "r.tif", "n.tsb2"), HasSubstr("hot start"));
   root().bathymetry->hotStart = 0;
   EXPECT_EQ(document.ModelState(), before);
 }
@@ -267,6 +269,9 @@ TEST_F(MapEdits, OutputsAndPolygonsOnTheGrid) {
   EXPECT_EQ(lastStep(), "Output 1, point 1");
   EXPECT_THAT(outputs.at(1).pointsJ, ElementsAre(2, 4));
   EXPECT_THAT(outputs.at(1).pointsK, ElementsAre(4, 5));
+  outputs.at(1).pointsJ = {2, 4.25};
+  EXPECT_THAT(map->moveVertex(id(MapKind::outputPoints, 1, 38), 0, at(3, 4)), IsEmpty());
+  EXPECT_THAT(outputs.at(1).pointsJ, ElementsAre(3, 4.25));
   EXPECT_THAT(map->removeVertex(id(MapKind::outputPoints, 1, 38), 0), IsEmpty());
   EXPECT_THAT(map->removeVertex(id(MapKind::outputPoints, 1, 38), 0), HasSubstr("keeps 1 points"));
   EXPECT_THAT(map->addFeature(MapKind::outputMap, {at(9, 8), at(3, 4)}), IsEmpty());

@@ -1,6 +1,7 @@
 #include "platform/side_by_side.h"
 
 #include <gtest/gtest.h>
+#include <pthread.h>
 #include <unistd.h>
 
 #include <csignal>
@@ -62,6 +63,29 @@ TEST(SideBySide, ACrashOrAnExceptionCostsOnePiece) {
                                        .processes = processes});
     EXPECT_EQ(results, (Results{{0, "0"}, {1, {}}, {2, "2"}, {3, "3"}, {4, {}}, {5, "5"}}));
   }
+}
+
+int doomedCopies = 0;
+bool isDoomed = false;
+
+TEST(SideBySide, ACopyThatEndsBeforeItBeginsCostsNothing) {
+  ASSERT_EQ(::pthread_atfork([] { isDoomed = doomedCopies > 0 && doomedCopies-- > 0; }, nullptr,
+                             [] {
+                               if (isDoomed) ::_exit(1);
+                             }),
+            0);
+  doomedCopies = 2;
+  const Results results =
+      resultsOf({.count = 3, .work = [](std::size_t i) { return std::to_string(i); }, .processes = 1});
+  EXPECT_EQ(results, (Results{{0, "0"}, {1, "1"}, {2, "2"}}));
+  // Those of which none comes to anything have an end.
+  doomedCopies = 1000;
+  const SideBySide task{.count = 3,
+                        .work = [](std::size_t) { return std::string(); },
+                        .took = [](std::size_t, const std::optional<std::string>&) {},
+                        .processes = 1};
+  EXPECT_FALSE(task.run());
+  doomedCopies = 0;
 }
 
 TEST(SideBySide, AStopFinishesWhatIsBegun) {

@@ -257,16 +257,20 @@ def test_the_tasks_of_a_module_are_known(setup):
     assert layers[3].areas[1].path.endswith("LAYER_3/AREA_1")
 
 
-def test_every_keyword_of_a_new_setup_has_an_attribute(kind):
-    setup = gridbay_setup.new(kind)
+FILLED = sorted((pathlib.Path(__file__).parents[1] / "main_job" / "setups").glob("*.v27*"))
+
+
+@pytest.mark.parametrize("source", ["v27", "v27wsk", *FILLED], ids=lambda source: getattr(source, "name", source))
+def test_every_keyword_has_an_attribute(source):
+    setup = gridbay_setup.new(source) if isinstance(source, str) else gridbay_setup.open(source)
 
     def names(section):
         held = {path.split("/")[0] for path in section.paths()} - {"OPTION_PARAMETERS"}
         known = section.fields()
         for name in sorted(held):
             step = name.split("[")[0].rstrip("0123456789")
-            assert any(field.name.lower() in (name.lower(), step.lower() + "{}", step.lower() + "[{}]")
-                       for field in known.values()), f"{section.path}/{name}"  # fmt: skip
+            meant = (name.lower(), step.lower() + "{}", step.lower() + "[{}]", step.lower() + "1")
+            assert any(field.name.lower() in meant for field in known.values()), f"{section.path}/{name}"
         for attribute, field in known.items():
             value = getattr(section, attribute) if not hasattr(field, "default") else None
             if hasattr(value, "fields") and field.name in held:
@@ -276,6 +280,18 @@ def test_every_keyword_of_a_new_setup_has_an_attribute(kind):
                     names(item)
 
     names(setup)
+
+
+def test_keywords_numbered_higher_than_those_of_a_new_setup(setup):
+    setup["NESTED_MODEL_GLOBALS/MODULE_SELECTION/Simulation_Type"] = 2
+    setup.advection_dispersion.component_specifications.no_of_components = 7
+    values = setup.advection_dispersion.open_boundary.boundaries[1]
+    values.constant_value_7 = 2.5
+    assert values["Constant_Value_7"] == values.constant_value_7 == 2.5
+    with pytest.raises(PathError, match="constant_value_8"):
+        values.constant_value_8 = 1
+    with pytest.raises(PathError):
+        values.constant_value_8
 
 
 def test_errors_go_through_pickle_and_copy():

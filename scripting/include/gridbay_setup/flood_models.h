@@ -26,8 +26,10 @@
 //
 // Threads: objects in different threads know nothing of each other; of the members that read data files one
 // runs at a time in a process. Members that are called on one object, or on objects that share a model, from
-// several threads run one after the other, each as a whole, in the order in which they come. What two threads
-// set is then a mixture that nobody decides; a position found before outputs were cleared finds none.
+// several threads run one after the other, each as a whole, in the order in which they come; only while a
+// message is shown others may go on. What two threads set is then a mixture that nobody decides; a position
+// found before outputs were cleared finds none. A message box that throws does so through the member, which
+// has done its work.
 
 namespace gridbay {
 class ScriptedModel;
