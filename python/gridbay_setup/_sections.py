@@ -83,34 +83,39 @@ class Section:
             f"{'did you mean' if near else 'there are'} {allowed}",
             self._path, name, allowed)  # fmt: skip
 
-    @classmethod
-    def _numbered(cls, name: str) -> Optional[Keyword[Any, Any]]:
-        """The keyword of an attribute that is numbered higher than those of a new setup, as constant_value_7."""
+    def _further(self, name: str) -> Optional[Keyword[Any, Any]]:
+        """The keyword of an attribute that no new setup has: one that is numbered higher, as constant_value_7, or one
+        that stands in this section alone."""
         stem, _, number = name.rpartition("_")
-        first = cls.fields().get(f"{stem}_1")
-        if not number.isdecimal() or not isinstance(first, Keyword) or not first.name.endswith("1"):
-            return None
-        return type(first)(first.name[:-1] + number, first.default, first.quantity, first.unit, first.label, first.page,
-                           first.choices, first.settable)  # fmt: skip
+        first = self.fields().get(f"{stem}_1")
+        if number.isdecimal() and isinstance(first, Keyword) and first.name.endswith("1"):
+            held = first.name[:-1] + number
+            if self._document.has(self._at(held), False):
+                return type(first)(held, first.default, first.quantity, first.unit, first.label, first.page,
+                                   first.choices, first.settable)  # fmt: skip
+        for path in self.paths():
+            if "/" not in path and path.lower() == name:
+                return Keyword(path)
+        return None
 
     if not TYPE_CHECKING:  # whose tools know what there is
 
         def __getattr__(self, name: str) -> Any:
-            if name.startswith("__"):
+            if name.startswith("_"):
                 raise AttributeError(name)
-            numbered = self._numbered(name)
-            if numbered is None or not self._document.has(self._at(numbered.name), False):
+            keyword = self._further(name)
+            if keyword is None:
                 raise self._unknown(name, "to read")
-            return numbered.__get__(self, type(self))
+            return keyword.__get__(self, type(self))
 
         def __setattr__(self, name: str, value: Any) -> None:
             if hasattr(type(self), name):
                 object.__setattr__(self, name, value)
                 return
-            numbered = self._numbered(name)
-            if numbered is None or not self._document.has(self._at(numbered.name), False):
+            keyword = self._further(name)
+            if keyword is None:
                 raise self._unknown(name, f"to be {value!r}")
-            numbered.__set__(self, value)
+            keyword.__set__(self, value)
 
     def __eq__(self, other: object) -> bool:
         return isinstance(other, Section) and (self._document, self._path) == (other._document, other._path)

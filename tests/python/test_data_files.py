@@ -67,11 +67,11 @@ def test_rasters_that_cannot_be_converted(raster, tmp_path, options, what):
 def test_files_in_the_way(raster, tmp_path):
     target = tmp_path / "r.tsb2"
     target.write_text("mine")
-    with pytest.raises(WrongValue, match="force=True replaces it"):
+    with pytest.raises(FileError, match="force=True replaces it"):
         gridbay_setup.convert_raster(raster, target, land=7)
     assert target.read_text() == "mine"
     gridbay_setup.convert_raster(raster, target, land=7, force=True)
-    with pytest.raises(WrongValue, match="gone.asc"):
+    with pytest.raises(FileError, match="gone.asc"):
         gridbay_setup.convert_raster(tmp_path / "gone.asc", tmp_path / "g.tsb2", land=7)
     with pytest.raises(TypeError):
         gridbay_setup.convert_raster(raster, tmp_path / "g.tsb2", land="high")
