@@ -333,7 +333,7 @@ void mapPlainRead(benchmark::State& state) {
 }
 
 // One frame of a pan and of a zoom, painted, while the finer picture is made beside it.
-void mapPan(benchmark::State& state) {
+void mapFrames(benchmark::State& state, const std::function<void(MapFrame& frame, int step)>& change) {
   Window window(NinePlaces::instance().setup());
   MapCanvas& canvas = window.map().canvas();
   window.map().show();
@@ -341,27 +341,23 @@ void mapPan(benchmark::State& state) {
   int step = 0;
   for (auto _ : state) {
     MapFrame frame = canvas.frame();
-    ++step;
-    frame.pan(QPointF(step / 40 % 2 == 0 ? 7 : -7, step / 80 % 2 == 0 ? 3 : -3));
+    change(frame, step++);
     canvas.setFrame(frame);
     canvas.repaint();
     QApplication::processEvents();
   }
 }
 
+void mapPan(benchmark::State& state) {
+  mapFrames(state, [](MapFrame& frame, int step) {
+    frame.pan(QPointF(step / 40 % 2 == 0 ? 7 : -7, step / 80 % 2 == 0 ? 3 : -3));
+  });
+}
+
 void mapZoom(benchmark::State& state) {
-  Window window(NinePlaces::instance().setup());
-  MapCanvas& canvas = window.map().canvas();
-  window.map().show();
-  waitFor(canvas);
-  int step = 0;
-  for (auto _ : state) {
-    MapFrame frame = canvas.frame();
-    frame.zoom(step++ / 60 % 2 == 0 ? 1.05 : 1 / 1.05, {300, 260});
-    canvas.setFrame(frame);
-    canvas.repaint();
-    QApplication::processEvents();
-  }
+  mapFrames(state, [](MapFrame& frame, int step) {
+    frame.zoom(step / 60 % 2 == 0 ? 1.05 : 1 / 1.05, {300, 260});
+  });
 }
 
 // A frame with 1,000 dikes, weirs and culverts in view.

@@ -10,9 +10,9 @@
 #include <fstream>
 #include <string>
 
-#include "benchmarks/no_host.h"
 #include "core/kdl_reader.h"
 #include "pages/grid_wnd.h"
+#include "pages/no_host.h"
 #include "setup/page_factory.h"
 #include "setup/setup_doc.h"
 #include "structures/dike.h"

@@ -7,11 +7,11 @@
 #include <fstream>
 
 #include "basic/bathymetry.h"
-#include "benchmarks/no_host.h"
 #include "ecology/constants.h"
 #include "ecology/model_definition.h"
 #include "pages/form_view.h"
 #include "pages/grid_wnd.h"
+#include "pages/no_host.h"
 #include "setup/page_factory.h"
 #include "setup/setup_doc.h"
 

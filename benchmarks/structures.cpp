@@ -6,11 +6,11 @@
 
 #include <filesystem>
 
-#include "benchmarks/no_host.h"
 #include "core/kdl_reader.h"
 #include "hydrodynamic/result.h"
 #include "pages/form_view.h"
 #include "pages/grid_wnd.h"
+#include "pages/no_host.h"
 #include "setup/global_kvs.h"
 #include "setup/page_factory.h"
 #include "setup/setup_doc.h"

@@ -17,6 +17,7 @@
 #include "ecology/model_definition.h"
 #include "pages/form_view.h"
 #include "pages/grid_wnd.h"
+#include "pages/no_host.h"
 #include "setup/gridbay_doc.h"
 #include "setup/member_keyword.h"
 #include "setup/page_factory.h"
@@ -24,23 +25,6 @@
 
 namespace gridbay::python {
 namespace {
-
-// There is nobody to be asked.
-class NobodyHost final : public SetupHost {
- public:
-  void show(const std::string&) override {}
-  bool askYesNo(const std::string&) override { return true; }
-  bool choose(CVdFileSelectorDlg&) override { return false; }
-  bool chooseFile(std::string_view, std::string_view, std::string*) override { return false; }
-  bool chooseSaveFile(std::string_view, std::string_view, std::string*) override { return false; }
-  bool chooseFileWithForm(const FileQuestion&, Form&, std::string*) override { return false; }
-  void doLongWork(std::string_view, const std::function<void(const Progress&)>&) override {}
-  bool editForm(std::string_view, Form&, const std::function<std::string()>&) override { return false; }
-  void openFile(const std::string&, int) override {}
-  void showMessages(const ValidationList&, unsigned) override {}
-  void startEngine(const EngineStart&) override {}
-  bool isShiftHeld() override { return false; }
-};
 
 struct Keyword {
   std::string path;
@@ -409,7 +393,7 @@ class Collector {
     }
   }
 
-  NobodyHost host_;
+  NoHost host_{true};
   std::unique_ptr<CGridbayDoc> document_;
   KeywordList list_;
   std::unordered_map<std::string, std::size_t> notes_;
