@@ -2,12 +2,18 @@
 # scripts/check-rooms holds its includes to these.
 #
 #   room(basic USES pages core platform SOURCES bathymetry.cpp ...)
+#
+# The sources of a room are compiled a few at a time: they include much the same, which costs more than they do.
+# What a source declares for itself alone has a name of its own in its room; APART compiles each by itself.
 function(room name)
-  cmake_parse_arguments(ROOM "" "" "USES;SOURCES;LIBRARIES" ${ARGN})
+  cmake_parse_arguments(ROOM "APART" "" "USES;SOURCES;LIBRARIES" ${ARGN})
   if(GRIDBAY_FUZZ)  # opens no page
     list(FILTER ROOM_SOURCES EXCLUDE REGEX "_(page|pages|dialog|factory|doc)\\.cpp$|navigation_tree")
   endif()
   add_library(gridbay_${name} STATIC ${ROOM_SOURCES})
+  if(NOT ROOM_APART)
+    set_target_properties(gridbay_${name} PROPERTIES UNITY_BUILD ON UNITY_BUILD_BATCH_SIZE 5)
+  endif()
   foreach(used ${ROOM_USES})
     target_link_libraries(gridbay_${name} PUBLIC gridbay_${used})
   endforeach()

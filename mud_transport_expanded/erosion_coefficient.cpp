@@ -6,22 +6,22 @@
 
 namespace gridbay {
 
-using Layer = CNmtExpErosionCoefficientComponentKvs;
+using Coefficient = CNmtExpErosionCoefficientComponentKvs;
 
-std::int32_t* Layer::findDescription(Layer& layer) {
-  auto* module = layer.parts<MudTransportExpandedParts>();
-  auto* found = module == nullptr ? nullptr : module->nmtExpErosionLayer->GetItem(layer.number());
+std::int32_t* Coefficient::findDescription(Coefficient& coefficient) {
+  auto* module = coefficient.parts<MudTransportExpandedParts>();
+  auto* found = module == nullptr ? nullptr : module->nmtExpErosionLayer->GetItem(coefficient.number());
   return found == nullptr ? nullptr : &found->description;
 }
 
-float* Layer::findPower(Layer& layer) {
-  auto* module = layer.parts<MudTransportExpandedParts>();
-  auto* found = module == nullptr ? nullptr : module->nmtExpPowerOfErosion->GetItem(layer.number());
+float* Coefficient::findPower(Coefficient& coefficient) {
+  auto* module = coefficient.parts<MudTransportExpandedParts>();
+  auto* found = module == nullptr ? nullptr : module->nmtExpPowerOfErosion->GetItem(coefficient.number());
   return found == nullptr ? nullptr : &found->power;
 }
 
-int Layer::number() const {
-  auto* layers = dynamic_cast<CNmtExpErosionCoefficientKvs*>(const_cast<Layer*>(this)->GetParent());
+int Coefficient::number() const {
+  auto* layers = dynamic_cast<CNmtExpErosionCoefficientKvs*>(const_cast<Coefficient*>(this)->GetParent());
   for (int place = 1; layers != nullptr && place <= layers->GetCount(); ++place) {
     if (layers->GetItem(place) == this) return place;
   }

@@ -5,8 +5,9 @@
 
 namespace gridbay {
 
+using Settlings = CNmtExpSettlingsKvs;
+
 void CNmtExpSettlingsDlg::DoDataExchange(Form& form) {
-  using Settlings = CNmtExpSettlingsKvs;
   const auto settlings = objectOf(&MudTransportExpandedParts::nmtExpSettlings);
   form.Radio("Settling velocity",
              Choices::numbered({"Include flocculation calculations", "Use constant settling velocity"}),

@@ -10,11 +10,11 @@
 namespace gridbay {
 namespace {
 
-using Object = CNhdCulvertObjectKvs;
+using Culvert = CNhdCulvertObjectKvs;
 
 constexpr std::array kLosses{"In flow+", "Out flow+", "Free flow+", "Bends+",
                              "In flow-", "Out flow-", "Free flow-", "Bends-"};
-static_assert(kLosses.size() == std::tuple_size_v<decltype(Object::headLoss)>);
+static_assert(kLosses.size() == std::tuple_size_v<decltype(Culvert::headLoss)>);
 
 }  // namespace
 
@@ -31,31 +31,31 @@ void CCulvertDataGrid::LayOut() {
   constexpr int kWidth = 75;
   constexpr int kLongWidth = 105;
   const auto culvert = RowsOf(&StructureParts::nhdCulvert);
-  const auto isOf = [culvert](Object::GeometryType type) {
+  const auto isOf = [culvert](Culvert::GeometryType type) {
     return [culvert, type](GridRow row) { return culvert(row)->geometryType == type; };
   };
-  const auto isCircular = isOf(Object::kCircular);
-  const auto isRectangular = isOf(Object::kRectangular);
-  List("Geometry Type", 140, culvert, &Object::geometryType,
+  const auto isCircular = isOf(Culvert::kCircular);
+  const auto isRectangular = isOf(Culvert::kRectangular);
+  List("Geometry Type", 140, culvert, &Culvert::geometryType,
        Choices::lines("Rectangular\r\nCircular\r\nIrregular, level-width"));
-  LevelWidthColumn(culvert).EnabledIf(isOf(Object::kIrregular)).header = "Geometry";
-  List("Section Type", 80, culvert, &Object::sectionType, Choices::lines("Closed\r\nOpen"))
+  LevelWidthColumn(culvert).EnabledIf(isOf(Culvert::kIrregular)).header = "Geometry";
+  List("Section Type", 80, culvert, &Culvert::sectionType, Choices::lines("Closed\r\nOpen"))
       .EnabledIf([isCircular](GridRow row) { return !isCircular(row); });
-  Number("Circular", kWidth, culvert, &Object::diameter, item::kLevel)
+  Number("Circular", kWidth, culvert, &Culvert::diameter, item::kLevel)
       .SubHeader("Diameter")
       .EnabledIf(isCircular);
-  Number("Rectangular", kWidth, culvert, &Object::sectionWidth, item::kLevel)
+  Number("Rectangular", kWidth, culvert, &Culvert::sectionWidth, item::kLevel)
       .SubHeader("Width")
       .HeaderSpan(2)
       .EnabledIf(isRectangular);
-  Number("", kWidth, culvert, &Object::sectionHeight, item::kLevel)
+  Number("", kWidth, culvert, &Culvert::sectionHeight, item::kLevel)
       .SubHeader("Height")
       .EnabledIf(isRectangular);
-  Number("Upstream invert", kLongWidth, culvert, &Object::upstreamInvert, item::kLevel);
-  Number("Downstream invert", kLongWidth, culvert, &Object::downstreamInvert, item::kLevel);
-  Number("Length", kWidth, culvert, &Object::length, item::kLevel);
-  Number("Mannings n", kWidth, culvert, &Object::manningN);
-  Integer("No of culverts", kWidth, culvert, &Object::numberOfCulverts).Right();
+  Number("Upstream invert", kLongWidth, culvert, &Culvert::upstreamInvert, item::kLevel);
+  Number("Downstream invert", kLongWidth, culvert, &Culvert::downstreamInvert, item::kLevel);
+  Number("Length", kWidth, culvert, &Culvert::length, item::kLevel);
+  Number("Mannings n", kWidth, culvert, &Culvert::manningN);
+  Integer("No of culverts", kWidth, culvert, &Culvert::numberOfCulverts).Right();
 }
 
 void CNHdCulvertDlg::DoDataExchange(Form& form) {

@@ -10,17 +10,17 @@
 namespace gridbay {
 namespace {
 
-using Object = CNhdWeirObjectKvs;
+using Weir = CNhdWeirObjectKvs;
 
 constexpr std::array kLosses{"In flow+", "Out flow+", "Free flow+", "In flow-", "Out flow-", "Free flow-"};
-static_assert(kLosses.size() == std::tuple_size_v<decltype(Object::headLoss)>);
+static_assert(kLosses.size() == std::tuple_size_v<decltype(Weir::headLoss)>);
 
 constexpr int kNoQuantity = 0;
 
 // In the order of the grid.
 Choices types() {
   return Choices::lines("Broad crested weir\r\nWeir formula 1\r\nWeir formula 2 (Honma)",
-                        {Object::kBroadCrested, Object::kFormula1, Object::kFormula2})
+                        {Weir::kBroadCrested, Weir::kFormula1, Weir::kFormula2})
       .Otherwise(0);
 }
 
@@ -29,7 +29,7 @@ Choices types() {
 void CWeirGrid::LayOut() {
   const auto weir = RowsOf(&StructureParts::nhdWeir);
   PlaceColumns(weir);
-  List("Type", 130, weir, &Object::type, types());
+  List("Type", 130, weir, &Weir::type, types());
   ValveColumn(weir);
   AlphaZeroColumn(weir);
   HeadLossColumns(texts::weirHeadLosses.format, kLosses,
@@ -39,31 +39,31 @@ void CWeirGrid::LayOut() {
 void CWeirDataGrid::LayOut() {
   constexpr int kWidth = 75;
   const auto weir = RowsOf(&StructureParts::nhdWeir);
-  const auto isOf = [weir](Object::Type type) {
+  const auto isOf = [weir](Weir::Type type) {
     return [weir, type](GridRow row) { return weir(row)->type == type; };
   };
-  const auto number = [&](const char* header, double Object::*value, int quantity) -> Column& {
+  const auto number = [&](const char* header, double Weir::*value, int quantity) -> Column& {
     return Number("", kWidth, weir, value, quantity).SubHeader(header);
   };
   // The first column of a group has the type that it is for above it.
-  const auto group = [](Column& column, Object::Type type, int columns) {
+  const auto group = [](Column& column, Weir::Type type, int columns) {
     column.HeaderSpan(columns).header = types().textOf(type);
   };
-  const auto broad = isOf(Object::kBroadCrested);
-  group(number("Datum", &Object::datum, item::kLevel).EnabledIf(broad), Object::kBroadCrested, 2);
+  const auto broad = isOf(Weir::kBroadCrested);
+  group(number("Datum", &Weir::datum, item::kLevel).EnabledIf(broad), Weir::kBroadCrested, 2);
   LevelWidthColumn(weir).SubHeader("Geometry").EnabledIf(broad);
 
-  const auto formula1 = isOf(Object::kFormula1);
-  group(number("Width", &Object::width1, item::kLevel).EnabledIf(formula1), Object::kFormula1, 5);
-  number("Height", &Object::height1, item::kLevel).EnabledIf(formula1);
-  number("Weir coeff.", &Object::coefficient1, item::kChezyNumber).EnabledIf(formula1);
-  number(" Weir exp.", &Object::exponent1, kNoQuantity).EnabledIf(formula1);
-  number("Invert level", &Object::invertLevel1, item::kLevel).EnabledIf(formula1);
+  const auto formula1 = isOf(Weir::kFormula1);
+  group(number("Width", &Weir::width1, item::kLevel).EnabledIf(formula1), Weir::kFormula1, 5);
+  number("Height", &Weir::height1, item::kLevel).EnabledIf(formula1);
+  number("Weir coeff.", &Weir::coefficient1, item::kChezyNumber).EnabledIf(formula1);
+  number(" Weir exp.", &Weir::exponent1, kNoQuantity).EnabledIf(formula1);
+  number("Invert level", &Weir::invertLevel1, item::kLevel).EnabledIf(formula1);
 
-  const auto formula2 = isOf(Object::kFormula2);
-  group(number("Width", &Object::width2, item::kLevel).EnabledIf(formula2), Object::kFormula2, 3);
-  number("Crest level", &Object::crestLevel2, item::kLevel).EnabledIf(formula2);
-  number("Weir coeff.", &Object::coefficient2, item::kChezyNumber).EnabledIf(formula2);
+  const auto formula2 = isOf(Weir::kFormula2);
+  group(number("Width", &Weir::width2, item::kLevel).EnabledIf(formula2), Weir::kFormula2, 3);
+  number("Crest level", &Weir::crestLevel2, item::kLevel).EnabledIf(formula2);
+  number("Weir coeff.", &Weir::coefficient2, item::kChezyNumber).EnabledIf(formula2);
 }
 
 void CNHdWeirDlg::DoDataExchange(Form& form) {

@@ -1,10 +1,10 @@
 #include "platform/cartography/cartography.h"
 
-#include <proj.h>
-
 #include <charconv>
 #include <cmath>
 #include <numbers>
+
+#include "platform/cartography/proj_objects.h"
 
 namespace gridbay {
 namespace {
@@ -12,16 +12,6 @@ namespace {
 constexpr std::string_view kLocal = "Local Coordinates";
 constexpr int kLocalId = 1;
 constexpr int kLongitudeLatitudeId = 2;
-
-struct FreeContext {
-  void operator()(PJ_CONTEXT* context) const { proj_context_destroy(context); }
-};
-struct FreeProjection {
-  void operator()(PJ* projection) const { proj_destroy(projection); }
-};
-using Projection = std::unique_ptr<PJ, FreeProjection>;
-
-void ignoreLog(void*, int, const char*) {}
 
 // "UTM-32" and "UTM-32S" as the code of the projection on WGS 84; other texts as they are.
 std::string libraryText(std::string_view text) {
@@ -40,22 +30,21 @@ std::string libraryText(std::string_view text) {
 
 struct CVdMapProjection::State {
   std::string text;
-  std::unique_ptr<PJ_CONTEXT, FreeContext> context;
-  Projection crs;
-  Projection fromGeographic;
+  proj::Context context;
+  proj::Object crs;
+  proj::Object fromGeographic;
 };
 
 CVdMapProjection::CVdMapProjection(std::string_view text) : state_(std::make_unique<State>()) {
   state_->text = text;
   if (IsLocal(text)) return;
-  state_->context.reset(proj_context_create());
+  state_->context = proj::quietContext();
   PJ_CONTEXT* context = state_->context.get();
-  proj_log_func(context, nullptr, ignoreLog);
-  Projection crs(proj_create(context, libraryText(text).c_str()));
+  proj::Object crs(proj_create(context, libraryText(text).c_str()));
   if (!crs || proj_is_crs(crs.get()) == 0) return;
-  const Projection geographic(proj_crs_get_geodetic_crs(context, crs.get()));
+  const proj::Object geographic(proj_crs_get_geodetic_crs(context, crs.get()));
   if (geographic) {
-    const Projection there(
+    const proj::Object there(
         proj_create_crs_to_crs_from_pj(context, geographic.get(), crs.get(), nullptr, nullptr));
     if (there) state_->fromGeographic.reset(proj_normalize_for_visualization(context, there.get()));
   }

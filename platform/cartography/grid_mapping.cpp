@@ -1,25 +1,17 @@
 #include "platform/cartography/grid_mapping.h"
 
-#include <proj.h>
-
 #include <array>
 #include <cmath>
 #include <memory>
 #include <numbers>
 #include <span>
 
+#include "platform/cartography/proj_objects.h"
+
 namespace gridbay {
 namespace {
 
-struct FreeContext {
-  void operator()(PJ_CONTEXT* context) const { proj_context_destroy(context); }
-};
-struct FreeObject {
-  void operator()(PJ* object) const { proj_destroy(object); }
-};
-using Object = std::unique_ptr<PJ, FreeObject>;
-
-void ignoreLog(void*, int, const char*) {}
+using proj::Object;
 
 // A parameter of a method, by the code of the EPSG data base, and the attribute that it stands in.
 struct Parameter {
@@ -201,8 +193,7 @@ class Reader {
 }  // namespace
 
 std::optional<GridMapping> gridMappingOf(std::string_view wkt) {
-  const std::unique_ptr<PJ_CONTEXT, FreeContext> context(proj_context_create());
-  proj_log_func(context.get(), nullptr, ignoreLog);
+  const proj::Context context = proj::quietContext();
   const Object crs(proj_create(context.get(), std::string(wkt).c_str()));
   GridMapping mapping;
   if (!crs || !Reader(context.get(), mapping).read(crs.get())) return std::nullopt;

@@ -1,27 +1,13 @@
 #include "platform/cartography/transformation.h"
 
-#include <proj.h>
-
 #include "platform/cartography/cartography.h"
+#include "platform/cartography/proj_objects.h"
 
 namespace gridbay {
-namespace {
-
-struct FreeContext {
-  void operator()(PJ_CONTEXT* context) const { proj_context_destroy(context); }
-};
-struct FreeProjection {
-  void operator()(PJ* projection) const { proj_destroy(projection); }
-};
-using Projection = std::unique_ptr<PJ, FreeProjection>;
-
-void ignoreLog(void*, int, const char*) {}
-
-}  // namespace
 
 struct Transformation::State {
-  std::unique_ptr<PJ_CONTEXT, FreeContext> context;
-  Projection way;
+  proj::Context context;
+  proj::Object way;
 };
 
 Transformation::Transformation(std::string_view from, std::string_view to)
@@ -29,10 +15,9 @@ Transformation::Transformation(std::string_view from, std::string_view to)
   const std::string source = CVdMapProjection(from).Wkt2();
   const std::string target = CVdMapProjection(to).Wkt2();
   if (source.empty() || target.empty()) return;
-  state_->context.reset(proj_context_create());
+  state_->context = proj::quietContext();
   PJ_CONTEXT* context = state_->context.get();
-  proj_log_func(context, nullptr, ignoreLog);
-  const Projection way(proj_create_crs_to_crs(context, source.c_str(), target.c_str(), nullptr));
+  const proj::Object way(proj_create_crs_to_crs(context, source.c_str(), target.c_str(), nullptr));
   if (way) state_->way.reset(proj_normalize_for_visualization(context, way.get()));
 }
 
