@@ -2,7 +2,9 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <cmath>
+#include <memory>
 #include <optional>
 #include <span>
 #include <string>
@@ -31,6 +33,18 @@ std::string commandLineText(const std::string& tool, std::span<const char* const
   }
   return text;
 }
+
+// Help without the parser's own marks: the usage tells what is needed, and a refusal what excludes what.
+class HelpFormatter final : public CLI::Formatter {
+ public:
+  std::string make_option_opts(const CLI::Option* option) const override {
+    constexpr std::string_view kNeeded = " REQUIRED";
+    std::string text = Formatter::make_option_opts(option);
+    text.erase(std::min(text.find(" Excludes:"), text.size()));
+    if (text.ends_with(kNeeded)) text.erase(text.size() - kNeeded.size());
+    return text;
+  }
+};
 
 }  // namespace
 
@@ -65,6 +79,7 @@ int runCommandLine(int argc, const char* const* argv, std::ostream& out, std::os
                     std::string(theEdition.editorName.format) +
                     ".\nExit status: 0 clean, 1 faults found, 2 could not do it.",
                 std::string(toolName()));
+  tool.formatter(std::make_shared<HelpFormatter>());
   tool.set_version_flag("--version", GRIDBAY_VERSION);
   tool.require_subcommand(1);
   Action action;

@@ -101,12 +101,13 @@ int run(const Options& options, const Console& console) {
 
 void addRun(CLI::App& tool, Action& action) {
   std::shared_ptr<Options> options;
-  CLI::App& command = addCommand(
-      tool, action, "run",
-      "Checks setups and hands them to the engine. Of one setup the exit status is the engine's, or 1 "
-      "for one with faults. Several run side by side, as many as there are cores, with what each "
-      "engine says in a folder \"run-N\" beside them; the exit status is 1 when one failed",
-      run, options);
+  CLI::App& command =
+      addCommand(tool, action, "run", "Checks setups and hands them to the engine", run, options);
+  command.footer(
+      "Of one setup the exit status is the engine's, or 1 for one with faults. Several run side by side, as "
+      "many as there are cores, with what each engine says in a folder \"run-N\" beside them; the exit "
+      "status "
+      "is 1 when one failed.");
   CLI::Option* files = command.add_option("FILE", options->files, "The setups, as they are saved");
   CLI::Option* force = command.add_flag("--force", options->force, "Start them with their faults too");
   CLI::Option* engine = command.add_option(

@@ -34,6 +34,8 @@ set(CPACK_STRIP_FILES ON)
 set(CPACK_INSTALL_DEFAULT_DIRECTORY_PERMISSIONS OWNER_READ OWNER_WRITE OWNER_EXECUTE GROUP_READ GROUP_EXECUTE WORLD_READ WORLD_EXECUTE)
 
 set(CPACK_PACKAGE_NAME gridbay-setup)
+# Each package has its own: the first line of its description.
+set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "")
 set(CPACK_PACKAGE_VENDOR "Gridbay Setup developers")
 set(CPACK_PACKAGE_CONTACT "Gridbay Setup developers <developers@gridbay.invalid>")
 set(CPACK_DEBIAN_FILE_NAME DEB-DEFAULT)
@@ -44,7 +46,8 @@ set(CPACK_DEBIAN_COMPRESSION_TYPE xz)
 set(CPACK_DEBIAN_GRIDBAY-SETUP_PACKAGE_NAME gridbay-setup)
 set(CPACK_DEBIAN_GRIDBAY-SETUP_PACKAGE_SECTION science)
 set(CPACK_DEBIAN_GRIDBAY-SETUP_DESCRIPTION
-    "Prepares the input of a two-dimensional free-surface flow model: the grids
+    "Setup editor of a nested-grid flow model
+Prepares the input of a two-dimensional free-surface flow model: the grids
 and how they nest, open boundaries, sources, rain and wind, resistance,
 structures, what is written, and where wanted the transport of dissolved
 components, mud, or an ecological model. It checks all of that and keeps it
@@ -58,15 +61,17 @@ set(CPACK_DEBIAN_GRIDBAY-SETUP_PACKAGE_SUGGESTS "libgridbay-setup-dev, python3-g
 set(CPACK_DEBIAN_LIBGRIDBAY-SETUP-DEV_PACKAGE_NAME libgridbay-setup-dev)
 set(CPACK_DEBIAN_LIBGRIDBAY-SETUP-DEV_PACKAGE_SECTION libdevel)
 set(CPACK_DEBIAN_LIBGRIDBAY-SETUP-DEV_DESCRIPTION
-    "The libraries by which other programs make, fill and check setups, one for
-each edition of the model, with their header, a CMake package and a file for
+    "Libraries to make setups of a nested-grid flow model
+The libraries by which other programs make, fill and check setups, one for
+each edition of the model, with their headers, a CMake package and a file for
 pkg-config.")
 set(CPACK_DEBIAN_LIBGRIDBAY-SETUP-DEV_PACKAGE_RECOMMENDS "gridbay-setup (= ${PROJECT_VERSION})")
 
 set(CPACK_DEBIAN_PYTHON3-GRIDBAY-SETUP_PACKAGE_NAME python3-gridbay-setup)
 set(CPACK_DEBIAN_PYTHON3-GRIDBAY-SETUP_PACKAGE_SECTION python)
 set(CPACK_DEBIAN_PYTHON3-GRIDBAY-SETUP_DESCRIPTION
-    "A module to make, fill, check and walk through setups, to convert rasters and
+    "Python module for setups of a nested-grid flow model
+A module to make, fill, check and walk through setups, to convert rasters and
 series, and to reach the values of grids as arrays.")
 # The raster reader and the templates are in the package of the programs.
 set(CPACK_DEBIAN_PYTHON3-GRIDBAY-SETUP_PACKAGE_DEPENDS

@@ -57,7 +57,8 @@ class [[gnu::visibility("default")]] FloodModel {
   // whatever happened.
   void LoadFile(std::string fileName);
   // Shows what validation finds, if anything, and writes the setup all the same. Why a file can't be written
-  // is shown too; it is then as it was. Options of the engine, which a loaded file may have, are not written.
+  // is shown too; it is then as it was. Options of the engine and sections of another version, which a loaded
+  // file may have, are not written.
   void SaveFile(std::string fileName);
   // ".v27", in both editions.
   std::string GetFileExtension();
