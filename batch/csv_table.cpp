@@ -2,6 +2,7 @@
 
 #include <csv.h>
 
+#include <algorithm>
 #include <memory>
 #include <new>
 
@@ -42,6 +43,15 @@ Result<std::vector<CsvRow>> readCsv(const std::string& path) {
   const Result<FileText> text = readFile(path);
   if (!text) return Failure{text.error()};
   std::string_view rest = text->view();
+  if (rest.starts_with("\xFF\xFE") || rest.starts_with("\xFE\xFF"))
+    return Failure{"cannot read \"" + path + "\": it is in UTF-16; save it in UTF-8"};
+  // Of one kind of line ends alone.
+  std::string lines;
+  if (rest.find('\n') == rest.npos) {
+    lines = rest;
+    std::ranges::replace(lines, '\r', '\n');
+    rest = lines;
+  }
   constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
   if (rest.starts_with(kByteOrderMark)) rest.remove_prefix(kByteOrderMark.size());
 

@@ -64,6 +64,23 @@ class MemberMaker {
 
   SetupFile& setup() { return setup_; }
 
+  // A path that no member gives a value would pass whatever it says.
+  Outcome findUnused() {
+    const EnsembleTable& table = ensemble_.table;
+    for (std::size_t i = 0; i < columns_.size(); ++i) {
+      const bool isUsed = std::ranges::any_of(
+          table.members, [i](const EnsembleTable::Member& member) { return !member.values[i].empty(); });
+      if (isUsed) continue;
+      const KvsHandle tree = setup_.tree(ensemble_.base);
+      const Result<const Node*> found =
+          findPath(isOption(table.paths[i]) ? setup_.source() : *tree, table.paths[i]);
+      if (!found)
+        return Failure{
+            fmt::format("{}, column {}: {}", table.path, table.firstPathColumn + i, found.error())};
+    }
+    return {};
+  }
+
   // Gives the model the member's values; the error of the first one that can't be set has its place.
   Outcome set(const EnsembleTable::Member& member) {
     setup_.model().AssignState(plain_);
@@ -177,6 +194,21 @@ Outcome mayWriteAll(const Ensemble& ensemble) {
   return {};
 }
 
+// Setups in the folder that are none of its members, as of an ensemble that was there before.
+std::size_t othersIn(const Ensemble& ensemble) {
+  std::set<std::string> own;
+  for (const EnsembleTable::Member& member : ensemble.table.members)
+    own.insert(fs::path(ensemble.fileOf(member)).filename().string());
+  std::error_code error;
+  std::size_t others = 0;
+  const std::string kind = fmt::format(".{}", theEdition.fileKind);
+  for (fs::directory_iterator at(ensemble.folder, error), end; !error && at != end; at.increment(error)) {
+    const fs::path name = at->path().filename();
+    if (name.extension() == kind && !own.contains(name.string())) ++others;
+  }
+  return others;
+}
+
 Outcome makeFolder(const std::string& folder) {
   std::error_code error;
   fs::create_directories(folder, error);
@@ -239,6 +271,7 @@ Result<EnsembleResult> makeEnsemble(const Ensemble& ensemble, MessageHost& host,
   for (const std::string& section : base->unknownSections())
     host.show("Warning: this version does not know section " + section + ", which the members do not have");
   MemberMaker maker(ensemble, std::move(*base));
+  if (const Outcome found = maker.findUnused(); !found) return Failure{found.error()};
   if (const Outcome tried = tryAll(ensemble, maker, watch); !tried) return Failure{tried.error()};
   if (const Outcome made = makeFolder(ensemble.folder); !made) return Failure{made.error()};
   for (const std::string& folder : maker.resultFolders()) {
@@ -277,6 +310,7 @@ Result<EnsembleResult> makeEnsemble(const Ensemble& ensemble, MessageHost& host,
   if (!ran) return Failure{ran.error()};
 
   EnsembleResult result;
+  result.others = othersIn(ensemble);
   for (std::optional<MemberReport>& report : reports) {
     if (report) result.members.push_back(*std::move(report));
   }

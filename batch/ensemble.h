@@ -26,6 +26,7 @@ struct Ensemble {
 struct EnsembleResult {
   std::vector<MemberReport> members;  // those that were made, in the order of the table
   bool isStopped = false;             // before all of them were
+  std::size_t others = 0;             // setups in the folder that are none of the table's members
 };
 
 // Makes the members and checks them, side by side on as many cores as there are, and writes both reports.

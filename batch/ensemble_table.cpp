@@ -61,8 +61,9 @@ Outcome takeMembers(EnsembleTable& table, std::vector<CsvRow> rows, std::size_t 
         hasNames ? row.cells.front() : fmt::format("{}_{:0{}}", stem, table.members.size() + 1, digits);
     if (row.cells.size() != cells) {
       const std::size_t column = std::min(row.cells.size(), cells) + 1;
-      return Failure{fmt::format("{}, column {}: the row has {} cells where the first one has {}",
-                                 table.placeOf(member), column, row.cells.size(), cells)};
+      return Failure{fmt::format("{}, column {}: the row has {} cell{} where the first one has {}",
+                                 table.placeOf(member), column, row.cells.size(),
+                                 row.cells.size() == 1 ? "" : "s", cells)};
     }
     const auto fail = [&](const std::string& why) {
       return Failure{fmt::format("{}, line {}, column 1: {}", table.path, row.line, why)};

@@ -38,6 +38,9 @@ int ensemble(const Options& options, const Console& console) {
   console.out << fmt::format("{}: {} member{}, {} with faults; see {}\n", options.folder,
                              result->members.size(), result->members.size() == 1 ? "" : "s", faulty,
                              asked.csvReport());
+  if (result->others > 0)
+    console.note(fmt::format("{} holds {} other setup{}, of which the reports tell nothing", options.folder,
+                             result->others, result->others == 1 ? "" : "s"));
   if (result->isStopped)
     return console.fail(
         fmt::format("Stopped before the other {}", asked.table.members.size() - result->members.size()));

@@ -47,6 +47,8 @@ struct ListMember {
 // The row of the count. A count that the file lacks is 0, and a negative one leaves the list as it is.
 template <class List>
 struct CountRow {
+  static constexpr int kMost = kMostItems;
+
   std::string_view name;
   List list;
 
@@ -64,7 +66,7 @@ struct CountRow {
   void set(auto& object, KvsSection from, const std::string&) const {
     int count = -1;
     kvsGetParam(from, name, &count, 1, 1);
-    if (count <= kMostItems) list.setCount(object, count);
+    if (count <= kMost) list.setCount(object, count);
   }
 };
 constexpr CountRow<OwnList> count(std::string_view name) {

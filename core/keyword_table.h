@@ -58,6 +58,7 @@ bool accessRow(const Row& row, auto& object, std::string_view path, PathAccess& 
     return row.access(object, path, access);
   } else if constexpr (requires { row.name; }) {
     if (access.onlySections || !sameName(path, row.name)) return false;
+    if constexpr (requires { Row::kMost; }) access.most = Row::kMost;
     if (access.what == PathAccess::What::write) row.save(object, *access.out, *access.documentPath);
     if (access.what != PathAccess::What::set) return true;
     if constexpr (requires { row.set(object, access.in, *access.documentPath); }) {

@@ -47,6 +47,7 @@ struct PathAccess {
   // What was found.
   bool isSection = false;
   bool takesAnyNumber = false;  // of values
+  int most = 0;                 // that it can be, of a count; 0 for no count
   bool isPinned = false;        // by the edition: it was not set
   bool isWrittenOnly = false;   // it follows from other values: it was not set
 };

@@ -125,8 +125,11 @@ class Document {
         valuesOf(given, keyword->node(), keyword->takesAnyNumber(), path, keeper);
     if (keyword->set(values)) return;
     const std::string stays = shownValues(keyword->node());
-    throw Refusal{kWrongValue, fmt::format("{} cannot be {} here: it stays {}", path, shown(given), stays),
-                  path, shown(given), stays};
+    const std::string allowed = keyword->allowed(values);
+    throw Refusal{
+        kWrongValue,
+        fmt::format("{} cannot be {} here: it stays {}; allowed is {}", path, shown(given), stays, allowed),
+        path, shown(given), allowed};
   }
 
   // Whether a path leads to a section or keyword of the model; of a name that is both, `section` asks for the

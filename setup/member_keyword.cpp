@@ -3,6 +3,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <cmath>
 
 #include "core/number_text.h"
 #include "setup/setup_path.h"
@@ -18,6 +19,12 @@ bool stands(const Node& keyword, const std::vector<Value>& wanted) {
   });
 }
 
+bool areFinite(const std::vector<Value>& values) {
+  return std::ranges::all_of(values, [](const Value& value) {
+    return value.kind() != ValueKind::real || std::isfinite(floatOfText(value.text()).value_or(0));
+  });
+}
+
 }  // namespace
 
 bool MemberKeyword::write() {
@@ -25,6 +32,7 @@ bool MemberKeyword::write() {
   PathAccess access{PathAccess::What::write, written_.get(), nullptr, &documentPath_};
   const bool found = model_->AccessPath(path_, access) && !access.isSection;
   takesAnyNumber_ = access.takesAnyNumber;
+  most_ = access.most;
   return found && written_->tree().root().first() != nullptr;
 }
 
@@ -37,6 +45,7 @@ void MemberKeyword::take(std::string_view name, std::span<const Value> values) {
 }
 
 bool MemberKeyword::set(const std::vector<Value>& values) {
+  if (!areFinite(values)) return false;
   const KvsHandle before = std::move(written_);
   const Node& keyword = *before->tree().root().first();
   take(keyword.name(), values);
@@ -44,6 +53,12 @@ bool MemberKeyword::set(const std::vector<Value>& values) {
   take(keyword.name(), keyword.values());
   write();
   return false;
+}
+
+std::string MemberKeyword::allowed(const std::vector<Value>& refused) const {
+  if (!areFinite(refused)) return "a finite number";
+  if (most_ > 0) return fmt::format("0 to {}", most_);
+  return shownValues(node());
 }
 
 Result<MemberKeyword> findKeyword(CGlobalKvs& model, std::string_view path, const std::string& documentPath) {

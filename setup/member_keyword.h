@@ -18,8 +18,11 @@ class MemberKeyword {
   const Node& node() const { return *written_->tree().root().first(); }
   bool takesAnyNumber() const { return takesAnyNumber_; }
   // Gives the member other values, of the kinds that it has. False, with its old values, when they do
-  // not stand then, as where an edition has its own.
+  // not stand then, as where an edition has its own, or are no finite numbers.
   bool set(const std::vector<Value>& values);
+  // What it takes beside the kinds of its values, for people: "a finite number", "0 to 65535", the values
+  // that it has where it takes no others.
+  std::string allowed(const std::vector<Value>& refused) const;
 
  private:
   friend Result<MemberKeyword> findKeyword(CGlobalKvs& model, std::string_view path,
@@ -33,6 +36,7 @@ class MemberKeyword {
   std::string documentPath_;
   KvsHandle written_;
   bool takesAnyNumber_ = false;
+  int most_ = 0;  // of a count
 };
 
 // An error when the model has no such keyword, or when its value follows from others.

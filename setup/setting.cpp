@@ -41,8 +41,8 @@ Outcome applySetting(CGlobalKvs& model, const Setting& setting, const std::strin
       valuesOfText(keyword->node(), setting.value, keyword->takesAnyNumber(), keeper);
   if (!values) return Failure{values.error()};
   if (keyword->set(*values)) return {};
-  return Failure{fmt::format("{} cannot be {} here: it stays {}", setting.path, setting.value,
-                             shownValues(keyword->node()))};
+  return Failure{fmt::format("{} cannot be {} here: it stays {}; allowed is {}", setting.path, setting.value,
+                             shownValues(keyword->node()), keyword->allowed(*values))};
 }
 
 Result<Setting> settingOf(const std::string& text) {

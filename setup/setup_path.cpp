@@ -157,7 +157,8 @@ Result<std::vector<Value>> valuesOfText(const Node& keyword, std::string_view te
   };
   if (now.size() == 1 && isText(now.front())) pieces = {text};
   if (pieces.size() != now.size() && !takesAnyNumber) {
-    return Failure{fmt::format("{} takes {} values, not {}", keyword.name(), now.size(), pieces.size())};
+    return Failure{fmt::format("{} takes {} value{}, not {}", keyword.name(), now.size(),
+                               now.size() == 1 ? "" : "s", pieces.size())};
   }
   std::vector<Value> values;
   for (std::size_t i = 0; i < pieces.size(); ++i) {

@@ -44,6 +44,7 @@ TEST(EnsembleTable, HasNamesOrGivesThem) {
   EXPECT_EQ(read("\xEF\xBB\xBF"
                  "Member;A\r\n\r\nm ; 1,5 \r\n"),
             "2 A|3 m,1,5");
+  EXPECT_EQ(read("name,A\rnorth,1\rsouth,\r"), "2 A|2 north,1|3 south,");
   EXPECT_EQ(read("\tA\nm\t\"a \"\"b\"\"\nc\"\nn\t2"), "2 A|2 m,a \"b\"\nc|4 n,2");
   std::string ten = "A\n";
   for (int i = 0; i < 10; ++i) ten += "1\n";
@@ -64,6 +65,7 @@ TEST(EnsembleTable, SaysWhereItIsWrong) {
   const std::string longName(300, 'n');
   const std::vector<std::pair<std::string, std::string>> cases{
       {"name,A,B\nm,1\n", ", line 2 (m), column 3: the row has 2 cells where the first one has 3"},
+      {"name,A\nm\n", ", line 2 (m), column 2: the row has 1 cell where the first one has 2"},
       {"name,A\nm,1,2\n", ", line 2 (m), column 3: the row has 3 cells where the first one has 2"},
       {"name,A,\nm,1,2\n", ", line 1, column 3: a column needs a path"},
       {"A,B,a\n1,2,3\n", ", line 1, column 3: \"a\" has column 1 already"},
@@ -80,6 +82,8 @@ TEST(EnsembleTable, SaysWhereItIsWrong) {
       {"name,A\n" + longName + ",1\n", ", line 2, column 1: a name has 231 bytes at most, not 300"},
   };
   for (const auto& [text, expected] : cases) EXPECT_EQ(error(text), file + expected);
+  EXPECT_EQ(error(std::string("\xFF\xFEn\0a\0", 6)),
+            "cannot read \"" + file + "\": it is in UTF-16; save it in UTF-8");
   EXPECT_EQ(error("name,A\nm,\"1\n2"), "cannot read \"" + file + "\": line 2: a quote is not closed");
   EXPECT_EQ(error("name,A\nm,1\"2\n"),
             "cannot read \"" + file +
@@ -204,9 +208,13 @@ TEST_F(EnsembleMaking, EachErrorHasItsLineAndColumnAndNothingIsMade) {
   const std::string file = folder.file("table.csv");
   EXPECT_EQ(errorOf("name," + kDrying + "," + kDrying + "x\nm,wet,1\nn,0.1,\no,1 2,\np,,2\n"),
             file + ", line 2 (m), column 2 (" + kDrying + "): Drying_Depth takes a number, not \"wet\"\n" +
-                file + ", line 4 (o), column 2 (" + kDrying + "): Drying_Depth takes 1 values, not 2\n" +
+                file + ", line 4 (o), column 2 (" + kDrying + "): Drying_Depth takes 1 value, not 2\n" +
                 file + ", line 5 (p), column 3 (" + kDrying + "x): There is no \"" + kDrying +
                 "x\" in this setup; did you mean \"" + kDrying + "\"?");
+  EXPECT_EQ(
+      errorOf("name," + kDrying + "," + kDrying + "x\nm,0.1,\n"),
+      file + ", column 3: There is no \"" + kDrying + "x\" in this setup; did you mean \"" + kDrying + "\"?");
+  EXPECT_THAT(errorOf("name," + kDrying + "\nm,1e400\n"), HasSubstr("allowed is a finite number"));
   EXPECT_THAT(filesMade(), IsEmpty());
   std::string many = kDrying + "\n";
   for (int i = 0; i < 50; ++i) many += "x\n";
@@ -240,6 +248,10 @@ TEST_F(EnsembleMaking, WhatIsThereIsReplacedByForceOnly) {
   const Result<EnsembleResult> forced = make("name," + kDrying + "\nn,0.3\n", true);
   ASSERT_TRUE(forced) << forced.error();
   EXPECT_NE(memberText("n"), before);
+  EXPECT_EQ(forced->others, 0U);
+  const Result<EnsembleResult> other = make("name," + kDrying + "\no,0.3\n", true);
+  ASSERT_TRUE(other) << other.error();
+  EXPECT_EQ(other->others, 1U);
   // Never the setup that is read.
   Result<EnsembleTable> read =
       readEnsembleTable(folder.write("table.csv", "name," + kDrying + "\nbase,1\n"), "b");

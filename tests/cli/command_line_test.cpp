@@ -314,10 +314,14 @@ TEST_F(Tool, ASettingThatCannotBeLeavesTheFile) {
               HasSubstr("is a section; name a keyword in it"));
   EXPECT_THAT(refused("NESTED_MODEL_GLOBALS"), HasSubstr("is not of the form PATH=VALUE"));
   EXPECT_THAT(refused("NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/Number_Of_Sources=-3"),
-              HasSubstr("cannot be -3 here: it stays 0"));
+              HasSubstr("cannot be -3 here: it stays 0; allowed is 0 to 65535"));
+  for (const char* number : {"1e400", "inf", "1e39"})
+    EXPECT_THAT(refused(std::string("NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Flooding_Depth=") + number),
+                HasSubstr("allowed is a finite number"))
+        << number;
   if (theEdition.wetlandSweepKit) {
     EXPECT_THAT(refused("NESTED_MODEL_GLOBALS/MODULE_SELECTION/Simulation_Type=2"),
-                HasSubstr("cannot be 2 here: it stays 0"));
+                HasSubstr("cannot be 2 here: it stays 0; allowed is 0"));
   }
   EXPECT_EQ(textOf(setup), before);
 }

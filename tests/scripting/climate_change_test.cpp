@@ -61,50 +61,78 @@ struct Family {
   UTsbSelection& (*file)(Climate&);
 };
 
-const Family kFamilies[] = {{"precipitation", &CClimateChange_V27::GetNoPrecValues,
-                             &CClimateChange_V27::GetPrecValues, &CClimateChange_V27::SetPrecValues,
-                             &CClimateChange_V27::GetNoPrecTimeSeries, &CClimateChange_V27::GetPrecFileItem,
-                             &CClimateChange_V27::SetPrecFile, &CClimateChange_V27::GetNoPrecGridSeries,
-                             &CClimateChange_V27::GetPrecGridFileItem, &CClimateChange_V27::SetPrecGridFile,
-                             [](Climate& it) -> auto& {return it.flows().precipitationKind;
-}  // namespace
-, {0, 1, 2}, [](Climate& it) -> auto& {
+std::int32_t& precipitationKind(Climate& it) {
+  return it.flows().precipitationKind;
+}
+float& precipitation(Climate& it) {
   return it.flows().precipitation;
 }
-, [](Climate& it) -> auto& {
+UTsbSelection& precipitationFile(Climate& it) {
   return it.flows().precipitationFile;
 }
-}  // namespace gridbay
-, {"evaporation", &CClimateChange_V27::GetNoEvapValues, &CClimateChange_V27::GetEvapValues,
-   &CClimateChange_V27::SetEvapValues, &CClimateChange_V27::GetNoEvapTimeSeries,
-   &CClimateChange_V27::GetEvapFileItem, &CClimateChange_V27::SetEvapFile,
-   &CClimateChange_V27::GetNoEvapGridSeries, &CClimateChange_V27::GetEvapGridFileItem,
-   &CClimateChange_V27::SetEvapGridFile, [](Climate& it) -> auto& {return it.flows().evaporationKind;
+std::int32_t& evaporationKind(Climate& it) {
+  return it.flows().evaporationKind;
 }
-, {0, 1, 2}, [](Climate& it) -> auto& {
+float& evaporation(Climate& it) {
   return it.flows().evaporation;
 }
-, [](Climate& it) -> auto& {
+UTsbSelection& evaporationFile(Climate& it) {
   return it.flows().evaporationFile;
 }
+std::int32_t& airFormat(Climate& it) {
+  return it.root().nadHeatExchange->airFormat;
 }
-, {"temperature", &CClimateChange_V27::GetNoTempValues, &CClimateChange_V27::GetTempValues,
-   &CClimateChange_V27::SetTempValues, &CClimateChange_V27::GetNoTempTimeSeries,
-   &CClimateChange_V27::GetTempFileItem, &CClimateChange_V27::SetTempFile,
-   &CClimateChange_V27::GetNoTempGridSeries, &CClimateChange_V27::GetTempGridFileItem,
-   &CClimateChange_V27::SetTempGridFile,
-   [](Climate& it) -> auto& {return it.root().nadHeatExchange->airFormat;
-}
-, {-1, 0, 2}, [](Climate& it) -> auto& {
+float& airTemperature(Climate& it) {
   return it.root().nadHeatExchange->airTemperature;
 }
-, [](Climate& it) -> auto& {
+UTsbSelection& airFile(Climate& it) {
   return it.root().nadHeatExchange->airFile;
 }
-}
-,
-}
-;
+
+const Family kFamilies[] = {
+    {"precipitation",
+     &CClimateChange_V27::GetNoPrecValues,
+     &CClimateChange_V27::GetPrecValues,
+     &CClimateChange_V27::SetPrecValues,
+     &CClimateChange_V27::GetNoPrecTimeSeries,
+     &CClimateChange_V27::GetPrecFileItem,
+     &CClimateChange_V27::SetPrecFile,
+     &CClimateChange_V27::GetNoPrecGridSeries,
+     &CClimateChange_V27::GetPrecGridFileItem,
+     &CClimateChange_V27::SetPrecGridFile,
+     precipitationKind,
+     {0, 1, 2},
+     precipitation,
+     precipitationFile},
+    {"evaporation",
+     &CClimateChange_V27::GetNoEvapValues,
+     &CClimateChange_V27::GetEvapValues,
+     &CClimateChange_V27::SetEvapValues,
+     &CClimateChange_V27::GetNoEvapTimeSeries,
+     &CClimateChange_V27::GetEvapFileItem,
+     &CClimateChange_V27::SetEvapFile,
+     &CClimateChange_V27::GetNoEvapGridSeries,
+     &CClimateChange_V27::GetEvapGridFileItem,
+     &CClimateChange_V27::SetEvapGridFile,
+     evaporationKind,
+     {0, 1, 2},
+     evaporation,
+     evaporationFile},
+    {"temperature",
+     &CClimateChange_V27::GetNoTempValues,
+     &CClimateChange_V27::GetTempValues,
+     &CClimateChange_V27::SetTempValues,
+     &CClimateChange_V27::GetNoTempTimeSeries,
+     &CClimateChange_V27::GetTempFileItem,
+     &CClimateChange_V27::SetTempFile,
+     &CClimateChange_V27::GetNoTempGridSeries,
+     &CClimateChange_V27::GetTempGridFileItem,
+     &CClimateChange_V27::SetTempGridFile,
+     airFormat,
+     {-1, 0, 2},
+     airTemperature,
+     airFile},
+};
 
 class ForcingFamilies : public ::testing::TestWithParam<const Family*> {
  protected:
@@ -194,7 +222,7 @@ TEST_P(ForcingFamilies, Files) {
     EXPECT_EQ(item, 1);
     EXPECT_EQ((climate.*set)(1, "/no/such/file"), 1);
     EXPECT_EQ(selection.fileName.text(), "/no/such/file");
-    EXPECT_EQ(selection.items.size(), 1U);
+    EXPECT_EQ(selection.items, std::vector<std::uint32_t>{3});
   }
 }
 
@@ -437,6 +465,13 @@ TEST_F(ClimateChange, LongitudeAndLatitude) {
   test::writeGrid(file, spec);
   EXPECT_EQ(locate(), 0);
   EXPECT_EQ(longitude, 0);
+  for (const char* unreadable : {"none.tsb2", "text.tsb2"}) {
+    folder.write("text.tsb2", "no grid");
+    climate.root().bathymetry->GetItem(1)->fileName = folder.file(unreadable);
+    longitude = 9;
+    EXPECT_EQ(locate(), 0) << unreadable;
+    EXPECT_EQ(longitude, 0);
+  }
   climate.root().bathymetry->SetNoAreas(0);
   EXPECT_EQ(locate(), 0);
   EXPECT_EQ(latitude, 0);
