@@ -6,7 +6,7 @@
 #include <vector>
 
 #include "core/grid_point.h"
-#include "core/page_id.h"
+#include "core/page_place.h"
 #include "setup/path_setting.h"
 
 namespace gridbay {
@@ -17,20 +17,6 @@ struct AdviceFix {
   std::vector<Setting> settings = {};
 
   bool operator==(const AdviceFix&) const = default;
-};
-
-// Where on its page a thing is edited.
-struct AdvicePlace {
-  PageId page = PageId::none;
-  std::string thing = {};    // "area 2"; empty for the page as a whole
-  std::string keyword = {};  // its path in the setup; empty where several concern
-  std::string field = {};    // the label of the control; empty for the page's first table
-  // The entry of that table, from 1, and how many there are; 0 where it is in none.
-  int item = 0;
-  int itemCount = 0;
-  int fieldNumber = 1;  // among the controls of that label
-
-  bool operator==(const AdvicePlace&) const = default;
 };
 
 // Where it lies: points of an area's grid, or points in a projection (metres).
@@ -55,7 +41,7 @@ struct Advice {
   std::string_view kind;  // the rule that gave it, as "area-position"
   std::string doubt;      // what is doubtful, in a sentence
   std::string reason;     // why that matters
-  AdvicePlace place;
+  PagePlace place;
   AdviceSite site = {};
   std::optional<AdviceFix> fix = {};
 

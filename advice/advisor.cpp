@@ -47,6 +47,15 @@ std::string thingOf(std::string_view what, int number) {
   return fmt::format("{} {}", what, number);
 }
 
+PagePlace placeOfEntry(PageId page, std::string_view what, ListEntry entry, std::string keyword,
+                       std::string_view column) {
+  return {.page = page,
+          .thing = thingOf(what, entry.number),
+          .keyword = std::move(keyword),
+          .field = std::string(column),
+          .entries = {entry}};
+}
+
 const GridFacts* AdviceContext::grid(int number) {
   const auto [at, isNew] = grids_.try_emplace(number, nullptr);
   const CBathymetryObjectKvs* area = model.bathymetry->GetArea(number);

@@ -18,13 +18,10 @@ namespace {
 constexpr std::string_view kSection = "NESTED_MODEL_GLOBALS/BATHYMETRY_SELECTION";
 constexpr double kNear = 0.25;  // of a spacing: what lies nearer than this lies on the point
 
-AdvicePlace placeOfArea(AdviceContext& context, int number, std::string_view keyword) {
-  return {PageId::bathymetry,
-          thingOf("area", number),
-          fmt::format("{}/AREA_{}/{}", kSection, number, keyword),
-          {},
-          number,
-          context.model.bathymetry->GetCount()};
+PagePlace placeOfArea(AdviceContext& context, int number, std::string_view keyword,
+                      std::string_view column = {}) {
+  return placeOfEntry(PageId::bathymetry, "area", {number, context.model.bathymetry->GetCount()},
+                      fmt::format("{}/AREA_{}/{}", kSection, number, keyword), column);
 }
 
 // The corners of a grid that lies in another one with its first point at `origin`.
@@ -34,22 +31,16 @@ std::vector<GridPoint> cornersOf(const GridFacts& inner, GridPoint origin) {
   return {origin, {last.j, origin.k}, last, {origin.j, last.k}};
 }
 
+GridFrame frameOf(const GridFacts& grid) {
+  return {grid.file.geography, grid.file.axes[0].first, grid.file.axes[1].first, grid.dx, grid.dy};
+}
+
 // Where the first point of a grid lies on the grid around it, by the coordinates of both; nothing where these
 // do not tell.
-std::optional<GridSpot> spotByCoordinates(AdviceContext& context, int inner, int outer) {
-  const GridFacts& grid = *context.grid(inner);
-  const GridFacts& around = *context.grid(outer);
-  if (const std::optional<GridPlace> place = context.placeOf(inner)) {
-    const AdviceSite::MapPoint first{place->easting, place->northing};
-    const auto spots = context.spotsOn(outer, place->projection, std::span(&first, 1));
-    return spots ? std::optional(spots->front()) : std::nullopt;
-  }
-  // In coordinates of their own a grid at 0, 0 says nothing of its place.
-  const bool isLocal = !grid.file.geography && !around.file.geography;
-  const double x = grid.file.axes[0].first;
-  const double y = grid.file.axes[1].first;
-  if (!isLocal || (x == 0 && y == 0)) return std::nullopt;
-  return GridSpot{(x - around.file.axes[0].first) / around.dx, (y - around.file.axes[1].first) / around.dy};
+std::optional<GridSpot> spotByCoordinates(AdviceContext& context, const GridFacts& grid,
+                                          const GridFacts& around) {
+  const std::string projection = around.file.geography ? around.file.geography->projection : std::string();
+  return spotOfGrid(frameOf(grid), frameOf(around), context.files.projection(projection));
 }
 
 bool nests(const GridFacts& inner, const GridFacts& outer, GridPoint origin) {
@@ -62,7 +53,7 @@ void advisePosition(AdviceContext& context, int number) {
   const GridFacts* inner = context.grid(number);
   const GridFacts* outer = area.enclosingArea == number ? nullptr : context.grid(area.enclosingArea);
   if (inner == nullptr || outer == nullptr) return;
-  const std::optional<GridSpot> spot = spotByCoordinates(context, number, area.enclosingArea);
+  const std::optional<GridSpot> spot = spotByCoordinates(context, *inner, *outer);
   constexpr double kMostSpacings = 1e6;  // further off it is in another world
   if (!spot || !(std::abs(spot->j) < kMostSpacings) || !(std::abs(spot->k) < kMostSpacings)) return;
   const GridPoint snapped{static_cast<int>(std::lround(spot->j)), static_cast<int>(std::lround(spot->k))};
@@ -75,7 +66,7 @@ void advisePosition(AdviceContext& context, int number) {
   Advice advice{{},
                 {},
                 "Water passes between the two grids at points that are not the same place.",
-                placeOfArea(context, number, "Origin"),
+                placeOfArea(context, number, "Origin", "Origin"),
                 {.area = area.enclosingArea, .points = cornersOf(*inner, area.origin)}};
   if (snapped == area.origin) {
     advice.doubt = fmt::format(
@@ -105,7 +96,7 @@ constexpr std::string_view kElsewhere =
 // The projection of the setup against that of Area 1's file.
 void adviseOwnProjection(AdviceContext& context) {
   const std::string& own = context.model.bathymetry->projection;
-  AdvicePlace place{PageId::bathymetry, {}, fmt::format("{}/Projection", kSection), "Map projection:"};
+  PagePlace place{PageId::bathymetry, {}, fmt::format("{}/Projection", kSection), "Map projection:"};
   const GridFacts* grid = context.grid(1);
   // A projection without a zone is completed from the longitude.
   const bool fileKnows = grid != nullptr && grid->file.geography &&
@@ -177,17 +168,16 @@ void adviseFileProjection(AdviceContext& context, int number) {
       "One of the two is wrong, and other programs may go by the other one.");
 }
 
-void adviseStructureProjection(AdviceContext& context, PageId page, const std::string& thing, int number,
-                               int count, const std::string& keyword, const std::string& projection) {
+void adviseStructureProjection(AdviceContext& context, PagePlace place, const std::string& projection) {
   if (context.files.projection(projection).IsValid()) return;
   const std::string& own = context.model.bathymetry->projection;
   std::optional<AdviceFix> fix;
   if (!own.empty() && context.files.projection(own).IsValid())
-    fix = AdviceFix{"Projection of " + thing, {{keyword, own}}};
+    fix = AdviceFix{"Projection of " + place.thing, {{place.keyword, own}}};
   context.add({{},
-               fmt::format("There is no projection \"{}\", in which {} is given.", projection, thing),
+               fmt::format("There is no projection \"{}\", in which {} is given.", projection, place.thing),
                "The engine can't place it on the grid.",
-               {page, thing, keyword, {}, number, count},
+               std::move(place),
                {},
                std::move(fix)});
 }
@@ -205,9 +195,10 @@ void adviseProjections(AdviceContext& context) {
     adviseFileProjection(context, number);
   const auto all = [&](PageId page, auto& list, std::string_view what, std::string_view path) {
     for (int number = 1; number <= list.GetCount(); ++number) {
-      adviseStructureProjection(context, page, thingOf(what, number), number, list.GetCount(),
-                                fmt::format(fmt::runtime(path), number),
-                                list.GetItem(number)->coordinateType);
+      adviseStructureProjection(
+          context,
+          placeOfEntry(page, what, {number, list.GetCount()}, fmt::format(fmt::runtime(path), number)),
+          list.GetItem(number)->coordinateType);
     }
   };
   all(PageId::weirs, *context.model.nhdWeir, "weir",

@@ -1,11 +1,11 @@
 #include "advice/data_file_facts.h"
 
-#include <sys/stat.h>
-
 #include <algorithm>
 #include <cmath>
 
-#include "core/name_bytes.h"
+#include "basic/grid_file.h"
+#include "core/land_value.h"
+#include "platform/files/file_stamp.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/units/units.h"
 
@@ -19,29 +19,8 @@ constexpr std::size_t kPiece = 1 << 18;             // values that are read at a
 constexpr std::size_t kMostSeriesValues = 16'000'000;
 constexpr std::size_t kMostProjections = 64;
 
-// Tells the states of a file apart.
-using Stamp = std::array<std::int64_t, 5>;
-
-Stamp stampOf(const std::string& path) {
-  struct stat info {};
-  if (path.empty() || ::stat(path.c_str(), &info) != 0) return {};
-  return {static_cast<std::int64_t>(info.st_ino), static_cast<std::int64_t>(info.st_size),
-          info.st_mtim.tv_sec, info.st_mtim.tv_nsec,
-          info.st_ctim.tv_sec * 1'000'000'000 + info.st_ctim.tv_nsec};
-}
-
 bool isMissing(float value, const TsbItem& item) {
   return !std::isfinite(value) || value == static_cast<float>(item.deleteValue);
-}
-
-float landValueOf(const TsbDefinition& file) {
-  constexpr std::size_t kLandPlace = 3;
-  constexpr float kNone = -999;
-  for (const TsbCustomBlock& block : file.customBlocks) {
-    if (names::same(block.name, "V27_Misc"))
-      return block.values.size() > kLandPlace ? block.values[kLandPlace] : kNone;
-  }
-  return kNone;
 }
 
 }  // namespace
@@ -65,7 +44,7 @@ std::optional<bool> GridFacts::isWater(int j, int k) const {
 }
 
 struct DataFileFacts::Entry {
-  Stamp stamp;
+  std::optional<FileStamp> stamp;
   std::string path;
   std::size_t item;
   bool isUsed = true;
@@ -115,7 +94,8 @@ void DataFileFacts::Entry::startGrid() {
   grid->file = definition;
   const TsbGridAxis& x = definition.axes[0];
   const TsbGridAxis& y = definition.axes[1];
-  grid->landValue = landValueOf(definition);
+  const Result<std::optional<float>> land = landValueOf(definition);
+  grid->landValue = land ? land->value_or(kNoLandValue) : kNoLandValue;
   grid->dx = x.spacing;
   grid->dy = y.spacing;
   if (x.points < 2 || y.points < 2 || !(x.spacing > 0) || !(y.spacing > 0)) return fail();
@@ -217,13 +197,13 @@ DataFileFacts::~DataFileFacts() = default;
 
 DataFileFacts::Entry& DataFileFacts::entry(const std::string& path, std::size_t item) {
   std::unique_ptr<Entry>& found = entries_[{path, item}];
-  const Stamp stamp = stampOf(path);
+  const std::optional<FileStamp> stamp = fileStamp(path);
   if (found == nullptr || found->stamp != stamp) {
     found = std::make_unique<Entry>();
     found->stamp = stamp;
     found->path = path;
     found->item = item;
-    found->isDone = stamp == Stamp{};
+    found->isDone = !stamp;
   }
   found->isUsed = true;
   return *found;

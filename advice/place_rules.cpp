@@ -56,12 +56,8 @@ Advice ofBoundary(AdviceContext& context, int number, std::string doubt, std::st
   return {{},
           std::move(doubt),
           std::move(reason),
-          {PageId::boundary,
-           thingOf("boundary", number),
-           boundaryKeyword(number, "First_Point"),
-           {},
-           number,
-           context.model.boundary->GetCount()},
+          placeOfEntry(PageId::boundary, "boundary", {number, context.model.boundary->GetCount()},
+                       boundaryKeyword(number, "First_Point"), "First point"),
           {.area = 1, .points = {boundary.first, boundary.last}}};
 }
 
@@ -210,13 +206,11 @@ void adviseSourcePoint(AdviceContext& context, int number, bool isSource) {
           : fmt::format("{} {} at {} lies on the edge of area {}.", what, number, pointText(point), area),
       inBoundary != 0 ? "The boundary gives the level or flux there, and what the source brings is lost."
                       : "The edge is not calculated: what enters there is lost.",
-      {PageId::sourceAndSink,
-       thingOf(isSource ? "source" : "sink", number),
-       fmt::format("NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/SOURCE_SINK_{}/{}", number,
-                   isSource ? "Source_Point" : "Sink_Point"),
-       {},
-       number,
-       context.model.sourceSink->GetCount()},
+      placeOfEntry(PageId::sourceAndSink, isSource ? "source" : "sink",
+                   {number, context.model.sourceSink->GetCount()},
+                   fmt::format("NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/SOURCE_SINK_{}/{}", number,
+                               isSource ? "Source_Point" : "Sink_Point"),
+                   what),
       {.area = area, .points = {point}}};
   const GridPoint inside{std::clamp(point.j, 1, grid->noJ - 2), std::clamp(point.k, 1, grid->noK - 2)};
   const bool isFree = grid->noJ > 2 && grid->noK > 2 && inside != point &&
@@ -276,7 +270,10 @@ void adviseLine(AdviceContext& context, const Line& line) {
     context.add({{},
                  std::move(doubt),
                  std::move(reason),
-                 {line.page, line.thing, line.path + "/number_of_points", {}, line.number, line.count},
+                 {.page = line.page,
+                  .thing = line.thing,
+                  .keyword = line.path + "/number_of_points",
+                  .entries = {{line.number, line.count}}},
                  {.projection = line.projection, .mapPoints = line.points},
                  std::move(fix)});
   };

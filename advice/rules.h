@@ -11,6 +11,7 @@
 
 #include "advice/advice.h"
 #include "advice/data_file_facts.h"
+#include "basic/grid_place.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay {
@@ -22,12 +23,6 @@ struct GridPlace {
   double easting = 0;
   double northing = 0;
   double rotation = 0;
-};
-
-// A place on a grid, in spacings from its first point.
-struct GridSpot {
-  double j = 0;
-  double k = 0;
 };
 
 // What the rules look at, and where they leave what they find.
@@ -80,9 +75,9 @@ std::span<const AdviceRule> adviceRules();
 // "area 2"
 std::string thingOf(std::string_view what, int number);
 
-// Tells each keyword of a setup's target with its path, in the order of the file.
-void eachKeyword(const KvsFile& file,
-                 const std::function<void(const std::string& path, const Node& keyword)>& tell);
+// An entry of a page's list, by its number of so many.
+PagePlace placeOfEntry(PageId page, std::string_view what, ListEntry entry, std::string keyword,
+                       std::string_view column = {});
 
 // Of areas and their grids.
 void adviseAreaPositions(AdviceContext& context);

@@ -26,6 +26,7 @@
 #include "hydrodynamic/surface_elevation.h"
 #include "hydrodynamic/wind_conditions.h"
 #include "setup/member_keyword.h"
+#include "setup/page_places.h"
 #include "structures/culvert.h"
 #include "structures/dike.h"
 #include "structures/weir.h"
@@ -35,14 +36,9 @@ namespace {
 
 constexpr const char* kPeriod = "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD";
 
-AdvicePlace onPeriod(std::string_view keyword, std::string_view field, int fieldNumber = 1) {
-  return {PageId::simulationPeriod,
-          {},
-          fmt::format("{}/{}", kPeriod, keyword),
-          std::string(field),
-          0,
-          0,
-          fieldNumber};
+PagePlace onPeriod(std::string_view keyword, std::string_view field, int fieldNumber = 1) {
+  return {
+      PageId::simulationPeriod, {}, fmt::format("{}/{}", kPeriod, keyword), std::string(field), fieldNumber};
 }
 
 struct Rectangle {
@@ -145,21 +141,21 @@ std::optional<AdviceFix> withShorterSteps(AdviceContext& context, int divisor) {
   AdviceFix fix{fmt::format("Time step of {:.6g} s", step),
                 {{fmt::format("{}/Time_Step_Interval", kPeriod), fmt::format("{:.7g}", step)}}};
   bool fits = true;
-  eachKeyword(*file, [&](const std::string& path, const Node& keyword) {
+  eachKeyword(*file, [&](const PagePlace& place, const Node& keyword) {
     if (keyword.values().size() != 1 || keyword.values()[0].kind() != ValueKind::integer) return;
     if (std::ranges::none_of(kCounts, [&](std::string_view name) { return sameName(name, keyword.name()); }))
       return;
     const long long count = std::atoll(std::string(keyword.values()[0].text()).c_str());
-    if (count <= 0 || !findKeyword(context.model, path, context.documentPath)) return;
+    if (count <= 0 || !findKeyword(context.model, place.keyword, context.documentPath)) return;
     fits = fits && count * divisor < std::numeric_limits<std::int32_t>::max();
-    fix.settings.push_back({path, std::to_string(count * divisor)});
+    fix.settings.push_back({place.keyword, std::to_string(count * divisor)});
   });
   return fits ? std::optional(std::move(fix)) : std::nullopt;
 }
 
 // A code with the values that it can have.
 struct Code {
-  AdvicePlace place;
+  PagePlace place;
   std::string_view what;
   std::int32_t value;
   std::span<const std::int32_t> allowed;
@@ -190,13 +186,9 @@ void adviseCodesOf(AdviceContext& context, PageId page, std::string_view thing, 
                    auto& list, std::string_view what, auto code, std::span<const std::int32_t> allowed,
                    std::int32_t usual) {
   for (int number = 1; number <= list.GetCount(); ++number) {
-    adviseCode(
-        context,
-        {{page, thingOf(thing, number), fmt::format(fmt::runtime(path), number), {}, number, list.GetCount()},
-         what,
-         code(*list.GetItem(number)),
-         allowed,
-         usual});
+    adviseCode(context,
+               {placeOfEntry(page, thing, {number, list.GetCount()}, fmt::format(fmt::runtime(path), number)),
+                what, code(*list.GetItem(number)), allowed, usual});
   }
 }
 

@@ -59,7 +59,8 @@ unsigned CBathymetryKvs::Validate(ValidationList& messages, int deep) {
       files.push_back(GetArea(number)->fileName.absolute());
     TsbFile::lookAhead(files);
     for (int number = 1; number <= GetCount(); ++number)
-      faults += GetArea(number)->ReadGrid(messages, number);
+      faults += checkedEntry(messages, {number, GetCount()},
+                             [&] { return GetArea(number)->ReadGrid(messages, number); });
   }
   if (faults > 0) return faults;
 
@@ -69,14 +70,19 @@ unsigned CBathymetryKvs::Validate(ValidationList& messages, int deep) {
   for (int number = 2; number <= GetCount(); ++number) {
     const CBathymetryObjectKvs& area = *GetArea(number);
     const CBathymetryObjectKvs* outer = GetArea(area.enclosingArea);
-    if (outer == nullptr || outer == &area) {
-      faults += report(messages, PageId::bathymetry, Severity::dependedUpon, texts::outerNotValid);
-    } else if (deep != 0) {
-      faults += CheckNesting(area, *outer, messages);
-    }
+    faults += checkedEntry(messages, {number, GetCount()}, [&] {
+      if (outer == nullptr || outer == &area)
+        return report(messages, PageId::bathymetry, Severity::dependedUpon, texts::outerNotValid);
+      return deep != 0 ? CheckNesting(area, *outer, messages) : 0U;
+    });
   }
   for (int a = 1; a <= GetCount(); ++a) {
-    for (int b = a + 1; b <= GetCount(); ++b) CheckOverlap(*GetArea(a), *GetArea(b), messages);
+    for (int b = a + 1; b <= GetCount(); ++b) {
+      checkedEntry(messages, {b, GetCount()}, [&] {
+        CheckOverlap(*GetArea(a), *GetArea(b), messages);
+        return 0U;
+      });
+    }
   }
   return faults;
 }

@@ -11,10 +11,6 @@ namespace gridbay {
 // Of an area whose file names none.
 inline constexpr float kNoLandValue = -999.0F;
 
-// The land value stands in a custom block; without one `landValue` stays. False when the blocks cannot be
-// read to that point.
-bool readLandValue(const TsbHeader& header, float& landValue);
-
 // The projection by its text; "UTM" alone gets its zone from the longitude.
 std::string completeProjection(const TsbGeography& place);
 

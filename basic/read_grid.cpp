@@ -9,15 +9,13 @@
 #include "basic/bathymetry_requests.h"
 #include "basic/grid_file.h"
 #include "basic/simulation_period.h"
-#include "core/name_bytes.h"
+#include "core/land_value.h"
 #include "platform/tsb/tsb_operations.h"
 
 namespace gridbay {
 namespace {
 
 constexpr int kLeastPoints = 3;
-constexpr std::string_view kMiscBlock = "V27_Misc";
-constexpr std::size_t kLandPlace = 3;
 // Where the first row of a hot start file's first item says how the area lies.
 constexpr int kEnclosingPlace = 4;
 constexpr int kOriginJPlace = 5;
@@ -56,20 +54,6 @@ int readItem(TsbHeader& header, int item, CVdArray2D<float>& grid) {
 }
 
 }  // namespace
-
-bool readLandValue(const TsbHeader& header, float& landValue) {
-  const TsbCustomBlock* block = nullptr;
-  if (tsbGetCustomBlockRef(header, &block) != 0) return false;
-  while (block != nullptr) {
-    std::string name;
-    std::span<const float> values;
-    if (tsbGetCustomBlock(header, &block, &name, &values) != 0) return false;
-    if (!names::same(name, kMiscBlock)) continue;
-    if (values.size() > kLandPlace) landValue = values[kLandPlace];
-    return true;
-  }
-  return true;
-}
 
 unsigned CBathymetryObjectKvs::ReadGrid(ValidationList& messages, int areaNumber) {
   auto* basic = parts<BasicParts>();
@@ -118,7 +102,12 @@ unsigned CBathymetryObjectKvs::ReadGrid(ValidationList& messages, int areaNumber
       file.start = dateTimeOf(date, time);
       file.timeStep = static_cast<float>(step);
     }
-    if (!readLandValue(header, file.landValue)) notValid();
+    const Result<std::optional<float>> land = landValueOf(header.file->definition());
+    if (!land) {
+      notValid();
+    } else if (*land) {
+      file.landValue = **land;
+    }
     return 0U;
   };
   faults += readContents();

@@ -84,16 +84,17 @@ std::vector<Advice> adviceOn(SetupFile& setup, const std::string& path) {
   return Advisor().lookThoroughly(setup.model(), path, &setup.source());
 }
 
-std::string pageText(PageId page) {
-  const auto id = static_cast<std::int32_t>(page);
+std::string placeText(const PagePlace& place) {
+  const auto id = static_cast<std::int32_t>(place.page);
   const std::string_view caption = CDlgEnumerator().GetCaption(id);
-  return caption.empty() ? fmt::format("page {}", id) : fmt::format("page {} ({})", id, caption);
+  const std::string page =
+      caption.empty() ? fmt::format("page {}", id) : fmt::format("page {} ({})", id, caption);
+  return place.thing.empty() ? page : page + ", " + place.thing;
 }
 
 std::string adviceText(const Advice& advice, std::size_t number, const std::string& path) {
   std::string text =
-      fmt::format("advice {}, {}{}: {} {}\n", number, pageText(advice.place.page),
-                  advice.place.thing.empty() ? "" : ", " + advice.place.thing, advice.doubt, advice.reason);
+      fmt::format("advice {}, {}: {} {}\n", number, placeText(advice.place), advice.doubt, advice.reason);
   if (advice.fix)
     text += fmt::format("  fix: {} ({} fix {} {})\n", advice.fix->name, toolName(), shellText(path), number);
   return text;

@@ -5,6 +5,7 @@
 #include "cli/advice_report.h"
 #include "cli/commands.h"
 #include "setup/dlg_enumerator.h"
+#include "setup/page_places.h"
 
 namespace gridbay::cli {
 namespace {
@@ -15,16 +16,19 @@ struct Options {
   bool advice = false;
 };
 
-// With advice the messages name their pages too.
+// With advice the messages name their pages, and what they speak of, too.
 std::string lineOf(const CMessage& message, bool namesPages) {
-  return namesPages ? fmt::format("{}, severity {}: {}", pageText(message.page),
-                                  static_cast<int>(message.severity), message.text)
-                    : messageLine(message);
+  if (!namesPages) return messageLine(message);
+  return fmt::format("{}, severity {}: {}", placeText(placeOfMessage(message)),
+                     static_cast<int>(message.severity), message.text);
 }
 
 nlohmann::ordered_json jsonOf(const CMessage& message, bool namesPages) {
   nlohmann::ordered_json json{{"page", static_cast<int>(message.page)}};
-  if (namesPages) json["pageName"] = CDlgEnumerator().GetCaption(static_cast<std::int32_t>(message.page));
+  if (namesPages) {
+    json["pageName"] = CDlgEnumerator().GetCaption(static_cast<std::int32_t>(message.page));
+    json["thing"] = thingOf(message.page, message.entries);
+  }
   json["severity"] = static_cast<int>(message.severity);
   json["text"] = message.text;
   return json;

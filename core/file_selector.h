@@ -98,6 +98,7 @@ class CVdFileSelectorDlg {
   void SetTimeAxisType(int type) { timeAxisType_ = type; }
   void SetTimeAxisQunUnitEquivalentWith(int unitCode) { timeAxisUnit_ = unitCode; }
   void SetRequestPeriod(const DateTime& start, const DateTime& end);
+  bool requestsPeriod() const { return periodStart_.has_value(); }
   // A file with one time step, which holds throughout, need not cover that period.
   void AllowOneTimeStep() { oneStepAllowed_ = true; }
   // The file must be one that the engine takes as it is: lengths in metres, values in base units.

@@ -40,11 +40,13 @@ class ListKvs : public TableKvs<Derived> {
     unsigned faults = 0;
     for (int number = 1; (kAlways || deep != 0) && number <= GetCount(); ++number) {
       Item& item = *GetItem(number);
-      if constexpr (requires { item.Validate(messages, deep, number); }) {
-        faults += item.Validate(messages, kAlways ? 0 : deep, number);
-      } else {
-        faults += item.Validate(messages, kAlways ? 0 : deep);
-      }
+      faults += checkedEntry(messages, {number, GetCount()}, [&] {
+        if constexpr (requires { item.Validate(messages, deep, number); }) {
+          return item.Validate(messages, kAlways ? 0 : deep, number);
+        } else {
+          return item.Validate(messages, kAlways ? 0 : deep);
+        }
+      });
     }
     return faults;
   }

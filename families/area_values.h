@@ -72,7 +72,9 @@ class AreaValuesKvs : public ListKvs<Self, Item> {
   unsigned Validate(ValidationList& messages, int deep, int entry, const auto&... further) {
     unsigned faults = 0;
     for (int area = 1; deep != 0 && area <= this->GetCount(); ++area)
-      faults += this->GetItem(area)->Validate(messages, deep, entry, area, further...);
+      faults += checkedEntry(messages, {area, this->GetCount()}, [&] {
+        return this->GetItem(area)->Validate(messages, deep, entry, area, further...);
+      });
     return faults;
   }
 };

@@ -72,8 +72,14 @@ unsigned reportDataFile(ValidationList& messages, PageId page, const FileNameVal
   return 1;
 }
 
+void noteDataFile(ValidationList& messages, PageId page, const CVdFileSelectorDlg& selector,
+                  const FileNameValue& file, const std::vector<std::uint32_t>& items) {
+  messages.files.push_back({page, file.text(), file.absolute(), items, selector.requestsPeriod()});
+}
+
 unsigned checkDataFile(ValidationList& messages, PageId page, const CVdFileSelectorDlg& selector,
                        const UTsbSelection& file, Reason reason, Severity severity) {
+  noteDataFile(messages, page, selector, file.fileName, file.items);
   std::string why;
   if (selector.IsTsbFileValid(file.fileName.absolute(), file.items, &why)) return 0;
   return reportDataFile(messages, page, file.fileName, why, reason, severity);
@@ -81,6 +87,7 @@ unsigned checkDataFile(ValidationList& messages, PageId page, const CVdFileSelec
 
 unsigned checkDataFile(ValidationList& messages, PageId page, const CVdFileSelectorDlg& selector,
                        const FileNameValue& file, Reason reason, Severity severity) {
+  noteDataFile(messages, page, selector, file);
   std::string why;
   if (selector.IsTsbFileValid(file.absolute(), &why)) return 0;
   return reportDataFile(messages, page, file, why, reason, severity);

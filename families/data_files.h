@@ -67,6 +67,10 @@ unsigned reportDataFile(ValidationList& messages, PageId page, const FileNameVal
                         const std::string& why, Reason reason = Reason::told,
                         Severity severity = Severity::fault);
 
+// Tells that the model uses a file, for a check that looks at it in a way of its own.
+void noteDataFile(ValidationList& messages, PageId page, const CVdFileSelectorDlg& selector,
+                  const FileNameValue& file, const std::vector<std::uint32_t>& items = {});
+
 // Whether a file, with the items chosen in it, meets what the selector asks; else that message. Returns the
 // number of faults.
 unsigned checkDataFile(ValidationList& messages, PageId page, const CVdFileSelectorDlg& selector,

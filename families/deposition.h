@@ -46,7 +46,9 @@ class DepositionKvs : public TableKvs<Self> {
     unsigned faults = 0;
     const auto check = [&](auto& list, const auto&... which) {
       for (int entry = 1; entry <= list.GetCount(); ++entry)
-        faults += list.GetItem(entry)->Validate(messages, deep, entry, which...);
+        faults += checkedEntry(messages, {entry, list.GetCount()}, [&] {
+          return list.GetItem(entry)->Validate(messages, deep, entry, which...);
+        });
     };
     if constexpr (requires { Self::kSurface; }) {
       if (includeSurface) check(surface, Self::kSurface);

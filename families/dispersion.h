@@ -128,7 +128,8 @@ class DispersionCoefKvs : public TableKvs<Self> {
   static unsigned checkFiles(ValidationList& messages, int deep, std::int32_t format, ItemList<Item>& files) {
     unsigned faults = 0;
     for (int area = 1; format == kFromFile && area <= files.GetCount(); ++area)
-      faults += files.GetItem(area)->Validate(messages, deep, area);
+      faults += checkedEntry(messages, {area, files.GetCount()},
+                             [&] { return files.GetItem(area)->Validate(messages, deep, area); });
     return faults;
   }
 };

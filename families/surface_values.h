@@ -33,7 +33,9 @@ class SurfaceValuesKvs : public EntryConstantsKvs<Self, Module> {
     RequestDataFile(selector);
     if constexpr (requires { Self::kFileNotValid; }) {
       ValidationList usual;
-      if (checkDataFile(usual, Self::kPage, selector, this->file) == 0) return 0;
+      const bool isValid = checkDataFile(usual, Self::kPage, selector, this->file) == 0;
+      messages.files.insert(messages.files.end(), usual.files.begin(), usual.files.end());
+      if (isValid) return 0;
       return report(messages, Self::kPage, Severity::fault, Self::kFileNotValid, this->file.fileName.text());
     } else {
       return checkDataFile(messages, Self::kPage, selector, this->file);

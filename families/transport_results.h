@@ -87,7 +87,8 @@ class TransportResultsKvs : public TableKvs<Self> {
   unsigned ValidateItems(ValidationList& messages) {
     unsigned faults = 0;
     for (int number = 1; number <= outputs.GetCount(); ++number)
-      faults += outputs.at(number).Validate(messages, 0);
+      faults += checkedEntry(messages, {number, outputs.GetCount()},
+                             [&] { return outputs.at(number).Validate(messages, 0); });
     for (int number = 1; generateHotStart && number <= hotStarts.GetCount(); ++number)
       faults += hotStarts.at(number).Validate(messages, 0);
     return faults;

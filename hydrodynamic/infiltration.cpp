@@ -99,7 +99,13 @@ void CNhdInfiltrationKvs::RequestCapacity(CVdFileSelectorDlg& selector) {
 }
 
 unsigned CNhdInfiltrationKvs::Validate(ValidationList& messages, int) {
-  if (File() == nullptr || !File()->fileName.empty()) return 0;
+  if (File() == nullptr) return 0;
+  if (!File()->fileName.empty()) {
+    CVdFileSelectorDlg selector;
+    if (infiltrationType == kNetRate) RequestNetRate(selector);
+    noteDataFile(messages, PageId::infiltration, selector, File()->fileName, File()->items);
+    return 0;
+  }
   return report(messages, PageId::infiltration, Severity::fault, texts::infiltrationFileNotValid);
 }
 

@@ -16,6 +16,7 @@ constexpr int kOuterArea = 1;
 
 unsigned checkFile(ValidationList& messages, PageId page, const CVdFileSelectorDlg& selector,
                    const UTsbSelection& file) {
+  noteDataFile(messages, page, selector, file.fileName, file.items);
   std::string why;
   if (selector.IsTsbFileValid(file.fileName.absolute(), file.items, &why)) return 0;
   return report(messages, page, Severity::fault, texts::waveOrGrainFileNotValid, file.fileName.text());

@@ -217,7 +217,8 @@ void CNhdResultKvs::Load(KvsSection section, const std::string& documentPath) {
 unsigned CNhdResultKvs::Validate(ValidationList& messages, int) {
   unsigned faults = 0;
   for (int number = 1; number <= outputs.GetCount(); ++number)
-    faults += outputs.GetItem(number)->Validate(messages, 0);
+    faults += checkedEntry(messages, {number, outputs.GetCount()},
+                           [&] { return outputs.GetItem(number)->Validate(messages, 0); });
   for (int number = 1; generateHotStart && number <= hotStarts.GetCount(); ++number)
     faults += hotStarts.GetItem(number)->Validate(messages, 0);
   return faults;

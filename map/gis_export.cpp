@@ -4,6 +4,7 @@
 
 #include "hydrodynamic/result.h"
 #include "map/grid_shapes.h"
+#include "map/map_names.h"
 #include "map/structure_lines.h"
 #include "setup/dlg_enumerator.h"
 #include "structures/culvert.h"
@@ -15,35 +16,6 @@ namespace {
 
 using Type = VectorLayer::Type;
 using Attribute = VectorValue;
-
-std::string driveName(MapDrive drive) {
-  switch (drive) {
-    case MapDrive::levelConstant:
-      return "level, constant";
-    case MapDrive::levelSeries:
-      return "level, sine series";
-    case MapDrive::levelFile:
-      return "level, file";
-    case MapDrive::fluxConstant:
-      return "flux, constant";
-    case MapDrive::fluxSeries:
-      return "flux, sine series";
-    case MapDrive::fluxFile:
-      return "flux, file";
-    case MapDrive::ratingCurve:
-      return "rating curve";
-    case MapDrive::source:
-      return "source";
-    case MapDrive::sink:
-      return "sink";
-    case MapDrive::pair:
-      return "pair";
-    case MapDrive::off:
-      return "not included";
-    default:
-      return {};
-  }
-}
 
 Attribute textOr(const std::string& text) {
   return text.empty() ? Attribute{} : Attribute{text};
@@ -187,7 +159,7 @@ std::vector<Attribute> commonValues(const MapFeature& feature) {
           textOr(feature.label),
           page,
           feature.area == 0 ? Attribute{} : whole(feature.area),
-          textOr(driveName(feature.drive)),
+          textOr(std::string(driveName(feature.drive))),
           textOr(feature.fault)};
 }
 

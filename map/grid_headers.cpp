@@ -3,9 +3,9 @@
 #include <fmt/format.h>
 
 #include <cmath>
-#include <filesystem>
 
 #include "basic/grid_file.h"
+#include "core/land_value.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_operations.h"
 
@@ -34,8 +34,8 @@ GridHeader readHeader(const std::string& path) {
   header.dy = y.spacing;
   header.firstX = x.first;
   header.firstY = y.first;
-  header.landValue = kNoLandValue;
-  readLandValue(file, header.landValue);
+  const Result<std::optional<float>> land = landValueOf(definition);
+  header.landValue = land ? land->value_or(kNoLandValue) : kNoLandValue;
   header.geography = definition.geography;
   if (header.geography) header.geography->projection = completeProjection(*header.geography);
   return header;
@@ -44,14 +44,10 @@ GridHeader readHeader(const std::string& path) {
 }  // namespace
 
 const GridHeader& GridHeaders::of(const std::string& path) {
-  std::error_code error;
-  const auto written = std::filesystem::last_write_time(path, error);
-  const std::int64_t time = error ? -1 : std::int64_t{written.time_since_epoch().count()};
-  const auto bytes = std::filesystem::file_size(path, error);
-  const std::int64_t size = error ? -1 : static_cast<std::int64_t>(bytes);
+  const std::optional<FileStamp> stamp = fileStamp(path);
   Known& known = known_[path];
-  if (known.header.state != 0 && known.time == time && known.size == size) return known.header;
-  known = {time, size, readHeader(path)};
+  if (known.header.state != 0 && known.stamp == stamp) return known.header;
+  known = {stamp, readHeader(path)};
   known.header.state = ++lastState_;
   return known.header;
 }

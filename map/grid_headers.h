@@ -5,6 +5,7 @@
 #include <optional>
 #include <string>
 
+#include "platform/files/file_stamp.h"
 #include "platform/tsb/tsb_types.h"
 
 namespace gridbay {
@@ -23,7 +24,7 @@ struct GridHeader {
   std::string fault;                      // why it is no grid; then the rest is without meaning
 };
 
-// The headers of grid files, each read once and again when the file has another time or size.
+// The headers of grid files, each read once and again when the file has been written to.
 class GridHeaders {
  public:
   // Of a file by its absolute name; until it has changed and is asked for again.
@@ -31,8 +32,7 @@ class GridHeaders {
 
  private:
   struct Known {
-    std::int64_t time = -1;
-    std::int64_t size = -1;
+    std::optional<FileStamp> stamp;
     GridHeader header;
   };
   std::map<std::string, Known, std::less<>> known_;

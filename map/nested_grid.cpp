@@ -11,6 +11,7 @@
 #include "conversion/history.h"
 #include "conversion/raster_reader.h"
 #include "conversion/tsb_raster.h"
+#include "core/land_value.h"
 #include "platform/files/may_write.h"
 #include "platform/tsb/tsb_writer.h"
 #include "platform/units/units.h"
@@ -168,7 +169,10 @@ Outcome cutNestedGrid(SetupMap& map, const MapScene& scene, const AreaPlace& pla
   if (isGridFile) {
     TsbHeader header;
     float land = kNone;
-    if (tsbFileRead(raster, &header) == 0) readLandValue(header, land);
+    if (tsbFileRead(raster, &header) == 0) {
+      const Result<std::optional<float>> known = landValueOf(header.file->definition());
+      if (known) land = known->value_or(kNone);
+    }
     sampler.emplace(**source, coordinates, (*source)->projection(), land);
   }
 

@@ -7,12 +7,14 @@
 #include <limits>
 
 #include "basic/boundary.h"
+#include "basic/grid_place.h"
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
 #include "basic/source_sink.h"
 #include "core/edition.h"
 #include "hydrodynamic/result.h"
 #include "map/map_areas.h"
+#include "map/map_names.h"
 #include "structures/line_structure.h"
 
 namespace gridbay {
@@ -28,27 +30,8 @@ MapEdit refused(std::string fault) {
   return {.fault = std::move(fault)};
 }
 
-std::string kindName(MapKind kind) {
-  switch (kind) {
-    case MapKind::boundary:
-      return "Boundary";
-    case MapKind::source:
-      return "Source";
-    case MapKind::massBudget:
-      return "Polygon";
-    case MapKind::dike:
-      return "Dike";
-    case MapKind::weir:
-      return "Weir";
-    case MapKind::culvert:
-      return "Culvert";
-    case MapKind::discharge:
-      return "Discharge line";
-    case MapKind::box:
-      return "Box";
-    default:
-      return "Output";
-  }
+GridFrame frameOf(const GridHeader& header) {
+  return {header.geography, header.firstX, header.firstY, header.dx, header.dy};
 }
 
 MapEdit made(MapFeatureId feature, std::string_view what) {
@@ -203,21 +186,22 @@ Result<AreaSnap> SetupMap::snapOf(CGlobalKvs& root, std::int32_t number) {
                                area->enclosing, number,
                                outer == nullptr || outer->fault.empty() ? "" : ": " + outer->fault)};
   if (!area->isPlaced) return Failure{area->fault};
-  const auto there = ownPlace(headers_.of(area->file), coordinates_);
-  if (!there)
+  const GridFrame around = frameOf(headers_.of(outer->file));
+  const CVdMapProjection projection(around.geography ? around.geography->projection : std::string());
+  const std::optional<GridSpot> spot = spotOfGrid(frameOf(headers_.of(area->file)), around, projection);
+  if (!spot)
     return Failure{
-        fmt::format("The files of areas 1 and {} do not both have coordinates of one kind: give the "
+        fmt::format("The files of areas {} and {} do not both have coordinates of one kind: give the "
                     "position as J,K",
-                    number)};
-  AreaSnap snap{outer->grid.pointOf(*there), {}};
+                    outer->number, number)};
+  AreaSnap snap{{spot->j, spot->k}, {}};
   constexpr double kFar = 1e9;
   if (!(std::abs(snap.exact[0]) < kFar && std::abs(snap.exact[1]) < kFar))
     return Failure{fmt::format("The file of area {} lies nowhere near area {}", number, outer->number)};
   snap.nearest = {static_cast<std::int32_t>(std::lround(snap.exact[0])),
                   static_cast<std::int32_t>(std::lround(snap.exact[1]))};
   const auto offBy = [&](GridPoint point) {
-    const MapPoint place = outer->grid.at(point.j, point.k);
-    return std::hypot(place.east - there->east, place.north - there->north);
+    return std::hypot((point.j - spot->j) * outer->dx, (point.k - spot->k) * outer->dy);
   };
   snap.offBy = offBy(snap.nearest);
   snap.heldOffBy = offBy(area->origin);

@@ -11,11 +11,13 @@ unsigned CNmtErosionForEachLayerPowerKvs::Validate(ValidationList& messages, int
   bool differs = false;
   for (int number = 1; number <= GetCount(); ++number) {
     CNmtErosionForEachLayerPowerLayerKvs& layer = *GetItem(number);
-    faults += layer.Validate(messages, deep);
+    const ListEntry entry{number, GetCount()};
+    faults += checkedEntry(messages, entry, [&] { return layer.Validate(messages, deep); });
     if (differs || layer.format == GetItem(1)->format) continue;
     differs = true;
-    faults +=
-        report(messages, PageId::mtErosionForEachLayerPower, Severity::fault, texts::layerFormatsDiffer);
+    faults += checkedEntry(messages, entry, [&] {
+      return report(messages, PageId::mtErosionForEachLayerPower, Severity::fault, texts::layerFormatsDiffer);
+    });
   }
   return faults;
 }

@@ -141,7 +141,9 @@ unsigned Entry::Validate(ValidationList& messages, int deep, int entry) {
     if (at(FormatArea(area, isThickness)).format != Initial::kMap) continue;
     CVdFileSelectorDlg selector;
     at(area).RequestDataFile(selector, entry, area);
-    faults += checkDataFile(messages, PageId::mtInitialConcentration, selector, at(area).file);
+    faults += checkedEntry(messages, {area, GetCount()}, [&] {
+      return checkDataFile(messages, PageId::mtInitialConcentration, selector, at(area).file);
+    });
   }
   return faults;
 }

@@ -77,8 +77,11 @@ unsigned Dredger::Validate(ValidationList& messages, int) {
     faults += report(messages, PageId::mtExpDredgings, Severity::fault, texts::bed::weightsNotOne);
   CVdFileSelectorDlg selector;
   RequestDataFile(selector, 0);
-  return faults + checkDataFile(messages, PageId::mtExpStartingConditions, selector, file, Reason::left,
-                                Severity::dependedUpon);
+  // The message is one of another page; that is meant.
+  faults += checkDataFile(messages, PageId::mtExpStartingConditions, selector, file, Reason::left,
+                          Severity::dependedUpon);
+  messages.files.back().page = PageId::mtExpDredgings;
+  return faults;
 }
 
 void Dredger::RequestDataFile(CVdFileSelectorDlg& selector, int) {

@@ -112,7 +112,8 @@ unsigned CNmtExpInitialConditionsKvs::Validate(ValidationList& messages, int dee
   unsigned faults = 0;
   const auto check = [&](auto& list) {
     for (int number = 1; deep != 0 && number <= list.GetCount(); ++number)
-      faults += list.at(number).Validate(messages, deep);
+      faults += checkedEntry(messages, {number, list.GetCount()},
+                             [&] { return list.at(number).Validate(messages, deep); });
   };
   check(components);
   check(thicknesses);

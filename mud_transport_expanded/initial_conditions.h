@@ -93,7 +93,8 @@ class ExpInitialEntry final : public ListKvs<ExpInitialEntry<what>, ExpInitialOb
   unsigned Validate(ValidationList& messages, int deep) override {
     unsigned faults = 0;
     for (int area = 1; deep != 0 && area <= this->GetCount(); ++area)
-      faults += this->at(area).Check(messages, given(area).format, area);
+      faults += checkedEntry(messages, {area, this->GetCount()},
+                             [&] { return this->at(area).Check(messages, given(area).format, area); });
     return faults;
   }
 

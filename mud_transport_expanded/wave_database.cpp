@@ -79,7 +79,8 @@ unsigned CNmtExpWaveDatabaseKvs::Validate(ValidationList& messages, int deep) {
   if (counts().product() > kMostMaps)
     faults += report(messages, kPage, Severity::fault, texts::tooManyWaveMaps);
   for (int number = 1; deep != 0 && number <= maps.GetCount(); ++number)
-    faults += maps.at(number).Validate(messages, deep);
+    faults += checkedEntry(messages, {number, maps.GetCount()},
+                           [&] { return maps.at(number).Validate(messages, deep); });
   return faults;
 }
 

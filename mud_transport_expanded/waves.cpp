@@ -28,6 +28,13 @@ void CNmtExpWavesKvs::TypeRow::set(CNmtExpWavesKvs& waves, KvsSection from,
     CNmtExpForcingsKvs::WavesRow{}.load(*module->nmtExpForcings, from, documentPath);
 }
 
+unsigned CNmtExpTSVWavesKvs::Validate(ValidationList& messages, int) {
+  CVdFileSelectorDlg selector;
+  RequestDataFile(selector);
+  noteDataFile(messages, PageId::mtExpTsvWaves, selector, file.fileName, file.items);
+  return 0;
+}
+
 void CNmtExpTSVWavesKvs::RequestDataFile(CVdFileSelectorDlg& selector) {
   requestWaveMaps(selector, *this);
   requestSimulationPeriod(selector, *this);

@@ -72,6 +72,8 @@ class CNmtExpTSVWavesKvs final : public TableKvs<CNmtExpTSVWavesKvs> {
 
   static constexpr auto table() { return section("TWOD_Wavefields", selection(&CNmtExpTSVWavesKvs::file)); }
 
+  // Finds no fault in the file.
+  unsigned Validate(ValidationList& messages, int deep) override;
   // Maps of Area 1 that cover the simulation.
   void RequestDataFile(CVdFileSelectorDlg& selector);
 };

@@ -9,6 +9,7 @@
 #include "setup/graphical_view.h"
 #include "setup/gridbay_doc.h"
 #include "setup/page_factory.h"
+#include "setup/page_places.h"
 
 namespace gridbay {
 namespace {
@@ -83,6 +84,7 @@ class Editor final : public SetupEditor {
                                                           : missingPage(pages.GetCaption(id));
   }
 
+  PagePlace placeOf(const CMessage& message) const override { return placeOfMessage(message); }
   std::vector<Advice> advice() override { return advisor_.look(document_.root(), document_.path()); }
   bool isAdviceWhole() const override { return advisor_.isComplete(); }
   bool readForAdvice(int milliseconds) override {

@@ -90,6 +90,8 @@ class SetupEditor {
   // The number of an item's help topic; 0 for one that has no page.
   virtual std::int32_t helpTopic(std::int32_t id) const = 0;
 
+  // Where what a message of a check speaks of is edited.
+  virtual PagePlace placeOf(const CMessage& message) const = 0;
   // What is doubtful in the setup as it is now, by what is known of its data files.
   virtual std::vector<Advice> advice() = 0;
   // Whether the last advice knew all that it asked for. Else reads in data files about so long; true once

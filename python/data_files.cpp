@@ -8,6 +8,7 @@
 
 #include "conversion/history.h"
 #include "conversion/item_types.h"
+#include "core/land_value.h"
 #include "platform/cartography/cartography.h"
 #include "platform/files/may_write.h"
 #include "platform/tsb/tsb_file.h"
@@ -21,7 +22,6 @@ namespace py = pybind11;
 namespace {
 
 constexpr const char* kLandBlock = "V27_Misc";
-constexpr std::size_t kLandPlace = 3;
 
 // Sizes of an array as Python has them: the last one is the fastest, x.
 std::vector<py::ssize_t> shapeOf(const TsbDefinition& definition, std::size_t steps = 0) {
@@ -112,11 +112,8 @@ py::dict definitionOf(const TsbFile& file) {
   dict["longitude"] = definition.geography ? py::cast(definition.geography->longitude) : py::none();
   dict["latitude"] = definition.geography ? py::cast(definition.geography->latitude) : py::none();
   dict["rotation"] = definition.geography ? definition.geography->rotation : 0.0;
-  dict["land"] = py::none();
-  for (const TsbCustomBlock& block : definition.customBlocks) {
-    if (block.name == kLandBlock && block.values.size() > kLandPlace)
-      dict["land"] = static_cast<double>(block.values[kLandPlace]);
-  }
+  const Result<std::optional<float>> land = landValueOf(definition);
+  dict["land"] = land && *land ? py::cast(static_cast<double>(**land)) : py::none();
   return dict;
 }
 

@@ -1,6 +1,5 @@
 #include "shell/document_tab.h"
 
-#include <QDateTime>
 #include <QFileInfo>
 #include <QPushButton>
 #include <QTimer>
@@ -66,7 +65,7 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
   connect(&adviceTimer_, &QTimer::timeout, this, &DocumentTab::lookForAdvice);
   connect(&readingTimer_, &QTimer::timeout, this, &DocumentTab::readForAdvice);
   connect(adviceStrip_, &AdviceStrip::chosen, this,
-          [this](int place) { goToAdvice(static_cast<std::size_t>(place)); });
+          [this](int place) { goToPlace(PagePlace(advice_.at(static_cast<std::size_t>(place)).place)); });
   connect(adviceStrip_, &AdviceStrip::fixWanted, this,
           [this](int place) { fixAdvice(static_cast<std::size_t>(place)); });
 
@@ -188,9 +187,12 @@ bool DocumentTab::goToPage(std::int32_t id) {
   return true;
 }
 
-void DocumentTab::goToRow(std::int32_t page, int row, int column) {
-  if (currentPage() != page && !goToPage(page)) return;
-  if (row > 0 || column > 0) pane_->showCell(std::max(row, 1), column);
+bool DocumentTab::goToPlace(const PagePlace& place, Keyboard keyboard) {
+  const auto page = static_cast<std::int32_t>(place.page);
+  if (currentPage() != page && !goToPage(page)) return false;
+  QWidget* found = pane_->goTo(place);
+  if (found != nullptr && keyboard == Keyboard::follows) found->setFocus(Qt::OtherFocusReason);
+  return true;
 }
 
 void DocumentTab::goToNeighbour(int direction) {
@@ -296,14 +298,6 @@ void DocumentTab::showAdvice() {
   emit advised();
 }
 
-bool DocumentTab::goToAdvice(std::size_t place) {
-  if (place >= advice_.size()) return false;
-  const AdvicePlace at = advice_[place].place;
-  if (!goToPage(static_cast<std::int32_t>(at.page))) return false;
-  pane_->focusOn(QString::fromStdString(at.field), at.fieldNumber, at.item, at.itemCount);
-  return true;
-}
-
 void DocumentTab::fixAdvice(std::size_t place) {
   if (place >= advice_.size()) return;
   const Advice wanted = advice_[place];
@@ -325,22 +319,17 @@ QString DocumentTab::title() const {
   return name() + (editor_->isModified() ? " *" : "");
 }
 
-DocumentTab::Stamp DocumentTab::stampOf(const QString& path) {
-  const QFileInfo info(path);
-  return info.exists() ? Stamp{info.lastModified().toMSecsSinceEpoch(), info.size()} : Stamp{};
-}
-
 void DocumentTab::watch() {
   const QString path = QString::fromStdString(editor_->path());
-  stamp_ = stampOf(path);
+  stamp_ = fileStamp(editor_->path());
   notice_->hide();
   if (!watcher_.files().isEmpty()) watcher_.removePaths(watcher_.files());
   if (!path.isEmpty() && QFileInfo::exists(path)) watcher_.addPath(path);
 }
 
 bool DocumentTab::isChangedOnDisk() const {
-  const QString path = QString::fromStdString(editor_->path());
-  return !path.isEmpty() && stamp_.size >= 0 && QFileInfo::exists(path) && stampOf(path) != stamp_;
+  const std::optional<FileStamp> now = fileStamp(editor_->path());
+  return stamp_ && now && !now->isOfSameContent(*stamp_);
 }
 
 void DocumentTab::fileChanged() {

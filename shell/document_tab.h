@@ -10,6 +10,7 @@
 #include <memory>
 #include <optional>
 
+#include "platform/files/file_stamp.h"
 #include "plugin/setup_editor.h"
 #include "shell/advice_strip.h"
 #include "shell/cover_view.h"
@@ -62,9 +63,7 @@ class DocumentTab final : public QSplitter, public SetupHost {
   // What is doubtful in the setup: of the model a moment after its last edit.
   const std::vector<Advice>& advice() const { return advice_; }
   AdviceStrip& adviceStrip() { return *adviceStrip_; }
-  // Goes to the page, and the field or entry, that an advice speaks of; false when the page does not apply.
-  // Makes its fix, and goes to its page.
-  bool goToAdvice(std::size_t place);
+  // Makes the fix of an advice, and goes to its page.
   void fixAdvice(std::size_t place);
 
   // Does a command of the editor, with what is typed and not yet entered, and shows the model anew.
@@ -74,8 +73,10 @@ class DocumentTab final : public QSplitter, public SetupHost {
   // Selects the tree item of a page, and ends a search that hides it; false when the page does not apply.
   bool goToPage(std::int32_t id);
   void goToNeighbour(int direction);
-  // A page, and a cell (from 1, without headers; 0 for any) of its first table that has it.
-  void goToRow(std::int32_t page, int row, int column);
+  // A place on a page, which the keyboard follows unless it is at work elsewhere; false when the page does
+  // not apply.
+  enum class Keyboard { follows, stays };
+  bool goToPlace(const PagePlace& place, Keyboard keyboard = Keyboard::follows);
   // The row (from 1, without headers) of the page that is at work; 0 for none.
   int currentRow() const { return pane_->currentRow(); }
   // The item that is selected; 0 for none.
@@ -152,14 +153,7 @@ class DocumentTab final : public QSplitter, public SetupHost {
   QLabel* noticeText_ = nullptr;
   QHash<std::int32_t, QTreeWidgetItem*> itemsById_;
   QFileSystemWatcher watcher_;
-  // The file's time and size when it was read or written here.
-  struct Stamp {
-    qint64 time = 0;
-    qint64 size = -1;
-    bool operator==(const Stamp&) const = default;
-  };
-  static Stamp stampOf(const QString& path);
-  Stamp stamp_;
+  std::optional<FileStamp> stamp_;  // of the file when it was read or written here
   std::optional<Check> check_;
   AdviceStrip* adviceStrip_;
   QTimer adviceTimer_;   // runs from an edit to the look at what it has made

@@ -26,6 +26,12 @@ QString shownText(const CellStyle& cell) {
   return all.size() <= kShort ? all : GridModel::tr("%1 of %2").arg(chosen.size()).arg(cell.choices.size());
 }
 
+int GridModel::headerRows() const {
+  int rows = 0;
+  while (rows < rowCount() && style(index(rows, 0)).isHeader) ++rows;
+  return rows;
+}
+
 CellStyle GridModel::style(const QModelIndex& index) const {
   CellStyle style;
   grid_.GetStyleRowCol(index.row() + 1, index.column() + 1, style);

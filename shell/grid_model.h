@@ -21,6 +21,8 @@ class GridModel final : public QAbstractTableModel {
   Qt::ItemFlags flags(const QModelIndex& index) const override;
   bool setData(const QModelIndex& index, const QVariant& value, int role) override;
 
+  // Further rows of headers, above those that can be chosen.
+  int headerRows() const;
   // How a cell looks at present; one of a grid that does not apply is greyed.
   CellStyle style(const QModelIndex& index) const;
   void press(const QModelIndex& index);

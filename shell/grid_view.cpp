@@ -419,26 +419,45 @@ void GridView::currentChanged(const QModelIndex& current, const QModelIndex& pre
   emit rowChosen(row);
 }
 
-void GridView::goTo(int row, int column) {
+bool GridView::goTo(const PagePlace& place) {
+  const int row = rowOf(place.entries);
+  const int column = row < 0 ? -1 : columnOf(place, row);
+  if (column < 0) return false;
   const bool outer = std::exchange(movingByKeys_, true);
-  setCurrentIndex(model_->index(row, column));
-  movingByKeys_ = outer;
+  selectionModel()->setCurrentIndex(model_->index(row, column), QItemSelectionModel::ClearAndSelect);
   scrollTo(currentIndex());
+  movingByKeys_ = outer;
+  return true;
 }
 
-// An entry may have several rows, and there may be rows of headers above the first.
-void GridView::goToItem(int item, int count) {
-  const int rows = model_->rowCount();
-  int first = 0;
-  while (first < rows && model_->style(model_->index(first, 0)).isHeader) ++first;
-  const int each = count > 0 ? std::max((rows - first) / count, 1) : 1;
-  const int row = first + (item - 1) * each;
-  if (row < 0 || row >= rows || model_->columnCount() == 0) return;
-  const bool outer = std::exchange(movingByKeys_, true);
-  selectionModel()->setCurrentIndex(model_->index(row, 0), QItemSelectionModel::ClearAndSelect);
-  scrollTo(model_->index(row, 0));
-  movingByKeys_ = outer;
-  setFocus(Qt::OtherFocusReason);
+// An entry may have several rows, and a title above them.
+int GridView::rowOf(const std::vector<ListEntry>& entries) const {
+  int first = model_->headerRows();
+  int rows = model_->rowCount() - first;
+  const auto isTitle = [this](int row) { return model_->style(model_->index(row, 0)).isHeading; };
+  for (const auto& [number, count] : entries) {
+    const int each = std::max(count > 0 ? rows / count : 1, 1);
+    if (number < 1 || (number - 1) * each >= rows) return -1;
+    first += (number - 1) * each;
+    rows = each;
+    while (rows > 1 && isTitle(first)) {
+      ++first;
+      --rows;
+    }
+  }
+  return rows > 0 ? first : -1;
+}
+
+int GridView::columnOf(const PagePlace& place, int row) const {
+  if (place.column > 0) return place.column <= model_->columnCount() ? place.column - 1 : -1;
+  int number = place.fieldNumber;
+  for (int column = 0; column < model_->columnCount(); ++column) {
+    if (isColumnHidden(column)) continue;
+    const QString header = model_->headerData(column, Qt::Horizontal, Qt::DisplayRole).toString().trimmed();
+    if (!place.field.empty() && header == QString::fromStdString(place.field) && --number == 0) return column;
+    if (!place.value.empty() && model_->style(model_->index(row, column)).value == place.value) return column;
+  }
+  return model_->columnCount() == 0 ? -1 : std::max(currentIndex().column(), 0);
 }
 
 // To come here by Tab makes a cell the current one, and opens none. The focus that a closed editor gives back

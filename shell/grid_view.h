@@ -3,6 +3,7 @@
 #include <QTableView>
 #include <set>
 
+#include "core/page_place.h"
 #include "shell/cell_delegate.h"
 #include "shell/grid_header.h"
 #include "shell/grid_model.h"
@@ -21,12 +22,10 @@ class GridView final : public QTableView {
   // Whether it takes the width that is left over; a table of numbers alone has no use for it.
   void setStretches(bool stretches);
   GridModel& cells() { return *model_; }
-  // Makes a cell (from 0) the current one, and opens no editor.
-  void goTo(int row, int column);
+  // Makes the cell at a place of the page the current one, and opens no editor; false where there is none.
+  bool goTo(const PagePlace& place);
   // Hands over what is typed in a cell and not yet entered.
   void commitEdit();
-  // Makes the entry `item` of `count`, from 1, the current one, and opens no editor.
-  void goToItem(int item, int count);
 
   QSize sizeHint() const override;
   QSize minimumSizeHint() const override;
@@ -65,6 +64,9 @@ class GridView final : public QTableView {
     bool isUserSized = false;
   };
 
+  // From 0; below 0 for none.
+  int rowOf(const std::vector<ListEntry>& entries) const;
+  int columnOf(const PagePlace& place, int row) const;
   void layOutGrid();
   void followCurrentRow();
   void measureColumns();

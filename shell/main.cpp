@@ -37,7 +37,7 @@ void takeMaps(MainWindow& window, const std::function<void(const QString&)>& tak
   window.resize(1500, 860);
   window.map().show();
   window.resizeDocks({&window.map()}, {kWidth}, Qt::Horizontal);
-  window.currentDocument()->goToRow(kAreas, 2, 0);
+  window.currentDocument()->goToPlace({.page = PageId::bathymetry, .entries = {{2}}});
   settle();
   take("map");
   const std::vector<gridbay::MapArea>& areas = canvas.scene().areas;

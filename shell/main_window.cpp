@@ -15,6 +15,8 @@
 namespace gridbay::shell {
 namespace {
 
+constexpr int kMessagesTopic = 1;  // of the help
+
 constexpr const char* kRecentKey = "recent";
 constexpr const char* kGeometryKey = "window/geometry";
 constexpr const char* kStateKey = "window/state";
@@ -73,16 +75,11 @@ MainWindow::~MainWindow() {
 void MainWindow::buildDocks() {
   messages_ = new MessagesDock(commandAction(DocumentTab::kValidate), this);
   addDockWidget(Qt::BottomDockWidgetArea, messages_);
-  connect(messages_, &MessagesDock::pageChosen, this, [this](int page) {
+  connect(messages_, &MessagesDock::placeChosen, this, [this](const PagePlace& place) {
     DocumentTab* tab = currentDocument();
-    if (tab != nullptr && !tab->goToPage(page))
-      statusBar()->showMessage(tr("The page %1 is not shown now.").arg(tab->caption(page)));
-  });
-
-  connect(messages_, &MessagesDock::adviceChosen, this, [this](int place) {
-    DocumentTab* tab = currentDocument();
-    if (tab != nullptr && !tab->goToAdvice(static_cast<std::size_t>(place)))
-      statusBar()->showMessage(tr("The page of this advice is not shown now."));
+    if (tab != nullptr && !tab->goToPlace(place))
+      statusBar()->showMessage(
+          tr("The page %1 is not shown now.").arg(tab->caption(static_cast<std::int32_t>(place.page))));
   });
   connect(messages_, &MessagesDock::fixWanted, this, [this](int place) {
     if (DocumentTab* tab = currentDocument()) tab->fixAdvice(static_cast<std::size_t>(place));
@@ -278,9 +275,16 @@ void MainWindow::startEngine(const EngineStart& start) {
 void MainWindow::showHelp() {
   DocumentTab* tab = currentDocument();
   const int page = tab == nullptr ? 0 : tab->currentPage();
-  const int topic = page == 0 ? 0 : tab->editor().helpTopic(page);
   QString error;
-  if (!help_->showTopic(topic, page == 0 ? tr("Overview") : tab->caption(page), &error)) tell(error);
+  bool isShown = true;
+  if (messages_->isAncestorOf(QApplication::focusWidget())) {
+    isShown = help_->showTopic(kMessagesTopic, messages_->windowTitle(), &error);
+  } else if (page == 0) {
+    isShown = help_->showTopic(0, tr("Overview"), &error);
+  } else {
+    isShown = help_->showTopic(tab->editor().helpTopic(page), tab->caption(page), &error);
+  }
+  if (!isShown) tell(error);
 }
 
 bool MainWindow::mayClose(DocumentTab& tab) {

@@ -10,11 +10,11 @@
 namespace gridbay::shell {
 namespace {
 
-constexpr int kPageRole = Qt::UserRole;
 constexpr int kAdviceType = QTreeWidgetItem::UserType;  // of an item with an advice
-constexpr int kPlaceRole = Qt::UserRole + 1;            // of an advice in its list
+constexpr int kNumberRole = Qt::UserRole;               // of a message or an advice in its list
 constexpr int kPageColumn = 1;
-constexpr int kFixColumn = 2;
+constexpr int kThingColumn = 2;
+constexpr int kFixColumn = 3;
 
 }  // namespace
 
@@ -28,7 +28,7 @@ MessagesDock::MessagesDock(QAction* check, QWidget* parent)
   check_->setDefaultAction(check);
   check_->setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
   check_->setFocusPolicy(Qt::StrongFocus);
-  list_->setHeaderLabels({tr("Message"), tr("Page"), QString()});
+  list_->setHeaderLabels({tr("Message"), tr("Page"), tr("Of"), QString()});
   list_->setRootIsDecorated(false);
   list_->header()->setStretchLastSection(false);
   list_->header()->setSectionResizeMode(QHeaderView::ResizeToContents);
@@ -46,10 +46,11 @@ MessagesDock::MessagesDock(QAction* check, QWidget* parent)
   setWidget(content);
   QWidget::setTabOrder(list_, check_);
   connect(list_, &QTreeWidget::itemActivated, this, [this](const QTreeWidgetItem* item) {
-    if (const int place = adviceAt(item); place >= 0) {
-      emit adviceChosen(place);
-    } else {
-      emit pageChosen(item->data(0, kPageRole).toInt());
+    const auto number = static_cast<std::size_t>(item->data(0, kNumberRole).toInt());
+    if (adviceAt(item) >= 0) {
+      emit placeChosen(PagePlace(tab_->advice()[number].place));
+    } else if (tab_ != nullptr && tab_->check() && number < tab_->check()->messages.size()) {
+      emit placeChosen(tab_->editor().placeOf(tab_->check()->messages[number]));
     }
   });
   fix_->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_Period));
@@ -73,10 +74,9 @@ void MessagesDock::showCheckOf(DocumentTab* tab) {
   if (tab != nullptr && tab->check()) {
     for (const CMessage& message : tab->check()->messages) {
       auto* item = new QTreeWidgetItem(list_);
-      const int page = static_cast<int>(message.page);
       item->setText(0, QString::fromStdString(message.text));
-      item->setText(1, tab->caption(page));
-      item->setData(0, kPageRole, page);
+      item->setData(0, kNumberRole, list_->topLevelItemCount() - 1);
+      showPlace(*item, tab->editor().placeOf(message));
       const bool isPlain = message.severity == Severity::fault;
       item->setIcon(
           0, style()->standardIcon(isPlain ? QStyle::SP_MessageBoxWarning : QStyle::SP_MessageBoxCritical));
@@ -89,7 +89,7 @@ void MessagesDock::showCheckOf(DocumentTab* tab) {
 
 int MessagesDock::adviceAt(const QTreeWidgetItem* item) const {
   if (tab_ == nullptr || item == nullptr || item->type() != kAdviceType) return -1;
-  const int place = item->data(0, kPlaceRole).toInt();
+  const int place = item->data(0, kNumberRole).toInt();
   return place < static_cast<int>(tab_->advice().size()) ? place : -1;
 }
 
@@ -109,13 +109,16 @@ void MessagesDock::showAdvice() {
     list_->setCurrentItem(list_->topLevelItem(messageCount() + current));
 }
 
+void MessagesDock::showPlace(QTreeWidgetItem& item, const PagePlace& place) {
+  item.setText(kPageColumn, tab_->caption(static_cast<std::int32_t>(place.page)));
+  item.setText(kThingColumn, QString::fromStdString(place.thing));
+}
+
 void MessagesDock::addAdvice(const Advice& advice, int place) {
   auto* item = new QTreeWidgetItem(list_, kAdviceType);
   item->setText(0, QString::fromStdString(advice.doubt));
-  const QString page = tab_->caption(static_cast<std::int32_t>(advice.place.page));
-  item->setText(kPageColumn,
-                advice.place.thing.empty() ? page : page + ", " + QString::fromStdString(advice.place.thing));
-  item->setData(0, kPlaceRole, place);
+  item->setData(0, kNumberRole, place);
+  showPlace(*item, advice.place);
   item->setIcon(0, toolIcon(Tool::advice));
   item->setToolTip(0, adviceTip(advice));
   if (!advice.fix) return;

@@ -33,15 +33,16 @@ class MessagesDock final : public QDockWidget {
   QLabel& note() { return *note_; }
 
  signals:
-  void pageChosen(int page);
+  // What a message or an advice speaks of.
+  void placeChosen(const gridbay::PagePlace& place);
   // An advice by its place in the document's list.
-  void adviceChosen(int place);
   void fixWanted(int place);
 
  protected:
   void changeEvent(QEvent* event) override;
 
  private:
+  void showPlace(QTreeWidgetItem& item, const PagePlace& place);
   void addAdvice(const Advice& advice, int place);
   int adviceAt(const QTreeWidgetItem* item) const;
 

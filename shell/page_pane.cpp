@@ -54,13 +54,6 @@ class Picture final : public QLabel {
   QPixmap picture_;
 };
 
-// Further rows of headers, above those that can be chosen.
-int headerRows(const GridModel& cells) {
-  int rows = 0;
-  while (rows < cells.rowCount() && cells.style(cells.index(rows, 0)).isHeader) ++rows;
-  return rows;
-}
-
 }  // namespace
 
 PagePane::PagePane(QWidget* parent) : QScrollArea(parent) {
@@ -147,7 +140,7 @@ PagePane::Part PagePane::makePart(Control& control, QWidget* parent, bool hasBod
     connect(grid, &GridView::edited, this, &PagePane::refresh);
     connect(grid, &GridView::rowChosen, this, [this, grid](int row) {
       lastGrid_ = grid;
-      emit rowChosen(std::max(row - headerRows(grid->cells()), 0));
+      emit rowChosen(std::max(row - grid->cells().headerRows(), 0));
     });
     return {&control, grid, nullptr, grid};
   }
@@ -259,24 +252,30 @@ void PagePane::refreshGroup(const Part& part, bool isShown) {
   if (part.grid != nullptr) part.grid->cells().refresh();
 }
 
-bool PagePane::showCell(int row, int column) {
+QWidget* PagePane::goTo(const PagePlace& place) {
+  QWidget* found = widgetAt(place);
+  if (found != nullptr) ensureWidgetVisible(found);
+  return found;
+}
+
+// A control of the label, or else one that holds the value; of a place in a table that table.
+QWidget* PagePane::widgetAt(const PagePlace& place) const {
   for (const Part& part : parts_) {
-    if (part.grid == nullptr || row < 1) continue;
-    const GridModel& cells = part.grid->cells();
-    const int place = row + headerRows(cells);
-    if (place > cells.rowCount() || column > cells.columnCount()) continue;
-    const QModelIndex now = part.grid->currentIndex();
-    const int any = now.isValid() ? now.column() : 0;
-    part.grid->goTo(place - 1, column > 0 ? column - 1 : any);
-    ensureWidgetVisible(part.grid);
-    return true;
+    if (place.isInTable() && part.grid != nullptr && part.control->visible && part.grid->goTo(place))
+      return part.grid;
   }
-  return false;
+  if (place.isInTable()) return nullptr;
+  if (!place.field.empty()) return widgetOf(QString::fromStdString(place.field), place.fieldNumber);
+  const auto holds = [&](const Part& part) {
+    return part.field != nullptr && part.control->visible && part.control->text == place.value;
+  };
+  const auto found = place.value.empty() ? parts_.end() : std::ranges::find_if(parts_, holds);
+  return found == parts_.end() ? nullptr : found->widget;
 }
 
 int PagePane::currentRow() const {
   if (lastGrid_ == nullptr || !lastGrid_->currentIndex().isValid()) return 0;
-  return std::max(lastGrid_->currentIndex().row() + 1 - headerRows(lastGrid_->cells()), 0);
+  return std::max(lastGrid_->currentIndex().row() + 1 - lastGrid_->cells().headerRows(), 0);
 }
 
 std::optional<QModelIndex> PagePane::pointCell() const {
@@ -298,21 +297,6 @@ QWidget* PagePane::widgetOf(const QString& label, int n) const {
     if (QString::fromStdString(part.control->label) == label && --n == 0) return part.widget;
   }
   return nullptr;
-}
-
-bool PagePane::focusOn(const QString& label, int n, int item, int itemCount) {
-  if (!label.isEmpty()) {
-    QWidget* input = widgetOf(label, n);
-    if (input == nullptr) return false;
-    input->setFocus(Qt::OtherFocusReason);
-    ensureWidgetVisible(input);
-    return true;
-  }
-  const auto table = std::ranges::find_if(parts_, [](const Part& part) { return part.grid != nullptr; });
-  if (item < 1 || table == parts_.end()) return false;
-  table->grid->goToItem(item, itemCount);
-  ensureWidgetVisible(table->grid);
-  return true;
 }
 
 }  // namespace gridbay::shell

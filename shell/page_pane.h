@@ -7,6 +7,7 @@
 #include <optional>
 #include <vector>
 
+#include "core/page_place.h"
 #include "shell/fields/accelerators.h"
 #include "shell/fields/field.h"
 #include "shell/fields/field_layout.h"
@@ -36,16 +37,13 @@ class PagePane final : public QScrollArea {
   // The input of the n-th control of a label; null when there is none.
   QWidget* widgetOf(const QString& label, int n = 1) const;
 
-  // Makes a cell (from 1; column 0 for any) the current one of the first table that has it; rows that are
-  // headers do not count. False where there is none.
-  bool showCell(int row, int column);
+  // Brings a place of the page into view, and makes its cell the current one, where it is in a table. The
+  // input or table that it is in, for who wants the focus there; null where there is none.
+  QWidget* goTo(const PagePlace& place);
   // The row (from 1, without headers) of the table that was last at work; 0 for none.
   int currentRow() const;
   // The cell that is at work, where it holds a point of a grid and takes another one.
   std::optional<QModelIndex> pointCell() const;
-  // Puts the focus on the n-th control of a label, or on an entry of the first table where there is no label;
-  // false when the page has no such thing.
-  bool focusOn(const QString& label, int n, int item, int itemCount);
 
   // The whole page, as far as the screen has the room.
   QSize sizeHint() const override;
@@ -62,6 +60,7 @@ class PagePane final : public QScrollArea {
     std::unique_ptr<Field> field = {};
     GridView* grid = nullptr;
   };
+  QWidget* widgetAt(const PagePlace& place) const;
   Part makePart(Control& control, QWidget* parent, bool hasBody);
   void place(const Part& part, FieldLayout& layout, bool beside);
   void connectField(Field& field, FieldLayout& layout);

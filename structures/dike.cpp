@@ -92,7 +92,11 @@ void CNhdDikeObjectKvs::RequestCrestLevelFile(CVdFileSelectorDlg& selector) {
 }
 
 unsigned CNhdDikeObjectKvs::Validate(ValidationList& messages, int) {
-  if (crest() != kInSpaceAndTime || isReadableFile(crestLevelFile.absolute())) return 0;
+  if (crest() != kInSpaceAndTime) return 0;
+  CVdFileSelectorDlg selector;
+  RequestCrestLevelFile(selector);
+  noteDataFile(messages, PageId::dikes, selector, crestLevelFile);
+  if (isReadableFile(crestLevelFile.absolute())) return 0;
   return reportDataFile(messages, PageId::dikes, crestLevelFile, {}, Reason::left);
 }
 

@@ -1,7 +1,5 @@
 #include "platform/tsb/known_files.h"
 
-#include <sys/stat.h>
-
 #include <algorithm>
 #include <ctime>
 
@@ -12,21 +10,14 @@ constexpr std::size_t kMostFiles = 64;
 
 }  // namespace
 
-std::optional<KnownFiles::State> KnownFiles::stateOf(const std::string& path) {
-  struct stat file {};
-  if (::stat(path.c_str(), &file) != 0) return std::nullopt;
-  return State{static_cast<std::int64_t>(file.st_dev), static_cast<std::int64_t>(file.st_ino), file.st_size,
-               file.st_ctim.tv_sec, file.st_ctim.tv_nsec};
-}
-
-std::optional<KnownFiles::State> KnownFiles::known(const std::string& path) const {
-  const std::optional<State> state = stateOf(path);
+std::optional<FileStamp> KnownFiles::known(const std::string& path) const {
+  const std::optional<FileStamp> state = fileStamp(path);
   return state && std::ranges::find(known_, *state) != known_.end() ? state : std::nullopt;
 }
 
-void KnownFiles::keep(const State& state) {
+void KnownFiles::keep(const FileStamp& state) {
   constexpr std::time_t kMoment = 2;
-  if (std::time(nullptr) - state[3] < kMoment) return;
+  if (std::time(nullptr) - state.changed.seconds < kMoment) return;
   std::erase(known_, state);
   known_.insert(known_.begin(), state);
   known_.resize(std::min(known_.size(), kMostFiles));
@@ -36,9 +27,9 @@ std::vector<bool> KnownFiles::hold(std::span<const std::string> paths, const Che
   std::vector<bool> holds(paths.size(), true);
   std::vector<std::string> unknown;
   std::vector<std::size_t> places;
-  std::vector<std::optional<State>> before;
+  std::vector<std::optional<FileStamp>> before;
   for (std::size_t i = 0; i < paths.size(); ++i) {
-    const std::optional<State> state = stateOf(paths[i]);
+    const std::optional<FileStamp> state = fileStamp(paths[i]);
     if (state && std::ranges::find(known_, *state) != known_.end()) continue;
     unknown.push_back(paths[i]);
     places.push_back(i);
@@ -48,7 +39,7 @@ std::vector<bool> KnownFiles::hold(std::span<const std::string> paths, const Che
   const std::vector<bool> checked = check(unknown);
   for (std::size_t i = 0; i < unknown.size(); ++i) {
     holds[places[i]] = checked[i];
-    if (checked[i] && before[i] && stateOf(unknown[i]) == before[i]) keep(*before[i]);
+    if (checked[i] && before[i] && fileStamp(unknown[i]) == before[i]) keep(*before[i]);
   }
   return holds;
 }

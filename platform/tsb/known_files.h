@@ -1,12 +1,12 @@
 #pragma once
 
-#include <array>
-#include <cstdint>
 #include <functional>
 #include <optional>
 #include <span>
 #include <string>
 #include <vector>
+
+#include "platform/files/file_stamp.h"
 
 namespace gridbay {
 
@@ -20,18 +20,13 @@ class KnownFiles {
   // Whether the check holds for each file as it is now. It is asked once, for those that are not known.
   std::vector<bool> hold(std::span<const std::string> paths, const Check& check);
 
-  // What tells a file from all others and from itself before a write: device, number, size and the time of
-  // the last change to its content or owner, in seconds and nanoseconds.
-  using State = std::array<std::int64_t, 5>;
-  // That of a file which is known as it is now.
-  std::optional<State> known(const std::string& path) const;
-  // That of any file as it is now; nothing where there is none.
-  static std::optional<State> stateOf(const std::string& path);
+  // The stamp of a file which is known as it is now.
+  std::optional<FileStamp> known(const std::string& path) const;
 
  private:
-  void keep(const State& state);
+  void keep(const FileStamp& state);
 
-  std::vector<State> known_;
+  std::vector<FileStamp> known_;
 };
 
 }  // namespace gridbay

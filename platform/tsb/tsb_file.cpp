@@ -298,12 +298,12 @@ KnownFiles& knownFiles() {
 
 // The contents of known files, by the state in which they were read: a model asks for its files at each
 // check, and to open one takes longer than most of what is done with it.
-std::map<KnownFiles::State, std::shared_ptr<const Content>>& knownContents() {
-  static std::map<KnownFiles::State, std::shared_ptr<const Content>> contents;
+std::map<FileStamp, std::shared_ptr<const Content>>& knownContents() {
+  static std::map<FileStamp, std::shared_ptr<const Content>> contents;
   return contents;
 }
 
-void keepContent(const KnownFiles::State& state, const std::shared_ptr<const Content>& content) {
+void keepContent(const FileStamp& state, const std::shared_ptr<const Content>& content) {
   constexpr std::size_t kMost = 64;
   if (knownContents().size() >= kMost) knownContents().clear();
   knownContents()[state] = content;
@@ -313,12 +313,12 @@ void keepContent(const KnownFiles::State& state, const std::shared_ptr<const Con
 
 struct TsbFile::State {
   State(std::string name, NetcdfFile open) : path(std::move(name)), file(std::move(open)) {}
-  State(std::string name, const KnownFiles::State& as, std::shared_ptr<const Content> known)
+  State(std::string name, const FileStamp& as, std::shared_ptr<const Content> known)
       : path(std::move(name)), knownAs(as), content(std::move(known)) {}
 
   std::string path;
-  mutable std::optional<NetcdfFile> file;    // opened when it is read from
-  std::optional<KnownFiles::State> knownAs;  // where the content was read before
+  mutable std::optional<NetcdfFile> file;  // opened when it is read from
+  std::optional<FileStamp> knownAs;        // where the content was read before
   std::shared_ptr<const Content> content;
 
   // Whether the library stands all that is asked of it for each file. Its reader was not written for files
@@ -366,7 +366,7 @@ struct TsbFile::State {
 
   Outcome openFile() const {
     if (file) return {};
-    if (KnownFiles::stateOf(path) != knownAs) return fail("it has been written to since it was opened");
+    if (fileStamp(path) != knownAs) return fail("it has been written to since it was opened");
     if (std::optional<NetcdfFile> opened = NetcdfFile::open(path)) {
       file.emplace(*std::move(opened));
       return {};
@@ -437,7 +437,7 @@ Result<TsbFile> TsbFile::open(const std::string& path) {
   if (path.empty()) return Failure{"no data file is named"};
   if (const std::string_view why = hindranceOf(path); !why.empty()) return cannotRead(path, why);
   if (!State::canBeRead({&path, 1})[0]) return cannotRead(path, kNoDataFile);
-  const std::optional<KnownFiles::State> known = knownFiles().known(path);
+  const std::optional<FileStamp> known = knownFiles().known(path);
   if (known) {
     if (const auto content = knownContents().find(*known); content != knownContents().end())
       return TsbFile(std::make_unique<State>(path, *known, content->second));

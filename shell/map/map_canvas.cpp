@@ -9,6 +9,7 @@
 #include <algorithm>
 #include <cmath>
 
+#include "map/map_names.h"
 #include "shell/shades.h"
 
 namespace gridbay::shell {
@@ -26,6 +27,10 @@ std::optional<MapFrame> wholeMap(const MapScene& scene, QSizeF size) {
   const double metres =
       std::max({extent->width() / inside.width(), extent->height() / inside.height(), 1e-3});
   return MapFrame{{extent->center().x(), extent->center().y()}, metres, size};
+}
+
+QString textOf(std::string_view name) {
+  return QString::fromUtf8(name.data(), static_cast<qsizetype>(name.size()));
 }
 
 bool isSame(const std::vector<TerrainArea>& a, const std::vector<TerrainArea>& b) {
@@ -150,6 +155,13 @@ void MapCanvas::selectFeature(const std::optional<MapFeatureId>& id, std::int32_
   if (chosen == drawing_.selection) return;
   drawing_.selection = chosen;
   forgetPlaced();
+}
+
+void MapCanvas::setMarks(std::vector<AdviceMark> marks) {
+  if (marks == drawing_.marks) return;
+  drawing_.marks = std::move(marks);
+  forgetPlaced();
+  update();
 }
 
 void MapCanvas::setLayer(MapLayer layer, bool on) {
@@ -305,11 +317,12 @@ bool MapCanvas::event(QEvent* event) {
 
 QString MapCanvas::tipAt(QPointF at) const {
   const MapHit hit = drawing_.hit(frame_, at);
+  if (hit.mark) return drawing_.marks[*hit.mark].tip;
   QStringList lines;
   if (const MapFeature* feature = hit.feature ? drawing_.feature(*hit.feature) : nullptr) {
-    lines << tr("%1 %2").arg(kindName(feature->id.kind)).arg(feature->id.number);
-    const QString drive = driveName(feature->drive);
-    if (!drive.isEmpty()) lines.back() += ": " + drive;
+    lines << tr("%1 %2").arg(textOf(kindName(feature->id.kind))).arg(feature->id.number);
+    if (const QString drive = textOf(driveName(feature->drive)); !drive.isEmpty())
+      lines.back() += ": " + drive;
     if (!feature->fault.empty()) lines << QString::fromStdString(feature->fault);
   } else if (const MapArea* area = hit.isBorder ? scene().area(hit.area) : nullptr) {
     lines << tr("Area %1: %2 x %3 points").arg(area->number).arg(area->nx).arg(area->ny);

@@ -51,6 +51,7 @@ class MapCanvas final : public QWidget {
   // Lights up, with no more ado, what a row of a page tells of.
   void selectFeature(const std::optional<MapFeatureId>& id, std::int32_t area = 0);
 
+  void setMarks(std::vector<AdviceMark> marks);
   void setTool(MapTool tool);
   MapTool tool() const { return tool_; }
   void setLayer(MapLayer layer, bool on);
@@ -81,6 +82,8 @@ class MapCanvas final : public QWidget {
  signals:
   void featureChosen(const gridbay::MapFeature& feature);
   void areaChosen(int number);
+  // The advice of a mark, by their places in the document's list; none for a click elsewhere.
+  void adviceChosen(const std::vector<int>& advice);
   void pointed(const QString& text);
   void picked(gridbay::MapPoint place);
   void nestedAreaWanted(gridbay::MapPoint corner, gridbay::MapPoint opposite);

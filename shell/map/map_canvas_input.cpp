@@ -134,7 +134,7 @@ void MapCanvas::showCursor(QPointF at) {
   const MapHit hit = drawing_.hit(frame_, at);
   const bool isHeld = (hit.vertex && hit.feature == drawing_.selection.feature) ||
                       (!hit.feature && hit.isBorder && hit.area > 1);
-  setCursor(isHeld ? Qt::SizeAllCursor : hit.feature ? Qt::PointingHandCursor : Qt::ArrowCursor);
+  setCursor(isHeld ? Qt::SizeAllCursor : hit.feature || hit.mark ? Qt::PointingHandCursor : Qt::ArrowCursor);
 }
 
 void MapCanvas::mouseReleaseEvent(QMouseEvent* event) {
@@ -174,6 +174,8 @@ void MapCanvas::click(QPointF at) {
 // Lights up what lies there, and leads to its page.
 void MapCanvas::chooseAt(QPointF at) {
   const MapHit hit = drawing_.hit(frame_, at);
+  emit adviceChosen(hit.mark ? drawing_.marks[*hit.mark].advice : std::vector<int>());
+  if (hit.mark) return;
   forgetPlaced();
   if (const MapFeature* feature = hit.feature ? drawing_.feature(*hit.feature) : nullptr) {
     drawing_.selection = {hit.feature, hit.vertex, 0};

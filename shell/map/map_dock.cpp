@@ -34,7 +34,8 @@ MapDock::MapDock(QWidget* parent)
     : QDockWidget(tr("Map"), parent),
       tools_(new QToolBar(this)),
       canvas_(new MapCanvas(this)),
-      readout_(new QLabel(this)) {
+      readout_(new QLabel(this)),
+      adviceStrip_(new AdviceStrip(this)) {
   setObjectName("map");
   toggleViewAction()->setShortcut(Qt::CTRL | Qt::Key_M);
   auto* content = new QWidget(this);
@@ -54,6 +55,7 @@ MapDock::MapDock(QWidget* parent)
   readout_->setText(" ");
   layout->addWidget(tools_);
   layout->addWidget(split, 1);
+  layout->addWidget(adviceStrip_);
   layout->addWidget(readout_);
   setWidget(content);
 
@@ -61,16 +63,25 @@ MapDock::MapDock(QWidget* parent)
   connect(&refreshTimer_, &QTimer::timeout, this, [this] {
     if (tab_ == nullptr) return;
     canvas_->refresh();
+    canvas_->setMarks(marksOf(tab_->advice(), canvas_->scene()));
     followRow(tab_->currentRow());
   });
   connect(this, &QDockWidget::visibilityChanged, this, [this](bool) { follow(); });
   connect(canvas_, &MapCanvas::pointed, this,
           [this](const QString& text) { readout_->setText(text.isEmpty() ? " " : text); });
   connect(canvas_, &MapCanvas::featureChosen, this, [this](const MapFeature& feature) {
-    if (tab_ != nullptr) tab_->goToRow(feature.id.page, feature.row, feature.column);
+    goToRow(static_cast<PageId>(feature.id.page), feature.row, feature.column);
   });
-  connect(canvas_, &MapCanvas::areaChosen, this, [this](int number) {
-    if (tab_ != nullptr) tab_->goToRow(kAreasPage, number, 0);
+  connect(canvas_, &MapCanvas::areaChosen, this,
+          [this](int number) { goToRow(PageId::bathymetry, number, 0); });
+  connect(canvas_, &MapCanvas::adviceChosen, this, [this](const std::vector<int>& advice) {
+    if (tab_ != nullptr) adviceStrip_->showAdvice(tab_->advice(), advice);
+  });
+  connect(adviceStrip_, &AdviceStrip::chosen, this, [this](int place) {
+    if (tab_ != nullptr) tab_->goToPlace(PagePlace(tab_->advice().at(static_cast<std::size_t>(place)).place));
+  });
+  connect(adviceStrip_, &AdviceStrip::fixWanted, this, [this](int place) {
+    if (tab_ != nullptr) tab_->fixAdvice(static_cast<std::size_t>(place));
   });
   connect(canvas_, &MapCanvas::editing, this, [this] {
     if (tab_ != nullptr) tab_->commit();
@@ -236,11 +247,17 @@ void MapDock::follow() {
     frames_[tab_] = canvas_->isFitted() ? std::nullopt : std::optional(canvas_->frame());
     disconnect(tab_, &DocumentTab::documentChanged, this, nullptr);
     disconnect(tab_, &DocumentTab::rowChosen, this, nullptr);
+    disconnect(tab_, &DocumentTab::advised, this, nullptr);
   }
   tab_ = tab;
-  if (tab == nullptr) return canvas_->showMap(nullptr);
+  if (tab == nullptr) {
+    showAdvice();
+    canvas_->setMarks({});
+    return canvas_->showMap(nullptr);
+  }
   connect(tab, &DocumentTab::documentChanged, this, &MapDock::refreshSoon);
   connect(tab, &DocumentTab::rowChosen, this, &MapDock::followRow);
+  connect(tab, &DocumentTab::advised, this, &MapDock::showAdvice);
   if (!frames_.contains(tab)) {
     frames_.insert(tab, std::nullopt);
     connect(tab, &QObject::destroyed, this, [this](QObject* gone) {
@@ -249,11 +266,18 @@ void MapDock::follow() {
     });
   }
   canvas_->showMap(&tab->editor().map(), frames_.value(tab));
+  showAdvice();
   followRow(tab->currentRow());
 }
 
 void MapDock::refreshSoon() {
   refreshTimer_.start(0);
+}
+
+// Other advice has other places in its list, so none is chosen any more.
+void MapDock::showAdvice() {
+  adviceStrip_->showAdvice({}, {});
+  if (tab_ != nullptr) canvas_->setMarks(marksOf(tab_->advice(), canvas_->scene()));
 }
 
 // Lights up what the row of the page tells of. What is chosen already stays so, though another row tells of
@@ -271,6 +295,14 @@ void MapDock::followRow(int row) {
   if (now != nullptr && now->id.page == page && (row == 0 || now->row == 0 || isOf(*now))) return;
   const auto found = std::ranges::find_if(features, isOf);
   canvas_->selectFeature(found == features.end() ? std::nullopt : std::optional(found->id));
+}
+
+// The keyboard stays on the map.
+void MapDock::goToRow(PageId page, int row, int column) {
+  if (tab_ == nullptr) return;
+  PagePlace place{.page = page, .column = column};
+  if (row > 0) place.entries = {{row}};
+  tab_->goToPlace(place, DocumentTab::Keyboard::stays);
 }
 
 void MapDock::startPick() {

@@ -34,6 +34,8 @@ class MapDock final : public QDockWidget {
   MapCanvas& canvas() { return *canvas_; }
   QListWidget& layers() { return *layers_; }
   QLabel& readout() { return *readout_; }
+  // The advice of the mark that was clicked on last.
+  AdviceStrip& adviceStrip() { return *adviceStrip_; }
   QToolBar& tools() { return *tools_; }
   QAction* toolAction(MapTool tool) { return toolActions_[tool]; }
   QAction* pickAction() { return pick_; }
@@ -54,6 +56,8 @@ class MapDock final : public QDockWidget {
   void showScale();
   void follow();
   void followRow(int row);
+  void showAdvice();
+  void goToRow(PageId page, int row, int column);
   void refreshSoon();
   void takePick(MapPoint place);
   void askNestedArea(MapPoint corner, MapPoint opposite);
@@ -65,6 +69,7 @@ class MapDock final : public QDockWidget {
   QToolBar* tools_;
   MapCanvas* canvas_;
   QLabel* readout_;
+  AdviceStrip* adviceStrip_;
   QWidget* panel_ = nullptr;
   QListWidget* layers_ = nullptr;
   QComboBox* colours_ = nullptr;

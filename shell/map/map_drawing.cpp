@@ -6,6 +6,8 @@
 #include <cmath>
 #include <limits>
 
+#include "shell/tool_icons.h"
+
 namespace gridbay::shell {
 namespace {
 
@@ -39,6 +41,13 @@ QRectF coverOf(const std::vector<MapPoint>& points) {
     north = std::max(north, point.north);
   }
   return {west, south, east - west, north - south};
+}
+
+// Where a mark stands: above its place, which stays free to be grasped.
+constexpr double kMarkSize = 20;
+QRectF boxOfMark(QPointF place) {
+  constexpr double kStalk = 12;
+  return {place.x() - kMarkSize / 2, place.y() - kStalk - kMarkSize, kMarkSize, kMarkSize};
 }
 
 // An arrow's head at the end of a line.
@@ -147,6 +156,23 @@ void MapDrawing::paint(QPainter& painter, const MapFrame& frame) const {
     }
   }
   if (lit != nullptr) paintFeature(painter, frame, *lit);
+  if (shows(MapLayer::advice)) paintAdvice(painter, frame);
+}
+
+void MapDrawing::paintAdvice(QPainter& painter, const MapFrame& frame) const {
+  constexpr int kInside = 3;
+  const QColor ground = layerColour(MapLayer::advice);
+  for (const AdviceMark& mark : marks) {
+    const QPointF place = frame.toScreen(mark.place);
+    const QRectF box = boxOfMark(place);
+    painter.setPen(QPen(ground, 2));
+    painter.drawLine(QPointF(place.x(), box.bottom()), place);
+    painter.setBrush(Qt::white);
+    painter.drawEllipse(box);
+    toolIcon(Tool::advice).paint(&painter, box.toRect().adjusted(kInside, kInside, -kInside, -kInside));
+    if (mark.advice.size() > 1)
+      paintBadge(painter, box.topRight(), QString::number(mark.advice.size()), ground);
+  }
 }
 
 void MapDrawing::paintAreas(QPainter& painter, const MapFrame& frame) const {
@@ -339,6 +365,11 @@ void MapDrawing::paintLegend(QPainter& painter, const MapFrame& frame, const Ter
 
 MapHit MapDrawing::hit(const MapFrame& frame, QPointF at) const {
   MapHit hit;
+  for (std::size_t i = marks.size(); shows(MapLayer::advice) && i-- > 0;) {
+    if (!boxOfMark(frame.toScreen(marks[i].place)).contains(at)) continue;
+    hit.mark = i;
+    return hit;
+  }
   const auto nearestVertex = [&](const MapFeature& feature) {
     std::optional<std::size_t> nearest;
     double least = kNear;

@@ -4,6 +4,7 @@
 #include <optional>
 #include <vector>
 
+#include "shell/map/advice_marks.h"
 #include "shell/map/map_frame.h"
 #include "shell/map/map_layers.h"
 #include "shell/map/terrain_picture.h"
@@ -26,6 +27,7 @@ struct MapHit {
   std::optional<std::size_t> segment;  // from this point to the next one
   std::int32_t area = 0;               // the finest one there, or the one whose border is hit
   bool isBorder = false;               // its outline or number
+  std::optional<std::size_t> mark;     // of advice, which lies above all else
 };
 
 // Draws what a scene places over the terrain, for the screen as for paper, and finds it again under the
@@ -38,6 +40,7 @@ class MapDrawing {
 
   MapLayers layers = MapLayers().set();
   MapSelection selection;
+  std::vector<AdviceMark> marks;
 
   void paint(QPainter& painter, const MapFrame& frame) const;
   // Scale bar, north arrow, colour scale and the name of the projection.
@@ -58,6 +61,7 @@ class MapDrawing {
   void paintFeature(QPainter& painter, const MapFrame& frame, const MapFeature& feature) const;
   void paintMarks(QPainter& painter, const MapFeature& feature, const QPolygonF& line,
                   const QColor& colour) const;
+  void paintAdvice(QPainter& painter, const MapFrame& frame) const;
   void paintHandles(QPainter& painter, const QPolygonF& line) const;
 
   MapScene scene_;

@@ -23,6 +23,7 @@ constexpr std::array<Layer, kMapLayers> kLayers{{
     {QT_TRANSLATE_NOOP("Map", "Culverts"), 0xFF4B4B4B},
     {QT_TRANSLATE_NOOP("Map", "Sources and sinks"), 0xFF00A651},
     {QT_TRANSLATE_NOOP("Map", "Output points"), 0xFF6A51A3},
+    {QT_TRANSLATE_NOOP("Map", "Advice"), 0xFFE0A800},
     {QT_TRANSLATE_NOOP("Map", "Scales and north"), 0xFF606060},
 }};
 
@@ -97,64 +98,6 @@ QColor featureColour(const MapFeature& feature) {
       break;
   }
   return layerColour(layerOf(feature.id.kind));
-}
-
-QString driveName(MapDrive drive) {
-  switch (drive) {
-    case MapDrive::levelConstant:
-      return QCoreApplication::translate("Map", "constant level");
-    case MapDrive::levelSeries:
-      return QCoreApplication::translate("Map", "sine series of the level");
-    case MapDrive::levelFile:
-      return QCoreApplication::translate("Map", "level from a file");
-    case MapDrive::fluxConstant:
-      return QCoreApplication::translate("Map", "constant flux");
-    case MapDrive::fluxSeries:
-      return QCoreApplication::translate("Map", "sine series of the flux");
-    case MapDrive::fluxFile:
-      return QCoreApplication::translate("Map", "flux from a file");
-    case MapDrive::ratingCurve:
-      return QCoreApplication::translate("Map", "rating curve");
-    case MapDrive::source:
-      return QCoreApplication::translate("Map", "source");
-    case MapDrive::sink:
-      return QCoreApplication::translate("Map", "sink");
-    case MapDrive::pair:
-      return QCoreApplication::translate("Map", "source and sink");
-    case MapDrive::off:
-      return QCoreApplication::translate("Map", "left out of the calculation");
-    case MapDrive::none:
-      break;
-  }
-  return {};
-}
-
-QString kindName(MapKind kind) {
-  switch (kind) {
-    case MapKind::boundary:
-      return QCoreApplication::translate("Map", "Open boundary");
-    case MapKind::source:
-      return QCoreApplication::translate("Map", "Source");
-    case MapKind::massBudget:
-      return QCoreApplication::translate("Map", "Mass budget polygon");
-    case MapKind::dike:
-      return QCoreApplication::translate("Map", "Dike");
-    case MapKind::weir:
-      return QCoreApplication::translate("Map", "Weir");
-    case MapKind::culvert:
-      return QCoreApplication::translate("Map", "Culvert");
-    case MapKind::outputMap:
-      return QCoreApplication::translate("Map", "Output area");
-    case MapKind::outputLine:
-      return QCoreApplication::translate("Map", "Output line");
-    case MapKind::outputPoints:
-      return QCoreApplication::translate("Map", "Output points");
-    case MapKind::discharge:
-      return QCoreApplication::translate("Map", "Discharge line");
-    case MapKind::box:
-      return QCoreApplication::translate("Map", "Box");
-  }
-  return {};
 }
 
 }  // namespace gridbay::shell

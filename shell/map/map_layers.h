@@ -24,9 +24,10 @@ enum class MapLayer {
   culverts,
   sources,
   outputPoints,
+  advice,
   legend
 };
-inline constexpr std::size_t kMapLayers = 14;
+inline constexpr std::size_t kMapLayers = 15;
 using MapLayers = std::bitset<kMapLayers>;
 
 QString layerName(MapLayer layer);
@@ -35,11 +36,6 @@ MapLayer layerOf(MapKind kind);
 QColor layerColour(MapLayer layer);
 // The colour of a feature by what drives it, and by its kind where nothing does.
 QColor featureColour(const MapFeature& feature);
-// "Constant level"; empty where nothing drives it.
-QString driveName(MapDrive drive);
-// "Weir"
-QString kindName(MapKind kind);
-
 inline std::size_t placeOf(MapLayer layer) {
   return static_cast<std::size_t>(layer);
 }

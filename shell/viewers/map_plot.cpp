@@ -199,7 +199,7 @@ QString MapPlot::textAt(double x, double y) {
   const bool missing = *value == static_cast<float>(item.deleteValue);
   text +=
       missing ? tr("   no value") : QString("   %1 %2").arg(*value).arg(QString::fromStdString(item.unit));
-  if (!missing && *value >= landValueOf(file_.definition(), item_)) text += tr("  (land)");
+  if (!missing && *value >= landLimitOf(file_.definition(), item_)) text += tr("  (land)");
   return text;
 }
 

@@ -4,6 +4,7 @@
 #include <cmath>
 #include <limits>
 
+#include "core/land_value.h"
 #include "platform/units/units.h"
 
 namespace gridbay::shell {
@@ -19,14 +20,11 @@ bool MapSample::range(double* least, double* greatest) const {
   return found;
 }
 
-float landValueOf(const TsbDefinition& definition, std::size_t item) {
-  constexpr std::size_t kLandPlace = 3;
-  const bool isBathymetry = definition.items[item - 1].type == item::kBathymetry;
-  for (const TsbCustomBlock& block : definition.customBlocks) {
-    if (isBathymetry && block.name == "V27_Misc" && block.values.size() > kLandPlace)
-      return block.values[kLandPlace];
-  }
-  return std::numeric_limits<float>::infinity();
+float landLimitOf(const TsbDefinition& definition, std::size_t item) {
+  constexpr float kNone = std::numeric_limits<float>::infinity();
+  if (definition.items[item - 1].type != item::kBathymetry) return kNone;
+  const Result<std::optional<float>> land = landValueOf(definition);
+  return land ? land->value_or(kNone) : kNone;
 }
 
 Result<MapSample> sampleMap(const TsbFile& file, std::size_t item, std::size_t step, const MapWindow& window,
@@ -40,7 +38,7 @@ Result<MapSample> sampleMap(const TsbFile& file, std::size_t item, std::size_t s
   sample.rows = (along - 1) / sample.stride + 1;
   sample.values.reserve(sample.columns * sample.rows);
 
-  const float land = landValueOf(file.definition(), item);
+  const float land = landLimitOf(file.definition(), item);
   const auto missing = static_cast<float>(file.definition().items[item - 1].deleteValue);
   std::vector<float> row(width);
   for (std::size_t r = 0; r < sample.rows; ++r) {

@@ -32,7 +32,7 @@ struct MapWindow {
 
 // Whether an item's values at or above a land value are land, and from where. Infinite where there is no
 // land.
-float landValueOf(const TsbDefinition& definition, std::size_t item);
+float landLimitOf(const TsbDefinition& definition, std::size_t item);
 
 // Reads an item (from 1) at a time step (from 0), with no more points along either axis than `most`. Only the
 // rows that are shown are read.

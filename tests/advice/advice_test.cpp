@@ -8,6 +8,7 @@
 #include <functional>
 #include <set>
 
+#include "advection_dispersion/boundary.h"
 #include "advice/advisor.h"
 #include "advice/rules.h"
 #include "basic/area_description.h"
@@ -17,8 +18,16 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "core/edition.h"
+#include "ecology/precipitation.h"
 #include "hydrodynamic/boundary.h"
+#include "hydrodynamic/infiltration.h"
+#include "hydrodynamic/resistance.h"
 #include "hydrodynamic/result.h"
+#include "hydrodynamic/source_sink.h"
+#include "mud_transport/wave_data.h"
+#include "mud_transport_expanded/forcings.h"
+#include "mud_transport_expanded/sources.h"
+#include "mud_transport_expanded/waves.h"
 #include "platform/cartography/cartography.h"
 #include "platform/tsb/tsb_writer.h"
 #include "setup/dlg_enumerator.h"
@@ -459,6 +468,100 @@ TEST_F(AdviceTest, Series) {
   EXPECT_EQ(model->nhdResult->outputs.GetItem(2)->steps, (USubLine{0, 100, 10}));
 }
 
+// Each of them ends in the run where it is in use, and is not spoken of where it is not.
+TEST_F(AdviceTest, SeriesOfAllModules) {
+  if (theEdition.wetlandSweepKit) GTEST_SKIP() << "it has the flow alone";
+  constexpr std::size_t kShort = 10;
+  writeTide(smooth(kShort), start());
+  const std::string file = folder.file("tide.tsb0");
+  struct Case {
+    PageId page;
+    std::string thing;
+    std::string keyword;
+    std::function<void()> use;
+    std::function<void()> leave;
+  };
+  const auto runs = [this](std::int32_t code) { model->moduleSelection->simulationType = code; };
+  const Case cases[] = {
+      {PageId::infiltration, "", "HYDRODYNAMIC_MODULE/INFILTRATION/File_Name",
+       [&] {
+         model->nhdInfiltration->infiltrationType = CNhdInfiltrationKvs::kNetRate;
+         model->nhdInfiltration->infiltrationFormat = CNhdInfiltrationKvs::kVaryingInTime;
+         model->nhdInfiltration->netRateFile.fileName = file;
+       },
+       [&] { model->nhdInfiltration->infiltrationFormat = CNhdInfiltrationKvs::kConstantInTime; }},
+      {PageId::waves, "", "HYDRODYNAMIC_MODULE/WAVES/File_Name",
+       [&] {
+         model->nhdResistance->formulation = CNhdResistanceKvs::kWaveInduced;
+         model->nhdResistance->waveFormat = CNhdResistanceKvs::kWaveSeries;
+         model->nhdResistance->waveFile.fileName = file;
+       },
+       [&] { model->nhdResistance->waveFormat = CNhdResistanceKvs::kWaveMap; }},
+      {PageId::hdSourceAndSink, "", "HYDRODYNAMIC_MODULE/SOURCE_AND_SINK/Precipitation/File_Name",
+       [&] {
+         model->nhdSourceSink->precipitationKind = CNhdSourceSinkKvs::kTimeSeries;
+         model->nhdSourceSink->precipitationFile.fileName = file;
+       },
+       [&] { model->nhdSourceSink->precipitationKind = CNhdSourceSinkKvs::kConstant; }},
+      {PageId::adBoundary, "boundary 1",
+       "ADVECTION_DISPERSION_MODULE/BOUNDARY_CONCENTRATIONS/BOUNDARY_1/FILE_NAME",
+       [&] {
+         runs(module::kAdvectionDispersion);
+         model->nadBoundary->GetItem(1)->format = 1;
+         model->nadBoundary->GetItem(1)->file = file;
+       },
+       [&] { runs(module::kHydrodynamic); }},
+      {PageId::mtWaveData, "", "MUD_TRANSPORT_MODULE/FORCING_FUNCTIONS/WAVE_DATA/File_Name",
+       [&] {
+         runs(module::kMudTransport);
+         model->nmtWaveData->description = CNmtWaveDataKvs::kIncluded;
+         model->nmtWaveData->input = CNmtWaveDataKvs::kFromFile;
+         model->nmtWaveData->file.fileName = file;
+       },
+       [&] { model->nmtWaveData->input = CNmtWaveDataKvs::kConstant; }},
+      {PageId::mtExpSources, "source 1",
+       "MUD_TRANSPORT_EXPANDED_MODULE/SOURCE_CONCENTRATIONS/SOURCE_SINK_1/FILE_NAME",
+       [&] {
+         runs(module::kMudTransportExpanded);
+         model->nmtExpSources->GetItem(1)->format = 1;
+         model->nmtExpSources->GetItem(1)->file = file;
+       },
+       [&] { model->nmtExpSources->GetItem(1)->format = 0; }},
+      {PageId::mtExpTsvWaves, "",
+       "MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/WAVE_DATA/TWOD_Wavefields/File_Name",
+       [&] {
+         runs(module::kMudTransportExpanded);
+         model->nmtExpForcings->includeWaves = 1;
+         model->nmtExpWaves->typeOfWaveVariation = CNmtExpWavesKvs::kVarying;
+         model->nmtExpTsvWaves->file.fileName = file;
+       },
+       [&] { model->nmtExpWaves->typeOfWaveVariation = CNmtExpWavesKvs::kConstant; }},
+      {PageId::ecoPrecipitation, "", "BIO_RIG_MODULE/AD_TRANSPORT_PARAMETERS/PRECIPITATION/File_Name",
+       [&] {
+         runs(module::kEcological);
+         model->nhdSourceSink->precipitation = 1;
+         model->wqsAdPrecipitation->format = 0;
+         model->wqsAdPrecipitation->file.fileName = file;
+       },
+       [&] { model->wqsAdPrecipitation->format = -1; }},
+  };
+  for (const Case& each : cases) {
+    SCOPED_TRACE(each.keyword);
+    clean();
+    each.use();
+    const std::vector<Advice> found = look();
+    const auto ofSeries = std::ranges::find(found, "series", &Advice::kind);
+    ASSERT_NE(ofSeries, found.end());
+    EXPECT_THAT(ofSeries->doubt, HasSubstr("tide.tsb0 ends at 1990-01-01 13:30:00, in the run"));
+    EXPECT_EQ(ofSeries->place.page, each.page);
+    EXPECT_EQ(ofSeries->place.thing, each.thing);
+    EXPECT_EQ(ofSeries->place.keyword, each.keyword);
+    EXPECT_EQ(std::ranges::count(found, "series", &Advice::kind), 1);
+    each.leave();
+    for (const Advice& advice : look()) EXPECT_NE(advice.kind, "series") << advice.doubt;
+  }
+}
+
 TEST_F(AdviceTest, NamesOfFiles) {
   const std::string beside = folder.file("fine.tsb2");
   speaks({
@@ -513,6 +616,18 @@ TEST_F(AdviceTest, OutputsLargerThanTheDisk) {
   speaks({{"output-size", "the disk has room for", "Write less often", big}});
   advisor.setFreeMegabytes([size](const std::string&) { return size; });
   isSilent({big});
+  // The disk is that of the output's own folder, or of what there is of it.
+  std::filesystem::create_directory(folder.file("there"));
+  advisor.setFreeMegabytes([=, this](const std::string& where) {
+    EXPECT_EQ(where, folder.file("there"));
+    return size / 3;
+  });
+  const auto elsewhere = [=, this] {
+    big();
+    model->nhdResult->outputs.GetItem(1)->file = folder.file("there/not yet/out.tsb2");
+  };
+  speaks({{"output-size", "to " + folder.file("there") + "; the disk has room for", "Write less often",
+           elsewhere}});
   advisor.setFreeMegabytes([](const std::string&) { return std::nullopt; });
   isSilent({big});
 }

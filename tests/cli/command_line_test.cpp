@@ -644,6 +644,15 @@ TEST_F(Tool, AdviceIsTakenByItsNumber) {
   EXPECT_EQ(run.status, 1);
   EXPECT_THAT(run.out, HasSubstr("page 26 (Flood and Dry), severity 1: "));
   EXPECT_THAT(runTool({"validate", setup}).out, HasSubstr("page 26, severity 1: "));
+  // And what they speak of.
+  ASSERT_EQ(runTool({"set", setup, depth + "=0.5", "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/Number_Of_Sources=1",
+                     "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/SOURCE_SINK_1/Source_Point=5000,5000"})
+                .status,
+            0);
+  EXPECT_THAT(runTool({"validate", setup, "--advice"}).out,
+              HasSubstr("page 40 (Source and Sink), source 1, severity 1: Source no.1 is outside of grid\n"));
+  const nlohmann::json faults = nlohmann::json::parse(runTool({"validate", setup, "--advice", "--json"}).out);
+  EXPECT_EQ(faults["messages"][0]["thing"], "source 1");
 }
 
 }  // namespace cli_command_line_test

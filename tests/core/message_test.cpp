@@ -40,6 +40,25 @@ TEST(ShowTogether, TheFaultsOfALoadKeepTheirLines) {
             "correspond to the given number"});
 }
 
+TEST(CheckedEntry, TellsTheEntriesFromTheOutside) {
+  ValidationList messages;
+  report(messages, PageId::weirs, Severity::fault, Text{"before"});
+  const auto inner = [&](int number) {
+    return checkedEntry(messages, {number, 3}, [&] {
+      messages.files.push_back({PageId::weirs, "f", "/f"});
+      return number == 2 ? report(messages, PageId::weirs, Severity::fault, Text{"in it"}) : 0U;
+    });
+  };
+  EXPECT_EQ(checkedEntry(messages, {4, 5}, [&] { return inner(1) + inner(2); }), 1U);
+  ASSERT_EQ(messages.size(), 2U);
+  EXPECT_TRUE(messages[0].entries.empty());
+  EXPECT_EQ(messages[1].entries, (std::vector<ListEntry>{{4, 5}, {2, 3}}));
+  ASSERT_EQ(messages.files.size(), 2U);
+  EXPECT_EQ(messages.files[0].entries, (std::vector<ListEntry>{{4, 5}, {1, 3}}));
+  // They stand beside the message, which is the same as without them.
+  EXPECT_EQ(messages[1], (CMessage{PageId::weirs, "in it"}));
+}
+
 TEST(SetupFile, WithoutItsTargetIsNoSetup) {
   const test::TemporaryFolder folder;
   CollectingMessageHost host;

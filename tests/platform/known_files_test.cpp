@@ -93,6 +93,21 @@ TEST_F(Known, AFileIsKnownInOneState) {
   EXPECT_FALSE(files.known(folder.file("none")));
 }
 
+TEST_F(Known, AStampTellsTheContentFromTheRest) {
+  const std::optional<FileStamp> before = fileStamp(path);
+  ASSERT_TRUE(before);
+  EXPECT_EQ(fileStamp(path), before);
+  waitAMoment();
+  std::filesystem::permissions(path, std::filesystem::perms::owner_all);
+  ASSERT_TRUE(fileStamp(path));
+  EXPECT_NE(fileStamp(path), before);
+  EXPECT_TRUE(fileStamp(path)->isOfSameContent(*before));
+  folder.write("a", "tend");
+  EXPECT_FALSE(fileStamp(path)->isOfSameContent(*before));
+  EXPECT_FALSE(fileStamp(folder.file("none")));
+  EXPECT_FALSE(fileStamp(""));
+}
+
 TEST_F(Known, ADataFileIsReadAnewOnceItIsWrittenTo) {
   const std::string grid = folder.file("g.tsb2");
   test::writeGrid(grid, {.noJ = 10});

@@ -184,7 +184,7 @@ class MapTest : public DesktopFixture {
   }
 
   void aRowLightsUpAndAClickLeadsToItsRow() {
-    tab().goToRow(kAreas, 2, 0);
+    tab().goToPlace({.page = PageId::bathymetry, .entries = {{2}}});
     QCOMPARE(canvas().drawing().selection.area, 2);
     tab().goToPage(39);
     QCOMPARE(canvas().drawing().selection.area, 0);
@@ -241,6 +241,45 @@ class MapTest : public DesktopFixture {
     const QColor shown = canvas().grab().toImage().pixelColor(
         badgeOf(outlineOf(canvas().frame(), area(2).corners)).toPoint() - QPoint(6, 0));
     QVERIFY(shown.red() > 180 && shown.green() < 80);
+  }
+
+  void adviceIsMarkedWhereItLiesAndFixedThere() {
+    QTRY_VERIFY(tab().advice().empty());
+    QVERIFY(canvas().drawing().marks.empty());
+    tab().goToPage(kAreas);
+    QVERIFY(cells().setData(cells().index(1, 2), "35,33", Qt::EditRole));
+    QTRY_COMPARE(canvas().drawing().marks.size(), std::size_t{1});
+    settle();
+    const AdviceMark mark = canvas().drawing().marks[0];
+    QVERIFY(mark.tip.contains("it belongs at (36,33)"));
+    const MapPoint first = area(1).grid.at(35, 33);
+    QCOMPARE(mark.place.east, first.east);
+    QCOMPARE(mark.place.north, first.north);
+    const QPointF lamp = screenOf(mark.place) - QPointF(0, 22);
+    QCOMPARE(canvas().tipAt(lamp), mark.tip);
+    const auto shown = [&] {
+      return canvas().grab().toImage().copy(QRect(lamp.toPoint() - QPoint(9, 9), QSize(19, 19)));
+    };
+    const QImage with = shown();
+    canvas().setLayer(MapLayer::advice, false);
+    QVERIFY(shown() != with);
+    QCOMPARE(canvas().tipAt(lamp).contains("it belongs at"), false);
+    canvas().setLayer(MapLayer::advice, true);
+    // A click shows it with its fix, and grasps nothing.
+    AdviceStrip& strip = window_->map().adviceStrip();
+    QVERIFY(!strip.isVisible());
+    tab().goToPage(kSources);
+    click(lamp);
+    QVERIFY(strip.isVisible());
+    QCOMPARE(tab().currentPage(), kSources);
+    click(screenOf(1, 2, 2));
+    QVERIFY(!strip.isVisible());
+    click(screenOf(mark.place) - QPointF(0, 22));
+    QTest::mouseClick(strip.findChild<QToolButton*>("fix"), Qt::LeftButton);
+    QCOMPARE(undoName(), QString("Move area 2 to (36,33)"));
+    QTRY_COMPARE(area(2).origin.j, 36);
+    QVERIFY(canvas().drawing().marks.empty());
+    QVERIFY(!strip.isVisible());
   }
 
   void aRectangleBecomesANestedArea() {
@@ -397,7 +436,7 @@ class MapTest : public DesktopFixture {
   }
 
   void aCellIsPickedOnTheMap() {
-    tab().goToRow(kAreas, 2, 3);
+    tab().goToPlace({.page = PageId::bathymetry, .entries = {{2}}, .column = 3});
     QVERIFY(tab().pane().pointCell().has_value());
     QTest::keyClick(window_.get(), Qt::Key_M, Qt::ControlModifier | Qt::ShiftModifier);
     QCOMPARE(canvas().tool(), MapTool::pick);
@@ -411,7 +450,7 @@ class MapTest : public DesktopFixture {
 
   void aCellWithNoPointIsNotPicked() {
     QSignalSpy failed(&window_->map(), &MapDock::failed);
-    tab().goToRow(kAreas, 1, 1);
+    tab().goToPlace({.page = PageId::bathymetry, .entries = {{1}}, .column = 1});
     window_->map().startPick();
     QCOMPARE(failed.count(), 1);
     QCOMPARE(canvas().tool(), MapTool::select);

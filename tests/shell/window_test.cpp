@@ -479,17 +479,18 @@ class WindowTest final : public DesktopFixture {
     QVERIFY(open());
     QTRY_COMPARE(adviceOf("it belongs at (36,33)"), 0);  // once the grids are read
     QCOMPARE(tab().advice().size(), std::size_t{1});
-    QCOMPARE(adviceItem("it belongs at")->text(1), QString("Bathymetry, area 2"));
+    QCOMPARE(adviceItem("it belongs at")->text(1), QString("Bathymetry"));
+    QCOMPARE(adviceItem("it belongs at")->text(2), QString("area 2"));
     emit messages().list().itemActivated(adviceItem("it belongs at"), 0);
     QCOMPARE(tab().currentPage(), 27);
     auto* grid = tab().pane().findChild<GridView*>();
     QVERIFY(grid->hasFocus());
-    QCOMPARE(grid->currentIndex().row(), 1);
+    QCOMPARE(grid->currentIndex(), grid->model()->index(1, 2));
     const auto origin = [grid] {
       return grid->model()->index(1, 2).data().toString().remove('(').remove(')');
     };
     QCOMPARE(origin(), QString("35,33"));
-    auto* fix = qobject_cast<QToolButton*>(messages().list().itemWidget(adviceItem("it belongs at"), 2));
+    auto* fix = qobject_cast<QToolButton*>(messages().list().itemWidget(adviceItem("it belongs at"), 3));
     QVERIFY(fix != nullptr);
     QTest::mouseClick(fix, Qt::LeftButton);
     QTRY_COMPARE(origin(), QString("36,33"));
@@ -502,6 +503,56 @@ class WindowTest final : public DesktopFixture {
     messages().list().setCurrentItem(adviceItem("it belongs at"));
     QTest::keyClick(&messages().list(), Qt::Key_Period, Qt::ControlModifier);
     QCOMPARE(origin(), QString("36,33"));
+  }
+
+  void messagesNameWhatTheySpeakOfAndLeadThere() {
+    const QString source = "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/SOURCE_SINK_2/";
+    run("v27setup",
+        {"set", "s.v27", "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/Number_Of_Sources=2",
+         "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/SOURCE_SINK_1/Source_Point=30,20", source + "Type=1",
+         source + "Sink_Point=5000,5000", "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=-1",
+         "HYDRODYNAMIC_MODULE/WIND_CONDITIONS/Data_Format=2",
+         "HYDRODYNAMIC_MODULE/WIND_CONDITIONS/File_Name=none.tsb0"});
+    QVERIFY(open());
+    QTest::keyClick(window_.get(), Qt::Key_F7);
+    QTreeWidget& list = messages().list();
+    const auto lineOf = [&](const QString& text) -> QTreeWidgetItem* {
+      const QList<QTreeWidgetItem*> found = list.findItems(text, Qt::MatchContains);
+      return found.isEmpty() ? nullptr : found.front();
+    };
+    const auto enter = [&](const QString& text) {
+      list.setFocus();
+      list.setCurrentItem(lineOf(text));
+      QTest::keyClick(&list, Qt::Key_Return);
+    };
+    QTreeWidgetItem* line = lineOf("Sink no.2 is outside of grid");
+    QVERIFY(line != nullptr);
+    QCOMPARE(line->text(1), QString("Source and Sink"));
+    QCOMPARE(line->text(2), QString("source 2"));
+    QTest::mouseDClick(list.viewport(), Qt::LeftButton, {}, list.visualItemRect(line).center());
+    QCOMPARE(tab().currentPage(), 40);
+    auto* grid = tab().pane().findChild<GridView*>();
+    QVERIFY(grid->hasFocus());
+    const auto header = [grid] {
+      return grid->model()->headerData(grid->currentIndex().column(), Qt::Horizontal).toString();
+    };
+    QCOMPARE(tab().currentRow(), 2);
+    QCOMPARE(header(), QString("Sink"));
+    // Help is on messages while they are at work.
+    list.setFocus();
+    QTest::keyClick(window_.get(), Qt::Key_F1);
+    QVERIFY(window_->help().isVisible());
+    QVERIFY(window_->help().findChild<QTextBrowser*>()->toPlainText().startsWith("Messages and advice"));
+    // A field by its label, and one by the file that it holds.
+    enter("Drying depth must be positive");
+    QCOMPARE(tab().currentPage(), 26);
+    QVERIFY(edit("Drying depth:").hasFocus());
+    QCOMPARE(lineOf("Drying depth must be positive")->text(2), QString());
+    enter("none.tsb0");
+    QCOMPARE(tab().currentPage(), 46);
+    auto* focused = qobject_cast<QLineEdit*>(QApplication::focusWidget());
+    QVERIFY(focused != nullptr);
+    QCOMPARE(focused->text(), QString("none.tsb0"));
   }
 
   void aSearchEndsWhereItHidesThePage() {

@@ -1,0 +1,331 @@
+#include "setup/page_places.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <array>
+#include <cstdlib>
+#include <map>
+
+#include "basic/texts.h"
+#include "ecology/texts.h"
+#include "families/result_texts.h"
+#include "families/texts.h"
+#include "families/transport_texts.h"
+#include "hydrodynamic/texts.h"
+#include "setup/global_kvs.h"
+
+namespace gridbay {
+namespace {
+
+// The sections that are edited on a page, by the beginning of their path without the numbers, and what the
+// entries of its lists are called. Of several rows that fit the first one holds.
+struct PageRow {
+  PageId page;
+  std::string_view path;
+  std::array<std::string_view, 2> words = {};
+};
+
+constexpr PageRow kPages[] = {
+    {PageId::moduleSelection, "NESTED_MODEL_GLOBALS/MODULE_SELECTION"},
+    {PageId::bathymetry, "NESTED_MODEL_GLOBALS/BATHYMETRY_SELECTION", {"area"}},
+    {PageId::simulationPeriod, "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD"},
+    {PageId::boundary, "NESTED_MODEL_GLOBALS/OPEN_BOUNDARY", {"boundary"}},
+    {PageId::sourceAndSink, "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK", {"source"}},
+    {PageId::massBudget, "NESTED_MODEL_GLOBALS/MASS_BUDGET", {"polygon"}},
+    {PageId::floodAndDry, "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY"},
+
+    {PageId::hdBoundary, "HYDRODYNAMIC_MODULE/OPEN_BOUNDARY", {"boundary"}},
+    {PageId::hdSourceAndSink, "HYDRODYNAMIC_MODULE/SOURCE_AND_SINK", {"source"}},
+    {PageId::infiltration, "HYDRODYNAMIC_MODULE/INFILTRATION"},
+    {PageId::windConditions, "HYDRODYNAMIC_MODULE/WIND_CONDITIONS"},
+    {PageId::eddyViscosity, "HYDRODYNAMIC_MODULE/EDDY_VISCOSITY", {"area"}},
+    {PageId::waveRadiation, "HYDRODYNAMIC_MODULE/WAVE_RADIATION", {"area"}},
+    {PageId::surfaceElevation, "HYDRODYNAMIC_MODULE/SURFACE_ELEVATION", {"area"}},
+    {PageId::resistance, "HYDRODYNAMIC_MODULE/RESISTANCE", {"area"}},
+    {PageId::waves, "HYDRODYNAMIC_MODULE/WAVES"},
+    {PageId::culverts, "HYDRODYNAMIC_MODULE/STRUCTURE_MODULE/CULVERTS", {"culvert"}},
+    {PageId::weirs, "HYDRODYNAMIC_MODULE/STRUCTURE_MODULE", {"weir"}},
+    {PageId::dikes, "HYDRODYNAMIC_MODULE/STRUCTURES/DIKES", {"dike"}},
+    {PageId::hdResult, "HYDRODYNAMIC_MODULE/OUTPUT_SPECIFICATION/HOTSTART_FILES"},
+    {PageId::hdResult, "HYDRODYNAMIC_MODULE/OUTPUT_SPECIFICATION", {"output"}},
+
+    {PageId::adStartingConditions, "ADVECTION_DISPERSION_MODULE/STARTING_CONDITIONS", {"area"}},
+    {PageId::adComponent, "ADVECTION_DISPERSION_MODULE/COMPONENT_SPECIFICATIONS", {"component"}},
+    {PageId::adInitialConcentration,
+     "ADVECTION_DISPERSION_MODULE/INITIAL_CONCENTRATIONS",
+     {"component", "area"}},
+    {PageId::adDispersionCoef, "ADVECTION_DISPERSION_MODULE/DISPERSION_CONDITIONS", {"area"}},
+    {PageId::adDecaySpecification, "ADVECTION_DISPERSION_MODULE/DECAY_COEFFICIENTS", {"component"}},
+    {PageId::adHeatDissipation, "ADVECTION_DISPERSION_MODULE/HEAT_DISSIPATION", {"component"}},
+    {PageId::adBoundary, "ADVECTION_DISPERSION_MODULE/BOUNDARY_CONCENTRATIONS", {"boundary"}},
+    {PageId::adSourceSink, "ADVECTION_DISPERSION_MODULE/SOURCE_CONCENTRATIONS", {"source"}},
+    {PageId::adDepositionConcentration,
+     "ADVECTION_DISPERSION_MODULE/DEPOSITION_CONCENTRATIONS",
+     {"component", "area"}},
+    {PageId::adHeatExchange, "ADVECTION_DISPERSION_MODULE/HEAT_EXCHANGE"},
+    {PageId::adPrecipitation, "ADVECTION_DISPERSION_MODULE/PRECIPITATION_CONCENTRATIONS"},
+    {PageId::adEvaporation, "ADVECTION_DISPERSION_MODULE/EVAPORATION_CONCENTRATIONS"},
+    {PageId::adInfiltration, "ADVECTION_DISPERSION_MODULE/INFILTRATION_CONCENTRATIONS"},
+    {PageId::adFeedback, "ADVECTION_DISPERSION_MODULE/AD_FEED_BACK_ON_HD_CALCULATIONS"},
+    {PageId::adMassBudget, "ADVECTION_DISPERSION_MODULE/MASS_BUDGET", {"polygon"}},
+    {PageId::adResult, "ADVECTION_DISPERSION_MODULE/OUTPUT_SPECIFICATION/HOTSTART_FILES"},
+    {PageId::adResult, "ADVECTION_DISPERSION_MODULE/OUTPUT_SPECIFICATION", {"output"}},
+    {PageId::adResult, "ADVECTION_DISPERSION_MODULE"},
+    {PageId::adLineDischarge, "", {"line"}},
+    {PageId::adBoxSummation, "", {"box"}},
+
+    {PageId::mtStartingConditions, "MUD_TRANSPORT_MODULE/STARTING_CONDITIONS", {"area"}},
+    {PageId::mtInitialConcentration, "MUD_TRANSPORT_MODULE/INITIAL_CONCENTRATIONS", {"component", "area"}},
+    {PageId::mtDispersionCoef, "MUD_TRANSPORT_MODULE/DISPERSION_CONDITIONS", {"area"}},
+    {PageId::mtBoundary, "MUD_TRANSPORT_MODULE/BOUNDARY_CONCENTRATIONS", {"boundary"}},
+    {PageId::mtSourceSink, "MUD_TRANSPORT_MODULE/SOURCE_CONCENTRATIONS", {"source"}},
+    {PageId::mtSettlingAndDespositionBedComposition,
+     "MUD_TRANSPORT_MODULE/MT_PARAMETERS/SETTLING_AND_DEPOSITION/COMPONENT_/Initial_bed_composition",
+     {"component", "area"}},
+    {PageId::mtSettlingAndDespositionErosion,
+     "MUD_TRANSPORT_MODULE/MT_PARAMETERS/SETTLING_AND_DEPOSITION/COMPONENT_/EROSION_COEFFICIENTS",
+     {"component", "area"}},
+    {PageId::mtMfSettlingAndDeposition, "MUD_TRANSPORT_MODULE/MT_PARAMETERS/SETTLING_AND_DEPOSITION"},
+    {PageId::mtMlSettlingAndDeposition, "", {"area"}},
+    {PageId::mtErosionForEachLayerCritical, "", {"layer", "area"}},
+    {PageId::mtErosionForEachLayerFactor, "", {"layer", "area"}},
+    {PageId::mtErosionForEachLayerFactor1, "", {"layer", "area"}},
+    {PageId::mtErosionForEachLayerFactor2, "", {"layer", "area"}},
+    {PageId::mtErosionForEachLayerPower, "", {"layer", "area"}},
+    {PageId::mtErosionForEachLayerDensity, "", {"layer", "area"}},
+    {PageId::mtConstantSliding, "", {"layer", "area"}},
+    {PageId::mtVariableSliding, "", {"area"}},
+    {PageId::mtTransitionBetweenLayers, "", {"layer", "area"}},
+    {PageId::mtBedRoughness, "", {"area"}},
+    {PageId::mtLineDischarge, "", {"line"}},
+    {PageId::mtBoxSummation, "", {"box"}},
+    {PageId::mtResult, "MUD_TRANSPORT_MODULE/OUTPUT_SPECIFICATION/HOTSTART_FILES"},
+    {PageId::mtResult, "MUD_TRANSPORT_MODULE/OUTPUT_SPECIFICATION", {"output"}},
+    {PageId::mtResult, "MUD_TRANSPORT_MODULE"},
+
+    {PageId::mtExpStartingConditions, "MUD_TRANSPORT_EXPANDED_MODULE/STARTING_CONDITIONS", {"area"}},
+    {PageId::mtExpInitialConditions,
+     "MUD_TRANSPORT_EXPANDED_MODULE/INITIAL_CONCENTRATIONS",
+     {"fraction", "area"}},
+    {PageId::mtExpInitialConditions,
+     "MUD_TRANSPORT_EXPANDED_MODULE/INITIAL_BED_THICKNESS",
+     {"layer", "area"}},
+    {PageId::mtExpDispersionCoef, "MUD_TRANSPORT_EXPANDED_MODULE/DISPERSION_CONDITIONS", {"area"}},
+    {PageId::mtExpSources, "MUD_TRANSPORT_EXPANDED_MODULE/SOURCE_CONCENTRATIONS", {"source"}},
+    {PageId::mtExpBoundary, "MUD_TRANSPORT_EXPANDED_MODULE/BOUNDARY_CONCENTRATIONS", {"boundary"}},
+    {PageId::mtExpTsvWaves, "MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/WAVE_DATA/TWOD_Wavefields"},
+    {PageId::mtExpWaveDatabase,
+     "MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/WAVE_DATA/WAVE_DATABASE_PARAMETERS",
+     {"map"}},
+    {PageId::mtExpDredgings, "MUD_TRANSPORT_EXPANDED_MODULE/FORCING_FUNCTIONS/DREDGING", {"dredger"}},
+    {PageId::mtExpDeposition,
+     "MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters/DEPOSITION_PARAMETERS",
+     {"fraction", "area"}},
+    {PageId::mtExpSettlingPar,
+     "MUD_TRANSPORT_EXPANDED_MODULE/Watercoloumn_Parameters/FALL_VELOCITY_PARAMETERS",
+     {"fraction", "area"}},
+    {PageId::mtExpErosionCoefficient,
+     "MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/EROSION_COEFFICIENTS",
+     {"layer", "area"}},
+    {PageId::mtExpCriticalShearStress,
+     "MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/CRITICAL_SHEAR_STRESS_EROSION",
+     {"layer", "area"}},
+    {PageId::mtExpBedDensity,
+     "MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/DENSITY_OF_BED_MATERIAL",
+     {"layer", "area"}},
+    {PageId::mtExpVarFrictionCoef,
+     "MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/SLIDING/Variable_sliding_coefficient",
+     {"area"}},
+    {PageId::mtExpConstFrictionCoef,
+     "MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/SLIDING/Constant_sliding_coefficient",
+     {"layer", "area"}},
+    {PageId::mtExpBedRoughness, "MUD_TRANSPORT_EXPANDED_MODULE/BED_PARAMETERS/BED_ROUGHNESS", {"area"}},
+    {PageId::mtExpPowerOfErosion, "", {"layer", "area"}},
+    {PageId::mtExpLineDischarge, "", {"line"}},
+    {PageId::mtExpMassBudget, "", {"polygon"}},
+    {PageId::mtExpResult, "MUD_TRANSPORT_EXPANDED_MODULE/OUTPUT_SPECIFICATION/HOTSTART_FILES"},
+    {PageId::mtExpResult, "MUD_TRANSPORT_EXPANDED_MODULE/OUTPUT_SPECIFICATION", {"output"}},
+    {PageId::mtExpResult, "MUD_TRANSPORT_EXPANDED_MODULE"},
+
+    {PageId::ecoModelDefinition, "BIO_RIG_MODULE/MODEL_DEFINITION"},
+    {PageId::ecoStartingConditions, "BIO_RIG_MODULE/STARTING_CONDITIONS", {"area"}},
+    {PageId::ecoInitialConditions, "BIO_RIG_MODULE/INITIAL_CONDITIONS", {"state variable", "area"}},
+    {PageId::ecoConstants, "BIO_RIG_MODULE/CONSTANTS", {"constant", "area"}},
+    {PageId::ecoForcings, "BIO_RIG_MODULE/FORCINGS", {"forcing"}},
+    {PageId::ecoBoundary, "BIO_RIG_MODULE/AD_TRANSPORT_PARAMETERS/AD_BOUNDARY", {"boundary"}},
+    {PageId::ecoDispersion, "BIO_RIG_MODULE/AD_TRANSPORT_PARAMETERS/AD_DISPERSION", {"area"}},
+    {PageId::ecoSourceSink, "BIO_RIG_MODULE/AD_TRANSPORT_PARAMETERS/AD_SOURCESINK", {"source"}},
+    {PageId::ecoPrecipitation, "BIO_RIG_MODULE/AD_TRANSPORT_PARAMETERS/PRECIPITATION"},
+    {PageId::ecoEvaporation, "BIO_RIG_MODULE/AD_TRANSPORT_PARAMETERS/EVAPORATION"},
+    {PageId::ecoInfiltration, "BIO_RIG_MODULE/AD_TRANSPORT_PARAMETERS/INFILTRATION"},
+    {PageId::ecoDeposition,
+     "BIO_RIG_MODULE/AD_TRANSPORT_PARAMETERS/AD_DEPOSITION",
+     {"state variable", "area"}},
+    {PageId::ecoMassBudget, "BIO_RIG_MODULE/MASS_BUDGET", {"polygon"}},
+    {PageId::ecoResults, "BIO_RIG_MODULE/OUTPUT_SPECIFICATION/HOTSTART_FILES"},
+    {PageId::ecoResults, "BIO_RIG_MODULE/OUTPUT_SPECIFICATION", {"output"}},
+    {PageId::ecoResults, "BIO_RIG_MODULE"},
+};
+
+// The field that a text speaks of: the label of a control, or the header of a column where an entry is known.
+struct FieldRow {
+  const Text& text;
+  std::string_view field;
+  int number = 1;
+};
+
+constexpr FieldRow kFields[] = {
+    {texts::dryingAboveFlooding, "Drying depth:"},
+    {texts::dryingNotPositive, "Drying depth:"},
+    {texts::timeStepTooSmall, "Time step interval:"},
+    {texts::negativeTimeSteps, "Last:"},
+    {texts::negativeWarmUp, "Last:", 2},
+    {texts::warmUpTooLong, "Last:", 2},
+    {texts::outerNotValid, "Enclosing Area"},
+    {texts::nestPosition, "Origin"},
+    {texts::firstPointNegative, "First point"},
+    {texts::lastPointNegative, "Last point"},
+    {texts::lineNotParallel, "Last point"},
+    {texts::sourceNoArea, "Source"},
+    {texts::sourceOutside, "Source"},
+    {texts::sourceCovered, "Source"},
+    {texts::sourceOnLand, "Source"},
+    {texts::sinkNoArea, "Sink"},
+    {texts::sinkOutside, "Sink"},
+    {texts::sinkCovered, "Sink"},
+    {texts::sinkOnLand, "Sink"},
+    {texts::negativeWindSpeed, "Speed:"},
+    {texts::firstTimeStepNegative, "First:"},
+    {texts::firstTimeStepAfterLast, "First:"},
+    {texts::lastTimeStepOutOfRange, "Last:"},
+    {texts::tooMuchDispersion, "Proportionality factor in x- direction:"},
+    {texts::maximumBelowMinimum, "Max. value:"},
+    {texts::noModelDefinition, "File"},
+    {texts::invalidUpdateFrequency, "Update Frequency"},
+};
+
+// What stands in a text where a format has its first placeholder; nothing for a text of another format.
+std::optional<std::string> firstOf(const std::string& text, std::string_view format) {
+  const std::size_t place = format.find('%');
+  if (place == format.npos || text.compare(0, place, format, 0, place) != 0) return std::nullopt;
+  const std::string_view after = format.substr(place + 2);
+  const std::size_t end = text.find(after, place);
+  if (end == text.npos) return std::nullopt;
+  return text.substr(place, end - place);
+}
+
+bool isOfFormat(const std::string& text, std::string_view format) {
+  return text == format || firstOf(text, format).has_value();
+}
+
+// Whether a path lies in the place of a row; the numbers of its sections do not count.
+bool isIn(std::string_view path, std::string_view place) {
+  std::size_t at = 0;
+  for (const char letter : place) {
+    while (at < path.size() && path[at] != letter && (path[at] >= '0' && path[at] <= '9')) ++at;
+    if (at >= path.size() || path[at++] != letter) return false;
+  }
+  return !place.empty() && at < path.size() && path[at] == '/';
+}
+
+std::string inWords(const std::array<std::string_view, 2>& words, const std::vector<ListEntry>& entries) {
+  std::string thing;
+  for (std::size_t i = 0; i < std::min(words.size(), entries.size()) && !words[i].empty(); ++i)
+    thing += fmt::format("{}{} {}", i == 0 ? "" : ", ", words[i], entries[i].number);
+  return thing;
+}
+
+// Of a page whose entries are columns the number leads to one.
+void layAcross(PagePlace& place) {
+  if (place.page != PageId::massBudget || place.entries.empty()) return;
+  place.column = place.entries.front().number;
+  place.entries.clear();
+}
+
+PagePlace placeOfKeyword(std::string path, const std::vector<ListEntry>& entries) {
+  const auto* row = std::ranges::find_if(kPages, [&](const PageRow& each) { return isIn(path, each.path); });
+  PagePlace place{.keyword = std::move(path)};
+  if (row == std::end(kPages)) return place;
+  place.page = row->page;
+  for (std::size_t i = 0; i < std::min(row->words.size(), entries.size()) && !row->words[i].empty(); ++i)
+    place.entries.push_back(entries[i]);
+  place.thing = inWords(row->words, place.entries);
+  layAcross(place);
+  return place;
+}
+
+// A section of a list, "AREA_2", but for its number; like names that stand together are one, too.
+std::string_view stemOf(std::string_view name) {
+  const std::size_t end = name.find_last_not_of("0123456789");
+  return end == name.npos ? name : name.substr(0, end + 1);
+}
+
+void eachIn(const Node& section, const std::string& path, std::vector<ListEntry>& entries,
+            const std::function<void(const PagePlace& place, const Node& keyword)>& tell) {
+  struct Like {
+    int seen = 0;
+    int all = 0;
+  };
+  std::map<std::string, Like, std::less<>> named;
+  std::map<std::string, int, std::less<>> stems;
+  for (const Node* node = section.first(); node != nullptr; node = node->next()) {
+    if (!node->isSection()) continue;
+    ++named[std::string(node->name())].all;
+    ++stems[std::string(stemOf(node->name()))];
+  }
+  for (const Node* node = section.first(); node != nullptr; node = node->next()) {
+    std::string here = path + (path.empty() ? "" : "/") + std::string(node->name());
+    if (!node->isSection()) {
+      tell(placeOfKeyword(std::move(here), entries), *node);
+      continue;
+    }
+    Like& like = named[std::string(node->name())];
+    if (++like.seen > 1) here += fmt::format("[{}]", like.seen);
+    const std::string_view stem = stemOf(node->name());
+    const bool isNumbered = stem.ends_with('_') && stem.size() < node->name().size();
+    const bool isRepeated = like.all > 1 || node->name().ends_with("_data");
+    if (isNumbered) {
+      const int number = std::atoi(std::string(node->name().substr(stem.size())).c_str());
+      entries.push_back({number, stems[std::string(stem)]});
+    } else if (isRepeated) {
+      entries.push_back({like.seen, like.all});
+    }
+    eachIn(*node, here, entries, tell);
+    if (isNumbered || isRepeated) entries.pop_back();
+  }
+}
+
+}  // namespace
+
+std::string thingOf(PageId page, const std::vector<ListEntry>& entries) {
+  const auto* row = std::ranges::find_if(
+      kPages, [&](const PageRow& each) { return each.page == page && !each.words[0].empty(); });
+  return row == std::end(kPages) ? std::string() : inWords(row->words, entries);
+}
+
+PagePlace placeOfMessage(const CMessage& message) {
+  PagePlace place{
+      .page = message.page, .thing = thingOf(message.page, message.entries), .entries = message.entries};
+  const auto* field = std::ranges::find_if(
+      kFields, [&](const FieldRow& each) { return isOfFormat(message.text, each.text.format); });
+  if (field != std::end(kFields)) {
+    place.field = field->field;
+    place.fieldNumber = field->number;
+  }
+  for (const Text& text :
+       {texts::dataFileNotValid, texts::waveOrGrainFileNotValid, texts::resultFileNotValid}) {
+    if (const std::optional<std::string> name = firstOf(message.text, text.format)) place.value = *name;
+  }
+  layAcross(place);
+  return place;
+}
+
+void eachKeyword(const KvsFile& file,
+                 const std::function<void(const PagePlace& place, const Node& keyword)>& tell) {
+  std::vector<ListEntry> entries;
+  if (const KvsSection target = kvsTargetByNameNum(file, CGlobalKvs::kTarget, 1); target != nullptr)
+    eachIn(*target, {}, entries, tell);
+}
+
+}  // namespace gridbay
