@@ -6,7 +6,7 @@ namespace gridbay {
 
 // A host with no user: what pages ask is declined, but for a question that may be agreed to; what they tell
 // is dropped.
-class NoHost final : public SetupHost {
+class NoHost : public SetupHost {
  public:
   explicit NoHost(bool agrees = false) : agrees_(agrees) {}
 

@@ -241,8 +241,11 @@ void addKeywordList(py::module_& module) {
         for (const KeywordNote& note : list.keywords) {
           py::list values;
           for (const auto& [kind, text] : note.values) values.append(py::make_tuple(kindOf(kind), text));
-          keywords.append(py::make_tuple(note.path, values, note.takesAnyNumber, note.canBeSet, note.label,
-                                         note.page, note.quantity, note.unit, note.choices));
+          py::list parts;
+          for (const ValueNote& part : note.parts)
+            parts.append(py::make_tuple(part.label, part.quantity, part.unit, part.choices));
+          keywords.append(
+              py::make_tuple(note.path, values, note.takesAnyNumber, note.canBeSet, note.page, parts));
         }
         py::list lists;
         for (const ListNote& note : list.lists)

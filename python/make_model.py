@@ -11,7 +11,7 @@ from pathlib import Path
 
 HEADER = '''"""The sections of a setup, made from the tables of the model and the controls of its pages."""
 
-from ._sections import File, Flag, ListOf, Moment, Number, Numbers, Section, Sub, Text, Values, Whole
+from ._sections import File, Flag, ListOf, Moment, Number, Numbers, Part, Section, Sub, Text, Values, Whole
 
 '''
 KINDS = ["Flag", "Whole", "Number", "Text", "File", "File"]  # by the numbers of the kinds of values
@@ -103,14 +103,13 @@ class Maker:
             self.node([*self.resolved(steps), last])
             old = holder.lists.get(last, ("", ""))
             holder.lists[last] = (old[0] or count.split("/")[-1], old[1] or followed)
-        for path, values, any_number, settable, label, page, quantity, unit, choices in keywords:
+        for path, values, any_number, settable, page, parts in keywords:
             *parents, name = path.split("/")
             node = self.node(self.resolved([step_of(step) for step in parents]))
-            new = dict(values=values, any_number=any_number, settable=settable, label=label, page=page,
-                       quantity=quantity, unit=unit, choices=choices)  # fmt: skip
+            new = dict(values=values, any_number=any_number, settable=settable, page=page, parts=parts)
             held = node.keywords.setdefault(name, new)
-            if not held["label"] and label:
-                held.update({key: new[key] for key in ("label", "page", "quantity", "unit", "choices")})
+            if not held["page"] and page:
+                held.update(page=page, parts=parts)
 
     def resolved(self, steps):
         """The steps with those of repeated sections, which have no number for the first, as their lists."""
@@ -173,13 +172,30 @@ def keyword_text(name, note):
     default = " ".join(text if k < 3 else f'"{text}"' if k == 3 else text for k, text in values)
     if kind == "Flag":
         default = default.capitalize()
-    given = {"default": default, **{key: note[key] for key in ("quantity", "unit", "label", "page")}}
-    further = "".join(f", {key}={value!r}" for key, value in given.items() if value)
-    if note["choices"]:
-        further += f", choices={dict(sorted(note['choices'], key=number_first))!r}"
+    # What holds for all values is said of the keyword.
+    whole = same_part(note["parts"])
+    given = {"default": default, **(part_given(whole) if whole else {}), "page": note["page"]}
+    if not whole:
+        given["parts"] = [f"Part({named(part_given(part))})" for part in note["parts"]]
+    further = "".join(f", {text}" for text in [named(given)] if text)
     if not note["settable"]:
         further += ", settable=False"
     return f"{kind}({name!r}{further})"
+
+
+def same_part(parts):
+    return parts[0] if all(part == parts[0] for part in parts) else None
+
+
+def part_given(part):
+    label, quantity, unit, choices = part
+    return dict(quantity=quantity, unit=unit, label=label, choices=dict(sorted(choices, key=number_first)))
+
+
+def named(given):
+    """Arguments by name, those that say nothing left out."""
+    return ", ".join(f"{key}=({', '.join(value)},)" if key == "parts" else f"{key}={value!r}"
+                     for key, value in given.items() if value)  # fmt: skip
 
 
 def number_first(choice):

@@ -9,7 +9,19 @@ import datetime
 import difflib
 import os
 import pathlib
-from typing import TYPE_CHECKING, Any, Generic, Iterator, Mapping, Optional, Sequence, TypeVar, Union, overload
+from typing import (
+    TYPE_CHECKING,
+    Any,
+    Generic,
+    Iterator,
+    Mapping,
+    NamedTuple,
+    Optional,
+    Sequence,
+    TypeVar,
+    Union,
+    overload,
+)
 
 from .errors import PathError, RangeError, WrongType, WrongValue
 
@@ -92,7 +104,7 @@ class Section:
             held = first.name[:-1] + number
             if self._document.has(self._at(held), False):
                 return type(first)(held, first.default, first.quantity, first.unit, first.label, first.page,
-                                   first.choices, first.settable)  # fmt: skip
+                                   first.choices, first.parts, first.settable)  # fmt: skip
         for path in self.paths():
             if "/" not in path and path.lower() == name:
                 return Keyword(path)
@@ -143,30 +155,55 @@ class Field:
         self.__doc__ = doc
 
 
+def _with_unit(quantity: str, unit: str) -> str:
+    return f"{quantity} ({unit})" if unit else quantity
+
+
+def _meanings(choices: Mapping[str, str]) -> str:
+    return "; ".join(f"{value}: {text}" for value, text in choices.items()) + "." if choices else ""
+
+
+class Part(NamedTuple):
+    """One of several values of a keyword."""
+
+    quantity: str = ""
+    unit: str = ""
+    label: str = ""
+    choices: Mapping[str, str] = {}
+
+
 class Keyword(Field, Generic[Get, Set]):
     """A keyword: its value is read from the model and set in it.
 
     default: the value in a new setup, as text; quantity and unit: those of a number, empty where its page
-    names none; label and page: of the control that edits it; choices: what its values mean.
+    names none; label and page: of the control that edits it; choices: what its values mean; parts: the same
+    for each of several values, where they differ.
     """
 
     kind = "a value"
 
     def __init__(self, name: str, default: str = "", quantity: str = "", unit: str = "", label: str = "",
-                 page: str = "", choices: Mapping[str, str] = {}, settable: bool = True) -> None:  # fmt: skip
+                 page: str = "", choices: Mapping[str, str] = {}, parts: Sequence[Part] = (),
+                 settable: bool = True) -> None:  # fmt: skip
         self.default = default
         self.quantity = quantity
         self.unit = unit
         self.label = label
         self.page = page
         self.choices = dict(choices)
+        self.parts = tuple(parts)
         self.settable = settable
-        what = f"{quantity} ({unit})" if quantity and unit else quantity or self.kind
-        lines = [f"{name}: {what}; {default or 'empty'} in a new setup."]
+        lines = [f"{name}: {_with_unit(quantity, unit) or self.kind}; {default or 'empty'} in a new setup."]
         if choices:
-            lines.append("; ".join(f"{value}: {text}" for value, text in choices.items()) + ".")
+            lines.append(_meanings(choices))
         if label:
             lines.append(f'"{label}" of page "{page}".')
+        elif parts:
+            lines.append(f'Of page "{page}":')
+        for number, part in enumerate(parts, 1):
+            what = [f'"{part.label}"', _with_unit(part.quantity, part.unit), _meanings(part.choices)]
+            text = ", ".join(each for each in what if each) if part.label else "no control"
+            lines.append(f"  value {number}: {text}")
         if not settable:
             lines.append("It follows from other values, and is not set by itself.")
         super().__init__(name, "\n".join(lines))
