@@ -125,10 +125,12 @@ bool ProcessQueue::run() const {
     while (!isStopped && started < count && running.size() < std::max<std::size_t>(atOnce, 1)) {
       const std::size_t number = started++;
       const Result<pid_t> child = startProcess(next(number), blocked.before());
-      if (child)
-        running.push_back({*child, number});
-      else
+      if (!child) {
         ended(number, Failure{child.error()});
+        continue;
+      }
+      running.push_back({*child, number});
+      began(number, *child);
     }
     if (running.empty()) return started == count;
     for (auto one = running.begin(); one != running.end();) {

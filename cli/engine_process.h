@@ -1,5 +1,7 @@
 #pragma once
 
+#include <sys/types.h>
+
 #include <cstddef>
 #include <functional>
 #include <string>
@@ -34,6 +36,7 @@ struct ProcessQueue {
   std::size_t count = 0;
   std::size_t atOnce = 1;
   std::function<ProcessStart(std::size_t number)> next;
+  std::function<void(std::size_t number, pid_t process)> began = [](std::size_t, pid_t) {};
   std::function<void(std::size_t number, const Result<ProcessEnd>& end)> ended;
 
   // Whether all were started.

@@ -7,6 +7,7 @@
 #include <cerrno>
 #include <filesystem>
 
+#include "cli/process_mark.h"
 #include "core/number_text.h"
 #include "platform/files/file_descriptor.h"
 #include "platform/files/paths.h"
@@ -20,7 +21,8 @@ namespace fs = std::filesystem;
 
 constexpr const char* kMembers = "members";
 constexpr const char* kJob = "job";
-constexpr const char* kRunning = "running";
+constexpr const char* kProcess = "process";
+constexpr std::string_view kRunning = "running";
 
 std::string inFolder(const std::string& folder, const std::string& name) {
   return (fs::path(folder) / name).string();
@@ -82,9 +84,10 @@ RunFolder::Member RunFolder::member(std::size_t number) const {
   if (!fs::exists(name, error)) return member;
   const Result<FileText> text = readFile(name);
   if (!text) return member;
-  const std::string_view word = text->view().substr(0, text->view().find('\n'));
-  member.isRunning = word == kRunning;
-  member.status = int32OfText(word);
+  const std::string_view line = text->view().substr(0, text->view().find('\n'));
+  member.isRunning = line.starts_with(kRunning);
+  if (member.isRunning) member.isGone = isGone(line.substr(kRunning.size()));
+  member.status = int32OfText(line);
   return member;
 }
 
@@ -93,8 +96,17 @@ Outcome RunFolder::setJob(const std::string& job) {
   return write(kJob, job + "\n");
 }
 
-Outcome RunFolder::setRunning(std::size_t number) const {
-  return write(statusName(number), std::string(kRunning) + "\n");
+bool RunFolder::isLeft() const {
+  const Result<FileText> process = readFile(inFolder(path_, kProcess));
+  return process && isGone(process->view());
+}
+
+Outcome RunFolder::setProcess(pid_t process) const {
+  return write(kProcess, markOf(process) + "\n");
+}
+
+Outcome RunFolder::setRunning(std::size_t number, pid_t engine) const {
+  return write(statusName(number), fmt::format("{} {}\n", kRunning, markOf(engine)));
 }
 
 Outcome RunFolder::setStatus(std::size_t number, int status) const {

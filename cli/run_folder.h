@@ -1,5 +1,7 @@
 #pragma once
 
+#include <sys/types.h>
+
 #include <cstddef>
 #include <optional>
 #include <string>
@@ -10,13 +12,15 @@
 namespace gridbay::cli {
 
 // A folder with what is known of a run of several setups, so that any later call can tell how they are: their
-// files, the number of the job if there is one, and for each, by its number from 1, its state (`N.status`:
-// "running", or its engine's exit status) and what its engine said (`N.log`).
+// files, the number of the job or else the process that makes the run (`process`), and for each, by its
+// number from 1, its state (`N.status`: "running" with the engine's process where that is known, or its exit
+// status) and what its engine said (`N.log`).
 class RunFolder {
  public:
   struct Member {
     std::string file;
     bool isRunning = false;
+    bool isGone = false;        // its engine has ended, though nobody told how
     std::optional<int> status;  // of the engine, once it has ended
   };
 
@@ -33,8 +37,12 @@ class RunFolder {
   // The number that Slurm gave its job; empty for a run on this machine.
   const std::string& job() const { return job_; }
 
+  // Whether the process that makes the run has ended, so that nothing more will come of what is not done.
+  bool isLeft() const;
+
   Outcome setJob(const std::string& job);
-  Outcome setRunning(std::size_t number) const;
+  Outcome setProcess(pid_t process) const;
+  Outcome setRunning(std::size_t number, pid_t engine) const;
   Outcome setStatus(std::size_t number, int status) const;
   Outcome write(const std::string& name, const std::string& text) const;
 

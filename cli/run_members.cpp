@@ -1,6 +1,7 @@
 #include "cli/run_members.h"
 
 #include <fmt/format.h>
+#include <unistd.h>
 
 #include <map>
 #include <set>
@@ -74,6 +75,7 @@ int runHere(const RunFolder& folder, const MembersRun& run, const Console& conso
   };
   bool areAllStarted = false;
   {
+    keep(folder.setProcess(::getpid()));
     Progress progress(console, "Run", folder.count());
     std::size_t done = 0;
     areAllStarted = ProcessQueue{
@@ -81,9 +83,9 @@ int runHere(const RunFolder& folder, const MembersRun& run, const Console& conso
         .atOnce = coreCount(),
         .next =
             [&](std::size_t i) {
-              keep(folder.setRunning(i + 1));
               return ProcessStart{run.engine, {folder.file(i + 1)}, folder.logOf(i + 1)};
             },
+        .began = [&](std::size_t i, pid_t engine) { keep(folder.setRunning(i + 1, engine)); },
         .ended =
             [&](std::size_t i, const Result<ProcessEnd>& end) {
               constexpr int kNotStarted = 127;
@@ -122,6 +124,7 @@ int showRun(const std::string& path, const Console& console) {
     tasks = std::move(*queued);
     taskCount = *count;
   }
+  const bool isLeft = !isJob && folder->isLeft();
   std::size_t done = 0;
   std::size_t running = 0;
   std::size_t waiting = 0;
@@ -129,15 +132,18 @@ int showRun(const std::string& path, const Console& console) {
   std::size_t failed = 0;
   for (std::size_t number = 1; number <= folder->count(); ++number) {
     const RunFolder::Member member = folder->member(number);
-    const bool isLost = !member.status && isJob && !tasks.contains((number - 1) % taskCount + 1);
+    const bool isEndedBySlurm = isJob && !tasks.contains((number - 1) % taskCount + 1);
+    // An engine whose run has been left may be at work still.
+    const bool isStopped = isLeft && (!member.isRunning || member.isGone);
     if (member.status == 0) {
       ++done;
-    } else if (member.status || isLost) {
+    } else if (member.status || isEndedBySlurm || isStopped) {
       ++failed;
-      failures += isLost ? fmt::format("{} failed: Slurm ended it{}\n", member.file,
-                                       member.isRunning ? "" : " before it began")
-                         : fmt::format("{} failed: status {}, see {}\n", member.file, *member.status,
-                                       folder->logOf(number));
+      failures += member.status ? fmt::format("{} failed: status {}, see {}\n", member.file, *member.status,
+                                              folder->logOf(number))
+                                : fmt::format("{} failed: {}{}\n", member.file,
+                                              isJob ? "Slurm ended it" : "stopped with its run",
+                                              member.isRunning ? "" : " before it began");
     } else {
       ++(member.isRunning ? running : waiting);
     }

@@ -127,6 +127,14 @@ bool ModelDefinition::IsEmpty() const {
   return std::ranges::all_of(items, [](const auto& declared) { return declared.empty(); });
 }
 
+bool sameValue(const std::shared_ptr<const ModelDefinition>& a,
+               const std::shared_ptr<const ModelDefinition>& b) {
+  if (a == b) return true;
+  const auto isSame = [](const CSolverItem* item, const CSolverItem* other) { return *item == *other; };
+  return a->name == b->name && a->items == b->items && a->transported == b->transported &&
+         std::ranges::equal(a->outputItems, b->outputItems, isSame) && a->fault == b->fault;
+}
+
 std::shared_ptr<const ModelDefinition> readModelDefinition(const std::string& path) {
   auto definition = std::make_shared<ModelDefinition>();
   if (!path.empty()) {

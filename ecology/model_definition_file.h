@@ -35,6 +35,11 @@ struct ModelDefinition {
   bool IsEmpty() const;
 };
 
+// Whether two declare the same to the last word, as two readings of a file do; a default or limit
+// that is not a number is no other's. By this the exact states of models are compared.
+bool sameValue(const std::shared_ptr<const ModelDefinition>& a,
+               const std::shared_ptr<const ModelDefinition>& b);
+
 // Reads a file. An empty path gives an empty definition without a fault.
 std::shared_ptr<const ModelDefinition> readModelDefinition(const std::string& path);
 

@@ -51,6 +51,8 @@ class CSolverItem {
   std::int32_t spatialVariation = kHorizontal;
   std::string unit;  // of the values as they are held and on file
 
+  bool operator==(const CSolverItem&) const = default;
+
   // Whether the variable is carried with the water.
   bool IsTransported() const;
   // The item code for columns and fields, which convert to the user's unit; 0 for a quantity that the units

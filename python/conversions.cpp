@@ -1,3 +1,4 @@
+#include <fmt/format.h>
 #include <pybind11/pybind11.h>
 #include <pybind11/stl.h>
 
@@ -7,10 +8,58 @@
 #include "conversion/raster_conversion.h"
 #include "conversion/series_conversion.h"
 #include "platform/units/units.h"
-#include "python/refusal.h"
+#include "python/arguments.h"
+#include "python/item_type_text.h"
 
 namespace gridbay::python {
 namespace py = pybind11;
+
+namespace {
+
+// One for all columns, or one for each.
+struct ItemTypes {
+  std::vector<std::string> texts;
+};
+// A moment as a datetime or its text.
+struct MomentText {
+  std::string text;
+};
+// A function of what is done and the whole, or None.
+struct Progress {
+  py::object function;
+};
+
+}  // namespace
+
+template <>
+struct Taken<ItemTypes> {
+  static constexpr const char* kName = "str | int | list";
+  static ItemTypes from(const Given& given) {
+    if (ItemTypeText::isOne(given.value)) return {{Taken<ItemTypeText>::from(given).text}};
+    ItemTypes types;
+    for (ItemTypeText& type : Taken<std::vector<ItemTypeText>>::from(given))
+      types.texts.push_back(std::move(type.text));
+    return types;
+  }
+};
+template <>
+struct Taken<MomentText> {
+  static constexpr const char* kName = "datetime.datetime";
+  static MomentText from(const Given& given) {
+    if (PyUnicode_Check(given.value.ptr()) != 0) return {textOf(given.value, given.path)};
+    const auto [year, month, day, hour, minute, second] = momentOf(given.value, given.path);
+    return {fmt::format("{:04}-{:02}-{:02} {:02}:{:02}:{:02}", year, month, day, hour, minute, second)};
+  }
+};
+template <>
+struct Taken<Progress> {
+  static constexpr const char* kName = "Callable[[int, int], bool | None] | None";
+  static Progress from(const Given& given) {
+    if (!given.value.is_none() && PyCallable_Check(given.value.ptr()) == 0)
+      throw refusal(kWrongType, given.path, shown(given.value), "a function of two numbers, or None");
+    return {py::reinterpret_borrow<py::object>(given.value)};
+  }
+};
 
 namespace {
 
@@ -56,7 +105,7 @@ py::dict convert(Result<Converted> (*work)(const Conversion&, ConversionHost&), 
                   converted.error(), conversion.in};
   }
   py::dict result;
-  result["summary"] = converted->summary;
+  result["summary"] = textObject(converted->summary);
   result["notes"] = host.notes;
   fill(result, *converted);
   return result;
@@ -86,52 +135,74 @@ py::dict series(SeriesConversion conversion, const py::object& progress) {
 
 void addConversions(py::module_& module) {
   using Path = std::string;
-  module.def(
-      "convert_raster",
-      [](Path in, Path out, std::optional<float> land, std::optional<std::string> itemType,
+  const auto file = [](const char* name) { return Argument{.name = name, .form = Argument::Form::file}; };
+  addFunction(
+      module, "convert_raster",
+      [](Path in, Path out, std::optional<float> land, std::optional<ItemTypeText> itemType,
          std::optional<int> band, std::optional<int> subdataset, std::optional<float> nodataAs,
          std::string crs, std::string reproject, std::optional<double> resample,
          std::optional<double> originX, std::optional<double> originY, int coarsen,
-         std::optional<std::array<int, 4>> window, bool force, std::string history,
-         const py::object& progress) {
-        return raster({.in = std::move(in),
-                       .out = std::move(out),
-                       .land = land,
-                       .itemType = std::move(itemType),
-                       .band = band,
-                       .subdataset = subdataset.value_or(0),
-                       .missingAs = nodataAs,
-                       .crs = std::move(crs),
-                       .reproject = std::move(reproject),
-                       .resample = resample,
-                       .originX = originX,
-                       .originY = originY,
-                       .coarsen = coarsen,
-                       .window = window,
-                       .force = force,
-                       .history = std::move(history)},
-                      progress);
+         std::optional<std::array<int, 4>> window, bool force, std::string history, Progress progress) {
+        RasterConversion conversion{
+            .in = std::move(in),
+            .out = std::move(out),
+            .land = land,
+            .itemType = itemType ? std::optional(std::move(itemType->text)) : std::nullopt,
+            .band = band,
+            .subdataset = subdataset.value_or(0),
+            .missingAs = nodataAs,
+            .crs = std::move(crs),
+            .reproject = std::move(reproject),
+            .resample = resample,
+            .originX = originX,
+            .originY = originY,
+            .coarsen = coarsen,
+            .window = window,
+            .force = force,
+            .history = std::move(history)};
+        return raster(std::move(conversion), progress.function);
       },
-      py::arg("source"), py::arg("target"), py::kw_only(), py::arg("land"), py::arg("item_type"),
-      py::arg("band"), py::arg("subdataset"), py::arg("nodata_as"), py::arg("crs"), py::arg("reproject"),
-      py::arg("resample"), py::arg("origin_x"), py::arg("origin_y"), py::arg("coarsen"), py::arg("window"),
-      py::arg("force"), py::arg("history"), py::arg("progress"), "Makes a map from a raster.");
-  module.def(
-      "convert_series",
-      [](Path in, Path out, std::vector<std::string> itemTypes, std::string start, std::string timeUnit,
-         int skipLines, bool force, std::string history, const py::object& progress) {
+      {file("source"),
+       file("target"),
+       {"land"},
+       {"item_type"},
+       {"band"},
+       {"subdataset"},
+       {"nodata_as"},
+       {"crs"},
+       {"reproject"},
+       {"resample"},
+       {"origin_x"},
+       {"origin_y"},
+       {"coarsen"},
+       {"window"},
+       {"force"},
+       {"history"},
+       {"progress"}},
+      "Makes a map from a raster.");
+  addFunction(
+      module, "convert_series",
+      [](Path in, Path out, ItemTypes itemTypes, MomentText start, std::string timeUnit, int skipLines,
+         bool force, std::string history, Progress progress) {
         return series({.in = std::move(in),
                        .out = std::move(out),
-                       .itemTypes = std::move(itemTypes),
-                       .start = std::move(start),
+                       .itemTypes = std::move(itemTypes.texts),
+                       .start = std::move(start.text),
                        .timeUnit = std::move(timeUnit),
                        .skipLines = skipLines,
                        .force = force,
                        .history = std::move(history)},
-                      progress);
+                      progress.function);
       },
-      py::arg("source"), py::arg("target"), py::kw_only(), py::arg("item_types"), py::arg("start"),
-      py::arg("time_unit"), py::arg("skip_lines"), py::arg("force"), py::arg("history"), py::arg("progress"),
+      {file("source"),
+       file("target"),
+       {"item_type"},
+       {"start"},
+       {"time_unit"},
+       {"skip_lines"},
+       {"force"},
+       {"history"},
+       {"progress"}},
       "Makes a time series from text.");
   module.def(
       "item_types",

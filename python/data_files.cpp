@@ -14,7 +14,8 @@
 #include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_writer.h"
 #include "platform/units/units.h"
-#include "python/refusal.h"
+#include "python/arguments.h"
+#include "python/item_type_text.h"
 
 namespace gridbay::python {
 namespace py = pybind11;
@@ -89,11 +90,11 @@ py::array read(const TsbFile& file, int item, int step) {
 py::dict definitionOf(const TsbFile& file) {
   const TsbDefinition& definition = file.definition();
   py::dict dict;
-  dict["title"] = definition.title;
-  dict["history"] = definition.history;
+  dict["title"] = textObject(definition.title);
+  dict["history"] = textObject(definition.history);
   py::list items;
   for (const TsbItem& item : definition.items)
-    items.append(py::make_tuple(item.name, item.type, item.unit, item.deleteValue));
+    items.append(tupleOf(item.name, item.type, item.unit, item.deleteValue));
   dict["items"] = items;
   py::list axes;
   for (const TsbGridAxis& axis : definition.axes)
@@ -108,7 +109,7 @@ py::dict definitionOf(const TsbFile& file) {
                                           .attr("datetime")(time.start[0], time.start[1], time.start[2],
                                                             time.start[3], time.start[4], time.start[5])
                                     : py::none();
-  dict["projection"] = definition.geography ? definition.geography->projection : std::string();
+  dict["projection"] = textObject(definition.geography ? definition.geography->projection : "");
   dict["longitude"] = definition.geography ? py::cast(definition.geography->longitude) : py::none();
   dict["latitude"] = definition.geography ? py::cast(definition.geography->latitude) : py::none();
   dict["rotation"] = definition.geography ? definition.geography->rotation : 0.0;
@@ -194,26 +195,44 @@ class NewGrid {
 }  // namespace
 
 void addDataFiles(py::module_& module) {
-  py::class_<TsbFile>(module, "DataFile", py::module_local(), "A data file, open for reading.")
-      .def_static("open", &openFile, py::arg("path"), "Opens a data file.")
-      .def_property_readonly("path", &TsbFile::path, "The file.")
-      .def("definition", &definitionOf, "All but the values.")
-      .def("read", &read, py::arg("item"), py::arg("step"), "The values of one time step.")
-      .def(
+  const Argument file{.name = "path", .form = Argument::Form::file};
+  addFunction(
+      module, "open_data", [](std::string path) { return py::object(py::cast(openFile(path))); }, {file},
+      "Opens a data file.");
+  Members<TsbFile>(
+      py::class_<TsbFile>(module, "DataFile", py::module_local(), "A data file, open for reading.")
+          .def("definition", &definitionOf, "All but the values."))
+      .add(
+          "read", [](TsbFile& data, int item, int step) { return read(data, item, step); },
+          {{"item"}, {"step"}}, "The values of one time step.")
+      .add(
           "read_all",
-          [](const TsbFile& file, int item) {
-            return itemOf(file, item).isDouble ? readAll<double>(file, item) : readAll<float>(file, item);
+          [](TsbFile& data, int item) {
+            return itemOf(data, item).isDouble ? readAll<double>(data, item) : readAll<float>(data, item);
           },
-          py::arg("item"), "The values of all time steps, the step first.");
-  py::class_<NewGrid>(module, "NewGrid", py::module_local(), "A map in the making.")
-      .def(py::init<std::array<int, 2>, std::array<double, 2>, std::array<double, 2>, std::string,
-                    std::optional<float>, std::string, double, int, double>(),
-           py::kw_only(), py::arg("points"), py::arg("spacing"), py::arg("first"), py::arg("item_type"),
-           py::arg("land"), py::arg("projection"), py::arg("rotation"), py::arg("steps"),
-           py::arg("time_step"))
-      .def_property_readonly("values", &NewGrid::values, "The values, to be written to.")
-      .def("save", &NewGrid::save, py::arg("path"), py::arg("title"), py::arg("history"), py::arg("force"),
+          {{"item"}}, "The values of all time steps, the step first.");
+  Members<NewGrid>(py::class_<NewGrid>(module, "NewGrid", py::module_local(), "A map in the making.")
+                       .def_property_readonly("values", &NewGrid::values, "The values, to be written to."))
+      .add("save", &NewGrid::save, {file, {"title"}, {"history"}, {"force"}},
            "Writes the file, whole or not at all.");
+  addFunction(
+      module, "new_grid",
+      [](std::array<int, 2> points, std::array<double, 2> spacing, std::array<double, 2> first,
+         ItemTypeText itemType, std::optional<float> land, std::string projection, double rotation, int steps,
+         double timeStep) {
+        return py::object(py::cast(std::make_unique<NewGrid>(points, spacing, first, itemType.text, land,
+                                                             projection, rotation, steps, timeStep)));
+      },
+      {{"points"},
+       {"spacing"},
+       {"first"},
+       {"item_type"},
+       {"land"},
+       {"projection"},
+       {"rotation"},
+       {"steps"},
+       {"time_step"}},
+      "Begins a map of 0 everywhere.");
 }
 
 }  // namespace gridbay::python

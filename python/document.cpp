@@ -12,9 +12,8 @@
 #include "core/edition.h"
 #include "core/kdl_writer.h"
 #include "platform/files/paths.h"
+#include "python/arguments.h"
 #include "python/keyword_list.h"
-#include "python/refusal.h"
-#include "python/values.h"
 #include "setup/dlg_enumerator.h"
 #include "setup/member_keyword.h"
 #include "setup/setup_file.h"
@@ -41,6 +40,12 @@ void listKeywords(const Node& section, const std::string& prefix, std::vector<st
     if (occurrence > 1) path += fmt::format("[{}]", occurrence);
     listKeywords(*node, path + "/", paths);
   }
+}
+
+py::list listOf(const std::vector<std::string>& texts) {
+  py::list list;
+  for (const std::string& text : texts) list.append(textObject(text));
+  return list;
 }
 
 // A setup, open for scripts.
@@ -79,14 +84,14 @@ class Document {
   }
 
   // Page, its caption, severity and text of each message.
-  std::vector<std::tuple<int, std::string, int, std::string>> validate() {
+  py::list validate() {
     ValidationList messages;
     setup_.model().Validate(messages, 1);
     const CDlgEnumerator pages;
-    std::vector<std::tuple<int, std::string, int, std::string>> list;
+    py::list list;
     for (const CMessage& message : messages) {
       const int page = static_cast<int>(message.page);
-      list.emplace_back(page, pages.GetCaption(page), static_cast<int>(message.severity), message.text);
+      list.append(tupleOf(page, pages.GetCaption(page), static_cast<int>(message.severity), message.text));
     }
     return list;
   }
@@ -208,15 +213,18 @@ class Document {
 }  // namespace
 
 void addDocument(py::module_& module) {
-  py::class_<Document>(module, "Document", py::module_local(), "A setup, by the paths of its keywords.")
-      .def(py::init<>(), "A new setup with the defaults.")
-      .def_static("open", &Document::open, py::arg("path"), "Reads a setup.")
+  const Argument file{.name = "path", .form = Argument::Form::file};
+  py::class_<Document> document(module, "Document", py::module_local(),
+                                "A setup, by the paths of its keywords.");
+  document.def(py::init<>(), "A new setup with the defaults.")
       .def("copy", &Document::copy, "Another setup in the same exact state.")
-      .def_property_readonly("path", &Document::path, "The file; empty until there is one.")
-      .def_property_readonly("said", &Document::said, "What the load had to say.")
+      .def_property_readonly(
+          "path", [](const Document& setup) { return textObject(setup.path()); },
+          "The file; empty until there is one.")
+      .def_property_readonly(
+          "said", [](const Document& setup) { return listOf(setup.said()); }, "What the load had to say.")
       .def("unknown_sections", &Document::unknownSections, "Sections of the file that a save leaves out.")
       .def("is_same", &Document::isSame, py::arg("other"), "Whether the models are in the same exact state.")
-      .def("save", &Document::save, py::arg("path"), "Writes the setup, whole or not at all.")
       .def("validate", &Document::validate, "Page, caption, severity and text of each message.")
       .def("get", &Document::get, py::arg("path"), "The value of a keyword.")
       .def("set", &Document::set, py::arg("path"), py::arg("value"), "Gives a keyword another value.")
@@ -225,9 +233,15 @@ void addDocument(py::module_& module) {
       .def("count", &Document::count, py::arg("name"),
            "How many items a list has, by the path of its sections with {} for the number.")
       .def("paths", &Document::paths, py::arg("section") = "", "The paths of all keywords, in order.")
-      .def("text", &Document::text, py::arg("section") = "", "What a save would write.")
+      .def(
+          "text", [](Document& setup, const std::string& section) { return textObject(setup.text(section)); },
+          py::arg("section") = "", "What a save would write.")
       .def("detect_boundaries", &Document::detectBoundaries,
            "Finds the open boundaries on the border of the first area; how many.");
+  Members<Document>(document).add("save", &Document::save, {file}, "Writes the setup, whole or not at all.");
+  addFunction(
+      module, "open", [](std::string path) { return py::object(py::cast(Document::open(path))); }, {file},
+      "Reads a setup.");
 }
 
 // Tuples, as little more than the making of the package reads them.

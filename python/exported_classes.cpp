@@ -3,10 +3,14 @@
 #include <pybind11/pybind11.h>
 #include <pybind11/stl.h>
 
+#include "basic/bathymetry.h"
 #include "core/date_time.h"
 #include "gridbay_setup/climate_change.h"
 #include "gridbay_setup/flood_models.h"
-#include "python/refusal.h"
+#include "hydrodynamic/result.h"
+#include "platform/tsb/tsb_file.h"
+#include "python/arguments.h"
+#include "scripting/scripted_model.h"
 
 namespace pybind11::detail {
 
@@ -15,18 +19,6 @@ template <>
 struct type_caster<gridbay::scripting::DateTime> {
   PYBIND11_TYPE_CASTER(gridbay::scripting::DateTime, const_name("datetime.datetime | None"));
 
-  bool load(handle given, bool) {
-    if (given.is_none()) {
-      value = {0, 1};
-      return true;
-    }
-    if (!isinstance(given, module_::import("datetime").attr("datetime"))) return false;
-    const auto part = [given](const char* what) { return pybind11::cast<std::int32_t>(given.attr(what)); };
-    const gridbay::DateTime moment = gridbay::DateTime::of(
-        {part("year"), part("month"), part("day"), part("hour"), part("minute"), part("second")});
-    value = {moment.day, moment.status};
-    return true;
-  }
   static handle cast(const gridbay::scripting::DateTime& moment, return_value_policy, handle) {
     const auto parts = gridbay::DateTime{moment.day, moment.status}.parts();
     if (!parts) return none().release();
@@ -41,33 +33,140 @@ namespace gridbay::python {
 namespace py = pybind11;
 using namespace scripting;
 
+template <>
+struct Taken<scripting::DateTime> {
+  static constexpr const char* kName = "datetime.datetime | None";
+  static scripting::DateTime from(const Given& given) {
+    if (given.value.is_none()) return {0, 1};
+    const auto [year, month, day, hour, minute, second] = momentOf(given.value, given.path);
+    const gridbay::DateTime moment = gridbay::DateTime::of({year, month, day, hour, minute, second});
+    return {moment.day, moment.status};
+  }
+};
+template <>
+struct Taken<OutputPosition> {
+  static constexpr const char* kName = "OutputPosition";
+  static OutputPosition from(const Given& given) {
+    if (!py::isinstance<OutputPosition>(given.value))
+      throw refusal(kWrongType, given.path, shown(given.value), "an OutputPosition");
+    const auto position = py::cast<OutputPosition>(given.value);
+    checkEnds(given, position.number);
+    return position;
+  }
+};
+template <>
+struct Taken<MessageBox> {
+  static constexpr const char* kName = "Callable[[str], None] | None";
+  static MessageBox from(const Given& given) {
+    if (given.value.is_none()) return {};
+    if (PyCallable_Check(given.value.ptr()) == 0)
+      throw refusal(kWrongType, given.path, shown(given.value), "a function of a text, or None");
+    return py::cast<MessageBox>(given.value);
+  }
+};
+
 namespace {
 
 constexpr const char* kTexts = "What validation and faults of a load have to say goes to this function.";
+constexpr int kMostObjects = 100000;
 
-// The outputs of a member that gives 1 and them, or 0 and nothing.
-template <class... Outputs>
-py::tuple given(int found, const Outputs&... outputs) {
-  if (found == 0) return py::make_tuple(0, (static_cast<void>(outputs), py::none())...);
-  return py::make_tuple(found, outputs...);
-}
-
-// A Get member of an index as a function of the index alone.
-template <class Model, class First>
-auto getter(int (Model::*member)(int, First&)) {
-  return [member](Model& model, int index) {
-    First first{};
-    const int found = (model.*member)(index, first);
-    return given(found, first);
+// The model behind an object of a class.
+template <class Model>
+ScriptedModel& modelOf(Model& object) {
+  struct Reach : Model {
+    static auto member() { return &Reach::model_; }
   };
+  return *(object.*Reach::member());
 }
-template <class Model, class First, class Second>
-auto getter(int (Model::*member)(int, First&, Second&)) {
+
+// Arguments of several members.
+Argument fileName() {
+  return {.name = "file_name", .form = Argument::Form::file};
+}
+Argument flag(const char* name) {
+  return {.name = name, .form = Argument::Form::flag};
+}
+// The number of an item of a data file.
+Argument item(const char* name = "item") {
+  return {.name = name, .least = 1};
+}
+// The number of a thing in a list, and how many there are.
+template <class Model, class Count>
+Argument indexIn(Count count) {
+  return {.name = "index", .least = 1, .most = [count](py::handle self) {
+            return std::invoke(count, py::cast<Model&>(self));
+          }};
+}
+template <class Model>
+Argument boundary() {
+  return indexIn<Model>([](Model& model) { return Flooding_V27FlowModel(model).getNoOfBndConditions(); });
+}
+Argument source() {
+  return indexIn<Flooding_V27FlowModel>(&Flooding_V27FlowModel::getNoOfSourceSink);
+}
+Argument count(std::optional<int> least) {
+  return {
+      .name = "count", .least = least, .most = [](py::handle) { return kMostObjects; }, .kind = kWrongValue};
+}
+template <class Model>
+Argument position() {
+  return {.name = "position", .least = 1, .most = [](py::handle self) {
+            ScriptedModel& model = modelOf(py::cast<Model&>(self));
+            const auto guard = model.lock();
+            return model.root.nhdResult->outputs.GetCount();
+          }};
+}
+// Of the points of a boundary, a source or a part of the map.
+std::vector<Argument> with(std::vector<Argument> first, const std::vector<const char*>& names,
+                           std::vector<Argument> last = {}) {
+  for (const char* name : names) first.push_back({.name = name});
+  for (Argument& argument : last) first.push_back(std::move(argument));
+  return first;
+}
+
+// A file that is to be read must be there, whatever else the class passes over.
+template <class Model>
+void load(Model& model, const std::string& file) {
+  const ScriptedModel::Loaded loaded = [&] {
+    const auto guard = modelOf(model).lock();
+    return modelOf(model).load(file);
+  }();
+  if (!loaded.fault.empty()) throw Refusal{kFileError, loaded.fault, file};
+}
+
+void refuseUnwritten(const Outcome& written, const std::string& file) {
+  if (!written) throw Refusal{kFileError, written.error(), file};
+}
+
+template <class Model>
+void setCoarseGrid(Model& object, const std::string& file) {
+  ScriptedModel& model = modelOf(object);
+  UFileName name;
+  {
+    const auto guard = model.lock();
+    const auto dataFiles = ScriptedModel::lockDataFiles();
+    model.setFileName(name, file);
+    const Result<TsbFile> grid = TsbFile::open(name.absolute());
+    if (!grid) throw Refusal{kFileError, grid.error(), name.absolute()};
+    if (grid->definition().axes.size() != 2)
+      throw refusal(kFileError, name.absolute(),
+                    fmt::format("a file of {} axes", grid->definition().axes.size()), "a grid, which has 2");
+  }
+  object.setCoarseBathymetryFile(file);
+}
+
+// A Get member of an index as a function of the index alone: 1 with its outputs, or 0 and nothing.
+template <class... Outputs>
+py::tuple found(int result, const Outputs&... outputs) {
+  if (result == 0) return py::make_tuple(0, (static_cast<void>(outputs), py::none())...);
+  return tupleOf(result, outputs...);
+}
+template <class Model, class... Outputs>
+auto getter(int (Model::*member)(int, Outputs&...)) {
   return [member](Model& model, int index) {
-    First first{};
-    Second second{};
-    const int found = (model.*member)(index, first, second);
-    return given(found, first, second);
+    std::tuple<Outputs...> outputs{};
+    return std::apply([&](auto&... output) { return found((model.*member)(index, output...), output...); },
+                      outputs);
   };
 }
 
@@ -91,60 +190,78 @@ struct Output {
 
   py::tuple tuple(const OutputPosition& next) const { return py::make_tuple(next, type) + withoutType(); }
   py::tuple withoutType() const {
-    return py::make_tuple(useSubArea, firstJ, firstK, lastJ, lastK, pointsJ, pointsK, usePeriod, firstDate,
-                          lastDate, frequency, fileName, title, items);
+    return tupleOf(useSubArea, firstJ, firstK, lastJ, lastK, pointsJ, pointsK, usePeriod, firstDate, lastDate,
+                   frequency, fileName, title, items);
   }
 };
 
 // The members that the two open classes share.
 template <class Model>
-py::class_<Model> addFloodModel(py::module_& module, const char* name, const char* doc) {
-  py::class_<Model> flood(module, name, py::module_local(), doc);
-  flood.def(py::init<>())
-      .def(
+Members<Model> addFloodModel(py::module_& module, const char* name, const char* doc) {
+  Members<Model> flood(py::class_<Model>(module, name, py::module_local(), doc).def(py::init<>()));
+  flood
+      .add(
           "ShowMessagesWith",
-          [](Model& model, std::function<void(const std::string&)> show) {
+          [](Model& model, MessageBox show) {
             ShowMessagesWith(static_cast<FloodModel&>(model), std::move(show));
           },
-          py::arg("show"), kTexts)
-      .def("LoadFile", &Model::LoadFile, py::arg("file_name"),
-           "Reads a setup. A syntax error is shown and leaves the model as it was; any other fault does so "
-           "silently.")
-      .def("SaveFile", &Model::SaveFile, py::arg("file_name"),
-           "Shows what validation finds, if anything, and writes the setup all the same.")
-      .def("GetFileExtension", &Model::GetFileExtension, "\".v27\", in both editions.")
-      .def("SetSimulationPeriod", &Model::SetSimulationPeriod, py::arg("start"), py::arg("end"),
-           py::arg("time_step"), "Time step in s.")
-      .def("setDryingFloodingDepth", &Model::setDryingFloodingDepth, py::arg("drying_depth"),
-           py::arg("flooding_depth"), "Metres of water.")
-      .def("setCoarseBathymetryFile", &Model::setCoarseBathymetryFile, py::arg("file_name"),
-           "The grid of the area, with its projection where none is set yet.")
-      .def("getCoarseBathymetryFile", &Model::getCoarseBathymetryFile, "The grid of the area.")
-      .def("setFineBathymetryFile", &Model::setFineBathymetryFile, py::arg("file_name"),
+          {{"show"}}, kTexts)
+      .add(
+          "LoadFile", [](Model& model, std::string file) { load(model, file); }, {fileName()},
+          "Reads a setup. FileError where it can't be read or is none; it leaves the model as it was.")
+      .add(
+          "SaveFile",
+          [](Model& object, std::string file) {
+            const Outcome written = [&] {
+              ScriptedModel& model = modelOf(object);
+              const auto guard = model.lock();
+              return model.save(file, model.errorTexts());
+            }();
+            refuseUnwritten(written, file);
+          },
+          {fileName()},
+          "Shows what validation finds, if anything, and writes the setup all the same. FileError where that "
+          "can't be.",
+          "outputs whose items can be saved")
+      .add("GetFileExtension", &Model::GetFileExtension, {}, "\".v27\", in both editions.")
+      .add("SetSimulationPeriod", &Model::SetSimulationPeriod, {{"start"}, {"end"}, {"time_step"}},
+           "Time step in s. Moments are of whole seconds and no time zone.")
+      .add("setDryingFloodingDepth", &Model::setDryingFloodingDepth, {{"drying_depth"}, {"flooding_depth"}},
+           "Metres of water.")
+      .add(
+          "setCoarseBathymetryFile", [](Model& model, std::string file) { setCoarseGrid(model, file); },
+          {fileName()},
+          "The grid of the area, with its projection where none is set yet. FileError where it can't be "
+          "read.",
+          "a model with an area")
+      .add("getCoarseBathymetryFile", &Model::getCoarseBathymetryFile, {}, "The grid of the area.",
+           "a model with an area")
+      .add("setFineBathymetryFile", &Model::setFineBathymetryFile, {fileName()},
            "The grid of the overland solver, which is not looked at.")
-      .def("getFineBathymetryFile", &Model::getFineBathymetryFile, "The grid of the overland solver.")
-      .def("setOverlandSolverOption", &Model::setOverlandSolverOption, py::arg("option"),
+      .add("getFineBathymetryFile", &Model::getFineBathymetryFile, {}, "The grid of the overland solver.")
+      .add("setOverlandSolverOption", &Model::setOverlandSolverOption, {flag("option")},
            "1 turns the solver on, any other number off.")
-      .def("setResistance_Value", &Model::setResistance_Value, py::arg("value"), "Manning number.")
-      .def("setResistance_File", &Model::setResistance_File, py::arg("file_name"), py::arg("item"),
+      .add("setResistance_Value", &Model::setResistance_Value, {{"value"}}, "Manning number.")
+      .add("setResistance_File", &Model::setResistance_File, {fileName(), item()},
            "A map of Manning numbers; items count from 1.")
-      .def("setInitialCondition_Value", &Model::setInitialCondition_Value, py::arg("value"), "Metres.")
-      .def("setInitialCondition_File", &Model::setInitialCondition_File, py::arg("file_name"),
-           py::arg("item"), "A map of water levels; items count from 1.")
-      .def("setNoOfBndCondition", &Model::setNoOfBndCondition, py::arg("count"),
+      .add("setInitialCondition_Value", &Model::setInitialCondition_Value, {{"value"}}, "Metres.")
+      .add("setInitialCondition_File", &Model::setInitialCondition_File, {fileName(), item()},
+           "A map of water levels; items count from 1.")
+      .add("setNoOfBndCondition", &Model::setNoOfBndCondition, {count({})},
            "Boundaries are user specified from now on; a negative count leaves them as many as they are.")
-      .def("setEddyViscosity_IncludedWithDefaultValue", &Model::setEddyViscosity_IncludedWithDefaultValue,
+      .add("setEddyViscosity_IncludedWithDefaultValue", &Model::setEddyViscosity_IncludedWithDefaultValue, {},
            "Flux based, 0.02 dx dy / dt: when grid and period are set.")
-      .def("setEddyViscosity_NotIncluded", &Model::setEddyViscosity_NotIncluded, "No eddy viscosity.")
-      .def("setEddyViscosity_Value", &Model::setEddyViscosity_Value, py::arg("value"), py::arg("formulation"),
+      .add("setEddyViscosity_NotIncluded", &Model::setEddyViscosity_NotIncluded, {}, "No eddy viscosity.")
+      .add("setEddyViscosity_Value", &Model::setEddyViscosity_Value, {{"value"}, {"formulation"}},
            "Square metres per second.")
-      .def("setRain_Value", &Model::setRain_Value, py::arg("value"), "Millimetres per day.")
-      .def("setRain_File", &Model::setRain_File, py::arg("file_name"), py::arg("precipitation_type"),
-           py::arg("item"), "Net precipitation from a file. Type: 1 a time series, 2 maps in time.")
-      .def("setOutput_MaximumFloodDepthAndExtend", &Model::setOutput_MaximumFloodDepthAndExtend,
-           py::arg("file_name"), py::arg("store_step"), "The store step is in time steps.")
-      .def("GetOutputsListHeadPos", &Model::GetOutputsListHeadPos, "Where a walk through the outputs begins.")
-      .def("ClearHDResultOutputs", &Model::ClearHDResultOutputs, "Takes all outputs out.");
+      .add("setRain_Value", &Model::setRain_Value, {{"value"}}, "Millimetres per day.")
+      .add("setRain_File", &Model::setRain_File, {fileName(), {"precipitation_type"}, item()},
+           "Net precipitation from a file. Type: 1 a time series, 2 maps in time.")
+      .add("setOutput_MaximumFloodDepthAndExtend", &Model::setOutput_MaximumFloodDepthAndExtend,
+           {fileName(), {"store_step"}}, "The store step is in time steps.")
+      .add("GetOutputsListHeadPos", &Model::GetOutputsListHeadPos, {},
+           "Where a walk through the outputs begins.")
+      .add("ClearHDResultOutputs", &Model::ClearHDResultOutputs, {}, "Takes all outputs out.");
   return flood;
 }
 
@@ -155,68 +272,71 @@ void addFloodModels(py::module_& module) {
       .def("__bool__", &OutputPosition::operator bool);
 
   using Flood = Flooding_V27FlowModel;
+  using Urban = UrbanFlooding_V27Flowmodel;
+  const std::vector line{"first_j", "first_k", "last_j", "last_k", "formulation"};
+  const std::vector points{"type", "source_j", "source_k", "sink_j", "sink_k"};
+  const std::vector<Argument> period{flag("use_period"), {"first_date"}, {"last_date"}};
+  constexpr const char* kBoundaryValue = "Formulation 1 is a level in m, 2 a flux in m3/s.";
+
   addFloodModel<Flood>(module, "Flooding_V27FlowModel",
                        "A flood model by grid points and numbers of data formats.")
-      .def("setHDBndCondition_Value", &Flood::setHDBndCondition_Value, py::arg("index"), py::arg("first_j"),
-           py::arg("first_k"), py::arg("last_j"), py::arg("last_k"), py::arg("formulation"), py::arg("value"),
-           "Formulation 1 is a level in m, 2 a flux in m3/s. A boundary that is not there is passed over.")
-      .def("setHDBndCondition_File", &Flood::setHDBndCondition_File, py::arg("index"), py::arg("first_j"),
-           py::arg("first_k"), py::arg("last_j"), py::arg("last_k"), py::arg("formulation"),
-           py::arg("data_format"), py::arg("file_name"), py::arg("item"),
+      .add("setHDBndCondition_Value", &Flood::setHDBndCondition_Value,
+           with({boundary<Flood>()}, line, {{"value"}}), kBoundaryValue)
+      .add("setHDBndCondition_File", &Flood::setHDBndCondition_File,
+           with({boundary<Flood>()}, line, {{"data_format"}, fileName(), item()}),
            "Data format: 3 a series in time, 4 one along the line, 5 transfer data (which has no item: "
-           "ValueError), 7 a rating curve.")
-      .def("getNoOfBndConditions", &Flood::getNoOfBndConditions, "How many boundaries there are.")
-      .def(
+           "WrongValue, when all else has been set), 7 a rating curve.",
+           "a data format that has an item")
+      .add("getNoOfBndConditions", &Flood::getNoOfBndConditions, {}, "How many boundaries there are.")
+      .add(
           "getHDBndCondition",
-          [](Flood& model, int index) -> py::object {
-            if (index < 1 || index > model.getNoOfBndConditions()) return py::none();
+          [](Flood& model, int index) {
             std::array<int, 6> numbers{};
             double value = 0;
             std::string file;
             int item = 0;
             auto& [j1, k1, j2, k2, formulation, format] = numbers;
             model.getHDBndCondition(index, j1, k1, j2, k2, formulation, format, value, file, item);
-            return py::make_tuple(j1, k1, j2, k2, formulation, format, value, file, item);
+            return tupleOf(j1, k1, j2, k2, formulation, format, value, file, item);
           },
-          py::arg("index"), "None for a boundary that is not there.")
-      .def("setNoOfSourceSink", &Flood::setNoOfSourceSink, py::arg("count"), "A negative count does nothing.")
-      .def("getNoOfSourceSink", &Flood::getNoOfSourceSink, "How many sources there are.")
-      .def("setHDSourceSink_Value", &Flood::setHDSourceSink_Value, py::arg("index"), py::arg("type"),
-           py::arg("source_j"), py::arg("source_k"), py::arg("sink_j"), py::arg("sink_k"),
-           py::arg("magnitude"), py::arg("velocity"), py::arg("outlet_direction"),
-           "Type: 0 source, 1 sink, 2 a pair. Magnitude in m3/s, velocity in m/s, direction in degrees. A "
-           "source that is not there is passed over.")
-      .def("setHDSourceSink_File", &Flood::setHDSourceSink_File, py::arg("index"), py::arg("type"),
-           py::arg("source_j"), py::arg("source_k"), py::arg("sink_j"), py::arg("sink_k"),
-           py::arg("file_name"), py::arg("outlet_direction"), py::arg("magnitude_item"),
-           py::arg("velocity_item"), "Only the items are stored: the file of the source stays what it was.")
-      .def("setHDSourceSink_FileEx", &Flood::setHDSourceSink_FileEx, py::arg("index"), py::arg("type"),
-           py::arg("source_j"), py::arg("source_k"), py::arg("sink_j"), py::arg("sink_k"),
-           py::arg("file_name"), py::arg("item_1"), py::arg("item_2"), py::arg("item_3"),
+          {boundary<Flood>()}, "Points, formulation, data format, value, file and item; 0 or \"\" for none.")
+      .add("setNoOfSourceSink", &Flood::setNoOfSourceSink, {count(0)}, "How many sources there are to be.")
+      .add("getNoOfSourceSink", &Flood::getNoOfSourceSink, {}, "How many sources there are.")
+      .add("setHDSourceSink_Value", &Flood::setHDSourceSink_Value,
+           with({source()}, points, {{"magnitude"}, {"velocity"}, {"outlet_direction"}}),
+           "Type: 0 source, 1 sink, 2 a pair. Magnitude in m3/s, velocity in m/s, direction in degrees.")
+      .add("setHDSourceSink_File", &Flood::setHDSourceSink_File,
+           with({source()}, points,
+                {fileName(), {"outlet_direction"}, item("magnitude_item"), item("velocity_item")}),
+           "Only the items are stored: the file of the source stays what it was.")
+      .add("setHDSourceSink_FileEx", &Flood::setHDSourceSink_FileEx,
+           with({source()}, points, {fileName(), item("item_1"), item("item_2"), item("item_3")}),
            "With three items, in data format 2; only the items are stored.")
-      .def(
+      .add(
           "getHDSourceSink",
-          [](Flood& model, int index) -> py::object {
-            if (index < 1 || index > model.getNoOfSourceSink()) return py::none();
+          [](Flood& model, int index) {
             std::array<int, 6> numbers{};
             auto& [type, format, sourceJ, sourceK, sinkJ, sinkK] = numbers;
-            std::array<double, 3> values{};
+            double magnitude = 0;
+            double velocity = 0;
+            double direction = 0;
             std::array<int, 3> items{};
             std::string file;
-            model.getHDSourceSink(index, type, format, sourceJ, sourceK, sinkJ, sinkK, values[0], values[1],
-                                  values[2], file, items[0], items[1], items[2]);
-            return py::make_tuple(type, format, sourceJ, sourceK, sinkJ, sinkK, values[0], values[1],
-                                  values[2], file, items[0], items[1], items[2]);
+            model.getHDSourceSink(index, type, format, sourceJ, sourceK, sinkJ, sinkK, magnitude, velocity,
+                                  direction, file, items[0], items[1], items[2]);
+            return tupleOf(type, format, sourceJ, sourceK, sinkJ, sinkK, magnitude, velocity, direction, file,
+                           items[0], items[1], items[2]);
           },
-          py::arg("index"), "None for a source that is not there.")
-      .def("AddOutput_MapsAndTimeSeriesJK", &Flood::AddOutput_MapsAndTimeSeriesJK, py::arg("type"),
-           py::arg("use_sub_area"), py::arg("first_j"), py::arg("first_k"), py::arg("last_j"),
-           py::arg("last_k"), py::arg("points_j"), py::arg("points_k"), py::arg("use_period"),
-           py::arg("first_date"), py::arg("last_date"), py::arg("time_step_frequency"), py::arg("file_name"),
-           py::arg("title"), py::arg("items"),
+          {source()},
+          "Type, data format, points, magnitude, velocity, direction, file, which is never told, and items.")
+      .add("AddOutput_MapsAndTimeSeriesJK", &Flood::AddOutput_MapsAndTimeSeriesJK,
+           with(with(with({{"type"}, flag("use_sub_area")},
+                          {"first_j", "first_k", "last_j", "last_k", "points_j", "points_k"}, period),
+                     {"time_step_frequency"}, {fileName()}),
+                {"title"}, {item("items")}),
            "Type: 0 a map, 1 points, which need both lists. Frequency in time steps. Items: 1 water depth, 2 "
            "and 3 fluxes, 4 surface elevation, 5 and 6 velocities.")
-      .def(
+      .add(
           "GetNextOutputs_MapsJKAndTS",
           [](Flood& model, OutputPosition position) {
             Output it;
@@ -225,36 +345,35 @@ void addFloodModels(py::module_& module) {
                                              it.lastDate, it.frequency, it.fileName, it.title, it.items);
             return it.tuple(position);
           },
-          py::arg("position"), "The next position and the output at this one.");
+          {position<Flood>()}, "The next position and the output at this one.");
 
-  py::class_<Flooding_V27WSKFlowModel>(module, "Flooding_V27WSKFlowModel", py::module_local(),
-                                       "A model of the Wetland Sweep Kit; it has no members of its own.")
-      .def(py::init<>())
-      .def(
-          "as_flow_model", [](const Flooding_V27WSKFlowModel& model) { return Flood(model); },
+  Members<Flooding_V27WSKFlowModel>(
+      py::class_<Flooding_V27WSKFlowModel>(module, "Flooding_V27WSKFlowModel", py::module_local(),
+                                           "A model of the Wetland Sweep Kit; it has no members of its own.")
+          .def(py::init<>()))
+      .add(
+          "as_flow_model", [](Flooding_V27WSKFlowModel& model) { return Flood(model); }, {},
           "An object with members that drives the same model.");
 
-  using Urban = UrbanFlooding_V27Flowmodel;
   addFloodModel<Urban>(module, "UrbanFlooding_V27Flowmodel",
                        "A flood model by map coordinates and extensions of files.")
-      .def("setBndCondition_Value", &Urban::setBndCondition_Value, py::arg("index"), py::arg("first_j"),
-           py::arg("first_k"), py::arg("last_j"), py::arg("last_k"), py::arg("formulation"), py::arg("value"),
-           "Formulation 1 is a level in m, 2 a flux in m3/s. A boundary that is not there is passed over.")
-      .def("setBndCondition_File", &Urban::setBndCondition_File, py::arg("index"), py::arg("first_j"),
-           py::arg("first_k"), py::arg("last_j"), py::arg("last_k"), py::arg("formulation"),
-           py::arg("file_name"), py::arg("item"),
+      .add("setBndCondition_Value", &Urban::setBndCondition_Value,
+           with({boundary<Urban>()}, line, {{"value"}}), kBoundaryValue)
+      .add("setBndCondition_File", &Urban::setBndCondition_File,
+           with({boundary<Urban>()}, line, {fileName(), item()}),
            "The extension says what the file is: .tsb0 or .tb0 a series in time, .tsb1 or .tb1 one along the "
-           "line; of others nothing is stored.")
-      .def(
-          "as_flow_model", [](const Urban& model) { return Flood(model); },
+           "line; of others nothing is stored.",
+           "a boundary whose selection has an item")
+      .add(
+          "as_flow_model", [](Urban& model) { return Flood(model); }, {},
           "An object of the other interface that drives the same model.")
-      .def("AddOutput_MapsAndTimeSeries", &Urban::AddOutput_MapsAndTimeSeries, py::arg("type"),
-           py::arg("use_sub_area"), py::arg("first_x"), py::arg("first_y"), py::arg("last_x"),
-           py::arg("last_y"), py::arg("use_period"), py::arg("first_date"), py::arg("last_date"),
-           py::arg("number_of_steps"), py::arg("file_name"), py::arg("title"), py::arg("water_depth"),
-           py::arg("surface_elevation"), py::arg("velocities"), py::arg("fluxes"),
+      .add("AddOutput_MapsAndTimeSeries", &Urban::AddOutput_MapsAndTimeSeries,
+           with(with(with({{"type"}, flag("use_sub_area")}, {"first_x", "first_y", "last_x", "last_y"},
+                          period),
+                     {"number_of_steps"}, {fileName()}),
+                {"title", "water_depth", "surface_elevation", "velocities", "fluxes"}),
            "A part of the map between two corners in m. Coordinates of a point output have no effect.")
-      .def(
+      .add(
           "GetNextOutputs_MapsJKAndTS",
           [](Urban& model, OutputPosition position, int ignored) {
             Output it;
@@ -263,82 +382,106 @@ void addFloodModels(py::module_& module) {
                                              it.lastDate, it.frequency, it.fileName, it.title, it.items);
             return py::tuple(py::make_tuple(position) + it.withoutType());
           },
-          py::arg("position"), py::arg("ignored") = 0,
+          {position<Urban>(), {.name = "ignored", .fallback = 0}},
           "The next position and the output at this one, whose type is not given.");
 }
 
+using Climate = CClimateChange_V27;
+
+Argument nth(int (Climate::*count)()) {
+  return indexIn<Climate>(count);
+}
+
 void addClimateChange(py::module_& module) {
-  using Climate = CClimateChange_V27;
-  py::class_<Climate> climate(module, "CClimateChange_V27", py::module_local(),
-                              "The forcings of a setup, to be looked at and replaced. Members give 1, and "
-                              "what was asked for; or 0, and None.");
-  climate.def(py::init<>())
-      .def(
+  const Argument value{"value"};
+  const Argument file = fileName();
+  Members<Climate>(
+      py::class_<Climate>(module, "CClimateChange_V27", py::module_local(),
+                          "The forcings of a setup, to be looked at and replaced. Indices count, "
+                          "from 1, what is of the kind. Members give 1, and what was asked for.")
+          .def(py::init<>()))
+      .add(
           "ShowMessagesWith",
-          [](Climate& model, std::function<void(const std::string&)> show) {
-            ShowMessagesWith(model, std::move(show));
+          [](Climate& model, MessageBox show) { ShowMessagesWith(model, std::move(show)); }, {{"show"}},
+          kTexts)
+      .add(
+          "OpenFile",
+          [](Climate& model, std::string name) {
+            load(model, name);
+            return 1;
           },
-          py::arg("show"), kTexts)
-      .def("OpenFile", &Climate::OpenFile, py::arg("file_name"), "1 where the file was read.")
-      .def("SaveFile", &Climate::SaveFile, py::arg("file_name"), "Always 1; nothing is checked.")
-      .def("GetSimulationPeriod",
-           [](Climate& model) {
-             scripting::DateTime start;
-             scripting::DateTime end;
-             const int result = model.GetSimulationPeriod(start, end);
-             return py::make_tuple(result, start, end);
-           })
-      .def("GetLongLat",
-           [](Climate& model) {
-             double longitude = 0;
-             double latitude = 0;
-             const int result = model.GetLongLat(longitude, latitude);
-             return py::make_tuple(result, longitude, latitude);
-           })
-      .def("ResultOutputsHasAbsolutePath", &Climate::ResultOutputsHasAbsolutePath,
-           "1 where the name of an output has a folder.");
-  const auto index = py::arg("index");
-  const auto file = py::arg("file_name");
-  const auto number = py::arg("value");
-  climate.def("GetNoPrecValues", &Climate::GetNoPrecValues)
-      .def("GetPrecValues", getter(&Climate::GetPrecValues), index)
-      .def("SetPrecValues", &Climate::SetPrecValues, index, number)
-      .def("GetNoPrecTimeSeries", &Climate::GetNoPrecTimeSeries)
-      .def("GetPrecFileItem", getter(&Climate::GetPrecFileItem), index)
-      .def("SetPrecFile", &Climate::SetPrecFile, index, file)
-      .def("GetNoPrecGridSeries", &Climate::GetNoPrecGridSeries)
-      .def("GetPrecGridFileItem", getter(&Climate::GetPrecGridFileItem), index)
-      .def("SetPrecGridFile", &Climate::SetPrecGridFile, index, file)
-      .def("GetNoEvapValues", &Climate::GetNoEvapValues)
-      .def("GetEvapValues", getter(&Climate::GetEvapValues), index)
-      .def("SetEvapValues", &Climate::SetEvapValues, index, number)
-      .def("GetNoEvapTimeSeries", &Climate::GetNoEvapTimeSeries)
-      .def("GetEvapFileItem", getter(&Climate::GetEvapFileItem), index)
-      .def("SetEvapFile", &Climate::SetEvapFile, index, file)
-      .def("GetNoEvapGridSeries", &Climate::GetNoEvapGridSeries)
-      .def("GetEvapGridFileItem", getter(&Climate::GetEvapGridFileItem), index)
-      .def("SetEvapGridFile", &Climate::SetEvapGridFile, index, file)
-      .def("GetNoTempValues", &Climate::GetNoTempValues)
-      .def("GetTempValues", getter(&Climate::GetTempValues), index)
-      .def("SetTempValues", &Climate::SetTempValues, index, number)
-      .def("GetNoTempTimeSeries", &Climate::GetNoTempTimeSeries)
-      .def("GetTempFileItem", getter(&Climate::GetTempFileItem), index)
-      .def("SetTempFile", &Climate::SetTempFile, index, file)
-      .def("GetNoTempGridSeries", &Climate::GetNoTempGridSeries)
-      .def("GetTempGridFileItem", getter(&Climate::GetTempGridFileItem), index)
-      .def("SetTempGridFile", &Climate::SetTempGridFile, index, file)
-      .def("GetNoWLValue", &Climate::GetNoWLValue)
-      .def("GetNoWLTimeSeries", &Climate::GetNoWLTimeSeries)
-      .def("GetNoWLLineSeries", &Climate::GetNoWLLineSeries)
-      .def("GetWLvalueIDLocation", getter(&Climate::GetWLvalueIDLocation), index)
-      .def("GetWLTSIDLocation", getter(&Climate::GetWLTSIDLocation), index)
-      .def("GetWLLineIDLocation", getter(&Climate::GetWLLineIDLocation), index)
-      .def("GetWLValue", getter(&Climate::GetWLValue), index)
-      .def("SetWLValue", &Climate::SetWLValue, index, number)
-      .def("GetWLFileItem", getter(&Climate::GetWLFileItem), index)
-      .def("SetWLFile", &Climate::SetWLFile, index, file)
-      .def("GetWLLineFileItem", getter(&Climate::GetWLLineFileItem), index)
-      .def("SetWLLineFile", &Climate::SetWLLineFile, index, file, py::arg("item"));
+          {file}, "1. FileError where the file can't be read or is no setup.")
+      .add(
+          "SaveFile",
+          [](Climate& object, std::string name) {
+            const Outcome written = [&] {
+              const auto guard = modelOf(object).lock();
+              return modelOf(object).write(name);
+            }();
+            refuseUnwritten(written, name);
+            return 1;
+          },
+          {file}, "1; nothing is checked. FileError where the file can't be written.",
+          "outputs whose items can be saved")
+      .add(
+          "GetSimulationPeriod",
+          [](Climate& model) {
+            scripting::DateTime start;
+            scripting::DateTime end;
+            const int result = model.GetSimulationPeriod(start, end);
+            return tupleOf(result, start, end);
+          },
+          {}, "Always 0, with start and end.")
+      .add(
+          "GetLongLat",
+          [](Climate& model) {
+            double longitude = 0;
+            double latitude = 0;
+            const int result = model.GetLongLat(longitude, latitude);
+            return tupleOf(result, longitude, latitude);
+          },
+          {}, "1 and degrees; 0 in local coordinates.")
+      .add("ResultOutputsHasAbsolutePath", &Climate::ResultOutputsHasAbsolutePath, {},
+           "1 where the name of an output has a folder.")
+      .add("GetNoPrecValues", &Climate::GetNoPrecValues)
+      .add("GetPrecValues", getter(&Climate::GetPrecValues), {nth(&Climate::GetNoPrecValues)})
+      .add("SetPrecValues", &Climate::SetPrecValues, {nth(&Climate::GetNoPrecValues), value})
+      .add("GetNoPrecTimeSeries", &Climate::GetNoPrecTimeSeries)
+      .add("GetPrecFileItem", getter(&Climate::GetPrecFileItem), {nth(&Climate::GetNoPrecTimeSeries)})
+      .add("SetPrecFile", &Climate::SetPrecFile, {nth(&Climate::GetNoPrecTimeSeries), file})
+      .add("GetNoPrecGridSeries", &Climate::GetNoPrecGridSeries)
+      .add("GetPrecGridFileItem", getter(&Climate::GetPrecGridFileItem), {nth(&Climate::GetNoPrecGridSeries)})
+      .add("SetPrecGridFile", &Climate::SetPrecGridFile, {nth(&Climate::GetNoPrecGridSeries), file})
+      .add("GetNoEvapValues", &Climate::GetNoEvapValues)
+      .add("GetEvapValues", getter(&Climate::GetEvapValues), {nth(&Climate::GetNoEvapValues)})
+      .add("SetEvapValues", &Climate::SetEvapValues, {nth(&Climate::GetNoEvapValues), value})
+      .add("GetNoEvapTimeSeries", &Climate::GetNoEvapTimeSeries)
+      .add("GetEvapFileItem", getter(&Climate::GetEvapFileItem), {nth(&Climate::GetNoEvapTimeSeries)})
+      .add("SetEvapFile", &Climate::SetEvapFile, {nth(&Climate::GetNoEvapTimeSeries), file})
+      .add("GetNoEvapGridSeries", &Climate::GetNoEvapGridSeries)
+      .add("GetEvapGridFileItem", getter(&Climate::GetEvapGridFileItem), {nth(&Climate::GetNoEvapGridSeries)})
+      .add("SetEvapGridFile", &Climate::SetEvapGridFile, {nth(&Climate::GetNoEvapGridSeries), file})
+      .add("GetNoTempValues", &Climate::GetNoTempValues)
+      .add("GetTempValues", getter(&Climate::GetTempValues), {nth(&Climate::GetNoTempValues)})
+      .add("SetTempValues", &Climate::SetTempValues, {nth(&Climate::GetNoTempValues), value})
+      .add("GetNoTempTimeSeries", &Climate::GetNoTempTimeSeries)
+      .add("GetTempFileItem", getter(&Climate::GetTempFileItem), {nth(&Climate::GetNoTempTimeSeries)})
+      .add("SetTempFile", &Climate::SetTempFile, {nth(&Climate::GetNoTempTimeSeries), file})
+      .add("GetNoTempGridSeries", &Climate::GetNoTempGridSeries)
+      .add("GetTempGridFileItem", getter(&Climate::GetTempGridFileItem), {nth(&Climate::GetNoTempGridSeries)})
+      .add("SetTempGridFile", &Climate::SetTempGridFile, {nth(&Climate::GetNoTempGridSeries), file})
+      .add("GetNoWLValue", &Climate::GetNoWLValue)
+      .add("GetNoWLTimeSeries", &Climate::GetNoWLTimeSeries)
+      .add("GetNoWLLineSeries", &Climate::GetNoWLLineSeries)
+      .add("GetWLvalueIDLocation", getter(&Climate::GetWLvalueIDLocation), {nth(&Climate::GetNoWLValue)})
+      .add("GetWLTSIDLocation", getter(&Climate::GetWLTSIDLocation), {nth(&Climate::GetNoWLTimeSeries)})
+      .add("GetWLLineIDLocation", getter(&Climate::GetWLLineIDLocation), {nth(&Climate::GetNoWLLineSeries)})
+      .add("GetWLValue", getter(&Climate::GetWLValue), {nth(&Climate::GetNoWLValue)})
+      .add("SetWLValue", &Climate::SetWLValue, {nth(&Climate::GetNoWLValue), value})
+      .add("GetWLFileItem", getter(&Climate::GetWLFileItem), {nth(&Climate::GetNoWLTimeSeries)})
+      .add("SetWLFile", &Climate::SetWLFile, {nth(&Climate::GetNoWLTimeSeries), file})
+      .add("GetWLLineFileItem", getter(&Climate::GetWLLineFileItem), {nth(&Climate::GetNoWLLineSeries)})
+      .add("SetWLLineFile", &Climate::SetWLLineFile, {nth(&Climate::GetNoWLLineSeries), file, item()});
 }
 
 }  // namespace

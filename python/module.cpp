@@ -3,6 +3,7 @@
 
 #include "core/edition.h"
 #include "python/refusal.h"
+#include "python/values.h"
 
 namespace gridbay::python {
 namespace py = pybind11;
@@ -27,13 +28,9 @@ std::string shown(py::handle value) {
 namespace {
 
 void raise(const Refusal& refused) {
-  const auto text = [](const std::string& held) -> py::object {
-    return py::reinterpret_steal<py::object>(
-        PyUnicode_DecodeUTF8(held.data(), static_cast<py::ssize_t>(held.size()), "surrogateescape"));
-  };
   const py::object kind = py::module_::import("gridbay_setup.errors").attr(std::string(refused.kind).c_str());
-  const py::object error =
-      kind(text(refused.text), text(refused.path), text(refused.given), text(refused.allowed));
+  const py::object error = kind(textObject(refused.text), textObject(refused.path), textObject(refused.given),
+                                textObject(refused.allowed));
   PyErr_SetObject(kind.ptr(), error.ptr());
 }
 

@@ -31,8 +31,7 @@ py::object objectOf(const Value& value) {
     case ValueKind::real:
       return py::float_(doubleOfText(text).value_or(std::numeric_limits<double>::quiet_NaN()));
     case ValueKind::string:
-      return py::reinterpret_steal<py::object>(
-          PyUnicode_DecodeUTF8(text.data(), static_cast<py::ssize_t>(text.size()), "surrogateescape"));
+      return textObject(text);
     default:
       if (text.empty()) return py::none();
       return py::module_::import("pathlib").attr("Path")(py::reinterpret_steal<py::object>(
@@ -69,17 +68,17 @@ bool isNumpy(py::handle given, std::string_view name) {
   return type.starts_with("numpy." + std::string(name));
 }
 
-bool isBool(py::handle given) {
-  return PyBool_Check(given.ptr()) != 0 || isNumpy(given, "bool");
-}
-
 bool isNumber(py::handle given) {
   return !isBool(given) &&
          (PyFloat_Check(given.ptr()) != 0 || PyIndex_Check(given.ptr()) != 0 || isNumpy(given, "float"));
 }
 
+Refusal wrong(std::string_view which, py::handle given, ValueKind kind, const std::string& path) {
+  return refusal(which, path, shown(given), std::string(nameOf(kind)));
+}
+
 // A text as bytes; a path too.
-std::string textOf(py::handle given, bool file, const std::string& path) {
+std::string bytesOf(py::handle given, bool file, const std::string& path) {
   py::object text = py::reinterpret_borrow<py::object>(given);
   if (file && PyUnicode_Check(text.ptr()) == 0) text = py::module_::import("os").attr("fspath")(text);
   PyObject* bytes = PyUnicode_Check(text.ptr()) == 0 ? nullptr
@@ -96,58 +95,84 @@ std::string textOf(py::handle given, bool file, const std::string& path) {
 }
 
 std::string valueText(py::handle given, ValueKind kind, const std::string& path) {
-  const auto wrong = [&](std::string_view which) {
-    return refusal(which, path, shown(given), std::string(nameOf(kind)));
-  };
   switch (kind) {
     case ValueKind::boolean:
-      if (!isBool(given)) throw wrong(kWrongType);
-      return py::bool_(py::reinterpret_borrow<py::object>(given)) ? "true" : "false";
-    case ValueKind::integer: {
-      if (isBool(given) || PyIndex_Check(given.ptr()) == 0) throw wrong(kWrongType);
-      const auto number = py::reinterpret_steal<py::int_>(PyNumber_Index(given.ptr()));
-      if (!number) throw py::error_already_set();
-      int overflow = 0;
-      const long long whole = PyLong_AsLongLongAndOverflow(number.ptr(), &overflow);
-      if (overflow != 0 || whole < std::numeric_limits<std::int32_t>::min() ||
-          whole > std::numeric_limits<std::int32_t>::max()) {
-        throw wrong(kWrongValue);
-      }
-      return numberText(std::int64_t{whole});
-    }
-    case ValueKind::real: {
-      if (!isNumber(given)) throw wrong(kWrongType);
-      const double number = PyFloat_AsDouble(given.ptr());
-      if (PyErr_Occurred() != nullptr) {
-        PyErr_Clear();
-        throw wrong(kWrongValue);
-      }
-      return numberText(number);
-    }
+      return boolOf(given, path) ? "true" : "false";
+    case ValueKind::integer:
+      return numberText(std::int64_t{wholeOf(given, path)});
+    case ValueKind::real:
+      return numberText(realOf(given, path));
     case ValueKind::string:
-      if (PyUnicode_Check(given.ptr()) == 0) throw wrong(kWrongType);
-      return textOf(given, false, path);
+      return textOf(given, path);
     default:
-      if (given.is_none()) return {};
-      if (PyUnicode_Check(given.ptr()) == 0 && !py::hasattr(given, "__fspath__")) throw wrong(kWrongType);
-      return textOf(given, true, path);
+      return fileOf(given, path);
   }
 }
 
 // Six whole numbers from a datetime.
 std::vector<py::object> dateParts(py::handle given, const std::string& path) {
-  const py::object datetime = py::module_::import("datetime").attr("datetime");
-  constexpr const char* kAllowed = "a datetime of whole seconds without a time zone";
-  if (!py::isinstance(given, datetime)) throw refusal(kWrongType, path, shown(given), kAllowed);
-  if (!given.attr("tzinfo").is_none() || py::cast<int>(given.attr("microsecond")) != 0)
-    throw refusal(kWrongValue, path, shown(given), kAllowed);
   std::vector<py::object> parts;
-  for (const char* part : {"year", "month", "day", "hour", "minute", "second"})
-    parts.emplace_back(given.attr(part));
+  for (const std::int32_t part : momentOf(given, path)) parts.emplace_back(py::int_(part));
   return parts;
 }
 
-// The pieces of what is given: several for anything that can be walked and is no text.
+}  // namespace
+
+bool isBool(py::handle given) {
+  return PyBool_Check(given.ptr()) != 0 || isNumpy(given, "bool");
+}
+
+bool boolOf(py::handle given, const std::string& path) {
+  if (!isBool(given)) throw wrong(kWrongType, given, ValueKind::boolean, path);
+  return py::bool_(py::reinterpret_borrow<py::object>(given));
+}
+
+std::int32_t wholeOf(py::handle given, const std::string& path) {
+  if (isBool(given) || PyIndex_Check(given.ptr()) == 0)
+    throw wrong(kWrongType, given, ValueKind::integer, path);
+  const auto number = py::reinterpret_steal<py::int_>(PyNumber_Index(given.ptr()));
+  if (!number) throw py::error_already_set();
+  int overflow = 0;
+  const long long whole = PyLong_AsLongLongAndOverflow(number.ptr(), &overflow);
+  if (overflow != 0 || whole < std::numeric_limits<std::int32_t>::min() ||
+      whole > std::numeric_limits<std::int32_t>::max()) {
+    throw wrong(kWrongValue, given, ValueKind::integer, path);
+  }
+  return static_cast<std::int32_t>(whole);
+}
+
+double realOf(py::handle given, const std::string& path) {
+  if (!isNumber(given)) throw wrong(kWrongType, given, ValueKind::real, path);
+  const double number = PyFloat_AsDouble(given.ptr());
+  if (PyErr_Occurred() != nullptr) {
+    PyErr_Clear();
+    throw wrong(kWrongValue, given, ValueKind::real, path);
+  }
+  return number;
+}
+
+std::string textOf(py::handle given, const std::string& path) {
+  if (PyUnicode_Check(given.ptr()) == 0) throw wrong(kWrongType, given, ValueKind::string, path);
+  return bytesOf(given, false, path);
+}
+
+std::string fileOf(py::handle given, const std::string& path) {
+  if (given.is_none()) return {};
+  if (PyUnicode_Check(given.ptr()) == 0 && !py::hasattr(given, "__fspath__"))
+    throw wrong(kWrongType, given, ValueKind::fileName, path);
+  return bytesOf(given, true, path);
+}
+
+std::array<std::int32_t, 6> momentOf(py::handle given, const std::string& path) {
+  constexpr const char* kAllowed = "a datetime of whole seconds without a time zone";
+  const auto part = [given](const char* name) { return py::cast<std::int32_t>(given.attr(name)); };
+  if (!py::isinstance(given, py::module_::import("datetime").attr("datetime")))
+    throw refusal(kWrongType, path, shown(given), kAllowed);
+  if (!given.attr("tzinfo").is_none() || part("microsecond") != 0)
+    throw refusal(kWrongValue, path, shown(given), kAllowed);
+  return {part("year"), part("month"), part("day"), part("hour"), part("minute"), part("second")};
+}
+
 std::vector<py::object> piecesOf(py::handle given, const std::string& path, const std::string& allowed) {
   if (PyUnicode_Check(given.ptr()) != 0 || PyBytes_Check(given.ptr()) != 0 ||
       py::isinstance<py::dict>(given) || !py::hasattr(given, "__iter__")) {
@@ -158,7 +183,10 @@ std::vector<py::object> piecesOf(py::handle given, const std::string& path, cons
   return pieces;
 }
 
-}  // namespace
+py::object textObject(std::string_view text) {
+  return py::reinterpret_steal<py::object>(
+      PyUnicode_DecodeUTF8(text.data(), static_cast<py::ssize_t>(text.size()), "surrogateescape"));
+}
 
 py::object objectOf(const Node& keyword, bool takesAnyNumber) {
   const std::span<const Value> values = keyword.values();

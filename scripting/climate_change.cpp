@@ -174,12 +174,12 @@ void ShowMessagesWith(CClimateChange_V27& model, MessageBox show) {
 
 int CClimateChange_V27::OpenFile(std::string fileName) {
   const auto guard = model_->lock();
-  return model_->load(fileName) ? 1 : 0;
+  return model_->load(fileName).isRead ? 1 : 0;
 }
 
 int CClimateChange_V27::SaveFile(std::string fileName) {
   const auto guard = model_->lock();
-  model_->write(fileName);
+  static_cast<void>(model_->write(fileName));
   return 1;
 }
 

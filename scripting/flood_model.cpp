@@ -1,4 +1,3 @@
-#include <exception>
 #include <stdexcept>
 
 #include "basic/area_description.h"
@@ -55,16 +54,7 @@ void FloodModel::LoadFile(std::string fileName) {
 
 void FloodModel::SaveFile(std::string fileName) {
   const auto guard = model_->lock();
-  const std::string errors = _GetErrorTexts();
-  // A message box that throws does not keep the setup from being written.
-  std::exception_ptr thrown;
-  try {
-    if (!errors.empty()) model_->show(errors);
-  } catch (...) {
-    thrown = std::current_exception();
-  }
-  if (!model_->write(fileName)) model_->show(kvsGetErrorText());
-  if (thrown) std::rethrow_exception(thrown);
+  static_cast<void>(model_->save(fileName, _GetErrorTexts()));
 }
 
 std::string FloodModel::GetFileExtension() {
@@ -75,15 +65,7 @@ std::string FloodModel::GetFileExtension() {
 }
 
 std::string FloodModel::_GetErrorTexts() {
-  const auto dataFiles = ScriptedModel::lockDataFiles();
-  ValidationList messages;
-  model_->root.Validate(messages, 1);
-  std::string lines;
-  for (const CMessage& message : messages) {
-    if (!lines.empty()) lines += '\n';
-    lines += "VANE 27: " + message.text;
-  }
-  return lines;
+  return model_->errorTexts();
 }
 
 void FloodModel::SetSimulationPeriod(DateTime start, DateTime end, float timeStep) {

@@ -1,6 +1,7 @@
 #include "scripting/scripted_model.h"
 
 #include <cstdio>
+#include <exception>
 
 #include "basic/module_selection.h"
 #include "platform/files/paths.h"
@@ -40,11 +41,14 @@ void ScriptedModel::show(const std::string& text) {
   }
 }
 
-bool ScriptedModel::load(const std::string& fileName) {
+ScriptedModel::Loaded ScriptedModel::load(const std::string& fileName) {
   KvsHandle file = kvsLoadFile(fileName, 0);
-  const bool isRead = kvsPeekErrorGlb() == kKvsNoError;
-  if (isRead) {
-    if (kvsTargetByNameNum(*file, CGlobalKvs::kTarget, 1) != nullptr) {
+  Loaded loaded{.isRead = kvsPeekErrorGlb() == kKvsNoError};
+  if (loaded.isRead) {
+    if (kvsTargetByNameNum(*file, CGlobalKvs::kTarget, 1) == nullptr) {
+      loaded.fault =
+          "\"" + fileName + "\" is not a setup: it has no section " + std::string(CGlobalKvs::kTarget);
+    } else {
       if (!documentPath_.empty()) {  // a root takes one load
         root.AssignState(CGlobalKvs());
         clearFeatures();
@@ -52,26 +56,55 @@ bool ScriptedModel::load(const std::string& fileName) {
       documentPath_ = absolutePath(fileName, {});
     }
     root.Load(&file->tree().root(), fileName);
-  } else if (kvsGetErrorGlb() == kKvsSyntaxError) {
-    int line = 0;
-    int column = 0;
-    std::string text;
-    kvsGetSyntaxErr(file.get(), &line, &column, &text);
-    show(text);
+  } else {
+    loaded.fault = kvsGetErrorText();
+    if (kvsGetErrorGlb() == kKvsSyntaxError) {
+      int line = 0;
+      int column = 0;
+      std::string text;
+      kvsGetSyntaxErr(file.get(), &line, &column, &text);
+      show(text);
+    }
   }
   kvsClose(&file);
   const auto dataFiles = lockDataFiles();
   ValidationList dropped;
   root.Validate(dropped, 1);
-  return isRead;
+  return loaded;
 }
 
-bool ScriptedModel::write(const std::string& fileName) {
+std::string ScriptedModel::errorTexts() {
+  const auto dataFiles = lockDataFiles();
+  ValidationList messages;
+  root.Validate(messages, 1);
+  std::string lines;
+  for (const CMessage& message : messages) {
+    if (!lines.empty()) lines += '\n';
+    lines += "VANE 27: " + message.text;
+  }
+  return lines;
+}
+
+Outcome ScriptedModel::save(const std::string& fileName, const std::string& texts) {
+  // A message box that throws does not keep the setup from being written.
+  std::exception_ptr thrown;
+  try {
+    if (!texts.empty()) show(texts);
+  } catch (...) {
+    thrown = std::current_exception();
+  }
+  Outcome written = write(fileName);
+  if (!written) show(written.error());
+  if (thrown) std::rethrow_exception(thrown);
+  return written;
+}
+
+Outcome ScriptedModel::write(const std::string& fileName) {
   KvsHandle file = kvsCreate();
   root.Save(*file, fileName);
-  if (kvsWrite(*file, fileName)) return true;
+  if (kvsWrite(*file, fileName)) return {};
   kvsGetErrorGlb();
-  return false;
+  return Failure{kvsGetErrorText()};
 }
 
 void ScriptedModel::setSelection(UTsbSelection& selection, const std::string& fileName, int item) const {

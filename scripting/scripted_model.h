@@ -6,6 +6,7 @@
 #include "core/date_time.h"
 #include "core/selections.h"
 #include "gridbay_setup/types.h"
+#include "platform/result.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay {
@@ -28,12 +29,22 @@ class ScriptedModel {
   // it. To be called under one lock.
   void show(const std::string& text);
 
+  // What came of a load: whether the file could be read, and else why not; also what it lacks to be a setup.
+  struct Loaded {
+    bool isRead = false;
+    std::string fault = {};
+  };
+
   // Reads a setup into the model: what it lacks keeps its value, but where another setup was read before, the
-  // default. True unless the file can't be read. A syntax error is shown. Then the model is checked, so that
-  // the areas have their grids.
-  bool load(const std::string& fileName);
-  // Whether the file was written. Throws what a save of the model throws.
-  bool write(const std::string& fileName);
+  // default. A syntax error is shown. Then the model is checked, so that the areas have their grids.
+  Loaded load(const std::string& fileName);
+  // What validation finds, each in a line.
+  std::string errorTexts();
+  // Shows the texts, if any, and writes the file all the same; why it can't be written is shown too. Throws
+  // what a save of the model throws, and what a message box threw at the texts.
+  Outcome save(const std::string& fileName, const std::string& texts);
+  // Writes the file. Throws what a save of the model throws.
+  Outcome write(const std::string& fileName);
 
   // Names a file as a caller does: from the folder of the setup that was loaded, if one was.
   template <class FileName>

@@ -8,6 +8,7 @@ import os
 from typing import TYPE_CHECKING, Any, Callable, NamedTuple, Optional, Sequence, Union
 
 from . import _flow_model as _native
+from ._sections import file_name
 
 if TYPE_CHECKING:
     import numpy
@@ -97,11 +98,12 @@ def convert_raster(
     coarsen: every so many points. window: j0, k0, j1, k1, from 0, both ends counted, K from the south. force:
     replaces a file that is there.
     """
+    name = file_name(source, "convert_raster(source)")
     converted = _native.convert_raster(
-        os.fspath(source), os.fspath(target), land=land, item_type=None if item_type is None else str(item_type),
-        band=band, subdataset=subdataset, nodata_as=nodata_as, crs=crs, reproject=reproject, resample=resample, origin_x=origin_x, origin_y=origin_y,
-        coarsen=coarsen, window=window, force=force, progress=progress,
-        history=f"gridbay_setup.convert_raster({os.fspath(source)!r})",
+        name, file_name(target, "convert_raster(target)"), land=land, item_type=item_type, band=band,
+        subdataset=subdataset, nodata_as=nodata_as, crs=crs, reproject=reproject, resample=resample, origin_x=origin_x,
+        origin_y=origin_y, coarsen=coarsen, window=window, force=force, progress=progress,
+        history=f"gridbay_setup.convert_raster({name!r})",
     )  # fmt: skip
     return ConvertedRaster(**converted)
 
@@ -120,16 +122,13 @@ def convert_series(
     """Makes a time series (*.tsb0) from lines of a time and values, between commas, semicolons, tabs or blanks.
 
     item_type: one for all columns or a list with one for each: code, name or beginning of a name. start: the moment
-    of time 0. time_unit: s, min, h or d. skip_lines: heading lines, of which the last names the columns. force:
+    of time 0, in whole seconds and no time zone. time_unit: s, min, h or d. skip_lines: heading lines, of which the last names the columns. force:
     replaces a file that is there.
     """
-    one = isinstance(item_type, (str, int))
-    types = [item_type] if one else list(item_type)  # type: ignore[arg-type]
+    name = file_name(source, "convert_series(source)")
     converted = _native.convert_series(
-        os.fspath(source), os.fspath(target), item_types=[str(each) for each in types],
-        start=f"{start:%Y-%m-%d %H:%M:%S}" if isinstance(start, datetime.datetime) else str(start),
-        time_unit=time_unit, skip_lines=skip_lines, force=force, progress=progress,
-        history=f"gridbay_setup.convert_series({os.fspath(source)!r})",
+        name, file_name(target, "convert_series(target)"), item_type=item_type, start=start, time_unit=time_unit,
+        skip_lines=skip_lines, force=force, progress=progress, history=f"gridbay_setup.convert_series({name!r})",
     )  # fmt: skip
     return ConvertedSeries(**converted)
 
@@ -144,9 +143,9 @@ class DataFile:
     """
 
     def __init__(self, path: PathLike) -> None:
-        self._file = _native.DataFile.open(os.fspath(path))
+        self.path = file_name(path, "open_data(path)")
+        self._file = _native.open_data(self.path)
         held: dict[str, Any] = self._file.definition()
-        self.path = os.fspath(path)
         self.title: str = held["title"]
         self.history: str = held["history"]
         self.items = [Item(*each) for each in held["items"]]
@@ -192,7 +191,7 @@ class NewGrid:
 
     def save(self, path: PathLike, *, title: str = "", force: bool = False) -> None:
         """Writes the map, whole or not at all. force: replaces a file that is there."""
-        name = os.fspath(path)
+        name = file_name(path, "NewGrid.save(path)")
         self._grid.save(name, title or os.path.splitext(os.path.basename(name))[0], "gridbay_setup.new_grid", force)
 
 
@@ -220,8 +219,8 @@ def new_grid(
     clockwise from the projection's north. steps, time_step (s): of a map in time.
     """
     return NewGrid(
-        _native.NewGrid(
-            points=points, spacing=spacing, first=first, item_type=str(item_type), land=land, projection=projection,
+        _native.new_grid(
+            points=points, spacing=spacing, first=first, item_type=item_type, land=land, projection=projection,
             rotation=rotation, steps=steps, time_step=time_step,
         )
     )  # fmt: skip

@@ -147,6 +147,15 @@ def _checked(path: object) -> str:
     return path
 
 
+def file_name(given: object, path: str) -> str:
+    """The name of a file; path says what it is for, as "open(path)"."""
+    name = os.fspath(given) if isinstance(given, (str, os.PathLike)) else None
+    if isinstance(name, str):
+        return name
+    allowed = "the name of a file (str or a path)"
+    raise WrongType(f"{path}: {given!r} ({type(given).__name__}) was given; allowed is {allowed}", path, repr(given), allowed)
+
+
 class Field:
     """What an attribute of a section stands for, by its name in the file."""
 

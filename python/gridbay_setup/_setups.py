@@ -6,11 +6,13 @@ import dataclasses
 import datetime
 import enum
 import os
+from collections.abc import Iterable
 from types import ModuleType
-from typing import Any, Iterable, Optional, Union
+from typing import Any, Optional, Union
 
 from . import _flow_model, _wetland_sweep_kit
-from .errors import WrongValue
+from ._sections import file_name
+from .errors import WrongType, WrongValue
 from .model import Model
 
 _EDITIONS: dict[str, ModuleType] = {
@@ -75,7 +77,7 @@ class Setup(Model):
     def save(self, path: Optional[PathLike] = None) -> None:
         """Writes the setup, to the file that it has or to another one, which it has from then on. A file that is
         there is replaced, whole or not at all."""
-        target = os.fspath(path) if path is not None else self.file
+        target = file_name(path, "save(path)") if path is not None else self.file
         if not target:
             raise WrongValue("save: no path was given, and the setup has no file yet; allowed is the path of a "
                              f"file *.{self.kind}", "path", "None", f"*.{self.kind}")  # fmt: skip
@@ -103,16 +105,16 @@ def _kind_of(path: str) -> str:
 
 
 def _edition_of(kind: str, given: str) -> ModuleType:
-    if kind not in _EDITIONS:
+    if not isinstance(kind, str) or kind not in _EDITIONS:
         allowed = " or ".join(f"*.{each}" for each in _EDITIONS)
-        raise WrongValue(f"{given}: allowed is {allowed}", given, given, allowed)
+        raise WrongValue(f"{given}: {kind!r} was given; allowed is {allowed}", str(given), repr(kind), allowed)
     return _EDITIONS[kind]
 
 
 def open(path: PathLike) -> Setup:
     """Reads a setup; the extension tells the edition."""
-    name = os.fspath(path)
-    return Setup(_edition_of(_kind_of(name), name).Document.open(name), "")
+    name = file_name(path, "open(path)")
+    return Setup(_edition_of(_kind_of(name), name).open(name), "")
 
 
 def new(
@@ -130,6 +132,9 @@ def new(
     start: of the simulation; time_step: s; time_steps: how many.
     """
     setup = Setup(_edition_of(kind, kind).Document(), "")
+    if isinstance(areas, (str, os.PathLike)) or not isinstance(areas, Iterable):
+        raise WrongType(f"new(areas): {areas!r} ({type(areas).__name__}) was given; allowed is a list of grids",
+                        "new(areas)", repr(areas), "a list of grids")  # fmt: skip
     given: list[Any] = list(areas)
     bathymetry = setup.nested_model_globals.bathymetry_selection
     if given:
@@ -140,7 +145,7 @@ def new(
             raise WrongValue(f"areas: area {number} lies in another; allowed is ({file!r}, (J, K))", "areas",
                              repr(area), "(file, (J, K))")  # fmt: skip
         target = bathymetry.areas[number]
-        target.data_file.file_name = os.path.abspath(os.fspath(file))
+        target.data_file.file_name = os.path.abspath(file_name(file, f"new(areas), area {number}"))
         if where:
             target.origin = where[0]
         if number > 1:

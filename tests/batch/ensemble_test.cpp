@@ -345,6 +345,30 @@ TEST(CheckSetups, ReportsEachFileInItsPlace) {
   }
 }
 
+// There is no memory for the first one, whose look at its data files is to serve the others.
+TEST(CheckSetups, ABrokenFirstFileDoesNotBringDownTheBatch) {
+  if (test::textOf("/proc/sys/vm/overcommit_memory").starts_with("1"))
+    GTEST_SKIP() << "memory is promised without end";
+  const test::TemporaryFolder folder;
+  SetupFile setup(nullptr);
+  std::vector<std::string> files{folder.write("broken" + kKind, "VANE27_NESTED_MODEL {")};
+  fs::resize_file(files[0], std::uintmax_t{8} << 40);
+  for (const char* name : {"one", "two"}) {
+    files.push_back(folder.file(name + kKind));
+    ASSERT_TRUE(setup.save(files.back()));
+  }
+  std::size_t reached = 0;
+  const auto count = [&reached](std::size_t done) { reached = done; };
+  const Result<std::vector<MemberReport>> reports = checkSetups(files, {.reached = count});
+  ASSERT_TRUE(reports) << reports.error();
+  EXPECT_EQ(reached, 3U);
+  EXPECT_EQ((*reports)[0].error, "\"" + files[0] + "\" was not checked");
+  for (const std::size_t i : {1U, 2U}) {
+    EXPECT_EQ((*reports)[i].error, "");
+    EXPECT_EQ((*reports)[i].faults, 1U);
+  }
+}
+
 TEST(MemberReport, ComesThroughAsItIs) {
   MemberReport report;
   report.error = "why\n";

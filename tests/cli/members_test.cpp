@@ -9,6 +9,7 @@
 #include <chrono>
 #include <cstdio>
 #include <filesystem>
+#include <sstream>
 #include <thread>
 
 #include "core/edition.h"
@@ -213,8 +214,56 @@ TEST_F(Members, ARunThatIsStoppedEndsItsEngines) {
   EXPECT_EQ(tool.endWith(SIGINT), 2);
   const ProgramRun status = runTool({"run", "--status", out + "/run-1"});
   EXPECT_THAT(status.out, HasSubstr(files[0] + " failed: status 9"));
-  EXPECT_THAT(status.out, HasSubstr(" 0 running, "));
-  if (coreCount() < files.size()) EXPECT_THAT(status.out, ::testing::Not(HasSubstr(" 0 waiting")));
+  EXPECT_THAT(status.out, HasSubstr(" 0 done, 8 failed, 0 running, 0 waiting\n"));
+  if (coreCount() < files.size())
+    EXPECT_THAT(status.out, HasSubstr(files[7] + " failed: stopped with its run before it began\n"));
+}
+
+// Nobody tells any more how the engines of a killed tool end.
+TEST_F(Members, ARunWhoseToolIsKilledIsStopped) {
+  const std::vector<std::string> files = make({"a", "b", "c", "d", "e", "f", "g", "h"});
+  const std::size_t begun = std::min(coreCount(), files.size());
+  const std::string program =
+      engine("echo $$ >\"$1.new\" && mv \"$1.new\" \"$1.pid\"; while :; do sleep 0.05; done");
+  std::vector<std::string> words{"run", "--engine", program};
+  words.insert(words.end(), files.begin(), files.end());
+  Started tool(words);
+  const auto status = [&] { return runTool({"run", "--status", out + "/run-1"}); };
+  const auto counted = [&](std::size_t failed, std::size_t running, std::size_t waiting) {
+    return "8 setups: 0 done, " + std::to_string(failed) + " failed, " + std::to_string(running) +
+           " running, " + std::to_string(waiting) + " waiting\n";
+  };
+  waitFor([&] { return status().out.find(" " + std::to_string(begun) + " running") != std::string::npos; });
+  EXPECT_EQ(status().out, counted(0, begun, 8 - begun));
+  waitFor([&] { return fs::exists(files[begun - 1] + ".pid"); });
+  EXPECT_EQ(tool.endWith(SIGKILL), 128 + SIGKILL);
+  // Those that it has started are at work still.
+  EXPECT_THAT(status().out, StartsWith(counted(8 - begun, begun, 0)));
+  for (std::size_t i = 0; i < begun; ++i) {
+    waitFor([&] { return fs::exists(files[i] + ".pid"); });
+    ASSERT_EQ(::kill(std::stoi(textOf(files[i] + ".pid")), SIGKILL), 0);
+  }
+  std::string expected = counted(8, 0, 0);
+  for (std::size_t i = 0; i < files.size(); ++i)
+    expected += files[i] + " failed: stopped with its run" + (i < begun ? "" : " before it began") + "\n";
+  waitFor([&] { return status().out == expected; });
+  EXPECT_EQ(status().out, expected);
+  EXPECT_EQ(status().status, 1);
+
+  // A process with the number of one that has ended is another one; what is elsewhere can't be told.
+  const std::string file = out + "/run-1/1.status";
+  std::istringstream line(textOf(file));
+  std::string word, process, start, machineStart, machine;
+  line >> word >> process >> start >> machineStart >> machine;
+  EXPECT_EQ(word, "running");
+  const std::string own = std::to_string(::getpid());
+  for (const auto& [mark, running] : {std::pair(own + " " + start + " " + machineStart + " " + machine, 0),
+                                      {process + " " + start + " other " + machine, 0},
+                                      {process + " " + start + " " + machineStart + " elsewhere", 1},
+                                      {std::string(), 1}}) {
+    folder.write("out/run-1/1.status", "running " + mark + "\n");
+    EXPECT_THAT(status().out, HasSubstr(" " + std::to_string(running) + " running, 0 waiting\n")) << mark;
+  }
 }
 
 TEST_F(Members, ARunThatIsNone) {

@@ -394,6 +394,30 @@ TEST_F(DefinitionFile, ACopyHasTheSameModel) {
   EXPECT_TRUE(other.root.wqsModelDefinition->SameState(*root.wqsModelDefinition));
 }
 
+// The exact state tells every word of a model, in whichever declaration.
+TEST_F(DefinitionFile, ReadingsAreTheSameWhereTheyDeclareTheSame) {
+  const auto text = [](std::string_view variable, std::string_view process) {
+    return fmt::format(
+        "BIO_RIG_SETUP {{ STATE_VARIABLES {{ STATE_VARIABLE_1 {{ SYMBOL \"A\"; {} }} }}\n"
+        "PROCESSES {{ PROCESS_1 {{ SYMBOL \"P\"; OUTPUT \"YES\"; {} }} }} }}\n",
+        variable, process);
+  };
+  const std::string plain = text("TRANSPORT \"AD\"", "DESCRIPTION \"d\"");
+  choose(plain);
+  CGlobalKvs first;
+  first.AssignState(root);
+  const ModelDefinition* const held = &root.wqsModelDefinition->definition();
+  choose(plain);
+  EXPECT_NE(&root.wqsModelDefinition->definition(), held);
+  EXPECT_TRUE(root.wqsModelDefinition->SameState(*first.wqsModelDefinition));
+  for (const std::string& other :
+       {text("TRANSPORT \"NONE\"", "DESCRIPTION \"d\""), text("TRANSPORT \"AD\"", "DESCRIPTION \"e\""),
+        text("TRANSPORT \"AD\"; DEFAULT_VALUE 2", "DESCRIPTION \"d\""), std::string("A {")}) {
+    choose(other);
+    EXPECT_FALSE(root.wqsModelDefinition->SameState(*first.wqsModelDefinition)) << other;
+  }
+}
+
 TEST_F(DefinitionFile, TemplatesByTheirDescriptionsOrNames) {
   folder.write("b.biorig", "BIO_RIG_SETUP { DESCRIPTION \"Plankton\" }");
   folder.write("a.BIORIG", "BIO_RIG_SETUP { }");

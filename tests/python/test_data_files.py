@@ -7,7 +7,7 @@ import numpy
 import pytest
 
 import gridbay_setup
-from gridbay_setup import FileError, RangeError, Stopped, WrongValue
+from gridbay_setup import FileError, RangeError, Stopped, WrongType, WrongValue
 
 START = datetime.datetime(2020, 1, 1)
 
@@ -46,13 +46,13 @@ def test_options_of_a_raster(raster, tmp_path):
 @pytest.mark.parametrize("options, what", [
     ({}, "land=VALUE"),
     ({"land": -1}, "land cannot be -1"),
-    ({"land": float("nan")}, "land cannot be nan"),
+    ({"land": float("nan")}, r"convert_raster\(land\): nan .*a finite number"),
     ({"land": 7, "band": 2}, "has no band 2"),
     ({"land": 7, "band": 0}, "bands count from 1"),
     ({"land": 7, "subdataset": 2}, "leave subdataset out"),
     ({"land": 7, "subdataset": -1}, "subdataset cannot be -1"),
     ({"land": 7, "coarsen": 0}, "coarsen cannot be 0"),
-    ({"land": 7, "origin_x": float("inf")}, "origin_x cannot be inf"),
+    ({"land": 7, "origin_x": float("inf")}, r"convert_raster\(origin_x\): inf .*a finite number"),
     ({"land": 7, "window": (0, 0, 9, 9)}, "does not lie in the raster"),
     ({"item_type": "Mannig number"}, "item_types"),
     ({"item_type": "Manning number"}, "nodata_as"),
@@ -73,8 +73,6 @@ def test_files_in_the_way(raster, tmp_path):
     gridbay_setup.convert_raster(raster, target, land=7, force=True)
     with pytest.raises(FileError, match="gone.asc"):
         gridbay_setup.convert_raster(tmp_path / "gone.asc", tmp_path / "g.tsb2", land=7)
-    with pytest.raises(TypeError):
-        gridbay_setup.convert_raster(raster, tmp_path / "g.tsb2", land="high")
 
 
 def test_work_can_be_stopped(raster, tmp_path):
@@ -180,3 +178,57 @@ def test_data_files_that_cannot_be_read(grid, tmp_path):
     for step in (-1, 1):
         with pytest.raises(RangeError, match=f"time step {step} was given; allowed is 0 to 0"):
             data.read(1, step)
+
+
+AWARE = datetime.datetime(2020, 1, 1, tzinfo=datetime.timezone.utc)
+RASTER = {"source": "r.asc", "target": "r.tsb2", "land": 7}
+SERIES = {"source": "r.csv", "target": "r.tsb0", "item_type": 999, "start": START}
+GRID = {"points": (3, 2), "spacing": (1, 1), "land": 1}
+
+
+@pytest.mark.parametrize("function, good, argument, value, error, allowed", [
+    ("convert_raster", RASTER, "source", 3, WrongType, "the name of a file"),
+    ("convert_raster", RASTER, "target", b"r.tsb2", WrongType, "the name of a file"),
+    ("convert_raster", RASTER, "target", "r\0.tsb2", WrongValue, "a text without zero bytes"),
+    ("convert_raster", RASTER, "land", "high", WrongType, "a number"),
+    ("convert_raster", RASTER, "item_type", 3.5, WrongType, "the code or name of an item type"),
+    ("convert_raster", RASTER, "band", 1.0, WrongType, "a whole number of 32 bits"),
+    ("convert_raster", RASTER, "coarsen", 2**40, WrongValue, "a whole number of 32 bits"),
+    ("convert_raster", RASTER, "crs", None, WrongType, "a text"),
+    ("convert_raster", RASTER, "window", (1, 2, 3), WrongValue, "4 values, as a tuple"),
+    ("convert_raster", RASTER, "window", "0123", WrongType, "a list"),
+    ("convert_raster", RASTER, "force", "yes", WrongType, "True or False"),
+    ("convert_raster", RASTER, "progress", 3, WrongType, "a function of two numbers, or None"),
+    ("convert_series", SERIES, "item_type", [999, None], WrongType, "the code or name of an item type"),
+    ("convert_series", SERIES, "start", None, WrongType, "a datetime of whole seconds without a time zone"),
+    ("convert_series", SERIES, "start", AWARE, WrongValue, "a datetime of whole seconds without a time zone"),
+    ("convert_series", SERIES, "start", START.replace(microsecond=1), WrongValue, "a datetime of whole seconds"),
+    ("convert_series", SERIES, "skip_lines", True, WrongType, "a whole number of 32 bits"),
+    ("new_grid", GRID, "points", (3, 2, 1), WrongValue, "2 values, as a tuple"),
+    ("new_grid", GRID, "points", (3, 2.5), WrongType, "a whole number of 32 bits"),
+    ("new_grid", GRID, "item_type", None, WrongType, "the code or name of an item type"),
+    ("new_grid", GRID, "spacing", 1, WrongType, "a list"),
+])  # fmt: skip
+def test_arguments_that_cannot_be(function, good, argument, value, error, allowed):
+    with pytest.raises(error) as caught:
+        getattr(gridbay_setup, function)(**{**good, argument: value})
+    fault = caught.value
+    assert fault.path == f"{function}({argument})" and allowed in fault.allowed and fault.given
+    assert all(part in str(fault) for part in (fault.path, fault.given, fault.allowed))
+
+
+def test_names_of_files_of_any_bytes(raster, tmp_path):
+    name = (tmp_path / "r").as_posix() + "\udcff"
+    gridbay_setup.convert_raster(raster, name + ".tsb2", land=7)
+    assert gridbay_setup.open_data(name + ".tsb2").read().shape == (2, 3)
+    gridbay_setup.new().save(name + ".v27")
+    setup = gridbay_setup.open(name + ".v27")
+    assert setup.file == name + ".v27"
+    with pytest.raises(FileError, match="gone"):
+        gridbay_setup.open(tmp_path / "gone\udcff.v27")
+    with pytest.raises(WrongType, match=r"open_data\(path\): 3 "):
+        gridbay_setup.open_data(3)
+    with pytest.raises(WrongType, match=r"DataFile.read\(step\): 1.5 "):
+        gridbay_setup.open_data(name + ".tsb2").read(1, 1.5)
+    with pytest.raises(WrongType, match=r"NewGrid.save\(path\): None "):
+        gridbay_setup.new_grid(points=(3, 2), spacing=(1, 1), land=1).save(None)

@@ -203,8 +203,11 @@ def test_files_that_are_no_setups(tmp_path, kind):
             gridbay_setup.open(name)
     with pytest.raises(WrongValue):
         gridbay_setup.new("v28")
-    with pytest.raises(TypeError):
+    with pytest.raises(WrongType, match=r"open\(path\): 3 "):
         gridbay_setup.open(3)
+    for areas in (3, "grid.tsb2", [3]):
+        with pytest.raises(WrongType, match=r"new\(areas\)"):
+            gridbay_setup.new(areas=areas)
 
 
 def test_copies_and_options(setup, tmp_path):
