@@ -1,4 +1,7 @@
 #include <array>
+#include <map>
+#include <string>
+#include <vector>
 
 #include "cli/commands.h"
 #include "cli/console_conversion.h"
@@ -9,13 +12,26 @@ namespace {
 
 struct Options {
   RasterConversion conversion;
-  std::vector<int> window;  // of four numbers, or none
+  std::vector<int> window;     // of four numbers, or none
+  std::vector<double> extent;  // likewise
+  std::string resampling = "bilinear";
+  std::string gridding;  // empty for none
 };
+
+const std::map<std::string, Resampling> kResamplings{
+    {"bilinear", Resampling::bilinear}, {"nearest", Resampling::nearest}, {"cubic", Resampling::cubic},
+    {"mean", Resampling::mean},         {"least", Resampling::least},     {"greatest", Resampling::greatest}};
+const std::map<std::string, Gridding> kGriddings{
+    {"linear", Gridding::linear}, {"nearest", Gridding::nearest}, {"idw", Gridding::inverseDistance}};
 
 int doConvert(const Options& options, const Console& console) {
   RasterConversion conversion = options.conversion;
   if (!options.window.empty())
     conversion.window = {options.window[0], options.window[1], options.window[2], options.window[3]};
+  if (!options.extent.empty())
+    conversion.extent = {options.extent[0], options.extent[1], options.extent[2], options.extent[3]};
+  conversion.resampling = kResamplings.at(options.resampling);
+  if (!options.gridding.empty()) conversion.gridding = kGriddings.at(options.gridding);
   return convertWith(convertRaster, std::move(conversion), console);
 }
 
@@ -28,7 +44,8 @@ void addConvertRaster(CLI::App& convert, Action& action) {
   RasterConversion* options = &given->conversion;
   command
       .add_option("IN", options->in,
-                  "The raster: a file, or a name of the raster library (NETCDF:file:variable)")
+                  "The raster: a file, or a name of the raster library (NETCDF:file:variable); or a text of "
+                  "points, x y z on each line")
       ->required();
   command.add_option("OUT", options->out, "The map to write (*.tsb2), rows turned so that K runs north")
       ->required();
@@ -56,8 +73,22 @@ void addConvertRaster(CLI::App& convert, Action& action) {
                      "The projection to bring the raster to, in metres, as EPSG:28356 or UTM-32");
   command
       .add_option("--resample", options->resample,
-                  "The spacing to bring the raster to (m): interpolated, or means of what the points cover")
+                  "The spacing to bring the raster to (m); a text of points needs one")
       ->check(CLI::PositiveNumber & finite());
+  command
+      .add_option(
+          "--resampling", given->resampling,
+          "How values of other points come from those of the raster; bilinear becomes means where points "
+          "lie wider")
+      ->check(CLI::IsMember(kResamplings))
+      ->capture_default_str();
+  command
+      .add_option(
+          "--gridding", given->gridding,
+          "IN is a text of points, which become a grid in this way: between the three around each point, "
+          "as the nearest one, or as means of near ones by the inverse square of their distance (default "
+          "for what is no raster: linear)")
+      ->check(CLI::IsMember(kGriddings));
   command
       .add_option("--origin-x", options->originX,
                   "Easting of the first point written (m; default: as the raster lies)")
@@ -74,6 +105,13 @@ void addConvertRaster(CLI::App& convert, Action& action) {
           "--window", given->window,
           "j0,k0,j1,k1: only these points, both ends counted, from 0, K from the south (default: all)")
       ->delimiter(',')
+      ->expected(4);
+  command
+      .add_option(
+          "--extent", given->extent,
+          "w,s,e,n: only points between these eastings and northings, in the projection of the map (m)")
+      ->delimiter(',')
+      ->check(finite())
       ->expected(4);
   addForce(command, options->force);
 }

@@ -101,15 +101,29 @@ class GdalRaster final : public Raster {
       *error = CPLGetLastErrorMsg();
       return false;
     }
-    if (scale_ == 1 && offset_ == 0) return true;
-    for (float& value : values) {
-      if (!missing_ || value != static_cast<float>(*missing_))
-        value = static_cast<float>(value * scale_ + offset_);
+    scale(values);
+    return true;
+  }
+  bool readWhole(int columnCount, int rowCount, std::span<float> values, std::string* error) override {
+    CPLErrorReset();
+    if (GDALRasterIO(band_, GF_Read, 0, 0, columns(), rows(), values.data(), columnCount, rowCount,
+                     GDT_Float32, 0, 0) != CE_None) {
+      *error = CPLGetLastErrorMsg();
+      return false;
     }
+    scale(values);
     return true;
   }
 
  private:
+  void scale(std::span<float> values) const {
+    if (scale_ == 1 && offset_ == 0) return;
+    for (float& value : values) {
+      if (!missing_ || value != static_cast<float>(*missing_))
+        value = static_cast<float>(value * scale_ + offset_);
+    }
+  }
+
   Dataset source_;  // that a data set worked out from it reads, up to its own end; else null
   Dataset dataset_;
   std::vector<std::string> subdatasets_;
@@ -187,8 +201,7 @@ class Warp {
     if (way == nullptr) return failed(error);
     GDALSetGenImgProjTransformerDstGeoTransform(way, transform);
     const std::unique_ptr<GDALWarpOptions, FreeWarpOptions> options(optionsFor(source));
-    // Interpolation from the nearest four points; where the new points lie wider, means of what they cover.
-    options->eResampleAlg = GRA_Bilinear;
+    options->eResampleAlg = algorithmOf(target.resampling);
     options->hSrcDS = source;
     options->pfnTransformer = GDALGenImgProjTransform;
     options->pTransformerArg = way;  // which the new data set owns
@@ -214,6 +227,25 @@ class Warp {
     *error = CPLGetLastErrorMsg();
     if (error->empty()) *error = "it can't be brought to that grid";
     return nullptr;
+  }
+  // Interpolation becomes means where the new points lie wider; other ways to values of all that they cover
+  // become interpolation where they lie closer.
+  static GDALResampleAlg algorithmOf(Resampling resampling) {
+    switch (resampling) {
+      case Resampling::nearest:
+        return GRA_NearestNeighbour;
+      case Resampling::cubic:
+        return GRA_Cubic;
+      case Resampling::mean:
+        return GRA_Average;
+      case Resampling::least:
+        return GRA_Min;
+      case Resampling::greatest:
+        return GRA_Max;
+      case Resampling::bilinear:
+        break;
+    }
+    return GRA_Bilinear;
   }
   static std::string projectionOf(GDALDatasetH source) {
     const char* text = GDALGetProjectionRef(source);
@@ -273,8 +305,55 @@ class Warp {
   }
 };
 
+// The chosen band of a raster in memory, with land as missing values from a value on; null with the reason.
+Dataset inMemory(Raster& raster, const std::optional<float>& land, std::string* error) {
+  constexpr float kMissing = -1e35F;
+  GDALAllRegister();
+  CPLSetErrorHandler(CPLQuietErrorHandler);
+  const int columns = raster.columns();
+  Dataset memory(GDALCreate(GDALGetDriverByName("MEM"), "", columns, raster.rows(), 1, GDT_Float32, nullptr));
+  if (!memory) {
+    *error = CPLGetLastErrorMsg();
+    return nullptr;
+  }
+  const RasterPlace at = raster.place();
+  double transform[6] = {
+      at.first[0] - at.nextColumn[0] / 2 - at.nextRow[0] / 2, at.nextColumn[0], at.nextRow[0],
+      at.first[1] - at.nextColumn[1] / 2 - at.nextRow[1] / 2, at.nextColumn[1], at.nextRow[1]};
+  GDALSetGeoTransform(memory.get(), transform);
+  GDALSetProjection(memory.get(), raster.projection().c_str());
+  const GDALRasterBandH band = GDALGetRasterBand(memory.get(), 1);
+  GDALSetRasterNoDataValue(band, kMissing);
+  const std::optional<double> missing = raster.missingValue();
+  std::vector<float> row(static_cast<std::size_t>(columns));
+  for (int number = 0; number < raster.rows(); ++number) {
+    if (!raster.read(number, row, error)) return nullptr;
+    for (float& value : row) {
+      const bool isMissing = !std::isfinite(value) || (missing && value == static_cast<float>(*missing));
+      if (isMissing || (land && value >= *land)) value = kMissing;
+    }
+    if (GDALRasterIO(band, GF_Write, 0, number, columns, 1, row.data(), columns, 1, GDT_Float32, 0, 0) !=
+        CE_None) {
+      *error = CPLGetLastErrorMsg();
+      return nullptr;
+    }
+  }
+  return memory;
+}
+
 }  // namespace
 }  // namespace gridbay
+
+extern "C" gridbay::Raster* gridbayWarpRaster(gridbay::Raster* raster, const gridbay::WarpTarget* target,
+                                              std::string* error) {
+  gridbay::Dataset memory = gridbay::inMemory(*raster, target->land, error);
+  if (!memory) return nullptr;
+  gridbay::Dataset warped = gridbay::Warp::of(memory.get(), *target, error);
+  if (!warped) return nullptr;
+  return std::make_unique<gridbay::GdalRaster>(std::move(warped), std::vector<std::string>(),
+                                               std::move(memory))
+      .release();
+}
 
 extern "C" gridbay::Raster* gridbayOpenRaster(const char* path, int subdataset, std::string* error) {
   gridbay::Opened file = gridbay::openFile(path, subdataset, error);

@@ -45,9 +45,15 @@ class Raster {
   // The projection's full text; empty when the file has none.
   virtual std::string projection() const = 0;
   virtual std::optional<double> missingValue() const = 0;
+  // From where on its values are land, where the file tells.
+  virtual std::optional<float> landValue() const { return {}; }
+  // How many points are best read at once.
+  virtual std::size_t pointsAtOnce() const { return std::size_t{1} << 20; }
   // Rows firstRow to firstRow + n - 1, n being what the span holds; false with the reason when they can't be
   // read.
   virtual bool read(int firstRow, std::span<float> values, std::string* error) = 0;
+  // All of it at fewer points, each the nearest one to its part of the raster.
+  virtual bool readWhole(int columnCount, int rowCount, std::span<float> values, std::string* error) = 0;
 };
 
 // The entry point of the raster module: a new raster that the caller owns, or null with the reason. With a
@@ -55,8 +61,11 @@ class Raster {
 inline constexpr const char* kOpenRaster = "gridbayOpenRaster";
 using OpenRaster = Raster* (*)(const char* path, int subdataset, std::string* error);
 
-// The grid that a raster is brought to: points between those of the raster are interpolated, wider ones are
-// means.
+// How values at other points come from those of a raster. All but the nearest one interpolate between closer
+// points; the least and the greatest are those of all that a wider point covers.
+enum class Resampling { bilinear, nearest, cubic, mean, least, greatest };
+
+// The grid that a raster is brought to.
 struct WarpTarget {
   std::string projection{};  // its full text; empty for the raster's own
   double spacing = 0;        // in its unit; 0 for one like the raster's
@@ -64,9 +73,34 @@ struct WarpTarget {
   int columns = 0;
   int rows = 0;
   std::string from{};  // the raster's own projection where it names none, or another one
+  Resampling resampling = Resampling::bilinear;
+  std::optional<float>
+      land{};  // values at or above it are taken for missing, so that none spreads to the sea
 };
 inline constexpr const char* kOpenWarped = "gridbayOpenWarped";
 using OpenWarped = Raster* (*)(const char* path, int subdataset, const WarpTarget* target,
                                std::string* error);
+// The same of the chosen band of a raster, which is read at once.
+inline constexpr const char* kWarpRaster = "gridbayWarpRaster";
+using WarpRaster = Raster* (*)(Raster* raster, const WarpTarget* target, std::string* error);
+
+// How a grid comes from points that lie anywhere: between the three around it, as the nearest one, or as the
+// mean of near ones by the inverse square of their distance. The first and the last leave out what has no
+// points around it, or near it.
+enum class Gridding { linear, nearest, inverseDistance };
+
+// Points that become a grid, northwards up, at whole multiples of its spacing.
+struct PointGrid {
+  std::vector<double> x;  // eastings or longitudes
+  std::vector<double> y;
+  std::vector<double> z;
+  std::string projection;  // its full text; empty for none
+  double spacing = 1;
+  double reach = 0;  // how far off a point counts, by distance
+  Gridding gridding = Gridding::linear;
+};
+// A raster that is worked out as it is read; it takes the points.
+inline constexpr const char* kGridPoints = "gridbayGridPoints";
+using GridPoints = Raster* (*)(PointGrid* points, std::string* error);
 
 }  // namespace gridbay

@@ -10,8 +10,7 @@
 #include "conversion/history.h"
 #include "conversion/item_types.h"
 #include "conversion/raster_layout.h"
-#include "conversion/raster_reader.h"
-#include "conversion/tsb_raster.h"
+#include "conversion/raster_source.h"
 #include "platform/cartography/cartography.h"
 #include "platform/cartography/grid_mapping.h"
 #include "platform/files/may_write.h"
@@ -20,8 +19,6 @@
 
 namespace gridbay {
 namespace {
-
-constexpr std::size_t kPointsAtOnce = 1 << 22;
 
 // What no raster could be converted with.
 Outcome check(const RasterConversion& options, const ConversionHost& host) {
@@ -38,6 +35,16 @@ Outcome check(const RasterConversion& options, const ConversionHost& host) {
   if (options.subdataset < 0) return refuse("subdataset", options.subdataset, "rasters count from 1");
   if (options.resample && !(*options.resample > 0 && std::isfinite(*options.resample)))
     return refuse("resample", *options.resample, "it is a number of metres above 0");
+  if (options.extent) {
+    const auto [west, south, east, north] = *options.extent;
+    // Also when one of them is no number.
+    if (!(west <= east && south <= north && std::isfinite(east - west + north - south)))
+      return refuse("extent", fmt::format("{:g},{:g},{:g},{:g}", west, south, east, north),
+                    "it is the least easting and northing, and then the greatest");
+    if (options.window)
+      return Failure{
+          fmt::format("{} and {} don't go together", host.option("window"), host.option("extent"))};
+  }
   if (options.coarsen < 1) return refuse("coarsen", options.coarsen, "it is at least 1");
   return {};
 }
@@ -51,94 +58,22 @@ struct Selection {
   int every;
 };
 
-// Texts with their numbers, a line each; of a long list the beginning.
-template <class TextOf>
-std::string numbered(int count, const TextOf& textOf) {
-  constexpr int kMost = 30;
-  std::string list;
-  for (int number = 1; number <= std::min(count, kMost); ++number)
-    list += fmt::format("\n  {}  {}", number, textOf(number));
-  if (count > kMost) list += fmt::format("\n  and {} more", count - kMost);
-  return list;
-}
-
-// Opens the raster and chooses what the options ask for; says what else there would be.
-Result<std::unique_ptr<Raster>> openRaster(const RasterConversion& options, ConversionHost& host) {
-  Result<std::unique_ptr<Raster>> opened = openAnyRaster(options.in, options.subdataset);
-  if (!opened) return opened;
-  const std::vector<std::string> others = (*opened)->subdatasets();
-  const int otherCount = static_cast<int>(others.size());
-  const std::string list =
-      numbered(otherCount, [&others](int number) { return others[static_cast<std::size_t>(number) - 1]; });
-  if (options.subdataset > otherCount) {
-    return Failure{
-        otherCount == 0
-            ? fmt::format("\"{}\" holds one raster only: leave {} out", options.in, host.option("subdataset"))
-            : fmt::format("\"{}\" has no raster {}. It holds{}", options.in, options.subdataset, list)};
-  }
-  if ((*opened)->bands() == 0) {
-    if (otherCount != 1)
-      return Failure{fmt::format("\"{}\" holds several rasters; choose one with {}:{}", options.in,
-                                 host.option("subdataset", "N"), list)};
-    opened = openAnyRaster(options.in, 1);
-    if (!opened) return opened;
-  } else if (options.subdataset == 0 && otherCount > 1) {
-    host.note(fmt::format("The file holds several rasters, of which {} takes another:{}",
-                          host.option("subdataset", "N"), list));
-  }
-  Raster& raster = **opened;
-  const auto bands = [&raster] {
-    return numbered(raster.bands(), [&raster](int band) { return raster.bandName(band); });
-  };
-  if (options.band && *options.band > raster.bands()) {
-    return Failure{
-        fmt::format("The raster has no band {}. It has {}:{}", *options.band, raster.bands(), bands())};
-  }
-  if (!options.band && raster.bands() > 1) {
-    host.note(fmt::format("The raster has {} bands, of which the first is taken; {} takes another:{}",
-                          raster.bands(), host.option("band", "N"), bands()));
-  }
-  raster.choose(options.band.value_or(1));
-  return opened;
-}
-
-// The full text of a projection in metres that a user names.
-Result<std::string> projectionInMetres(const std::string& text) {
-  const CVdMapProjection map(text);
-  if (!map.IsValid() || map.IsLocal())
-    return Failure{fmt::format("\"{}\" is no projection that is known here", text)};
-  if (const auto mapping = gridMappingOf(map.Wkt2()); mapping && mapping->name == kGeographicMapping)
-    return Failure{fmt::format("\"{}\" is in degrees: a grid wants a projection in metres", map.Name())};
-  return map.Wkt2();
-}
-
-// The raster brought to another projection or spacing, as the options ask.
-Result<std::unique_ptr<Raster>> warpedRaster(const RasterConversion& options, const Raster& raster,
-                                             const ConversionHost& host) {
-  if (isTsbRaster(options.in))
-    return Failure{fmt::format("{} and {} take rasters of other kinds; a map of our own takes {}",
-                               host.option("resample"), host.option("reproject"), host.option("coarsen"))};
-  WarpTarget target{.spacing = options.resample.value_or(0)};
-  if (!options.reproject.empty()) {
-    const Result<std::string> projection = projectionInMetres(options.reproject);
-    if (!projection) return Failure{projection.error()};
-    target.projection = *projection;
-  }
-  if (!options.crs.empty()) {
-    const CVdMapProjection own(options.crs);
-    if (!own.IsValid())
-      return Failure{fmt::format("\"{}\" is no projection that is known here", options.crs)};
-    target.from = own.Wkt2();
-  }
-  // A file that holds one raster only, inside of others, has that as its first.
-  const int subdataset = options.subdataset == 0 && raster.bands() == 0 ? 1 : options.subdataset;
-  Result<std::unique_ptr<Raster>> warped = openWarpedRaster(options.in, subdataset, target);
-  if (warped) (*warped)->choose(options.band.value_or(1));
-  return warped;
-}
-
-Result<Selection> select(const RasterConversion& options, const Raster& raster) {
+Result<Selection> select(const RasterConversion& options, const Raster& raster, const RasterLayout& layout) {
   Selection all{0, 0, raster.columns(), raster.rows(), options.coarsen};
+  if (options.extent) {
+    const auto [west, south, east, north] = *options.extent;
+    const auto [x, y] = layout.axesFirst();
+    const auto [j0, j1] = pointsBetween(west, east, x, layout.dx, raster.columns());
+    const auto [k0, k1] = pointsBetween(south, north, y, layout.dy, raster.rows());
+    if (j1 < j0 || k1 < k0) {
+      return Failure{
+          fmt::format("The extent {:.10g},{:.10g},{:.10g},{:.10g} holds no point of the raster, which "
+                      "goes from {:.10g},{:.10g} to {:.10g},{:.10g}",
+                      west, south, east, north, x, y, x + (raster.columns() - 1) * layout.dx,
+                      y + (raster.rows() - 1) * layout.dy)};
+    }
+    all = {j0, k0, j1 - j0 + 1, k1 - k0 + 1, options.coarsen};
+  }
   if (options.window) {
     const auto [j0, k0, j1, k1] = *options.window;
     if (j0 < 0 || k0 < 0 || j1 < j0 || k1 < k0 || j1 >= raster.columns() || k1 >= raster.rows()) {
@@ -215,7 +150,7 @@ Result<Target> define(const RasterConversion& options, const Raster& raster, con
 Result<std::size_t> copyValues(const RasterConversion& options, Raster& raster, const RasterLayout& layout,
                                const Selection& chosen, TsbWriter& writer, ConversionHost& host) {
   const auto columns = static_cast<std::size_t>(raster.columns());
-  const int rowsAtOnce = static_cast<int>(std::max<std::size_t>(kPointsAtOnce / columns, 1));
+  const int rowsAtOnce = static_cast<int>(std::max<std::size_t>(raster.pointsAtOnce() / columns, 1));
   const std::optional<float> missingAs = options.missingAs ? options.missingAs : options.land;
   const std::optional<double> missing = raster.missingValue();
   const auto isMissing = [&missing](float value) {
@@ -282,13 +217,9 @@ Result<ConvertedRaster> convertRaster(const RasterConversion& options, Conversio
   if (const Outcome free = mayWrite(options.out, options.force, {&options.in, 1}, host.option("force"));
       !free)
     return Failure{free.error()};
-  Result<std::unique_ptr<Raster>> opened = openRaster(options, host);
+  const Result<RasterSource> opened = openRasterSource(options, host);
   if (!opened) return Failure{opened.error()};
-  if (!options.reproject.empty() || options.resample) {
-    opened = warpedRaster(options, **opened, host);
-    if (!opened) return Failure{opened.error()};
-  }
-  Raster& raster = **opened;
+  Raster& raster = *opened->raster;
   if (const Outcome free =
           mayWrite(options.out, options.force, filesIn(raster.files()), host.option("force"));
       !free)
@@ -301,7 +232,7 @@ Result<ConvertedRaster> convertRaster(const RasterConversion& options, Conversio
   if (!raster.hasPlace()) host.note("The raster does not say where it lies: its points are taken 1 m apart");
   const Result<RasterLayout> layout = layoutOf(raster.place(), raster.columns(), raster.rows());
   if (!layout) return Failure{layout.error()};
-  const Result<Selection> chosen = select(options, raster);
+  const Result<Selection> chosen = select(options, raster, *layout);
   if (!chosen) return Failure{chosen.error()};
   const Result<Target> target = define(options, raster, *layout, *chosen, host);
   if (!target) return Failure{target.error()};

@@ -5,14 +5,15 @@
 #include <string>
 
 #include "conversion/conversion_host.h"
+#include "conversion/raster.h"
 #include "platform/result.h"
 
 namespace gridbay {
 
 // Which raster is to become which map, and how.
 struct RasterConversion {
-  std::string in;             // a file, or a name of the raster library (NETCDF:file:variable)
-  std::string out;            // the map (*.tsb2), rows turned so that K runs north
+  std::string in;   // a file of points or a raster, or a name of the raster library (NETCDF:file:variable)
+  std::string out;  // the map (*.tsb2), rows turned so that K runs north
   std::optional<float> land;  // points at or above it are land; a bathymetry needs it (unit of the values)
   std::optional<std::string> itemType;  // by code, name or beginning of one; else the file's, or Bathymetry
   std::optional<int> band;              // from 1; else the first
@@ -20,13 +21,18 @@ struct RasterConversion {
   std::optional<float> missingAs;       // stands for missing values (unit of the values); else the land value
   std::string crs;                      // as EPSG:28356, UTM-32 or a full text; empty for the raster's own
   std::string reproject;                // the projection to bring it to; empty for its own
-  std::optional<double> resample;       // the spacing to bring it to (m), else its own
-  std::optional<double> originX;        // easting and northing of the first point (m), else as it lies
+  std::optional<double> resample;       // the spacing to bring it to (m), else its own; points need one
+  Resampling resampling = Resampling::bilinear;
+  std::optional<Gridding> gridding;  // the file is one of points; else it is where it is no raster
+  std::optional<double> originX;     // easting and northing of the first point (m), else as it lies
   std::optional<double> originY;
   int coarsen = 1;                           // every so many points, at least 1
   std::optional<std::array<int, 4>> window;  // j0, k0, j1, k1, from 0, both ends counted, K from the south
-  bool force = false;                        // replaces a file that is there
-  std::string history;                       // how the map came about, a line of its history without the date
+  // Only points within: least easting and northing, greatest easting and northing, in the projection of the
+  // map; of a map that is turned along its own axes (m).
+  std::optional<std::array<double, 4>> extent;
+  bool force = false;   // replaces a file that is there
+  std::string history;  // how the map came about, a line of its history without the date
 };
 
 // The map that was written.

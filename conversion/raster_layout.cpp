@@ -26,6 +26,13 @@ double lengthOf(const Vector& vector) {
 
 }  // namespace
 
+std::array<int, 2> pointsBetween(double least, double greatest, double first, double spacing, int count) {
+  constexpr double kDigits = 1e-6;
+  const auto point = [count](double exact) { return static_cast<int>(std::clamp<double>(exact, -1, count)); };
+  return {std::max(point(std::ceil((least - first) / spacing - kDigits)), 0),
+          std::min(point(std::floor((greatest - first) / spacing + kDigits)), count - 1)};
+}
+
 Result<RasterLayout> layoutOf(const RasterPlace& place, int columns, int rows) {
   RasterLayout layout;
   layout.columns = columns;

@@ -42,4 +42,20 @@ Result<std::unique_ptr<Raster>> openWarpedRaster(const std::string& path, int su
   return taken(reinterpret_cast<OpenWarped>(*entry)(path.c_str(), subdataset, &target, &why), path, why);
 }
 
+Result<std::unique_ptr<Raster>> warpRaster(Raster& raster, const WarpTarget& target) {
+  const Result<void*> entry = rasterModuleEntry(kWarpRaster);
+  if (!entry) return Failure{entry.error()};
+  std::string why;
+  return taken(reinterpret_cast<WarpRaster>(*entry)(&raster, &target, &why), raster.files().front(), why);
+}
+
+Result<std::unique_ptr<Raster>> gridPoints(PointGrid points) {
+  const Result<void*> entry = rasterModuleEntry(kGridPoints);
+  if (!entry) return Failure{entry.error()};
+  std::string why;
+  Raster* grid = reinterpret_cast<GridPoints>(*entry)(&points, &why);
+  if (grid == nullptr) return Failure{fmt::format("The points can't be gridded: {}", why)};
+  return std::unique_ptr<Raster>(grid);
+}
+
 }  // namespace gridbay

@@ -16,6 +16,10 @@ Result<std::unique_ptr<Raster>> openAnyRaster(const std::string& path, int subda
 // of our own.
 Result<std::unique_ptr<Raster>> openWarpedRaster(const std::string& path, int subdataset,
                                                  const WarpTarget& target);
+// The same of the chosen band of a raster that is open, which may be a map of our own.
+Result<std::unique_ptr<Raster>> warpRaster(Raster& raster, const WarpTarget& target);
+// A grid of points that lie anywhere.
+Result<std::unique_ptr<Raster>> gridPoints(PointGrid points);
 
 // An entry point of the module through which the raster library is used, which stands beside the library that
 // this code is in, or else beside the program. It is loaded when it is first asked for.

@@ -5,6 +5,7 @@
 #include <cmath>
 #include <filesystem>
 #include <limits>
+#include <vector>
 
 #include "conversion/moments.h"
 #include "platform/cartography/cartography.h"
@@ -78,6 +79,30 @@ class TsbRaster final : public Raster {
     return definition().geography ? definition().geography->projection : std::string();
   }
   std::optional<double> missingValue() const override { return definition().items[item_ - 1].deleteValue; }
+
+  std::optional<float> landValue() const override {
+    constexpr std::size_t kPlace = 3;
+    for (const TsbCustomBlock& block : definition().customBlocks) {
+      if (block.name == "V27_Misc" && block.readable && block.values.size() > kPlace)
+        return block.values[kPlace];
+    }
+    return {};
+  }
+
+  bool readWhole(int columnCount, int rowCount, std::span<float> values, std::string* error) override {
+    std::vector<float> row(definition().axes[0].points);
+    const auto nearest = [](std::size_t part, int parts, std::size_t all) {
+      return (2 * part + 1) * all / (2 * static_cast<std::size_t>(parts));
+    };
+    const auto across = static_cast<std::size_t>(columnCount);
+    for (std::size_t k = 0; k < static_cast<std::size_t>(rowCount); ++k) {
+      if (!read(static_cast<int>(nearest(k, rowCount, definition().axes[1].points)), row, error))
+        return false;
+      for (std::size_t j = 0; j < across; ++j)
+        values[k * across + j] = row[nearest(j, columnCount, row.size())];
+    }
+    return true;
+  }
 
   bool read(int firstRow, std::span<float> values, std::string* error) override {
     const Outcome done = file_.readRows(item_, step_, static_cast<std::size_t>(firstRow), values);

@@ -10,6 +10,9 @@ namespace gridbay::shell {
 class HelpDock final : public QDockWidget {
   Q_OBJECT
  public:
+  // The topics of what is no page.
+  static constexpr int kImportTerrain = 100;
+
   explicit HelpDock(QWidget* parent);
 
   // False, with what was looked for and where, when there is none.

@@ -43,6 +43,9 @@ QMenu* MainWindow::buildFileMenu() {
   file->addAction(save_);
   file->addAction(saveAs_);
   file->addSeparator();
+  file->addAction(tr("Import &Terrain..."), QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_T), this,
+                  [this] { importTerrain(); });
+  file->addSeparator();
   file->addAction(tr("E&xit"), QKeySequence::Quit, this, &QWidget::close);
   return file;
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QMainWindow>
+#include <QPointer>
 #include <QStackedWidget>
 #include <QTabWidget>
 #include <QTimer>
@@ -14,6 +15,7 @@
 #include "shell/document_tab.h"
 #include "shell/editor_library.h"
 #include "shell/help_dock.h"
+#include "shell/import/terrain_import.h"
 #include "shell/map/map_dock.h"
 #include "shell/messages_dock.h"
 #include "shell/recovery.h"
@@ -41,6 +43,9 @@ class MainWindow final : public QMainWindow {
   // A setup or a data file, by its extension; any other file by the program that the desktop has for it.
   void openFile(const QString& path, int item = 0);
   bool saveDocument(const QString& path = {});
+  // Opens the dialog in which a map is made from terrain of any kind.
+  void importTerrain();
+  TerrainImport* terrainImport() { return terrainImport_; }
   // Offers the edits that a run which ended suddenly has left behind.
   void offerRecovery();
 
@@ -94,6 +99,8 @@ class MainWindow final : public QMainWindow {
   void showMessages(DocumentTab* tab);
   void startEngine(const EngineStart& start);
   void showHelp();
+  std::vector<TerrainImport::Use> bathymetryUses();
+  void useBathymetry(DocumentTab& tab, int area, const QString& map);
   void tell(const QString& text);
   void documentChanged(DocumentTab* tab);
   void writeRecoveryCopies();
@@ -130,6 +137,7 @@ class MainWindow final : public QMainWindow {
   QMenu* recentMenu_ = nullptr;
   QMenu* windowMenu_ = nullptr;
   UnitsMenu* units_ = nullptr;
+  QPointer<TerrainImport> terrainImport_;
   MessagesDock* messages_ = nullptr;
   RunDock* run_ = nullptr;
   HelpDock* help_ = nullptr;

@@ -187,9 +187,25 @@ TEST_F(ConvertRaster, ToAnotherSpacingAndProjection) {
               HasSubstr("in which projection"));
   EXPECT_THAT(refused({plain, out, "--land", "1", "--resample", "1e-5"}), HasSubstr("points 1e-05 apart"));
   EXPECT_THAT(refused({plain, out, "--land", "1", "--resample", "0"}), HasSubstr("--resample"));
-  test::writeGrid(folder.file("own.tsb2"));
-  EXPECT_THAT(refused({folder.file("own.tsb2"), out, "--land", "1", "--resample", "5"}),
-              HasSubstr("--coarsen"));
+  EXPECT_THAT(refused({plain, out, "--land", "1", "--resampling", "best"}), HasSubstr("--resampling"));
+  EXPECT_THAT(refused({plain, out, "--land", "1", "--extent", "1,2,3"}), HasSubstr("--extent"));
+  EXPECT_THAT(refused({plain, out, "--land", "1", "--extent", "1,2,0,4"}),
+              HasSubstr("--extent cannot be 1,2,0,4: it is the least easting"));
+  EXPECT_THAT(refused({plain, out, "--land", "1", "--gridding", "linear"}),
+              HasSubstr("line 2: a point has three numbers"));
+}
+
+TEST_F(ConvertRaster, PointsAndAnExtent) {
+  const std::string points = folder.write("p.xyz", "x;y;z\n0;0;1\n40;0;5\n0;33;1\n41,5;30;5,15\n20;20;3\n");
+  EXPECT_THAT(refused({points, out, "--land", "60"}), HasSubstr("--resample DX (they lie about 17 apart)"));
+  run = runTool({"convert", "raster", points, out, "--land", "60", "--resample", "10", "--gridding", "linear",
+                 "--extent", "10,10,30,20"});
+  ASSERT_EQ(run.status, 0) << run.err;
+  EXPECT_EQ(values(6), (std::vector<float>{2, 3, 4, 2, 3, 4}));
+  run = runTool({"convert", "raster", folder.write("r.asc", kRaster), out, "--land", "60", "--resample", "20",
+                 "--resampling", "greatest", "--force"});
+  ASSERT_EQ(run.status, 0) << run.err;
+  EXPECT_EQ(values(4), (std::vector<float>{5, 6, 9, 11}));
 }
 
 TEST_F(ConvertRaster, WhatIsThereIsReplacedOnlyWhenAsked) {

@@ -5,6 +5,7 @@
 #include <map>
 
 #include "platform/cartography/grid_mapping.h"
+#include "platform/projection_search.h"
 
 namespace gridbay {
 namespace platform_cartography_test {
@@ -96,6 +97,66 @@ TEST(GridMapping, ByTheConventions) {
   EXPECT_TRUE(numbers("EPSG:5070").contains("albers_conical_equal_area"));
   for (const char* text : {"", "nonsense", "EPSG:2056", "EPSG:4978"})
     EXPECT_FALSE(gridMappingOf(text)) << text;
+}
+
+TEST(ProjectionSearch, ByAllWordsInAnyCaseTheLikeliestFirst) {
+  struct Case {
+    const char* words;
+    const char* first;  // code and name
+  };
+  for (const Case& it : std::initializer_list<Case>{
+           {"utm 32", "EPSG:32632 WGS 84 / UTM zone 32N"},
+           {"wgs84 utm32n", "EPSG:32632 WGS 84 / UTM zone 32N"},
+           {"UTM-56S", "EPSG:32756 WGS 84 / UTM zone 56S"},
+           {"zone 56 mga", "EPSG:28356 GDA94 / MGA zone 56"},
+           {"28356", "EPSG:28356 GDA94 / MGA zone 56"},
+           {"epsg:28356", "EPSG:28356 GDA94 / MGA zone 56"},
+           {"british grid", "EPSG:27700 OSGB36 / British National Grid"},
+           {"gda2020 mga 56", "EPSG:7856 GDA2020 / MGA zone 56"},
+           {"lambert nsw gda", "EPSG:3308 GDA94 / NSW Lambert"},
+           {"4326", "EPSG:4326 WGS 84"},
+       }) {
+    const std::vector<KnownProjection> found = findProjections(it.words, 3);
+    ASSERT_FALSE(found.empty()) << it.words;
+    EXPECT_EQ(found.front().code + " " + found.front().name, it.first) << it.words;
+    EXPECT_FALSE(found.front().area.empty());
+    EXPECT_LE(found.size(), 3U);
+  }
+  for (const char* words : {"", "  ", " / ", "utm nowhere", "9999999"})
+    EXPECT_TRUE(findProjections(words, 3).empty()) << words;
+  EXPECT_TRUE(findProjections("utm", 0).empty());
+  // One that is withdrawn.
+  EXPECT_TRUE(findProjections("EPSG:2192", 3).empty());
+}
+
+TEST(ProjectionSearch, TheTextThatFilesHold) {
+  for (const char* code : {"EPSG:32632", "32632", "UTM-32", "UTM-32N", "WGS 84 / UTM zone 32N"}) {
+    const Result<std::string> text = projectionText(code);
+    ASSERT_TRUE(text) << code;
+    EXPECT_EQ(*text, "UTM-32") << code;
+  }
+  for (const char* code : {"EPSG:32756", "UTM-56S"})
+    EXPECT_THAT(*projectionText(code), StartsWith("PROJCS[\"WGS_1984_UTM_Zone_56S\""));
+  // Each leads to the same place as its code.
+  for (const char* code :
+       {"EPSG:28356", "EPSG:27700", "EPSG:2056", "EPSG:3857", "EPSG:28992", "EPSG:32661"}) {
+    const Result<std::string> text = projectionText(code);
+    ASSERT_TRUE(text) << code;
+    const CVdMapProjection byCode(code);
+    const CVdMapProjection byText(*text);
+    double there[2]{};
+    double again[2]{};
+    ASSERT_TRUE(byCode.Geo2Proj(8, 60, &there[0], &there[1])) << code;
+    ASSERT_TRUE(byText.Geo2Proj(8, 60, &again[0], &again[1])) << code;
+    EXPECT_NEAR(there[0], again[0], 1e-3) << code;
+    EXPECT_NEAR(there[1], again[1], 1e-3) << code;
+  }
+  EXPECT_EQ(*projectionText("Local Coordinates"), "Local Coordinates");
+  for (const char* code : {"EPSG:1", "1", "foo", "UTM-61", "PROJCS[", "WGS 84 / UTM zone"}) {
+    const Result<std::string> text = projectionText(code);
+    ASSERT_FALSE(text) << code;
+    EXPECT_EQ(text.error(), "\"" + std::string(code) + "\" is no projection that is known");
+  }
 }
 
 TEST(Cartography, OriginAndRotation) {

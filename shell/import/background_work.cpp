@@ -1,0 +1,39 @@
+#include "shell/import/background_work.h"
+
+#include <utility>
+
+namespace gridbay::shell {
+
+void BackgroundWork::begin(const WorkApart::Work& work) {
+  stop();
+  Result<WorkApart> begun = WorkApart::begin(work);
+  if (!begun) {
+    QMetaObject::invokeMethod(
+        this, [this] { emit ended(std::nullopt); }, Qt::QueuedConnection);
+    return;
+  }
+  work_ = std::make_unique<WorkApart>(std::move(*begun));
+  notifier_ = std::make_unique<QSocketNotifier>(work_->descriptor(), QSocketNotifier::Read);
+  connect(notifier_.get(), &QSocketNotifier::activated, this, &BackgroundWork::take);
+}
+
+void BackgroundWork::stop() {
+  notifier_.reset();
+  work_.reset();
+}
+
+void BackgroundWork::take() {
+  const bool goesOn = work_->take();
+  const double done = work_->done();
+  if (goesOn) {
+    emit progressed(done);
+    return;
+  }
+  // The notifier is at work, and goes later.
+  notifier_->setEnabled(false);
+  notifier_.release()->deleteLater();
+  const std::optional<std::string> text = std::exchange(work_, nullptr)->text();
+  emit ended(text);
+}
+
+}  // namespace gridbay::shell

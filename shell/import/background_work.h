@@ -1,0 +1,37 @@
+#pragma once
+
+#include <QObject>
+#include <QSocketNotifier>
+#include <memory>
+#include <optional>
+#include <string>
+
+#include "platform/work_apart.h"
+
+namespace gridbay::shell {
+
+// Long work beside the window, a piece at a time. A new piece takes the place of one that is not done.
+class BackgroundWork final : public QObject {
+  Q_OBJECT
+ public:
+  explicit BackgroundWork(QObject* parent) : QObject(parent) {}
+
+  void begin(const WorkApart::Work& work);
+  bool isRunning() const { return work_ != nullptr; }
+  // Stops the work and waits for its end; what it would have told is not told any more.
+  void stop();
+
+ signals:
+  // How much is done, 0 to 1.
+  void progressed(double done);
+  // What the work has handed back; nothing where it has ended by a crash, or could not be begun.
+  void ended(const std::optional<std::string>& text);
+
+ private:
+  void take();
+
+  std::unique_ptr<WorkApart> work_;
+  std::unique_ptr<QSocketNotifier> notifier_;
+};
+
+}  // namespace gridbay::shell

@@ -1,0 +1,101 @@
+#include "shell/import/terrain_packing.h"
+
+#include <cstring>
+#include <type_traits>
+
+namespace gridbay::shell {
+namespace {
+
+// Puts members into bytes, or fills them from there: both by one list of them.
+class Packing {
+ public:
+  Packing() = default;
+  explicit Packing(const std::string& bytes) : bytes_(bytes), reads_(true) {}
+
+  template <class... Members>
+  void operator()(Members&... members) {
+    (member(members), ...);
+  }
+  std::string& bytes() { return bytes_; }
+
+ private:
+  void raw(void* at, std::size_t size) {
+    if (!reads_) {
+      bytes_.append(static_cast<const char*>(at), size);
+    } else if (bytes_.size() - at_ >= size) {
+      std::memcpy(at, bytes_.data() + at_, size);
+      at_ += size;
+    }
+  }
+  template <class Member>
+  void member(Member& member) {
+    if constexpr (std::is_trivially_copyable_v<Member>) {
+      raw(&member, sizeof member);
+    } else {
+      std::size_t count = member.size();
+      raw(&count, sizeof count);
+      member.resize(count);
+      if constexpr (std::is_trivially_copyable_v<typename Member::value_type>) {
+        raw(member.data(), count * sizeof(typename Member::value_type));
+      } else {
+        for (auto& element : member) this->member(element);
+      }
+    }
+  }
+
+  std::string bytes_;
+  std::size_t at_ = 0;
+  bool reads_ = false;
+};
+
+void pass(Packing& pack, RasterPreview& each) {
+  pack(each.columns, each.rows, each.values, each.points, each.first, each.spacing, each.rotation,
+       each.hasPlace, each.isOfPoints, each.isOwnMap, each.unit, each.projection, each.projectionName,
+       each.itemType, each.valueUnit, each.landValue, each.middle, each.bands, each.rasters);
+}
+void pass(Packing& pack, std::string& text) {
+  pack(text);
+}
+
+template <class Value>
+std::string packedResult(Result<Value> result) {
+  Packing pack;
+  bool isMade = static_cast<bool>(result);
+  std::string error = isMade ? std::string() : result.error();
+  pack(isMade, error);
+  if (isMade) pass(pack, *result);
+  return std::move(pack.bytes());
+}
+
+template <class Value>
+Result<Value> unpackedResult(const std::string& bytes) {
+  Packing pack(bytes);
+  bool isMade = false;
+  std::string error;
+  pack(isMade, error);
+  if (!isMade) return Failure{error};
+  Value value;
+  pass(pack, value);
+  return value;
+}
+
+}  // namespace
+
+std::string packed(const Result<RasterPreview>& preview) {
+  return packedResult(preview);
+}
+
+std::string packed(const Result<ConvertedRaster>& converted) {
+  if (!converted) return packedResult(Result<std::string>(Failure{converted.error()}));
+  return packedResult(Result<std::string>(converted->summary));
+}
+
+Result<RasterPreview> unpackedPreview(const std::string& bytes) {
+  return unpackedResult<RasterPreview>(bytes);
+}
+
+Result<std::string> unpackedSummary(const std::string& bytes) {
+  return unpackedResult<std::string>(bytes);
+}
+
+}  // namespace gridbay::shell

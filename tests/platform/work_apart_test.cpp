@@ -1,0 +1,76 @@
+#include "platform/work_apart.h"
+
+#include <gmock/gmock.h>
+#include <poll.h>
+
+#include <chrono>
+#include <csignal>
+#include <filesystem>
+#include <fstream>
+#include <thread>
+
+#include "tests/support/temporary_folder.h"
+
+namespace gridbay {
+namespace platform_work_apart_test {
+
+void waitForEnd(WorkApart& work) {
+  do {
+    pollfd line{work.descriptor(), POLLIN, 0};
+    ASSERT_EQ(::poll(&line, 1, 10000), 1);
+  } while (work.take());
+}
+
+TEST(WorkApart, HandsBackATextAndTellsHowMuchIsDone) {
+  const std::string bytes(3 << 20, 'x');
+  int here = 0;
+  Result<WorkApart> work = WorkApart::begin([&](const WorkApart::Progress& progress) {
+    ++here;
+    EXPECT_TRUE(progress(0.5));
+    return bytes + '\0' + "end";
+  });
+  ASSERT_TRUE(work);
+  EXPECT_FALSE(work->text());
+  waitForEnd(*work);
+  EXPECT_EQ(work->done(), 0.5);
+  EXPECT_EQ(work->text(), bytes + '\0' + "end");
+  EXPECT_EQ(here, 0);  // what it does to memory stays with it
+}
+
+TEST(WorkApart, ACrashOrAnExceptionEndsTheWorkAlone) {
+  for (const bool throws : {false, true}) {
+    Result<WorkApart> work = WorkApart::begin([throws](const WorkApart::Progress&) -> std::string {
+      if (throws) throw std::runtime_error("no text");
+      std::raise(SIGSEGV);
+      return "no text";
+    });
+    ASSERT_TRUE(work);
+    waitForEnd(*work);
+    EXPECT_FALSE(work->text());
+  }
+}
+
+TEST(WorkApart, IsStoppedByItsEnd) {
+  const test::TemporaryFolder folder;
+  const std::string left = folder.file("left");
+  for (const bool heeds : {true, false}) {
+    const auto start = std::chrono::steady_clock::now();
+    {
+      const Result<WorkApart> work = WorkApart::begin([&](const WorkApart::Progress& progress) {
+        const std::ofstream made(left);
+        while (progress(0) || !heeds) std::this_thread::sleep_for(std::chrono::milliseconds(5));
+        std::filesystem::remove(left);
+        return std::string();
+      });
+      ASSERT_TRUE(work);
+      while (!std::filesystem::exists(left)) std::this_thread::yield();
+    }
+    // It has put away what it had begun; what heeds nothing is ended a while later.
+    EXPECT_EQ(std::filesystem::exists(left), !heeds);
+    EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(heeds ? 10 : 20));
+    std::filesystem::remove(left);
+  }
+}
+
+}  // namespace platform_work_apart_test
+}  // namespace gridbay
