@@ -1,3 +1,5 @@
+#include <map>
+
 #include "cli/commands.h"
 #include "cli/console_conversion.h"
 #include "conversion/series_conversion.h"
@@ -20,15 +22,23 @@ void addConvertSeries(CLI::App& convert, Action& action) {
       ->required();
   command.add_option("OUT", options->out, "The time series to write (*.tsb0)")->required();
   addItemType(command, options->itemTypes,
-              "the values, which are in its base unit; once for all columns, or once for each")
-      ->required()
+              "the values, which are in its base unit; once for all columns, or once for each (default: as "
+              "their names and units say)")
       ->allow_extra_args(false);
-  command.add_option("--start", options->start, "The moment of time 0, \"YYYY-MM-DD hh:mm:ss\"")->required();
+  command.add_option("--start", options->start,
+                     "The moment of time 0, \"YYYY-MM-DD hh:mm:ss\"; the first column has the times then "
+                     "(default: dates, names and units of the table are recognised)");
   command.add_option("--time-unit", options->timeUnit, "Unit of the times: s, min, h, d")
       ->capture_default_str();
   command.add_option("--skip-lines", options->skipLines, "Heading lines; the last one names the columns")
       ->check(CLI::NonNegativeNumber)
       ->capture_default_str();
+  const std::map<std::string, DateOrder> orders{
+      {"ymd", DateOrder::yearMonthDay}, {"dmy", DateOrder::dayMonthYear}, {"mdy", DateOrder::monthDayYear}};
+  command
+      .add_option("--dates", options->dateOrder,
+                  "The order of dates that do not tell it themselves: ymd, dmy, mdy")
+      ->transform(CLI::CheckedTransformer(orders, CLI::ignore_case));
   addForce(command, options->force);
 }
 

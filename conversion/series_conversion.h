@@ -1,14 +1,17 @@
 #pragma once
 
+#include <optional>
 #include <string>
 #include <vector>
 
 #include "conversion/conversion_host.h"
+#include "conversion/series_table.h"
 #include "platform/result.h"
 
 namespace gridbay {
 
-// Which table of text is to become which time series, and how.
+// Which table of text is to become which time series, and how. Without a start the table itself tells what it
+// holds; its names, units and dates are recognised, and a value may be missing.
 struct SeriesConversion {
   std::string in;   // lines of a time and values, between commas, semicolons, tabs or blanks
   std::string out;  // the time series (*.tsb0)
@@ -18,16 +21,7 @@ struct SeriesConversion {
   int skipLines = 0;                   // heading lines; the last one names the columns
   bool force = false;                  // replaces a file that is there
   std::string history;                 // how the series came about, a line of its history without the date
-};
-
-// The series that was written.
-struct ConvertedSeries {
-  std::vector<std::string> items;
-  std::size_t steps = 0;
-  bool equidistant = true;
-  std::string first;  // moments of the first and last step, as text
-  std::string last;
-  std::string summary;  // the same for people, one line
+  std::optional<DateOrder> dateOrder = {};  // of dates that do not tell it themselves
 };
 
 // Makes a time series from delimited text. An error leaves what is at the path as it was.

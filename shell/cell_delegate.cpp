@@ -7,8 +7,10 @@
 #include <QPainter>
 #include <QToolTip>
 
+#include "platform/projection_search.h"
 #include "shell/cell_editors.h"
 #include "shell/grid_model.h"
+#include "shell/projection_search.h"
 #include "shell/shades.h"
 
 namespace gridbay::shell {
@@ -80,6 +82,21 @@ QRect textRoom(const QRect& cell, CellKind kind) {
   return cell.adjusted(kPadding, 0, -kPadding - 1 - (hasList(kind) ? cell.height() / 2 : 0), 0);
 }
 
+// One of the list's own texts, or what is typed where that names a projection.
+bool storeProjection(GridModel& cells, const QModelIndex& index, const QComboBox& list) {
+  std::string text = list.currentText().toStdString();
+  if (list.findText(list.currentText(), Qt::MatchExactly | Qt::MatchCaseSensitive) < 0) {
+    const Result<std::string> known = projectionText(list.currentText().trimmed().toStdString());
+    if (!known || known->empty()) return false;
+    text = *known;
+  }
+  cells.grid().OnModifyCell(text);
+  cells.grid().OnEndEditing(index.row() + 1, index.column() + 1);
+  cells.refresh();
+  emit cells.edited();
+  return true;
+}
+
 // Why a text was not taken, by what the cell holds.
 QString refusal(const QString& typed, const QModelIndex& index) {
   const CellStyle cell = gridOf(index).style(index);
@@ -141,18 +158,24 @@ QWidget* CellDelegate::makeEdit(QWidget* parent, const CellStyle& cell, const QM
 QWidget* CellDelegate::makeList(QWidget* parent, const CellStyle& cell, const QModelIndex& index) const {
   auto* self = const_cast<CellDelegate*>(this);
   auto* list = new QComboBox(parent);
+  const auto take = [self, list] {
+    emit self->commitData(list);
+    emit self->closeEditor(list);
+  };
   if (cell.kind == CellKind::mapProjection) {
     for (const std::string& choice : gridOf(index).grid().OnStartEditing(index.row() + 1, index.column() + 1))
       list->addItem(QString::fromStdString(choice));
+    auto* completer = new ProjectionCompleter(*list, new CellEdit(list));
+    connect(completer, &ProjectionCompleter::chosen, self, [list, take](const QString& text) {
+      list->setEditText(text);
+      take();
+    });
   }
   for (const std::string& choice : cell.choices) list->addItem(QString::fromStdString(choice));
   // The list shows its texts whole, also below a narrow cell.
   list->view()->setMinimumWidth(list->view()->sizeHintForColumn(0) + 3 * list->fontMetrics().height());
   // A choice counts at once, without a further key.
-  connect(list, &QComboBox::activated, self, [self, list] {
-    emit self->commitData(list);
-    emit self->closeEditor(list);
-  });
+  connect(list, &QComboBox::activated, self, take);
   return list;
 }
 
@@ -178,6 +201,7 @@ void CellDelegate::setEditorData(QWidget* editor, const QModelIndex& index) cons
   const QString text = index.data(Qt::EditRole).toString();
   if (auto* list = qobject_cast<QComboBox*>(editor)) {
     list->setCurrentText(text);
+    if (list->isEditable()) list->lineEdit()->selectAll();
   } else if (auto* choice = qobject_cast<MultiChoiceEditor*>(editor)) {
     choice->setValue(text.toULongLong());
   } else if (auto* edit = qobject_cast<QLineEdit*>(editor)) {
@@ -189,23 +213,18 @@ void CellDelegate::setModelData(QWidget* editor, QAbstractItemModel* model, cons
   auto* cells = static_cast<GridModel*>(model);
   const auto* list = qobject_cast<QComboBox*>(editor);
   const auto* choice = qobject_cast<MultiChoiceEditor*>(editor);
-  auto* edit = qobject_cast<CellEdit*>(editor);
+  CellEdit* edit = editOf(editor);
   const QString text = list != nullptr     ? list->currentText()
                        : choice != nullptr ? QString::number(choice->value())
                                            : edit->text();
   const bool isSame = text == index.data(Qt::EditRole).toString();
-  if (!isSame && cells->style(index).kind == CellKind::mapProjection) {
-    cells->grid().OnModifyCell(text.toStdString());
-    cells->grid().OnEndEditing(index.row() + 1, index.column() + 1);
-    cells->refresh();
-    emit cells->edited();
-    return;
-  }
   // What the change leads to may close the grid.
   const QPersistentModelIndex at(index);
-  const QPointer<QWidget> alive(editor);
-  const bool taken = isSame || cells->setData(index, text, Qt::EditRole);
-  if (alive == nullptr || edit == nullptr) return;
+  const QPointer<CellEdit> alive(edit);
+  const bool isProjection = cells->style(index).kind == CellKind::mapProjection;
+  const bool taken = isSame || (isProjection ? storeProjection(*cells, index, *list)
+                                             : cells->setData(index, text, Qt::EditRole));
+  if (alive == nullptr) return;
   const QString why = taken || !at.isValid() ? QString() : refusal(text, at);
   edit->setFault(why);
   edit->setToolTip(why);

@@ -1,5 +1,6 @@
 #include "shell/cell_editors.h"
 
+#include <QComboBox>
 #include <QFrame>
 #include <QKeyEvent>
 #include <QScreen>
@@ -12,6 +13,11 @@ namespace {
 constexpr int kSpacing = 2;  // around each choice
 
 }  // namespace
+
+CellEdit* editOf(QWidget* editor) {
+  const auto* list = qobject_cast<QComboBox*>(editor);
+  return qobject_cast<CellEdit*>(list == nullptr ? editor : list->lineEdit());
+}
 
 MultiChoiceEditor::MultiChoiceEditor(const std::vector<std::string>& choices, QWidget* parent)
     : QWidget(parent), popup_(new QFrame(this, Qt::Popup)), list_(new QListWidget(popup_)) {

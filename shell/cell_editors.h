@@ -17,6 +17,9 @@ class CellEdit final : public ValueEdit {
   bool hasReturned = false;
 };
 
+// The edit of an editor: itself, or that of a list in which one can type; null for any other.
+CellEdit* editOf(QWidget* editor);
+
 // The list of a multiple choice cell, each with a mark to set. It opens below the cell; Return or a click
 // elsewhere takes what is marked, Esc leaves the cell as it was.
 class MultiChoiceEditor final : public QWidget {

@@ -377,7 +377,7 @@ void GridView::closeEditor(QWidget* editor, QAbstractItemDelegate::EndEditHint h
 
 // Whether an editor with a refused text stays open. Who leaves it for elsewhere is brought back once.
 bool GridView::keepsRefused(QWidget* editor, QAbstractItemDelegate::EndEditHint hint) {
-  auto* edit = qobject_cast<CellEdit*>(editor);
+  CellEdit* edit = editOf(editor);
   if (edit == nullptr || !edit->isRefused() || hint == QAbstractItemDelegate::RevertModelCache) return false;
   if (isReturning_) return true;
   const bool isLeft = !edit->hasFocus();
@@ -387,7 +387,7 @@ bool GridView::keepsRefused(QWidget* editor, QAbstractItemDelegate::EndEditHint 
     isReturning_ = true;
     // Not at once: the click that leaves it is still on its way.
     QMetaObject::invokeMethod(
-        edit, [this, edit] { returnToEditor(edit); }, Qt::QueuedConnection);
+        editor, [this, editor] { returnToEditor(editor); }, Qt::QueuedConnection);
   }
   if (edit->isVisible())
     QToolTip::showText(edit->mapToGlobal(QPoint(0, edit->height())), edit->fault(), edit, {}, 10000);
@@ -501,7 +501,7 @@ void GridView::keyPressEvent(QKeyEvent* event) {
     paste();
   } else if (isPress && kind == CellKind::button) {
     model_->press(index);
-  } else if (opensList && hasListEditor(kind)) {
+  } else if (opensList && hasListEditor(kind) && editOf(delegate_->editor()) == nullptr) {
     if (model_->flags(index).testFlag(Qt::ItemIsEditable)) openCell(index, true);
   } else if (isEnter && index.isValid()) {
     if (model_->flags(index).testFlag(Qt::ItemIsEditable)) openCell(index, false);

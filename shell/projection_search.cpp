@@ -2,6 +2,7 @@
 
 #include <QHBoxLayout>
 #include <QHeaderView>
+#include <QKeyEvent>
 #include <QTreeView>
 
 #include "platform/cartography/cartography.h"
@@ -13,15 +14,14 @@ namespace {
 constexpr std::size_t kMost = 50;  // that are listed
 constexpr int kRows = 12;          // that are seen at a time
 
-// A full text by its name; one that is short as it is.
-QString shownText(const QString& text) {
+}  // namespace
+
+QString shownProjection(const QString& text) {
   constexpr int kLong = 40;
   if (text.size() < kLong) return text;
   const QString name = QString::fromStdString(CVdMapProjection(text.toStdString()).Name());
   return name.isEmpty() ? text : name;
 }
-
-}  // namespace
 
 ProjectionCompleter::ProjectionCompleter(QLineEdit* edit) : QCompleter(edit), edit_(edit) {
   auto* list = new QTreeView;
@@ -40,6 +40,30 @@ ProjectionCompleter::ProjectionCompleter(QLineEdit* edit) : QCompleter(edit), ed
     openList();
   });
   connect(this, QOverload<const QModelIndex&>::of(&QCompleter::activated), this, &ProjectionCompleter::take);
+}
+
+ProjectionCompleter::ProjectionCompleter(QComboBox& list, QLineEdit* edit) : ProjectionCompleter(edit) {
+  list_ = &list;
+  const QString text = list.currentText();
+  list.setLineEdit(edit);
+  list.setCompleter(nullptr);
+  list.setInsertPolicy(QComboBox::NoInsert);
+  list.setCurrentText(text);
+  list.view()->installEventFilter(this);
+  edit->setPlaceholderText(tr("Name, EPSG code or area of use"));
+}
+
+// Typing while the list of the choices is open goes to the edit.
+bool ProjectionCompleter::eventFilter(QObject* watched, QEvent* event) {
+  if (list_ == nullptr || watched != list_->view()) return QCompleter::eventFilter(watched, event);
+  if (event->type() != QEvent::KeyPress) return false;
+  const QString typed = static_cast<QKeyEvent*>(event)->text();
+  if (typed.isEmpty() || !typed[0].isPrint() || typed[0].isSpace()) return false;
+  list_->hidePopup();
+  edit_->setFocus();
+  edit_->selectAll();
+  QCoreApplication::sendEvent(edit_, event);
+  return true;
 }
 
 void ProjectionCompleter::search(const QString& words) {
@@ -86,7 +110,7 @@ ProjectionSearch::ProjectionSearch(QWidget* parent)
 
 void ProjectionSearch::setText(const QString& text) {
   text_ = text;
-  shown_ = shownText(text);
+  shown_ = shownProjection(text);
   edit_->setText(shown_);
   edit_->setCursorPosition(0);
 }
@@ -101,7 +125,7 @@ void ProjectionSearch::takeTyped() {
   if (completer_->popup()->isVisible() || typed == shown_) return;
   const Result<std::string> text = projectionText(typed.toStdString());
   const QString taken = text ? QString::fromStdString(*text) : typed;
-  choose(taken, shownText(taken));
+  choose(taken, shownProjection(taken));
 }
 
 void ProjectionSearch::choose(const QString& text, const QString& shown) {

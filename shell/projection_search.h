@@ -1,10 +1,14 @@
 #pragma once
 
+#include <QComboBox>
 #include <QCompleter>
 #include <QLineEdit>
 #include <QStandardItemModel>
 
 namespace gridbay::shell {
+
+// A projection's text as people read it: a full text by its name, one that is short as it is.
+QString shownProjection(const QString& text);
 
 // A list below an edit, of the projections whose name, code or area of use has what is typed. The first one
 // is lit: Return takes it, the arrow keys light another one, Esc closes the list.
@@ -13,6 +17,8 @@ class ProjectionCompleter final : public QCompleter {
  public:
   // Serves the edit, and belongs to it.
   explicit ProjectionCompleter(QLineEdit* edit);
+  // Makes the edit that of a list, which keeps its choices: what is typed searches all projections.
+  ProjectionCompleter(QComboBox& list, QLineEdit* edit);
 
   // What the list holds for a text.
   void search(const QString& words);
@@ -22,11 +28,15 @@ class ProjectionCompleter final : public QCompleter {
   // The projection as files hold it, and its name.
   void chosen(const QString& text, const QString& name);
 
+ protected:
+  bool eventFilter(QObject* watched, QEvent* event) override;
+
  private:
   void openList();
   void take(const QModelIndex& index);
 
   QLineEdit* edit_;
+  QComboBox* list_ = nullptr;
   QStandardItemModel found_;
 };
 

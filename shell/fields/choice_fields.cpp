@@ -4,11 +4,17 @@
 #include <QRadioButton>
 #include <QSignalBlocker>
 #include <QWheelEvent>
+#include <algorithm>
+#include <utility>
 
+#include "platform/cartography/cartography.h"
+#include "platform/projection_search.h"
 #include "shell/fields/text_field.h"
 
 namespace gridbay::shell {
 namespace {
+
+constexpr int kLocalCoordinates = 1;
 
 QStringList textsOf(const std::vector<std::string>& choices) {
   QStringList texts;
@@ -38,11 +44,77 @@ DropDownField::DropDownField(Control& control, Accelerators& keys, QWidget* pare
     : Field(control, keys), list_(new ChoiceList(parent)) {
   giveKey();
   makeLabel(parent);
-  connect(list_, &QComboBox::activated, this, [this](int index) {
-    if (this->control().index == index) return;
-    this->control().index = index;
-    emit changed();
-  });
+  connect(list_, &QComboBox::activated, this, &DropDownField::take);
+}
+
+void DropDownField::take(int index) {
+  if (search_ != nullptr) list_->lineEdit()->setModified(false);
+  if (control().index == index && control().fault.empty()) return;
+  control().index = index;
+  control().fault.clear();
+  emit changed();
+}
+
+void DropDownField::makeSearchable() {
+  auto* edit = new ValueEdit(list_);
+  edit->setFrame(false);
+  list_->installEventFilter(this);
+  search_ = new ProjectionCompleter(*list_, edit);
+  connect(search_, &ProjectionCompleter::chosen, this,
+          [this](const QString& text) { takeProjection(text.toStdString()); });
+  connect(edit, &QLineEdit::editingFinished, this, &DropDownField::commit);
+  constexpr int kLetters = 32;
+  list_->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
+  list_->setMinimumContentsLength(kLetters);
+}
+
+// A projection that is not in the list joins it.
+void DropDownField::takeProjection(const std::string& text) {
+  std::vector<std::string>& choices = control().choices;
+  const auto found = std::ranges::find(choices, text);
+  const auto place = static_cast<int>(found - choices.begin());
+  if (found == choices.end()) choices.push_back(text);
+  take(place);
+  showChoice();
+}
+
+bool DropDownField::commit() {
+  if (search_ == nullptr || search_->popup()->isVisible()) return true;
+  const QString typed = list_->currentText().trimmed();
+  if (typed == list_->itemText(control().index)) return control().fault.empty();
+  const Result<std::string> text = projectionText(typed.toStdString());
+  if (text && !text->empty()) {
+    takeProjection(*text);
+    return true;
+  }
+  control().fault = text ? tr("A projection is missing").toStdString() : text.error();
+  refresh();
+  // Who leaves comes back to it once.
+  if (!list_->hasFocus() && !std::exchange(hasReturned_, true)) emit returnWanted();
+  return false;
+}
+
+// Esc brings the choice back.
+bool DropDownField::eventFilter(QObject*, QEvent* event) {
+  if (event->type() != QEvent::KeyPress || static_cast<QKeyEvent*>(event)->key() != Qt::Key_Escape)
+    return false;
+  if (list_->currentText() == list_->itemText(control().index)) return false;
+  control().fault.clear();
+  list_->setEditText(list_->itemText(control().index));
+  refresh();
+  return true;
+}
+
+void DropDownField::showChoice() {
+  if (list_->currentIndex() != control().index) list_->setCurrentIndex(control().index);
+  if (search_ == nullptr) return;
+  auto* edit = static_cast<ValueEdit*>(list_->lineEdit());
+  const bool isTyped = edit->hasFocus() && edit->isModified();
+  edit->setFault(QString::fromStdString(control().fault));
+  if (isTyped || !control().fault.empty()) return;
+  hasReturned_ = false;
+  list_->setEditText(list_->itemText(control().index));
+  edit->setCursorPosition(0);
 }
 
 void DropDownField::show() {
@@ -51,9 +123,15 @@ void DropDownField::show() {
   if (it.choices != shownChoices_) {
     shownChoices_ = it.choices;
     list_->clear();
-    list_->addItems(textsOf(it.choices));
+    // A list that offers local coordinates is one of projections.
+    const bool ofProjections =
+        std::ranges::find(it.choices, CVdMapProjection::IDtoProjectionString(kLocalCoordinates)) !=
+        it.choices.end();
+    if (ofProjections && search_ == nullptr) makeSearchable();
+    for (const QString& text : textsOf(it.choices))
+      list_->addItem(ofProjections ? shownProjection(text) : text);
   }
-  if (list_->currentIndex() != it.index) list_->setCurrentIndex(it.index);
+  showChoice();
 }
 
 RadioField::RadioField(Control& control, Accelerators& keys, QWidget* parent)

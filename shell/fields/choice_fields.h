@@ -6,6 +6,7 @@
 #include <QPushButton>
 
 #include "shell/fields/field.h"
+#include "shell/projection_search.h"
 
 namespace gridbay::shell {
 
@@ -19,17 +20,27 @@ class ChoiceList final : public QComboBox {
   void wheelEvent(QWheelEvent* event) override;
 };
 
+// A list to choose from. One of map projections can be typed in: that searches all projections there are.
 class DropDownField final : public Field {
   Q_OBJECT
  public:
   DropDownField(Control& control, Accelerators& keys, QWidget* parent);
   QWidget* input() const override { return list_; }
+  bool commit() override;
 
  protected:
   void show() override;
+  bool eventFilter(QObject* watched, QEvent* event) override;
 
  private:
+  void makeSearchable();
+  void showChoice();
+  void take(int index);
+  void takeProjection(const std::string& text);
+
   ChoiceList* list_;
+  ProjectionCompleter* search_ = nullptr;  // of a list of projections
+  bool hasReturned_ = false;
   std::vector<std::string> shownChoices_;
 };
 

@@ -620,5 +620,52 @@ TEST_F(ConvertSeries, WhatCannotBeDone) {
   EXPECT_FALSE(fs::exists(out));
 }
 
+TEST_F(ConvertSeries, WithoutAStartTheTableTellsWhatItHolds) {
+  const std::string text = folder.write(
+      "q.csv", "Datum;Pegel (cm);Q [m3/s]\n01.02.2020 00:00;125;10,5\n01.02.2020 01:00;-9999;11\n");
+  const ProgramRun run = runTool({"convert", "series", text, out});
+  ASSERT_EQ(run.status, 0) << run.err;
+  EXPECT_THAT(run.err, HasSubstr("-9999 stands once for a value: it is taken for a missing one"));
+  EXPECT_EQ(run.out, out +
+                         ": Pegel of 2 time steps, 3600 s apart, from 2020-02-01 00:00:00 to 2020-02-01 "
+                         "01:00:00\n");
+  EXPECT_EQ(info()["items"][0]["type"], 100000);
+  EXPECT_EQ(info()["items"][1]["type"], 100001);
+  const Result<TsbFile> file = TsbFile::open(out);
+  double level = 0;
+  ASSERT_TRUE(file->read(1, 0, std::span<double>(&level, 1)));
+  EXPECT_DOUBLE_EQ(level, 1.25);  // in its base unit
+  ASSERT_TRUE(file->read(1, 1, std::span<double>(&level, 1)));
+  EXPECT_EQ(level, file->definition().items[0].deleteValue);
+
+  // What is given counts.
+  ASSERT_EQ(runTool({"convert", "series", text, out, "--force", "--item-type", "surface elevation",
+                     "--item-type", "100001"})
+                .status,
+            0);
+  EXPECT_EQ(info()["items"][0]["type"], 100078);
+  const std::string open = folder.write("d.csv", "d,Q\n1/2/2020,1\n2/2/2020,2\n");
+  EXPECT_THAT(runTool({"convert", "series", open, out, "--force"}).err,
+              HasSubstr("may be day/month/year or month/day/year: the first is meant"));
+  EXPECT_THAT(runTool({"convert", "series", open, out, "--force", "--dates", "mdy"}).out,
+              HasSubstr("from 2020-01-02 00:00:00 to 2020-02-02 00:00:00"));
+}
+
+TEST_F(ConvertSeries, WhatTheTableDoesNotTellIsAskedFor) {
+  const auto fails = [this](std::string_view text) {
+    const ProgramRun run = runTool({"convert", "series", folder.write("s.txt", text), out});
+    EXPECT_EQ(run.status, 2);
+    EXPECT_FALSE(fs::exists(out));
+    return run.err;
+  };
+  EXPECT_THAT(fails("t,Q\n0,1\n1,2\n"), HasSubstr("are numbers: --start gives the moment of time 0"));
+  EXPECT_THAT(
+      fails("d,what\n2020-01-01,1\n2020-01-02,2\n"),
+      HasSubstr("What \"what\" holds is not seen from its name and unit: --item-type gives its item type"));
+  EXPECT_THAT(fails("words\n"), HasSubstr("no table of times and values is seen in it"));
+  EXPECT_THAT(fails("d,Q\n2020-01-01,1\n2020-01-02,x\n"), HasSubstr("line 3: \"x\" is no number"));
+  EXPECT_THAT(fails("a,Q\n3,1\n2,2\n"), HasSubstr("There is no column of times"));
+}
+
 }  // namespace cli_convert_test
 }  // namespace gridbay

@@ -12,6 +12,8 @@
 
 #include "shell/appearance.h"
 #include "shell/cell_editors.h"
+#include "shell/projection_search.h"
+#include "tests/shell/real_keys.h"
 #include "tests/shell/test_forms.h"
 
 namespace gridbay::shell {
@@ -432,6 +434,65 @@ class GridViewTest : public QObject {
     key(Qt::Key_V, Qt::ControlModifier);
     QCOMPARE(grid.at(2, 2).value, std::string("10"));
     QCOMPARE(grid.at(1, 1).value, std::string("7"));
+  }
+
+  // Typing in the cell of a projection searches all there are; its own list stays.
+  void aProjectionIsSearchedInItsCell() {
+    GridOfAllKinds grid;
+    const auto shown = show(grid);
+    const auto value = [&grid] {
+      return QString::fromStdString(grid.at(1, GridOfAllKinds::kProjection).value);
+    };
+    const auto list = [this] {
+      return qobject_cast<QComboBox*>(static_cast<CellDelegate*>(view_->itemDelegate())->editor());
+    };
+    const auto found = [&list] { return list()->findChild<ProjectionCompleter*>()->popup(); };
+    // On this platform the window is not active again once a list has closed.
+    const auto backToTheCell = [this] {
+      view_->goTo(0, GridOfAllKinds::kProjection - 1);
+      window_->activateWindow();
+      view_->setFocus();
+      QVERIFY(QTest::qWaitForWindowActive(window_));
+    };
+    click(1, GridOfAllKinds::kProjection);
+    QVERIFY(list() != nullptr && list()->view()->isVisible());
+    QCOMPARE(list()->count(), 61);
+    // While the list is open, too.
+    typeKeys("mga 94 56");
+    QVERIFY(!list()->view()->isVisible());
+    QCOMPARE(list()->currentText(), QString("mga 94 56"));
+    QVERIFY(found()->isVisible());
+    pressKey(Qt::Key_Return);
+    QTRY_VERIFY2(value().startsWith("PROJCS[\"GDA_1994_MGA_Zone_56\""), qPrintable(value()));
+    QTRY_VERIFY(list() == nullptr);
+
+    // A code that is typed and entered with the list closed; the arrows light another projection.
+    backToTheCell();
+    typeKeys("EPSG:32633");
+    pressKey(Qt::Key_Escape);
+    QVERIFY(!found()->isVisible());
+    QCOMPARE(list()->currentText(), QString("EPSG:32633"));
+    pressKey(Qt::Key_Return);
+    QTRY_COMPARE(value(), QString("UTM-33"));
+    QTRY_VERIFY(list() == nullptr);
+    backToTheCell();
+    typeKeys("WGS84 UTM 56");
+    pressKey(Qt::Key_Down);
+    pressKey(Qt::Key_Return);
+    QTRY_VERIFY2(value().startsWith("PROJCS[\"WGS_1984_UTM_Zone_56S\""), qPrintable(value()));
+
+    // What names none is refused, and Esc brings the value back.
+    const QString before = value();
+    backToTheCell();
+    typeKeys("nowhere");
+    QVERIFY(!found()->isVisible());
+    pressKey(Qt::Key_Return);
+    QTRY_VERIFY(list() != nullptr && editOf(list())->isRefused());
+    QVERIFY(editOf(list())->toolTip().contains("\"nowhere\""));
+    QCOMPARE(value(), before);
+    pressKey(Qt::Key_Escape);
+    QTRY_VERIFY(list() == nullptr);
+    QCOMPARE(value(), before);
   }
 };
 

@@ -20,6 +20,8 @@
 #include "shell/appearance.h"
 #include "shell/fields/value_edit.h"
 #include "shell/grid_view.h"
+#include "shell/projection_search.h"
+#include "tests/shell/real_keys.h"
 #include "tests/shell/test_forms.h"
 
 namespace gridbay::shell {
@@ -548,6 +550,102 @@ class PagePaneTest : public QObject {
     grid.setRows(1000);
     pane_->refresh();
     QVERIFY(pane_->sizeHint().height() <= pane_->screen()->availableSize().height());
+  }
+
+  void aListOfProjectionsIsSearched() {
+    Form form;
+    std::int32_t place = 0;
+    std::int32_t other = 0;
+    form.DDX_CBIndex("Map projection:", {"UTM-32", "Local Coordinates", "UTM-1"}, place);
+    form.DDX_CBIndex("Kind:", {"A", "B"}, other);
+    const auto shown = show(form);
+    auto* list = input<QComboBox>("Map projection:");
+    QVERIFY(list->isEditable() && !input<QComboBox>("Kind:")->isEditable());
+    QCOMPARE(list->count(), 3);
+    auto* found = list->findChild<ProjectionCompleter*>()->popup();
+    const auto& control = test::of(form, &place);
+    const auto typeIn = [list](const QString& typed) {
+      list->setFocus();
+      list->lineEdit()->selectAll();
+      typeKeys(typed);
+    };
+    typeIn("gda2020 mga 56");
+    QVERIFY(found->isVisible());
+    pressKey(Qt::Key_Return);
+    QCOMPARE(control.index, 3);
+    QVERIFY(QString::fromStdString(control.choices.back()).startsWith("PROJCS[\"GDA2020_MGA_Zone_56\""));
+    // A full text is shown by its name.
+    QCOMPARE(list->currentText(), QString("GDA2020 / MGA zone 56"));
+    QCOMPARE(list->currentIndex(), 3);
+    // A code that is typed, and one of the list's own.
+    typeIn("32601");
+    pressKey(Qt::Key_Escape);
+    pressKey(Qt::Key_Return);
+    QCOMPARE(control.index, 2);
+    QCOMPARE(list->currentText(), QString("UTM-1"));
+    // What names none stays with its reason, and the value too; Esc brings it back.
+    typeIn("nowhere");
+    pressKey(Qt::Key_Tab);
+    QCOMPARE(control.index, 2);
+    QCOMPARE(list->currentText(), QString("nowhere"));
+    QVERIFY(text("\"nowhere\" is no projection that is known") != nullptr);
+    QTRY_VERIFY(list->hasFocus());
+    pressKey(Qt::Key_Escape);
+    QCOMPARE(list->currentText(), QString("UTM-1"));
+    QVERIFY(text("\"nowhere\" is no projection that is known") == nullptr);
+    // By the list itself.
+    list->setFocus();
+    pressKey(Qt::Key_Up);
+    QCOMPARE(control.index, 1);
+    QCOMPARE(list->currentText(), QString("Local Coordinates"));
+  }
+
+  void aProjectionIsSearchedOrTyped() {
+    ProjectionSearch search;
+    search.setText("EPSG:28356");
+    search.show();
+    search.activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(&search));
+    QStringList chosen;
+    connect(&search, &ProjectionSearch::chosen, this, [&chosen](const QString& text) { chosen << text; });
+    QVERIFY(search.isValid());
+    QLineEdit& edit = search.edit();
+    const auto typeIn = [&edit](const QString& typed) {
+      edit.setFocus();
+      edit.selectAll();
+      typeKeys(typed);
+    };
+    QAbstractItemView* found = search.completer().popup();
+    typeIn("utm 32");
+    QVERIFY(found->isVisible());
+    QCOMPARE(found->currentIndex().data().toString(), QString("WGS 84 / UTM zone 32N"));
+    QCOMPARE(found->currentIndex().siblingAtColumn(1).data().toString(), QString("EPSG:32632"));
+    QVERIFY(found->currentIndex().siblingAtColumn(2).data().toString().contains("Denmark"));
+    QVERIFY(chosen.isEmpty());
+    pressKey(Qt::Key_Return);
+    QCOMPARE(chosen, QStringList{"UTM-32"});
+    QCOMPARE(search.text(), QString("UTM-32"));
+    QCOMPARE(edit.text(), QString("WGS 84 / UTM zone 32N"));
+    // Typed and left.
+    typeIn("28992");
+    pressKey(Qt::Key_Escape);
+    pressKey(Qt::Key_Return);
+    QCOMPARE(chosen.size(), 2);
+    QVERIFY(search.text().startsWith("PROJCS[") && search.isValid());
+    QCOMPARE(edit.text(), QString("Amersfoort / RD New"));
+    // By the mouse.
+    typeIn("british national grid");
+    QTest::mouseClick(found->viewport(), Qt::LeftButton, {},
+                      found->visualRect(found->model()->index(0, 0)).center());
+    QCOMPARE(chosen.size(), 3);
+    QCOMPARE(edit.text(), QString("OSGB36 / British National Grid"));
+    // What names none is told by what it is.
+    typeIn("nowhere");
+    pressKey(Qt::Key_Return);
+    QCOMPARE(search.text(), QString("nowhere"));
+    QVERIFY(!search.isValid());
+    search.setText(QString());
+    QVERIFY(!search.isValid() && edit.text().isEmpty());
   }
 
   // Pictures to look at, on request.
