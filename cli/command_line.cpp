@@ -97,6 +97,8 @@ int runCommandLine(int argc, const char* const* argv, std::ostream& out, std::os
   addExport(tool, action);
   addValidate(tool, action);
   addFix(tool, action);
+  addDiff(tool, action);
+  addMerge(tool, action);
   addRun(tool, action);
   addEnsemble(tool, action);
   addCompletion(tool, action);

@@ -28,6 +28,8 @@ void addArea(CLI::App& tool, Action& action);
 void addExport(CLI::App& tool, Action& action);
 void addValidate(CLI::App& tool, Action& action);
 void addFix(CLI::App& tool, Action& action);
+void addDiff(CLI::App& tool, Action& action);
+void addMerge(CLI::App& tool, Action& action);
 void addRun(CLI::App& tool, Action& action);
 void addEnsemble(CLI::App& tool, Action& action);
 void addCompletion(CLI::App& tool, Action& action);

@@ -4,6 +4,7 @@
 #include <stdexcept>
 
 #include "advice/advisor.h"
+#include "compare/document_comparison.h"
 #include "map/document_map.h"
 #include "plugin/cover_pages.h"
 #include "setup/graphical_view.h"
@@ -123,11 +124,13 @@ class Editor final : public SetupEditor {
   const UnitChoices& units() const override { return document_.units(); }
   void setUnits(const UnitChoices& units) override {
     document_.units() = units;
+    comparison_->unitsChanged();
     refreshPage();
     update();
   }
   void onChange(std::function<void()> changed) override { changed_ = std::move(changed); }
   void onSave(std::function<void()> saved) override { document_.OnSaved(std::move(saved)); }
+  SetupComparison& comparison() override { return *comparison_; }
 
  private:
   std::optional<Edit> editOf(const EditHistory::Step* step) const {
@@ -142,6 +145,7 @@ class Editor final : public SetupEditor {
 
   CGridbayDoc document_;
   std::unique_ptr<MapEditor> map_ = makeMapEditor(document_);
+  std::unique_ptr<SetupComparison> comparison_ = makeSetupComparison(document_);
   CNavigationView tree_;
   Advisor advisor_;
   std::unique_ptr<CV27SetupFormView> page_;

@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "advice/advice.h"
+#include "compare/setup_comparison.h"
 #include "core/message.h"
 #include "map/map_editor.h"
 #include "pages/form.h"
@@ -113,6 +114,9 @@ class SetupEditor {
   virtual void onChange(std::function<void()> changed) = 0;
   // Called after each save, whoever has asked for it.
   virtual void onSave(std::function<void()> saved) = 0;
+
+  // Another setup beside this one. What is taken over is shown by the open page too.
+  virtual SetupComparison& comparison() = 0;
 };
 
 std::unique_ptr<SetupEditor> makeSetupEditor(SetupHost& host);

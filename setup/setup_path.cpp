@@ -107,7 +107,7 @@ bool isOption(std::string_view path) {
   return false;
 }
 
-Result<const Node*> findPath(const KvsFile& file, std::string_view path) {
+const Node* nodeAt(const KvsFile& file, std::string_view path) {
   const Node* at = kvsTargetByNameNum(file, CGlobalKvs::kTarget, 1);
   std::string_view rest = withoutTarget(path);
   while (at != nullptr && !rest.empty()) {
@@ -119,7 +119,11 @@ Result<const Node*> findPath(const KvsFile& file, std::string_view path) {
     at = keyword != nullptr ? keyword : at->section(name, occurrence);
     rest.remove_prefix(std::min(part.size() + 1, rest.size()));
   }
-  if (at != nullptr) return at;
+  return at;
+}
+
+Result<const Node*> findPath(const KvsFile& file, std::string_view path) {
+  if (const Node* at = nodeAt(file, path)) return at;
   const std::string nearest = nearestPath(file, path);
   return Failure{fmt::format("There is no \"{}\" in this setup{}", path,
                              nearest.empty() ? "" : fmt::format("; did you mean \"{}\"?", nearest))};

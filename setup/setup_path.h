@@ -16,7 +16,8 @@ std::string_view withoutTarget(std::string_view path);
 bool isOption(std::string_view path);
 
 // The section or keyword that a path such as NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth names in a
-// setup's target. An unknown path is an error that suggests the nearest one.
+// setup's target; null for none. `findPath` makes an unknown path an error that suggests the nearest one.
+const Node* nodeAt(const KvsFile& file, std::string_view path);
 Result<const Node*> findPath(const KvsFile& file, std::string_view path);
 
 // The path of the nearest name in the file; empty when none is near.

@@ -1,6 +1,7 @@
 #include "shell/document_tab.h"
 
 #include <QFileInfo>
+#include <QHeaderView>
 #include <QPushButton>
 #include <QTimer>
 #include <QVBoxLayout>
@@ -43,12 +44,15 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
   auto* mainLayout = new QVBoxLayout(main);
   mainLayout->setContentsMargins(0, 0, 0, 0);
   notice_ = makeNotice(main);
-  pane_ = new PagePane(main);
+  pages_ = new QSplitter(main);
+  pages_->setChildrenCollapsible(false);
+  pane_ = new PagePane(pages_);
+  pages_->addWidget(pane_);
   cover_ = new CoverView(main);
   summary_ = new SummaryView(main);
   adviceStrip_ = new AdviceStrip(main);
   mainLayout->addWidget(notice_);
-  mainLayout->addWidget(pane_, 1);
+  mainLayout->addWidget(pages_, 1);
   mainLayout->addWidget(cover_, 1);
   mainLayout->addWidget(summary_, 1);
   // Below the page, which stays where it is when advice comes and goes.
@@ -98,6 +102,7 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
 
 // The page's widgets go before the editor whose form they show.
 DocumentTab::~DocumentTab() {
+  emit closing();
   pane_->clear();
 }
 
@@ -218,10 +223,11 @@ void DocumentTab::showFirstView() {
   const SetupEditor::FirstView view = editor_->firstView();
   pane_->showPicture(QString::fromStdString(view.picture.value_or("")), QString::fromStdString(view.text));
   cover_->hide();
-  pane_->show();
+  pages_->show();
   summary_->show();
   showSummary();
   showAdvice();
+  emit pageShown();
 }
 
 // The model's lines, and one for its check.
@@ -254,9 +260,33 @@ void DocumentTab::showCurrentPage() {
     cover_->showCover(editor_->cover(id));
   }
   cover_->setVisible(form == nullptr);
-  pane_->setVisible(form != nullptr);
+  pages_->setVisible(form != nullptr);
   emit rowChosen(0);
   showAdvice();
+  emit pageShown();
+}
+
+// In a column of their own, as advice has its marks beside the captions.
+void DocumentTab::markPages(const QHash<std::int32_t, QString>& tips) {
+  constexpr int kMarkColumn = 1;
+  const bool hasMarks = !tips.isEmpty();
+  tree_->setColumnCount(hasMarks ? kMarkColumn + 1 : kMarkColumn);
+  tree_->header()->setStretchLastSection(!hasMarks);
+  if (!hasMarks) return;
+  tree_->header()->setSectionResizeMode(0, QHeaderView::Stretch);
+  tree_->header()->setSectionResizeMode(kMarkColumn, QHeaderView::ResizeToContents);
+  for (auto item = itemsById_.cbegin(); item != itemsById_.cend(); ++item) {
+    QStringList tip{tips.value(item.key())};
+    // One that is folded in is marked on what it is folded into.
+    for (auto below = itemsById_.cbegin(); below != itemsById_.cend(); ++below) {
+      if (below.value()->parent() == item.value() && item.value()->parent() != nullptr)
+        tip << tips.value(below.key());
+    }
+    tip.removeAll(QString());
+    item.value()->setIcon(kMarkColumn, tip.isEmpty() ? QIcon() : toolIcon(Tool::differs));
+    item.value()->setToolTip(kMarkColumn, tip.join('\n'));
+    item.value()->setData(kMarkColumn, Qt::AccessibleTextRole, tip.join('\n'));
+  }
 }
 
 void DocumentTab::lookForAdvice() {

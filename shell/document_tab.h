@@ -51,6 +51,10 @@ class DocumentTab final : public QSplitter, public SetupHost {
   SetupEditor& editor() { return *editor_; }
   PagePane& pane() { return *pane_; }
   CoverView& cover() { return *cover_; }
+  // Where the page is, for what is to stand beside it.
+  QSplitter& pages() { return *pages_; }
+  // Marks items of the tree by their pages, with what the mark means; none for no marks.
+  void markPages(const QHash<std::int32_t, QString>& tips);
   SummaryView& summary() { return *summary_; }
   QTreeWidget& tree() { return *tree_; }
   QLineEdit& filter() { return *filter_; }
@@ -123,6 +127,10 @@ class DocumentTab final : public QSplitter, public SetupHost {
   // The setup was checked, or there is another one whose check is not known.
   void checked();
   void saved();
+  // Another page, or none, is shown.
+  void pageShown();
+  // It goes, and its editor with it.
+  void closing();
   // There is other advice.
   void advised();
 
@@ -146,6 +154,7 @@ class DocumentTab final : public QSplitter, public SetupHost {
   WindowServices services_;
   QLineEdit* filter_;
   QTreeWidget* tree_;
+  QSplitter* pages_;
   PagePane* pane_;
   CoverView* cover_;
   SummaryView* summary_;

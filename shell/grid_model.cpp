@@ -36,6 +36,7 @@ CellStyle GridModel::style(const QModelIndex& index) const {
   CellStyle style;
   grid_.GetStyleRowCol(index.row() + 1, index.column() + 1, style);
   if (!grid_.IsEnabled()) style.enabled = false;
+  if (readOnly_) style.readOnly = true;
   return style;
 }
 
@@ -93,7 +94,7 @@ Qt::ItemFlags GridModel::flags(const QModelIndex& index) const {
 // What a change leads to may close the grid, so that nothing is done after it then.
 bool GridModel::setData(const QModelIndex& index, const QVariant& value, int role) {
   if (role != Qt::EditRole && role != Qt::CheckStateRole) return false;
-  if (!grid_.IsEnabled()) return false;
+  if (readOnly_ || !grid_.IsEnabled()) return false;
   const QString text = role == Qt::EditRole ? value.toString() : value.toInt() == Qt::Checked ? "1" : "0";
   const QPointer<GridModel> self(this);
   const bool stored = grid_.StoreStyleRowCol(index.row() + 1, index.column() + 1, text.toStdString()) != 0;
@@ -103,7 +104,7 @@ bool GridModel::setData(const QModelIndex& index, const QVariant& value, int rol
 }
 
 void GridModel::press(const QModelIndex& index) {
-  if (!grid_.IsEnabled()) return;
+  if (readOnly_ || !grid_.IsEnabled()) return;
   const QPointer<GridModel> self(this);
   grid_.OnClickedButtonRowCol(index.row() + 1, index.column() + 1);
   if (self != nullptr) refresh();
@@ -111,7 +112,7 @@ void GridModel::press(const QModelIndex& index) {
 }
 
 bool GridModel::browse(const QModelIndex& index) {
-  if (!grid_.IsEnabled()) return false;
+  if (readOnly_ || !grid_.IsEnabled()) return false;
   const QPointer<GridModel> self(this);
   const bool browsed = grid_.ProcessKeys(GridKey::browse, index.row() + 1, index.column() + 1);
   if (self != nullptr && browsed) refresh();

@@ -26,6 +26,8 @@ class GridModel final : public QAbstractTableModel {
   // How a cell looks at present; one of a grid that does not apply is greyed.
   CellStyle style(const QModelIndex& index) const;
   void press(const QModelIndex& index);
+  // Whether its cells can be read only.
+  void setReadOnly(bool readOnly) { readOnly_ = readOnly; }
   // Lets the user browse for a cell's file, where it has one.
   bool browse(const QModelIndex& index);
   CV27SetupGridWnd& grid() const { return grid_; }
@@ -48,6 +50,7 @@ class GridModel final : public QAbstractTableModel {
   int shownRows_ = 0;
   int shownColumns_ = 0;
   bool isRefreshing_ = false;
+  bool readOnly_ = false;
 };
 
 // The texts of the choices that a multiple choice cell holds.

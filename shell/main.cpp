@@ -51,9 +51,24 @@ void takeMaps(MainWindow& window, const std::function<void(const QString&)>& tak
   window.resize(before);
 }
 
+// A picture of the first difference from the setup beside the document.
+void takeComparison(MainWindow& window, const std::function<void(const QString&)>& take) {
+  TabComparison* comparison = TabComparison::of(window.currentDocument());
+  if (comparison == nullptr) return;
+  const QSize before = window.size();
+  window.resize(1500, 860);
+  QApplication::processEvents();
+  comparison->goTo(0, true);
+  take("compare");
+  comparison->end();
+  window.differences().hide();
+  window.resize(before);
+}
+
 // Pictures of the start view, of a setup's first view and each page that its tree shows, of the map, of the
 // help, and of each data file that is open.
-void takeScreenshots(MainWindow& window, const QStringList& paths, const QString& folder) {
+void takeScreenshots(MainWindow& window, const QStringList& paths, const QString& other,
+                     const QString& folder) {
   const auto take = [&window, &folder](const QString& name) {
     QApplication::processEvents();
     window.grab().save(QString("%1/%2.png").arg(folder, name));
@@ -64,6 +79,7 @@ void takeScreenshots(MainWindow& window, const QStringList& paths, const QString
   openFiles(window, paths);
   if (window.currentDocument() == nullptr) window.newDocument(0);
   take("first-view");
+  if (!other.isEmpty() && window.compareWith(other)) takeComparison(window, take);
   for (const auto& item : window.currentDocument()->editor().items()) {
     if (!item.visible || !window.currentDocument()->goToPage(item.id)) continue;
     take(QString("page-%1").arg(item.id));
@@ -97,6 +113,7 @@ int main(int argc, char** argv) {
   parser.addVersionOption();
   parser.addOption({"edition", "The editor of new documents: v27 or wsk.", "edition", "v27"});
   parser.addOption({"new", "Begins with a new document where no setup is given."});
+  parser.addOption({"compare", "Puts another setup beside the last one that is opened.", "setup"});
   parser.addOption({"screenshots", "Writes a picture of each page to a folder, and ends.", "folder"});
   parser.addOption({"exit-when-shown", "Ends once the window has been painted, as a benchmark wants it."});
   parser.addOption({"appearance", "Colours for this time: light or dark.", "colours"});
@@ -119,10 +136,12 @@ int main(int argc, char** argv) {
   if (parser.isSet("appearance"))
     setAppearance(parser.value("appearance") == "dark" ? Appearance::dark : Appearance::light);
   if (parser.isSet("screenshots")) {
-    takeScreenshots(window, parser.positionalArguments(), parser.value("screenshots"));
+    takeScreenshots(window, parser.positionalArguments(), parser.value("compare"),
+                    parser.value("screenshots"));
     return 0;
   }
   openFiles(window, parser.positionalArguments());
+  if (parser.isSet("compare")) window.compareWith(parser.value("compare"));
   if (parser.isSet("new") && window.currentDocument() == nullptr) window.newDocument(0);
   window.show();
   if (parser.isSet("exit-when-shown")) {

@@ -45,6 +45,9 @@ QMenu* MainWindow::buildFileMenu() {
   file->addSeparator();
   file->addAction(tr("Import &Terrain..."), QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_T), this,
                   [this] { importTerrain(); });
+  compareWith_ = file->addAction(tr("Compare &With..."), QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_D), this,
+                                 [this] { askCompare(); });
+  merge_ = file->addAction(tr("&Merge..."), this, [this] { askMerge(); });
   file->addSeparator();
   file->addAction(tr("E&xit"), QKeySequence::Quit, this, &QWidget::close);
   return file;
@@ -80,6 +83,10 @@ QMenu* MainWindow::buildViewMenu() {
   summary_ = view->addAction(tr("&Summary of the setup"), QKeySequence(Qt::ALT | Qt::Key_Home), this, [this] {
     if (DocumentTab* tab = currentDocument()) tab->showFirstView();
   });
+  view->addSeparator();
+  for (QAction* action : {compare_->nextAction(), compare_->previousAction(), compare_->takeAction(),
+                          compare_->takePageAction(), compare_->takeAllAction()})
+    view->addAction(action);
   view->addSeparator();
   for (QDockWidget* dock : findChildren<QDockWidget*>()) view->addAction(dock->toggleViewAction());
   view->addAction(map_->pickAction());

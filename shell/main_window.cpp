@@ -54,6 +54,7 @@ MainWindow::MainWindow(std::vector<std::unique_ptr<EditorLibrary>> libraries)
     refreshActions();
     messages_->showCheckOf(currentDocument());
     map_->showDocument(currentDocument());
+    compare_->showDocument(currentDocument());
     showTabsOrStart();
   });
   recoveryTimer_.setSingleShot(true);
@@ -65,6 +66,7 @@ MainWindow::MainWindow(std::vector<std::unique_ptr<EditorLibrary>> libraries)
 MainWindow::~MainWindow() {
   disconnect(tabs_, nullptr, this, nullptr);
   map_->showDocument(nullptr);
+  compare_->showDocument(nullptr);
   while (tabs_->count() > 0) {
     QWidget* tab = tabs_->widget(0);
     tabs_->removeTab(0);
@@ -90,6 +92,14 @@ void MainWindow::buildDocks() {
   tabifyDockWidget(messages_, run_);
   messages_->raise();
   resizeDocks({messages_}, {140}, Qt::Vertical);
+
+  compare_ = new CompareDock(this);
+  addDockWidget(Qt::BottomDockWidgetArea, compare_);
+  tabifyDockWidget(messages_, compare_);
+  compare_->hide();
+  messages_->raise();
+  connect(compare_, &CompareDock::failed, this,
+          [this](const QString& text) { statusBar()->showMessage(text); });
 
   help_ = new HelpDock(this);
   addDockWidget(Qt::RightDockWidgetArea, help_);

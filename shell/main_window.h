@@ -12,6 +12,7 @@
 #include <set>
 #include <vector>
 
+#include "shell/compare/compare_dock.h"
 #include "shell/document_tab.h"
 #include "shell/editor_library.h"
 #include "shell/help_dock.h"
@@ -46,6 +47,11 @@ class MainWindow final : public QMainWindow {
   // Opens the dialog in which a map is made from terrain of any kind.
   void importTerrain();
   TerrainImport* terrainImport() { return terrainImport_; }
+  // Puts another setup beside the one that is shown; false where it can't be read, which is then said.
+  bool compareWith(const QString& path);
+  // Merges another setup, which has come from the same one, into the one that is shown. False where that is
+  // not done, with what is wrong said.
+  bool mergeWith(const QString& base, const QString& other);
   // Offers the edits that a run which ended suddenly has left behind.
   void offerRecovery();
 
@@ -57,6 +63,7 @@ class MainWindow final : public QMainWindow {
   RunDock& run() { return *run_; }
   HelpDock& help() { return *help_; }
   MapDock& map() { return *map_; }
+  CompareDock& differences() { return *compare_; }
   UnitsMenu& units() { return *units_; }
   QAction* undoAction() { return undo_; }
   QAction* redoAction() { return redo_; }
@@ -90,6 +97,8 @@ class MainWindow final : public QMainWindow {
   // Opens, and has the user save under, a name of his choice.
   void askOpen();
   bool askSave();
+  void askCompare();
+  void askMerge();
   QString askSaveName(const DocumentTab& tab);
   // The list of setups opened last, newest first, and the menu that offers them.
   void remember(const QString& path);
@@ -142,6 +151,9 @@ class MainWindow final : public QMainWindow {
   RunDock* run_ = nullptr;
   HelpDock* help_ = nullptr;
   MapDock* map_ = nullptr;
+  CompareDock* compare_ = nullptr;
+  QAction* compareWith_ = nullptr;
+  QAction* merge_ = nullptr;
 };
 
 }  // namespace gridbay::shell

@@ -136,6 +136,7 @@ PagePane::Part PagePane::makePart(Control& control, QWidget* parent, bool hasBod
   if (control.kind == ControlKind::grid) {
     auto* grid = new GridView(*control.grid, parent);
     grid->setStretches(control.alignRight);
+    grid->cells().setReadOnly(readOnly_);
     // What a cell changes may show in other controls.
     connect(grid, &GridView::edited, this, &PagePane::refresh);
     connect(grid, &GridView::rowChosen, this, [this, grid](int row) {
@@ -166,7 +167,7 @@ void PagePane::place(const Part& part, FieldLayout& layout, bool beside) {
 void PagePane::connectField(Field& field, FieldLayout& layout) {
   connect(&field, &Field::changed, this, [this, &field] { changed(field.control()); });
   connect(&field, &Field::stepped, this, [this, &field](int delta) {
-    form_->spin(field.control(), delta);
+    if (!readOnly_) form_->spin(field.control(), delta);
     refresh();
   });
   connect(&field, &Field::explained, this,
@@ -212,7 +213,7 @@ void PagePane::commit() {
 
 void PagePane::changed(Control& control) {
   if (refreshing_) return;
-  form_->act(control);
+  if (!readOnly_) form_->act(control);
   refresh();
 }
 
@@ -295,6 +296,13 @@ QSize PagePane::sizeHint() const {
 QWidget* PagePane::widgetOf(const QString& label, int n) const {
   for (const Part& part : parts_) {
     if (QString::fromStdString(part.control->label) == label && --n == 0) return part.widget;
+  }
+  return nullptr;
+}
+
+GridView* PagePane::tableAt(int n) const {
+  for (const Part& part : parts_) {
+    if (part.grid != nullptr && --n == 0) return part.grid;
   }
   return nullptr;
 }

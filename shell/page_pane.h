@@ -23,6 +23,8 @@ class PagePane final : public QScrollArea {
  public:
   explicit PagePane(QWidget* parent);
 
+  // What is shown from now on can be read only; its form says the same of its controls.
+  void setReadOnly(bool readOnly) { readOnly_ = readOnly; }
   // With no caption there is none above the form.
   void showForm(const QString& caption, Form& form);
   void showText(const QString& caption, const QString& text);
@@ -37,6 +39,8 @@ class PagePane final : public QScrollArea {
   // The input of the n-th control of a label; null when there is none.
   QWidget* widgetOf(const QString& label, int n = 1) const;
 
+  // The n-th table, from 1; null where there is none.
+  GridView* tableAt(int n) const;
   // Brings a place of the page into view, and makes its cell the current one, where it is in a table. The
   // input or table that it is in, for who wants the focus there; null where there is none.
   QWidget* goTo(const PagePlace& place);
@@ -74,6 +78,7 @@ class PagePane final : public QScrollArea {
   QPointer<GridView> lastGrid_;
   Accelerators keys_;
   bool refreshing_ = false;
+  bool readOnly_ = false;
 };
 
 }  // namespace gridbay::shell

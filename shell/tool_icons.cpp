@@ -115,6 +115,13 @@ Drawing advice() {
   return drawing;
 }
 
+Drawing differs() {
+  Drawing drawing;
+  drawing.accent.addEllipse(QPointF(12, 12), 4.5, 4.5);
+  drawing.fillsAccent = true;
+  return drawing;
+}
+
 struct Entry {
   const char* themeName;
   Drawing (*draw)();
@@ -132,6 +139,7 @@ constexpr Entry kEntries[] = {
     {"measure", units},
     {"help-contents", help},
     {"dialog-information", advice},
+    {"", differs},
 };
 
 class Engine final : public QIconEngine {
@@ -149,7 +157,9 @@ class Engine final : public QIconEngine {
     const QPalette palette = QGuiApplication::palette();
     const auto group = mode == QIcon::Disabled ? QPalette::Disabled : QPalette::Active;
     const QColor text = palette.color(group, QPalette::ButtonText);
-    const QColor accent = mode == QIcon::Disabled ? text : palette.color(group, QPalette::Link);
+    const QColor accent = mode == QIcon::Disabled   ? text
+                          : mode == QIcon::Selected ? palette.color(group, QPalette::HighlightedText)
+                                                    : palette.color(group, QPalette::Link);
     const Drawing drawing = entry.draw();
     constexpr qreal kWidth = 1.6;
     painter->save();

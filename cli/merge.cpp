@@ -1,0 +1,137 @@
+// What two setups have made of a third, together.
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <filesystem>
+#include <nlohmann/json.hpp>
+
+#include "cli/commands.h"
+#include "compare/setup_merge.h"
+
+namespace gridbay::cli {
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+struct Options {
+  std::string base;
+  std::string own;
+  std::string other;
+  std::string out;
+  bool takesOwn = false;
+  bool takesOther = false;
+  bool asWritten = false;
+  bool force = false;
+  bool json = false;
+};
+
+Result<SetupOnDisk> open(const std::string& path, const Options& options, MessageHost& host) {
+  const std::string& start = options.asWritten ? options.out : path;
+  Result<SetupFile> setup = SetupFile::open(path, &host, start);
+  if (!setup) return Failure{setup.error()};
+  return SetupOnDisk{std::move(*setup), path};
+}
+
+// What a merge leaves out is told of each file that has it.
+void tellUnknown(SetupOnDisk& source, const Console& console) {
+  for (const std::string& section : source.setup.unknownSections())
+    console.note(
+        fmt::format("{}: this version does not know {}, and a merge leaves it out", source.path, section));
+}
+
+std::string lineOf(const MergeQuestion& question) {
+  const std::string base =
+      question.base ? fmt::format(", {} in the base", question.base->empty() ? "nothing" : *question.base)
+                    : std::string();
+  return fmt::format("{}: {}{}\n", question.thing, wordsOf(question.own, question.other, "A", "B"), base);
+}
+
+Json jsonOf(const MergeQuestion& question, const std::string& path) {
+  const auto value = [](const std::optional<std::string>& text) {
+    return text ? Json(*text) : Json(nullptr);
+  };
+  return {{"path", path},
+          {"thing", question.thing},
+          {"base", value(question.base)},
+          {"a", value(question.own)},
+          {"b", value(question.other)}};
+}
+
+// What the check of the result found.
+unsigned tellFaults(SetupFile& result, const Console& console) {
+  ValidationList messages;
+  const unsigned faults = result.model().Validate(messages, 1);
+  for (const CMessage& message : messages) console.note(messageLine(message));
+  return faults;
+}
+
+int merge(const Options& options, const Console& console) {
+  if (!options.force && std::filesystem::exists(options.out))
+    return console.fail(fmt::format("{} exists; --force replaces it", options.out));
+  ConsoleMessageHost host(console);
+  Result<SetupOnDisk> base = open(options.base, options, host);
+  if (!base) return console.fail(base.error());
+  Result<SetupOnDisk> own = open(options.own, options, host);
+  if (!own) return console.fail(own.error());
+  Result<SetupOnDisk> other = open(options.other, options, host);
+  if (!other) return console.fail(other.error());
+  MergeSources sources{std::move(*base), std::move(*own), std::move(*other)};
+  tellUnknown(sources.own, console);
+  tellUnknown(sources.other, console);
+
+  const MergeSide side = options.takesOther ? MergeSide::other : MergeSide::own;
+  MergedTree merged = mergeSetups(sources, options.out, [side](const MergeConflict&) { return side; });
+  const std::vector<MergeQuestion> questions =
+      questionsOf(merged.conflicts, *sources.own.setup.tree(options.out),
+                  *sources.other.setup.tree(options.out), options.out);
+  const bool isWritten = questions.empty() || options.takesOwn || options.takesOther;
+  unsigned faults = 0;
+  if (isWritten) {
+    SetupFile result = SetupFile::fromTree(std::move(merged.file), options.out, &host);
+    if (const int status = saveSetup(result, options.out, console); status != kClean) return status;
+    faults = tellFaults(result, console);
+  }
+  if (options.json) {
+    Json report{{"conflicts", Json::array()}, {"takenFromB", merged.takenFromOther}, {"written", isWritten}};
+    for (std::size_t i = 0; i < questions.size(); ++i)
+      report["conflicts"].push_back(jsonOf(questions[i], merged.conflicts[i].path));
+    if (isWritten) report["faults"] = faults;
+    console.out << report.dump(2, ' ', false, Json::error_handler_t::replace) << '\n';
+    return questions.empty() ? kClean : kFaultsFound;
+  }
+  for (const MergeQuestion& question : questions) console.out << lineOf(question);
+  const std::size_t count = questions.size();
+  if (!isWritten) {
+    console.note(fmt::format("{} conflict{}; nothing is written without --ours (A) or --theirs (B)", count,
+                             count == 1 ? "" : "s"));
+  } else {
+    console.out << fmt::format("{}: {} change{} taken from B, {} conflict{}, {} fault{}\n", options.out,
+                               merged.takenFromOther, merged.takenFromOther == 1 ? "" : "s", count,
+                               count == 1 ? "" : "s", faults, faults == 1 ? "" : "s");
+  }
+  return count == 0 ? kClean : kFaultsFound;
+}
+
+}  // namespace
+
+void addMerge(CLI::App& tool, Action& action) {
+  std::shared_ptr<Options> options;
+  CLI::App& command = addCommand(
+      tool, action, "merge",
+      "Makes one setup of two that come from a third; exit status 0 for a clean merge, 1 for conflicts, 2 "
+      "for trouble",
+      merge, options);
+  command.add_option("BASE", options->base, "The setup that both come from")->required();
+  command.add_option("A", options->own, "A setup")->required();
+  command.add_option("B", options->other, "Another one")->required();
+  command.add_option("-o,--out", options->out, "The setup to write")->required();
+  CLI::Option* ours = command.add_flag("--ours", options->takesOwn, "In conflicts what A has");
+  command.add_flag("--theirs", options->takesOther, "In conflicts what B has")->excludes(ours);
+  command.add_flag("--as-written", options->asWritten,
+                   "Take file names as they are written, as if all lay in the folder of the result");
+  addForce(command, options->force);
+  command.add_flag("--json", options->json, "The conflicts and the outcome as JSON");
+}
+
+}  // namespace gridbay::cli

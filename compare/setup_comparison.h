@@ -1,0 +1,79 @@
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <optional>
+#include <span>
+#include <string>
+#include <vector>
+
+#include "pages/form.h"
+
+namespace gridbay {
+
+// Something that two setups hold differently, as their pages show it; or, where no page does, by its keyword.
+struct Difference {
+  std::int32_t page = 0;      // 0 where none shows it
+  std::string pageName = {};  // with the root of the tree that it stands under
+  std::string thing = {};     // "Drying depth", "Type, row 2"; a path; empty for a page as a whole
+  // What each shows; nothing where it has no such thing.
+  std::optional<std::string> own = {};
+  std::optional<std::string> other = {};
+
+  // Where on its page: a control by its label and number among those of that label; or a row and column (0
+  // for the whole row) of the n-th table, from 1. What is shown for the current row of a table has that row.
+  std::string label = {};
+  int labelNumber = 0;
+  int table = 0;
+  int row = 0;
+  int column = 0;
+  int currentRow = 0;
+
+  // The keywords that make it, by their paths, as far as they are known.
+  std::vector<std::string> keywords = {};
+
+  bool operator==(const Difference&) const = default;
+};
+
+// What two setups have each made into something else, in words, with the one or the other to be chosen.
+struct MergeQuestion {
+  std::string thing;  // "Basic Parameters, Flood and Dry: Drying depth", or a path
+  std::optional<std::string> base;
+  std::optional<std::string> own;
+  std::optional<std::string> other;
+  bool takesOther = false;
+};
+
+// An open setup beside another one, which is never changed. All of it is virtual, as a host links nothing of
+// it.
+class SetupComparison {
+ public:
+  virtual ~SetupComparison() = default;
+
+  // Reads the setup to compare with; what is wrong, or empty.
+  virtual std::string open(const std::string& path) = 0;
+  virtual void close() = 0;
+  virtual bool isOpen() const = 0;
+  virtual std::string otherPath() const = 0;
+
+  // All that differs as the setup is now, in the order of the tree; until the next call.
+  virtual const std::vector<Difference>& differences() = 0;
+  // The other setup's page; null where it has none. Nothing on it can be used. It lives until the next call.
+  virtual Form* openPage(std::int32_t id) = 0;
+  // What the user sees is in other units.
+  virtual void unitsChanged() = 0;
+
+  // Makes a difference of the last look as the other setup has it; or all of a page; or all. One step each.
+  // What is wrong, or empty.
+  virtual std::string takeOver(std::size_t place) = 0;
+  virtual std::string takeOverPage(std::int32_t id) = 0;
+  virtual std::string takeOverAll() = 0;
+
+  // Reads two setups: the one that both have come from, and the one to merge. What is wrong, or empty. Then
+  // what is to be chosen; and the result in place of the setup, as one step.
+  virtual std::string startMerge(const std::string& base, const std::string& other) = 0;
+  virtual std::vector<MergeQuestion>& questions() = 0;
+  virtual std::string finishMerge() = 0;
+};
+
+}  // namespace gridbay

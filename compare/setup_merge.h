@@ -1,0 +1,29 @@
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "compare/setup_comparison.h"
+#include "compare/setup_difference.h"
+#include "compare/tree_merge.h"
+
+namespace gridbay {
+
+// Three setups on their way to one: the base, and the two that have come from it.
+struct MergeSources {
+  SetupOnDisk base;
+  SetupOnDisk own;
+  SetupOnDisk other;
+};
+
+// The setup that the two make together, as the file at `path` will have it: file names lead from there to
+// where they led before. Sections that this version does not know are left out.
+MergedTree mergeSetups(MergeSources& sources, const std::string& path, const MergeChoice& choose);
+
+// What was chosen, or is to be, in the words of the pages where one shows it. `own` and `other` are the files
+// that the conflicts come from, as a save to the path would write them.
+std::vector<MergeQuestion> questionsOf(const std::vector<MergeConflict>& conflicts, const KvsFile& own,
+                                       const KvsFile& other, const std::string& path,
+                                       const UnitChoices& units = {});
+
+}  // namespace gridbay

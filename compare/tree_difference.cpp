@@ -1,0 +1,69 @@
+#include "compare/tree_difference.h"
+
+#include "setup/global_kvs.h"
+#include "setup/setup_path.h"
+
+namespace gridbay {
+namespace {
+
+std::optional<std::string> shown(const Node* node) {
+  if (node == nullptr) return std::nullopt;
+  return node->isSection() ? std::string() : shownValues(*node);
+}
+
+// The path of a thing that one of the two sections has at least.
+std::string pathOf(const std::string& prefix, const NodeGroup<2>& sections, const NodeGroup<2>& nodes) {
+  const std::size_t holder = nodes[0] != nullptr ? 0 : 1;
+  return prefix + stepOfNode(*sections[holder], *nodes[holder]);
+}
+
+void compare(const NodeGroup<2>& sections, const std::string& prefix,
+             std::vector<KeywordDifference>& differences) {
+  for (const NodeGroup<2>& nodes : groupsOf<2>(sections)) {
+    const auto [own, other] = nodes;
+    const bool isSection = (own != nullptr ? own : other)->isSection();
+    if (own != nullptr && other != nullptr && isSection) {
+      compare(nodes, pathOf(prefix, sections, nodes) + "/", differences);
+    } else if (own == nullptr || other == nullptr || !sameKeyword(*own, *other)) {
+      differences.push_back({pathOf(prefix, sections, nodes), isSection, shown(own), shown(other)});
+    }
+  }
+}
+
+using IsTaken = std::function<bool(const std::string& path)>;
+
+void writeTaken(const NodeGroup<2>& sections, const std::string& prefix, const IsTaken& isTaken,
+                KvsFile& file) {
+  for (const NodeGroup<2>& nodes : groupsOf<2>(sections)) {
+    const auto [own, other] = nodes;
+    if (own != nullptr && other != nullptr && own->isSection()) {
+      kvsAddSection(file, own->name());
+      writeTaken(nodes, pathOf(prefix, sections, nodes) + "/", isTaken, file);
+      kvsEndSection(file);
+      continue;
+    }
+    const bool differs = own == nullptr || other == nullptr || !sameKeyword(*own, *other);
+    const Node* wanted = differs && isTaken(pathOf(prefix, sections, nodes)) ? other : own;
+    if (wanted != nullptr) writeNode(*wanted, file);
+  }
+}
+
+}  // namespace
+
+std::vector<KeywordDifference> differencesOf(const Node& own, const Node& other) {
+  std::vector<KeywordDifference> differences;
+  compare({&own, &other}, {}, differences);
+  return differences;
+}
+
+KvsHandle withTaken(const KvsFile& own, const KvsFile& other, const IsTaken& isTaken) {
+  KvsHandle file = kvsCreate();
+  kvsAddTarget(*file, CGlobalKvs::kTarget);
+  writeTaken(
+      {kvsTargetByNameNum(own, CGlobalKvs::kTarget, 1), kvsTargetByNameNum(other, CGlobalKvs::kTarget, 1)},
+      {}, isTaken, *file);
+  kvsEndSection(*file);
+  return file;
+}
+
+}  // namespace gridbay

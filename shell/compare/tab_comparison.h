@@ -1,0 +1,71 @@
+#pragma once
+
+#include <QPointer>
+#include <QTimer>
+#include <vector>
+
+#include "shell/compare/difference_marks.h"
+#include "shell/document_tab.h"
+
+namespace gridbay::shell {
+
+// Another setup beside an open one: its page beside that of the document, read only and scrolled with it,
+// what differs marked on both and in the tree. It looks again a moment after each edit.
+class TabComparison final : public QObject {
+  Q_OBJECT
+ public:
+  // That of a document; null where it has none.
+  static TabComparison* of(DocumentTab* tab);
+  // Begins one, or goes on with another setup; what is wrong, or empty.
+  static QString begin(DocumentTab& tab, const QString& path);
+  ~TabComparison() override;
+
+  // The comparison goes, and with it all that it shows.
+  void end();
+
+  QString otherName() const;
+  const std::vector<Difference>& differences() const { return differences_; }
+  // The difference that stands out, by its place; -1 for none.
+  int current() const { return current_; }
+  // Shows a difference on its page; with the focus on its field or cell where that is wanted.
+  void goTo(int place, bool withFocus);
+  // The next one, or the one before, round and round.
+  void step(int by);
+  // Each is one step of the history.
+  void takeOver();
+  void takeOverPage();
+  void takeOverAll();
+  // Looks now, and not in a moment.
+  void refresh();
+
+  PagePane& otherPane() { return *pane_; }
+  // Marks of the document's page and of the other one; null where there is none.
+  DifferenceMarks* marks() { return marks_; }
+  DifferenceMarks* otherMarks() { return otherMarks_; }
+
+ signals:
+  void changed();
+  void currentChanged(int place);
+  void failed(const QString& text);
+
+ private:
+  explicit TabComparison(DocumentTab& tab);
+
+  void showPage();
+  void markPage();
+  void markTree();
+  void joinScrolling();
+  void take(const std::function<std::string(SetupComparison&)>& act);
+  SetupComparison& comparison() { return tab_.editor().comparison(); }
+
+  DocumentTab& tab_;
+  PagePane* pane_;
+  QPointer<DifferenceMarks> marks_;
+  QPointer<DifferenceMarks> otherMarks_;
+  QTimer timer_;
+  std::vector<Difference> differences_;
+  int current_ = -1;
+  bool isScrolling_ = false;
+};
+
+}  // namespace gridbay::shell

@@ -1,0 +1,359 @@
+// Another setup beside the one that is open, as a user has it: real widgets, real keys and clicks, real
+// files, with no display.
+
+#include <QFileDialog>
+#include <QFileInfo>
+#include <QLabel>
+#include <QScrollBar>
+#include <QStatusBar>
+#include <QToolButton>
+
+#include "shell/compare/merge_dialog.h"
+#include "shell/grid_view.h"
+#include "tests/shell/desktop_fixture.h"
+
+namespace gridbay::shell {
+
+class CompareTest final : public DesktopFixture {
+  Q_OBJECT
+
+  static constexpr int kFloodAndDry = 26;
+  static constexpr int kAreas = 27;
+  static constexpr int kPeriod = 39;
+  static constexpr const char* kDepth = "Drying depth:";
+
+  TabComparison& comparison() { return *TabComparison::of(&tab()); }
+  CompareDock& dock() { return window_->differences(); }
+  QTreeWidgetItem* itemOf(const QString& caption) {
+    for (QTreeWidgetItem* item : tab().tree().findItems(caption, Qt::MatchExactly | Qt::MatchRecursive))
+      return item;
+    return nullptr;
+  }
+  bool isMarked(const QString& caption) {
+    return tab().tree().columnCount() == 2 && !itemOf(caption)->icon(1).isNull();
+  }
+  // The things that differ, as the list has them.
+  QStringList listed() {
+    QStringList things;
+    for (QTreeWidgetItemIterator item(&dock().list()); *item != nullptr; ++item) {
+      if ((*item)->childCount() == 0)
+        things << QString("%1: %2 | %3").arg((*item)->text(0), (*item)->text(1), (*item)->text(2));
+    }
+    return things;
+  }
+  void click(QAction* action) {
+    QWidget* button = dock().tools().widgetForAction(action);
+    QVERIFY(button->isVisible());
+    QTest::mouseClick(button, Qt::LeftButton);
+    QCoreApplication::processEvents();
+  }
+  QString undoName() {
+    const auto edit = tab().editor().undoable();
+    return edit ? QString::fromStdString(edit->name) : QString();
+  }
+  QLineEdit& otherEdit(const QString& label) {
+    QWidget* widget = comparison().otherPane().widgetOf(label);
+    return *qobject_cast<QLineEdit*>(widget->focusProxy() != nullptr ? widget->focusProxy() : widget);
+  }
+  // A copy of the setup with other values.
+  void makeOther(const QString& name, const QStringList& settings) {
+    QFile::remove(file(name));
+    QVERIFY(QFile::copy(file("s.v27"), file(name)));
+    if (!settings.isEmpty()) run("v27setup", QStringList{"set", name} + settings);
+  }
+
+ private slots:
+  void initTestCase() { makeFolder(); }
+  void init() {
+    makeWindow();
+    window_->resize(1500, 900);
+    makeOther("o.v27", {"NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.05",
+                        "NESTED_MODEL_GLOBALS/BATHYMETRY_SELECTION/AREA_2/Origin=37,33",
+                        "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD/Warm_Up_Period=7"});
+    QVERIFY(window_->openDocument(file("s.v27")) != nullptr);
+  }
+  void cleanup() { window_.reset(); }
+
+  void theSetupIsChosenByItsFile() {
+    auto* poll = new QTimer(qApp);
+    connect(poll, &QTimer::timeout, qApp, [poll, this] {
+      auto* files = qobject_cast<QFileDialog*>(QApplication::activeModalWidget());
+      if (files == nullptr) return;
+      poll->deleteLater();
+      files->findChild<QLineEdit*>()->setText(file("o.v27"));
+      QMetaObject::invokeMethod(files, "accept");
+    });
+    poll->start(20);
+    QTest::keyClick(window_.get(), Qt::Key_D, Qt::ControlModifier | Qt::ShiftModifier);
+    QTRY_VERIFY(TabComparison::of(&tab()) != nullptr);
+    QVERIFY(dock().isVisible());
+    QCOMPARE(dock().note().text(), QString("s.v27 and o.v27: 3 differences"));
+  }
+
+  void differingPagesAreListedAndMarked() {
+    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(dock().isVisible());
+    const QStringList things = listed();
+    QCOMPARE(things.size(), 3);
+    QVERIFY2(things.contains("Drying depth: 0.02 m | 0.05 m"), qPrintable(things.join("\n")));
+    QVERIFY(isMarked("Flood and Dry"));
+    QVERIFY(isMarked("Bathymetry"));
+    QVERIFY(!isMarked("Boundary"));
+    QCOMPARE(itemOf("Flood and Dry")->toolTip(1), QString("Flood and Dry: 1 difference from o.v27"));
+  }
+
+  void thePagesStandSideBySide() {
+    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(!comparison().otherPane().isVisible());
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    QCoreApplication::processEvents();
+    QVERIFY(comparison().otherPane().isVisible());
+    QCOMPARE(comparison().otherPane().findChild<QLabel*>()->text(), QString("Flood and Dry in o.v27"));
+    QCOMPARE(edit(kDepth).text(), QString("0.02"));
+    QCOMPARE(otherEdit(kDepth).text(), QString("0.05"));
+    QVERIFY(otherEdit(kDepth).isReadOnly());
+    // What differs has a frame around it on both.
+    const std::vector<QRect> own = comparison().marks()->rects();
+    QCOMPARE(own.size(), std::size_t{1});
+    const QPoint middle =
+        edit(kDepth).mapTo(comparison().marks()->parentWidget(), edit(kDepth).rect().center());
+    QVERIFY(own[0].contains(middle));
+    QCOMPARE(comparison().otherMarks()->rects().size(), std::size_t{1});
+    const QImage picture = comparison().marks()->parentWidget()->grab().toImage();
+    const QColor frame = tab().palette().color(QPalette::Active, QPalette::Link);
+    bool isPainted = false;
+    for (int y = own[0].top(); y <= own[0].top() + 3; ++y) {
+      const QColor at = picture.pixelColor(own[0].center().x(), y);
+      isPainted =
+          isPainted || (std::abs(at.red() - frame.red()) < 60 && std::abs(at.blue() - frame.blue()) < 60);
+    }
+    QVERIFY(isPainted);
+    // A page without differences has none.
+    QVERIFY(tab().goToPage(40));
+    QVERIFY(comparison().marks()->rects().empty());
+  }
+
+  void cellsAreMarkedAndReadOnly() {
+    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(tab().goToPage(kAreas));
+    QCoreApplication::processEvents();
+    GridView& table = *tab().pane().tableAt(1);
+    GridView& other = *comparison().otherPane().tableAt(1);
+    const Difference& difference = *std::ranges::find(comparison().differences(), kAreas, &Difference::page);
+    const QModelIndex cell = table.model()->index(difference.row - 1, difference.column - 1);
+    QCOMPARE(cell.data().toString(), QString("(36,33)"));
+    const QModelIndex otherCell = other.model()->index(cell.row(), cell.column());
+    QCOMPARE(otherCell.data().toString(), QString("(37,33)"));
+    QVERIFY(!otherCell.flags().testFlag(Qt::ItemIsEditable));
+    QVERIFY(!other.model()->setData(otherCell, "(1,1)", Qt::EditRole));
+    QTest::mouseClick(other.viewport(), Qt::LeftButton, {}, other.visualRect(otherCell).center());
+    QVERIFY(other.viewport()->findChild<QLineEdit*>() == nullptr);
+    const QRect mark = comparison().marks()->rects().at(0);
+    QVERIFY(mark.contains(
+        table.viewport()->mapTo(comparison().marks()->parentWidget(), table.visualRect(cell).center())));
+  }
+
+  void keysGoFromDifferenceToDifference() {
+    QVERIFY(window_->compareWith(file("o.v27")));
+    std::vector<int> pages;
+    for (int i = 0; i < 4; ++i) {
+      QTest::keyClick(window_.get(), Qt::Key_F8);
+      QCOMPARE(comparison().current(), i % 3);
+      pages.push_back(tab().currentPage());
+    }
+    QCOMPARE(pages, (std::vector<int>{kAreas, kPeriod, kFloodAndDry, kAreas}));
+    QVERIFY(tab().pane().tableAt(1)->hasFocus());
+    QTest::keyClick(window_.get(), Qt::Key_F8, Qt::ShiftModifier);
+    QCOMPARE(tab().currentPage(), kFloodAndDry);
+    QVERIFY(edit(kDepth).hasFocus());
+    QCOMPARE(dock().list().currentItem()->text(0), QString("Drying depth"));
+  }
+
+  void theListLeadsToThePage() {
+    QVERIFY(window_->compareWith(file("o.v27")));
+    QTreeWidget& list = dock().list();
+    QTreeWidgetItem* item = list.findItems("Drying depth", Qt::MatchExactly | Qt::MatchRecursive).at(0);
+    list.scrollToItem(item);
+    QTest::mouseClick(list.viewport(), Qt::LeftButton, {}, list.visualItemRect(item).center());
+    QCOMPARE(tab().currentPage(), kFloodAndDry);
+    QVERIFY(comparison().marks()->rects().size() == 1);
+  }
+
+  void aDifferenceIsTakenOverAndBack() {
+    QVERIFY(window_->compareWith(file("o.v27")));
+    QTest::keyClick(window_.get(), Qt::Key_F8, Qt::ShiftModifier);
+    QCOMPARE(edit(kDepth).text(), QString("0.02"));
+    click(dock().takeAction());
+    QCOMPARE(edit(kDepth).text(), QString("0.05"));
+    QCOMPARE(undoName(), QString("Take over Drying depth"));
+    QCOMPARE(window_->undoAction()->text(), QString("&Undo Take over Drying depth"));
+    QCOMPARE(listed().size(), 2);
+    QVERIFY(!isMarked("Flood and Dry"));
+    QVERIFY(comparison().marks()->rects().empty());
+    window_->undoAction()->trigger();
+    QCOMPARE(edit(kDepth).text(), QString("0.02"));
+    QTRY_COMPARE(listed().size(), 3);
+    QVERIFY(isMarked("Flood and Dry"));
+    // By its key.
+    QTest::keyClick(window_.get(), Qt::Key_F8, Qt::ShiftModifier);
+    QTest::keyClick(window_.get(), Qt::Key_T, Qt::ControlModifier | Qt::AltModifier);
+    QCOMPARE(undoName(), QString("Take over Drying depth"));
+  }
+
+  void aPageAndAllAreTakenOver() {
+    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(tab().goToPage(kAreas));
+    click(dock().takePageAction());
+    QCOMPARE(undoName(), QString("Take over Basic Parameters, Bathymetry"));
+    QCOMPARE(listed().size(), 2);
+    click(dock().takeAllAction());
+    QCOMPARE(undoName(), QString("Take over all"));
+    QVERIFY(listed().isEmpty());
+    QCOMPARE(dock().note().text(), QString("s.v27 and o.v27 are the same."));
+    QVERIFY(!dock().takeAllAction()->isEnabled());
+    QVERIFY(window_->saveDocument());
+    QCOMPARE(textOf(file("s.v27")), textOf(file("o.v27")));
+  }
+
+  void itFollowsEachEdit() {
+    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    enter(kDepth, "0.05");
+    QTRY_COMPARE(listed().size(), 2);
+    QVERIFY(!isMarked("Flood and Dry"));
+    enter("Flooding depth:", "0.9");
+    QTRY_COMPARE(listed().size(), 3);
+    QCOMPARE(comparison().marks()->rects().size(), std::size_t{1});
+  }
+
+  void bothPagesScrollTogether() {
+    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(tab().goToPage(29));
+    window_->resize(900, 420);
+    QCoreApplication::processEvents();
+    QScrollBar& own = *tab().pane().verticalScrollBar();
+    QScrollBar& other = *comparison().otherPane().verticalScrollBar();
+    const int most = std::min(own.maximum(), other.maximum());
+    if (most > 0) {
+      own.setValue(most);
+      QCOMPARE(other.value(), most);
+      other.setValue(0);
+      QCOMPARE(own.value(), 0);
+    }
+    GridView& table = *tab().pane().tableAt(1);
+    GridView& beside = *comparison().otherPane().tableAt(1);
+    const int wide =
+        std::min(table.horizontalScrollBar()->maximum(), beside.horizontalScrollBar()->maximum());
+    QVERIFY(most > 0 || wide > 0);
+    table.horizontalScrollBar()->setValue(wide);
+    QCOMPARE(beside.horizontalScrollBar()->value(), wide);
+  }
+
+  void unitsAreThoseOfTheDocument() {
+    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    UnitChoices us;
+    us.setSystem(UnitSystem::us);
+    tab().setUnits(us);
+    QTRY_VERIFY(listed().filter("Drying depth").value(0).contains("ft"));
+    QVERIFY(otherEdit(kDepth).text().startsWith("0.164"));
+  }
+
+  void itEnds() {
+    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    click(dock().endAction());
+    QVERIFY(TabComparison::of(&tab()) == nullptr);
+    QCOMPARE(tab().tree().columnCount(), 1);
+    QVERIFY(tab().pane().findChild<DifferenceMarks*>() == nullptr);
+    QVERIFY(listed().isEmpty());
+    QVERIFY(!dock().nextAction()->isEnabled());
+    // And begins again; the document goes with it.
+    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    QTest::keySequence(window_.get(), QKeySequence(QKeySequence::Close));
+    QVERIFY(window_->currentDocument() == nullptr);
+    QVERIFY(listed().isEmpty());
+  }
+
+  void eachDocumentHasItsOwn() {
+    QVERIFY(window_->compareWith(file("o.v27")));
+    makeOther("p.v27", {});
+    QVERIFY(window_->openDocument(file("p.v27")) != nullptr);
+    QVERIFY(listed().isEmpty());
+    QVERIFY(!dock().takeAllAction()->isEnabled());
+    QVERIFY(window_->openDocument(file("s.v27")) != nullptr);
+    QCOMPARE(listed().size(), 3);
+  }
+
+  void whatCannotBeReadIsTold() {
+    write(file("no.v27"), "OTHER {}\n");
+    for (const QString name : {"none.v27", "no.v27"}) {
+      bool isDone = true;
+      const QStringList told = answers({QMessageBox::Ok}, [&] { isDone = window_->compareWith(file(name)); });
+      QVERIFY(!isDone);
+      QCOMPARE(told.size(), 1);
+      QVERIFY2(told[0].contains(name), qPrintable(told[0]));
+      QVERIFY(TabComparison::of(&tab()) == nullptr);
+    }
+  }
+
+  void aMergeIsOneStep() {
+    makeOther("base.v27", {});
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    enter("Flooding depth:", "0.9");
+    QVERIFY(window_->mergeWith(file("base.v27"), file("o.v27")));
+    QCOMPARE(edit(kDepth).text(), QString("0.05"));
+    QCOMPARE(edit("Flooding depth:").text(), QString("0.9"));
+    QCOMPARE(undoName(), QString("Merge"));
+    window_->undoAction()->trigger();
+    QCOMPARE(edit(kDepth).text(), QString("0.02"));
+  }
+
+  void conflictsHaveAChoiceEach() {
+    makeOther("base.v27", {});
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    enter(kDepth, "0.01");
+    const auto merge = [this](bool takesOther, bool accepts) {
+      QTimer poll;
+      bool isShown = false;
+      connect(&poll, &QTimer::timeout, qApp, [&] {
+        auto* dialog = qobject_cast<MergeDialog*>(QApplication::activeModalWidget());
+        if (dialog == nullptr) return;
+        poll.stop();
+        isShown =
+            dialog->list().topLevelItemCount() == 1 &&
+            dialog->list().topLevelItem(0)->text(0) == "Basic Parameters, Flood and Dry: Drying depth" &&
+            dialog->list().topLevelItem(0)->text(2) == "0.01 m" &&
+            dialog->list().topLevelItem(0)->text(3) == "0.05 m";
+        dialog->choice(0).setFocus();
+        if (takesOther) QTest::keyClick(&dialog->choice(0), Qt::Key_Down);
+        accepts ? dialog->accept() : dialog->reject();
+      });
+      poll.start(10);
+      const bool isDone = window_->mergeWith(file("base.v27"), file("o.v27"));
+      return isShown && isDone == accepts;
+    };
+    QVERIFY(merge(true, false));
+    QCOMPARE(edit(kDepth).text(), QString("0.01"));
+    QVERIFY(merge(false, true));
+    QCOMPARE(edit(kDepth).text(), QString("0.01"));
+    window_->undoAction()->trigger();
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    QVERIFY(merge(true, true));
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    QCOMPARE(edit(kDepth).text(), QString("0.05"));
+  }
+};
+
+}  // namespace gridbay::shell
+
+int main(int argc, char** argv) {
+  QApplication application(argc, argv);
+  QCoreApplication::setOrganizationName("test");
+  QCoreApplication::setApplicationName("compare-test");
+  gridbay::shell::CompareTest test;
+  return QTest::qExec(&test, argc, argv);
+}
+
+#include "compare_test.moc"
