@@ -8,6 +8,7 @@
 #include "basic/grid_file.h"
 #include "basic/nesting.h"
 #include "platform/cartography/cartography.h"
+#include "platform/cartography/utm_zone.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_operations.h"
 
@@ -32,8 +33,7 @@ std::optional<TsbGeography> geographyOf(const CBathymetryObjectKvs* area) {
 }  // namespace
 
 std::string completeProjection(const TsbGeography& place) {
-  if (place.projection != "UTM") return place.projection;
-  return formatted(texts::utmZone, place.projection, std::floor((place.longitude + 180) / 6 + 1));
+  return withUtmZone(place.projection, place.longitude);
 }
 
 void CBathymetryKvs::OverlandFileRow::save(const CBathymetryKvs& areas, KvsFile& file,

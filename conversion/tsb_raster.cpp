@@ -9,6 +9,7 @@
 
 #include "conversion/moments.h"
 #include "platform/cartography/cartography.h"
+#include "platform/cartography/utm_zone.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/units/units.h"
 
@@ -17,7 +18,10 @@ namespace {
 
 class TsbRaster final : public Raster {
  public:
-  TsbRaster(TsbFile file, std::size_t item) : file_(std::move(file)), item_(item) {}
+  TsbRaster(TsbFile file, std::size_t item)
+      : file_(std::move(file)), item_(item), geography_(definition().geography) {
+    if (geography_) geography_->projection = withUtmZone(geography_->projection, geography_->longitude);
+  }
 
   int bands() const override { return item_ == 0 ? 0 : static_cast<int>(definition().time.count); }
   std::string bandName(int band) const override {
@@ -48,7 +52,7 @@ class TsbRaster final : public Raster {
         {CVdUnitConverter(x.unit, "m").Convert(x.first), CVdUnitConverter(y.unit, "m").Convert(y.first)},
         {dx, 0},
         {0, dy}};
-    const std::optional<TsbGeography>& geography = definition().geography;
+    const std::optional<TsbGeography>& geography = geography_;
     double east = 0;
     double north = 0;
     if (!geography || !CVdMapProjection(geography->projection)
@@ -76,7 +80,7 @@ class TsbRaster final : public Raster {
     return {};
   }
   std::string projection() const override {
-    return definition().geography ? definition().geography->projection : std::string();
+    return geography_ ? geography_->projection : std::string();
   }
   std::optional<double> missingValue() const override { return definition().items[item_ - 1].deleteValue; }
 
@@ -116,6 +120,7 @@ class TsbRaster final : public Raster {
   TsbFile file_;
   std::size_t item_;  // from 1; 0 as long as none is chosen
   std::size_t step_ = 0;
+  std::optional<TsbGeography> geography_;  // with a zone where the file leaves it out
 };
 
 }  // namespace

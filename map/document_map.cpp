@@ -26,14 +26,22 @@ class DocumentMap final : public MapEditor {
     return map_.previewNestedArea(root(), corner, opposite);
   }
   std::string addNestedArea(MapPoint corner, MapPoint opposite, const std::string& raster,
-                            const std::string& file, const std::function<bool(double)>& progress) override {
+                            const std::string& file) override {
     if (std::string fault = SetupMap::noMoreAreas(root()); !fault.empty()) return fault;
     const AreaPlace place = map_.previewNestedArea(root(), corner, opposite);
     if (!place.fault.empty()) return place.fault;
-    // A copy, as the progress may bring another scene.
+    // Copies, as the map is drawn, and the document may even be gone, while the work lets the program go on.
     const MapScene scene = map_.scene(root());
-    const Outcome cut = cutNestedGrid(map_, scene, place, raster, file, progress);
-    if (!cut) return cut.error();
+    const std::string projection = map_.coordinates().text();
+    std::string fault;
+    const std::weak_ptr<const bool> alive = alive_;
+    document_.host().doLongWork("Cutting the grid of the new area", [&](const Progress& progress) {
+      const Outcome cut = cutNestedGrid(projection, scene, place, raster, file,
+                                        [&](double done) { return progress(done) && !alive.expired(); });
+      if (!cut) fault = cut.error();
+    });
+    if (alive.expired()) return "The setup was closed meanwhile";
+    if (!fault.empty()) return fault;
     return record([&] { return map_.addArea(root(), place.enclosing, place.origin, file); });
   }
 
@@ -49,8 +57,8 @@ class DocumentMap final : public MapEditor {
   std::string removeVertex(MapFeatureId feature, std::size_t vertex) override {
     return record([&] { return map_.removeVertex(root(), feature, vertex); });
   }
-  std::string addFeature(MapKind kind, const std::vector<MapPoint>& points) override {
-    return record([&] { return map_.addFeature(root(), kind, points); });
+  std::string addFeature(MapKind kind, const std::vector<MapPoint>& points, std::int32_t page) override {
+    return record([&] { return map_.addFeature(root(), kind, points, page); });
   }
   std::string removeFeature(MapFeatureId feature) override {
     return record([&] { return map_.removeFeature(root(), feature); });
@@ -73,6 +81,7 @@ class DocumentMap final : public MapEditor {
 
   CV27SetupDoc& document_;
   SetupMap map_;
+  std::shared_ptr<const bool> alive_ = std::make_shared<const bool>(true);
 };
 
 }  // namespace

@@ -5,86 +5,22 @@
 #include <algorithm>
 #include <cmath>
 
-#include "advection_dispersion/box_summation.h"
-#include "advection_dispersion/line_discharge.h"
-#include "advection_dispersion/result.h"
 #include "basic/boundary.h"
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
 #include "basic/source_sink.h"
-#include "ecology/results.h"
-#include "families/line_box.h"
-#include "families/transport_results.h"
 #include "hydrodynamic/boundary.h"
 #include "hydrodynamic/result.h"
-#include "mud_transport/box_summation.h"
-#include "mud_transport/line_discharge.h"
-#include "mud_transport/result.h"
-#include "mud_transport_expanded/line_discharge.h"
-#include "mud_transport_expanded/result.h"
+#include "map/module_outputs.h"
 
 namespace gridbay {
 namespace {
 
 using HdOutput = CNhdResultObjectKvs;
 
-// The outputs of the module that is chosen.
-struct Outputs {
-  PageId page = PageId::none;
-  int count = 0;
-  std::function<TransportOutput*(int number)> item;
-};
-
-template <class Results>
-Outputs outputsOf(PageId page, Results& results) {
-  return {page, results.outputs.GetCount(),
-          [&results](int number) -> TransportOutput* { return results.outputs.GetItem(number); }};
-}
-
-Outputs moduleOutputs(CGlobalKvs& root) {
-  switch (root.moduleSelection->simulationType) {
-    case module::kAdvectionDispersion:
-      return outputsOf(PageId::adResult, *root.nadResult);
-    case module::kMudTransport:
-      return outputsOf(PageId::mtResult, *root.nmtResult);
-    case module::kMudTransportExpanded:
-      return outputsOf(PageId::mtExpResult, *root.nmtExpResult);
-    case module::kEcological:
-      return outputsOf(PageId::ecoResults, *root.wqsResults);
-    default:
-      return {};
-  }
-}
-
-TransportOutput* moduleOutput(CGlobalKvs& root, MapFeatureId id) {
-  const Outputs outputs = moduleOutputs(root);
-  return static_cast<std::int32_t>(outputs.page) == id.page && outputs.item ? outputs.item(id.number)
-                                                                            : nullptr;
-}
-
 HdOutput* flowOutput(CGlobalKvs& root, MapFeatureId id) {
   return id.page == static_cast<std::int32_t>(PageId::hdResult) ? root.nhdResult->outputs.GetItem(id.number)
                                                                 : nullptr;
-}
-
-std::vector<LineOrBoxList*> linesAndBoxes(CGlobalKvs& root) {
-  switch (root.moduleSelection->simulationType) {
-    case module::kAdvectionDispersion:
-      return {root.nadLineDischarge.get(), root.nadBoxSummation.get()};
-    case module::kMudTransport:
-      return {root.nmtLineDischarge.get(), root.nmtBoxSummation.get()};
-    case module::kMudTransportExpanded:
-      return {root.nmtExpLineDischarge.get()};
-    default:
-      return {};
-  }
-}
-
-LineOrBox* lineOrBox(CGlobalKvs& root, MapFeatureId id) {
-  for (LineOrBoxList* list : linesAndBoxes(root)) {
-    if (static_cast<std::int32_t>(list->kind().page) == id.page) return list->GetLineOrBox(id.number);
-  }
-  return nullptr;
 }
 
 MapKind kindOf(Extent extent) {
@@ -209,7 +145,7 @@ std::vector<ListedShape> listedShapes(CGlobalKvs& root) {
     const HdOutput& output = root.nhdResult->outputs.at(number);
     add(kindOf(output), number, PageId::hdResult, titleOr(output.title, "Output", number));
   }
-  const Outputs outputs = moduleOutputs(root);
+  const ModuleOutputs outputs = moduleOutputs(root);
   for (int number = 1; number <= outputs.count; ++number) {
     const TransportOutput& output = *outputs.item(number);
     add(kindOf(extentOf(output.part)), number, outputs.page, titleOr(output.title, "Output", number));

@@ -40,7 +40,9 @@ const MapCoordinates::Way* MapCoordinates::wayOf(const std::string& projection, 
     found =
         ways_.emplace(projection, std::make_unique<Way>(Way{{projection, text_}, {text_, projection}})).first;
   }
-  if (!found->second->there.isValid() || !found->second->back.isValid())
+  if (projection == "UTM")
+    *fault = "has UTM coordinates without a zone: give it, as in UTM-32";
+  else if (!found->second->there.isValid() || !found->second->back.isValid())
     *fault = CVdMapProjection(projection).IsValid() ? "can't be brought into the projection of Area 1"
                                                     : "has a projection that is not known";
   return found->second.get();

@@ -19,6 +19,7 @@ class MapCoordinates {
 
   // Of Area 1, by its text; empty for local coordinates. True where it is another one than before.
   bool setProjection(const std::string& text);
+  const std::string& text() const { return text_; }
   const CVdMapProjection& projection() const { return projection_; }
   bool isLocal() const { return projection_.IsLocal(); }
 

@@ -2,7 +2,6 @@
 
 #include <array>
 #include <cstddef>
-#include <functional>
 #include <optional>
 #include <string>
 #include <vector>
@@ -55,11 +54,10 @@ class MapEditor {
   // The nested area that a rectangle of two opposite corners becomes, in the finest area that holds both: a
   // third of its spacing, an extent that nests.
   virtual AreaPlace previewNestedArea(MapPoint corner, MapPoint opposite) = 0;
-  // Cuts its grid from a raster, or from another grid file, into a new file; told how much is done, 0 to 1,
-  // the progress says whether to go on.
+  // Cuts its grid from a raster, or from another grid file, into a new file. The host shows how much is done,
+  // and lets the user stop it.
   virtual std::string addNestedArea(MapPoint corner, MapPoint opposite, const std::string& raster,
-                                    const std::string& file,
-                                    const std::function<bool(double)>& progress = {}) = 0;
+                                    const std::string& file) = 0;
 
   // Points of a feature, from 0. Ends of user-specified boundaries slide along the border of Area 1. Corners
   // of polygons, points of outputs and points of dikes, weirs and culverts can be put in and taken out.
@@ -69,9 +67,10 @@ class MapEditor {
   virtual std::string insertVertex(MapFeatureId feature, std::size_t vertex, MapPoint place) = 0;
   virtual std::string removeVertex(MapFeatureId feature, std::size_t vertex) = 0;
   // A new feature of its list with these points: a source (one point, or two for a pair), a sink is made of a
-  // source on its page; a user-specified boundary, an output of the flow calculation, a polygon, a structure.
-  // The page is of no meaning.
-  virtual std::string addFeature(MapKind kind, const std::vector<MapPoint>& points) = 0;
+  // source on its page; a user-specified boundary, an output, a polygon, a structure, a line or box of the
+  // module that is chosen. Outputs are those of the flow calculation unless the page is that of the module's.
+  virtual std::string addFeature(MapKind kind, const std::vector<MapPoint>& points,
+                                 std::int32_t page = 0) = 0;
   virtual std::string removeFeature(MapFeatureId feature) = 0;
 };
 

@@ -129,6 +129,10 @@ struct MapScene {
   std::string projectionText;  // the full text; empty for local coordinates
   std::vector<MapArea> areas;  // in the order of their numbers
   std::vector<MapFeature> features;
+  // The pages of what the module that is chosen writes, and more of which can be drawn; 0 where it has none.
+  std::int32_t moduleOutputs = 0;
+  std::int32_t moduleLines = 0;
+  std::int32_t moduleBoxes = 0;
 
   // Null where there is none.
   const MapArea* area(std::int32_t number) const {

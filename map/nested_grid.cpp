@@ -12,6 +12,7 @@
 #include "conversion/raster_reader.h"
 #include "conversion/tsb_raster.h"
 #include "core/land_value.h"
+#include "map/map_coordinates.h"
 #include "platform/files/may_write.h"
 #include "platform/tsb/tsb_writer.h"
 #include "platform/units/units.h"
@@ -20,7 +21,8 @@ namespace gridbay {
 namespace {
 
 constexpr float kNone = std::numeric_limits<float>::quiet_NaN();
-constexpr std::size_t kPointsAtOnce = std::size_t{1} << 22;
+constexpr std::size_t kMostKept = std::size_t{1} << 23;  // points of a raster, unless two rows have more
+constexpr int kBlock = 256;                              // points along the edge of what is cut at once
 
 // Values of a raster at any places on the map, by the four points around each. Where one of them is land the
 // nearest one counts, so that a coast stays where it is.
@@ -37,17 +39,32 @@ class Sampler {
   Outcome sample(std::vector<MapPoint> places, std::span<float> values) {
     if (const std::string fault = coordinates_.fromMap(projection_, places); !fault.empty())
       return Failure{"The raster " + fault};
-    int least = raster_.rows();
-    int most = -1;
     for (MapPoint& place : places) {
       const auto [column, row] = grid_.pointOf(place);
       place = {column, row};
-      if (!isInside(place)) continue;
-      least = std::min(least, static_cast<int>(std::max(std::floor(row), 0.0)));
-      most = std::max(most, std::min(static_cast<int>(std::floor(row)) + 1, raster_.rows() - 1));
     }
     std::ranges::fill(values, kNone);
+    return sampleAt(places, values);
+  }
+
+ private:
+  // By columns and rows of the raster. What needs too much of it at once is done in two halves.
+  Outcome sampleAt(std::span<const MapPoint> places, std::span<float> values) {
+    int least = raster_.rows();
+    int most = -1;
+    for (const MapPoint& place : places) {
+      if (!isInside(place)) continue;
+      least = std::min(least, static_cast<int>(std::max(std::floor(place.north), 0.0)));
+      most = std::max(most, std::min(static_cast<int>(std::floor(place.north)) + 1, raster_.rows() - 1));
+    }
     if (most < least) return {};
+    const auto needed =
+        static_cast<std::size_t>(most - least + 1) * static_cast<std::size_t>(raster_.columns());
+    if (needed > kMostKept && places.size() > 1) {
+      const std::size_t half = places.size() / 2;
+      if (const Outcome done = sampleAt(places.first(half), values.first(half)); !done) return done;
+      return sampleAt(places.subspan(half), values.subspan(half));
+    }
     if (const Outcome done = keep(least, most); !done) return done;
     for (std::size_t i = 0; i < places.size(); ++i) {
       if (isInside(places[i])) values[i] = between(places[i]);
@@ -55,7 +72,6 @@ class Sampler {
     return {};
   }
 
- private:
   // Up to half a point beyond the outermost ones.
   bool isInside(MapPoint at) const {
     constexpr double kHalf = 0.5 + 1e-6;
@@ -106,17 +122,31 @@ class Sampler {
   int rows_ = 0;
 };
 
-// The places of some rows of a grid.
-std::vector<MapPoint> placesOf(const AreaPlace& place, int firstRow, int rows) {
+// The values of some rows of a grid, block by block, so that those of a raster that is turned against it lie
+// near each other.
+Outcome sampleRows(Sampler& sampler, const AreaPlace& place, int firstRow, int rows,
+                   std::span<float> values) {
+  const auto columns = static_cast<std::size_t>(place.nx);
   std::vector<MapPoint> places;
-  places.reserve(static_cast<std::size_t>(place.nx) * static_cast<std::size_t>(rows));
-  for (int k = firstRow; k < firstRow + rows; ++k) {
-    for (int j = 0; j < place.nx; ++j) places.push_back(place.grid.at(j, k));
+  std::vector<float> block;
+  for (int firstColumn = 0; firstColumn < place.nx; firstColumn += kBlock) {
+    const int across = std::min(kBlock, place.nx - firstColumn);
+    places.clear();
+    for (int k = firstRow; k < firstRow + rows; ++k) {
+      for (int j = firstColumn; j < firstColumn + across; ++j) places.push_back(place.grid.at(j, k));
+    }
+    block.resize(places.size());
+    if (const Outcome done = sampler.sample(places, block); !done) return done;
+    for (std::size_t row = 0; row < static_cast<std::size_t>(rows); ++row)
+      std::ranges::copy(
+          std::span(block).subspan(row * static_cast<std::size_t>(across), static_cast<std::size_t>(across)),
+          values.begin() +
+              static_cast<std::ptrdiff_t>(row * columns + static_cast<std::size_t>(firstColumn)));
   }
-  return places;
+  return {};
 }
 
-TsbDefinition definitionOf(SetupMap& map, const MapArea& outer, const AreaPlace& place,
+TsbDefinition definitionOf(const MapCoordinates& coordinates, const MapArea& outer, const AreaPlace& place,
                            const std::string& raster, const std::string& file) {
   const bool isTurned = TsbGeography{{}, 0, 0, outer.rotation}.isTurned();
   TsbDefinition definition;
@@ -131,15 +161,18 @@ TsbDefinition definitionOf(SetupMap& map, const MapArea& outer, const AreaPlace&
   definition.items = {{quantity == nullptr ? std::string("Bathymetry") : std::string(quantity->name),
                        item::kBathymetry, "m"}};
   definition.customBlocks = {{"V27_Misc", {0, 0, 0, outer.landValue}}};
-  if (const auto there = map.geographic(place.grid.first))
-    definition.geography = {map.coordinates().projection().Wkt(), (*there)[0], (*there)[1], outer.rotation};
+  TsbGeography there{coordinates.projection().Wkt(), 0, 0, outer.rotation};
+  if (coordinates.projection().Proj2Geo(place.grid.first.east, place.grid.first.north, &there.longitude,
+                                        &there.latitude))
+    definition.geography = there;
   return definition;
 }
 
 }  // namespace
 
-Outcome cutNestedGrid(SetupMap& map, const MapScene& scene, const AreaPlace& place, const std::string& raster,
-                      const std::string& file, const std::function<bool(double)>& progress) {
+Outcome cutNestedGrid(const std::string& projection, const MapScene& scene, const AreaPlace& place,
+                      const std::string& raster, const std::string& file,
+                      const std::function<bool(double)>& progress) {
   const MapArea* outer = scene.area(place.enclosing);
   if (outer == nullptr || !outer->isPlaced || place.nx < 1) return Failure{"There is no area around it"};
   std::vector<std::string> inputs{raster};
@@ -148,7 +181,8 @@ Outcome cutNestedGrid(SetupMap& map, const MapScene& scene, const AreaPlace& pla
 
   const Result<std::unique_ptr<Raster>> around = openTsbRaster(outer->file, outer->item);
   if (!around) return Failure{around.error()};
-  MapCoordinates& coordinates = map.coordinates();
+  MapCoordinates coordinates;
+  coordinates.setProjection(projection);
   const std::string own = (*around)->projection();
   Sampler enclosing(**around, coordinates, own, outer->landValue);
 
@@ -176,10 +210,11 @@ Outcome cutNestedGrid(SetupMap& map, const MapScene& scene, const AreaPlace& pla
     sampler.emplace(**source, coordinates, (*source)->projection(), land);
   }
 
-  Result<TsbWriter> writer = TsbWriter::create(file, definitionOf(map, *outer, place, raster, file));
+  Result<TsbWriter> writer = TsbWriter::create(file, definitionOf(coordinates, *outer, place, raster, file));
   if (!writer) return Failure{writer.error()};
   const auto columns = static_cast<std::size_t>(place.nx);
-  const int rowsAtOnce = static_cast<int>(std::clamp<std::size_t>(kPointsAtOnce / columns, 1, 256));
+  constexpr std::size_t kPointsAtOnce = std::size_t{1} << 22;
+  const int rowsAtOnce = static_cast<int>(std::clamp<std::size_t>(kPointsAtOnce / columns, 1, kBlock));
   bool hasAny = false;
   std::vector<float> values;
   std::vector<float> behind;
@@ -189,7 +224,7 @@ Outcome cutNestedGrid(SetupMap& map, const MapScene& scene, const AreaPlace& pla
     behind = values;
     std::string why;
     if (sampler) {
-      if (const Outcome done = sampler->sample(placesOf(place, first, rows), values); !done)
+      if (const Outcome done = sampleRows(*sampler, place, first, rows, values); !done)
         return Failure{fmt::format("cannot cut from \"{}\": {}", raster, done.error())};
     } else if (!(*source)->read(first, values, &why)) {
       return Failure{fmt::format("cannot read \"{}\": {}", raster, why)};
@@ -201,7 +236,7 @@ Outcome cutNestedGrid(SetupMap& map, const MapScene& scene, const AreaPlace& pla
     const auto gone = std::ranges::count_if(values, isMissing);
     hasAny = hasAny || static_cast<std::size_t>(gone) < values.size();
     if (gone > 0) {
-      if (const Outcome done = enclosing.sample(placesOf(place, first, rows), behind); !done)
+      if (const Outcome done = sampleRows(enclosing, place, first, rows, behind); !done)
         return Failure{fmt::format("cannot read \"{}\": {}", outer->file, done.error())};
       for (std::size_t i = 0; i < values.size(); ++i) {
         if (isMissing(values[i])) values[i] = std::isfinite(behind[i]) ? behind[i] : outer->landValue;

@@ -15,6 +15,7 @@
 #include "hydrodynamic/result.h"
 #include "map/map_areas.h"
 #include "map/map_names.h"
+#include "map/module_outputs.h"
 #include "structures/line_structure.h"
 
 namespace gridbay {
@@ -22,21 +23,13 @@ namespace {
 
 constexpr const char* kPlacedByHotStart = "A hot start file says itself where its area lies";
 
-MapFeatureId idOf(MapKind kind, int number, PageId page) {
-  return {kind, number, static_cast<std::int32_t>(page)};
-}
-
-MapEdit refused(std::string fault) {
-  return {.fault = std::move(fault)};
-}
-
 GridFrame frameOf(const GridHeader& header) {
   return {header.geography, header.firstX, header.firstY, header.dx, header.dy};
 }
 
 MapEdit made(MapFeatureId feature, std::string_view what) {
   return {.page = static_cast<PageId>(feature.page),
-          .name = fmt::format("{} {}, {}", kindName(feature.kind), feature.number, what)};
+          .name = fmt::format("{} {}, {}", editKindName(feature.kind), feature.number, what)};
 }
 
 std::string pointName(MapFeatureId feature, std::size_t vertex) {
@@ -77,12 +70,6 @@ bool isFinite(MapPoint point) {
   return std::isfinite(point.east) && std::isfinite(point.north);
 }
 
-constexpr std::array kOutputs{MapKind::outputMap, MapKind::outputLine, MapKind::outputPoints};
-
-bool isOutput(MapKind kind) {
-  return std::ranges::find(kOutputs, kind) != kOutputs.end();
-}
-
 }  // namespace
 
 GridPoint slideAlongBorder(double j, double k, std::int32_t nx, std::int32_t ny,
@@ -119,6 +106,11 @@ const MapScene& SetupMap::scene(CGlobalKvs& root) {
   scene_.projectionText = coordinates_.projection().Wkt();
   if (scene_.projectionText != before) structures_.forget();
   scene_.features.clear();
+  scene_.moduleOutputs = static_cast<std::int32_t>(moduleOutputs(root).page);
+  scene_.moduleLines = scene_.moduleBoxes = 0;
+  for (const LineOrBoxList* list : linesAndBoxes(root))
+    (list->kind().isLine ? scene_.moduleLines : scene_.moduleBoxes) =
+        static_cast<std::int32_t>(list->kind().page);
   appendOnGrids(root);
   structures_.append(root, coordinates_, scene_.areas, scene_.features);
   return scene_;
@@ -170,8 +162,8 @@ AreaPlace SetupMap::previewMoveArea(CGlobalKvs& root, std::int32_t number, MapPo
 
 MapEdit SetupMap::moveArea(CGlobalKvs& root, std::int32_t number, MapPoint first) {
   const AreaPlace place = previewMoveArea(root, number, first);
-  if (place.nx == 0) return refused(place.fault);
-  if (root.bathymetry->hotStart == 1) return refused(kPlacedByHotStart);
+  if (place.nx == 0) return refusedEdit(place.fault);
+  if (root.bathymetry->hotStart == 1) return refusedEdit(kPlacedByHotStart);
   root.bathymetry->at(number).origin = place.origin;
   return {.page = PageId::bathymetry, .name = fmt::format("Area {}, Origin", number)};
 }
@@ -222,7 +214,7 @@ std::string SetupMap::noMoreAreas(const CGlobalKvs& root) {
 
 MapEdit SetupMap::addArea(CGlobalKvs& root, std::int32_t enclosing, GridPoint origin,
                           const std::string& file) {
-  if (std::string fault = noMoreAreas(root); !fault.empty()) return refused(std::move(fault));
+  if (std::string fault = noMoreAreas(root); !fault.empty()) return refusedEdit(std::move(fault));
   CBathymetryKvs& areas = *root.bathymetry;
   const int number = areas.GetCount() + 1;
   areas.SetNoAreas(number);
@@ -238,7 +230,8 @@ SetupMap::Shaped SetupMap::shaped(CGlobalKvs& root, MapFeatureId feature, std::s
   Shaped result;
   std::optional<GridShape> shape = shapeOf(root, feature);
   if (!shape || vertex >= shape->points.size()) {
-    result.fault = fmt::format("{} {} has no point {}", kindName(feature.kind), feature.number, vertex + 1);
+    result.fault =
+        fmt::format("{} {} has no point {}", editKindName(feature.kind), feature.number, vertex + 1);
     return result;
   }
   std::vector<GridPoint>& points = shape->points;
@@ -298,22 +291,23 @@ MapEdit SetupMap::moveVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t
   scene(root);
   if (isStructure(feature.kind)) {
     if (feature.number < 1 || feature.number > structureCount(root, feature.kind))
-      return refused(fmt::format("There is no {} {}", kindName(feature.kind), feature.number));
+      return refusedEdit(fmt::format("There is no {} {}", editKindName(feature.kind), feature.number));
     const StructureLine line = structureLine(root, feature.kind, feature.number);
     if (vertex >= line.points.size())
-      return refused(fmt::format("\"{}\" has no point {}", line.name, vertex + 1));
+      return refusedEdit(fmt::format("\"{}\" has no point {}", line.name, vertex + 1));
     std::vector<MapPoint> own{place};
     if (const std::string fault = coordinates_.fromMap(line.projection, own); !fault.empty())
-      return refused(fmt::format("\"{}\" {}", line.name, fault));
+      return refusedEdit(fmt::format("\"{}\" {}", line.name, fault));
     if (!isFinite(own.front()))
-      return refused(fmt::format("The projection of \"{}\" does not reach there", line.name));
+      return refusedEdit(fmt::format("The projection of \"{}\" does not reach there", line.name));
     moveStructurePoint(root, feature.kind, feature.number, vertex, own.front());
     return made(feature, pointName(feature, vertex));
   }
   if (feature.kind == MapKind::boundary && !root.boundary->isUserSpecified())
-    return refused("The boundaries are found by the program; choose \"User specified\" on their page first");
+    return refusedEdit(
+        "The boundaries are found by the program; choose \"User specified\" on their page first");
   const Shaped result = shaped(root, feature, vertex, place);
-  if (result.shape.points.empty()) return refused(result.fault);
+  if (result.shape.points.empty()) return refusedEdit(result.fault);
   giveShape(root, feature, result.shape);
   return made(feature, pointName(feature, vertex));
 }
@@ -326,32 +320,33 @@ MapEdit SetupMap::insertVertex(CGlobalKvs& root, MapFeatureId feature, std::size
 MapEdit SetupMap::insertPoint(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place) {
   if (isStructure(feature.kind)) {
     if (feature.number < 1 || feature.number > structureCount(root, feature.kind))
-      return refused(fmt::format("There is no {} {}", kindName(feature.kind), feature.number));
+      return refusedEdit(fmt::format("There is no {} {}", editKindName(feature.kind), feature.number));
     const StructureLine line = structureLine(root, feature.kind, feature.number);
     if (vertex > line.points.size())
-      return refused(fmt::format("\"{}\" has {} points", line.name, line.points.size()));
+      return refusedEdit(fmt::format("\"{}\" has {} points", line.name, line.points.size()));
     if (feature.kind != MapKind::dike && line.points.size() >= LineStructure::kMostPoints)
-      return refused(fmt::format("A line has no more than {} points", LineStructure::kMostPoints));
+      return refusedEdit(fmt::format("A line has no more than {} points", LineStructure::kMostPoints));
     std::vector<MapPoint> own{place};
     if (const std::string fault = coordinates_.fromMap(line.projection, own); !fault.empty())
-      return refused(fmt::format("\"{}\" {}", line.name, fault));
+      return refusedEdit(fmt::format("\"{}\" {}", line.name, fault));
     if (!isFinite(own.front()))
-      return refused(fmt::format("The projection of \"{}\" does not reach there", line.name));
+      return refusedEdit(fmt::format("The projection of \"{}\" does not reach there", line.name));
     insertStructurePoint(root, feature.kind, feature.number, vertex, own.front());
     return made(feature, "new point");
   }
   std::optional<GridShape> shape = shapeOf(root, feature);
   if (!shape || !shapeRule(feature.kind).canGrow || shape->joined == (feature.kind == MapKind::outputPoints))
-    return refused(fmt::format("{} {} takes no further points", kindName(feature.kind), feature.number));
+    return refusedEdit(
+        fmt::format("{} {} takes no further points", editKindName(feature.kind), feature.number));
   if (feature.kind == MapKind::outputPoints) {
     const bool isOfFlow = feature.page == static_cast<std::int32_t>(PageId::hdResult);
     const auto* output = isOfFlow ? root.nhdResult->outputs.GetItem(feature.number) : nullptr;
     if (output == nullptr || output->type != CNhdResultObjectKvs::kPoints)
-      return refused("An output of ranges has no further points");
+      return refusedEdit("An output of ranges has no further points");
   }
   const MapArea* area = scene_.area(shape->area());
   const auto point = area == nullptr ? std::nullopt : pointAt(*area, place);
-  if (!point) return refused(fmt::format("Area {} does not reach there", shape->area()));
+  if (!point) return refusedEdit(fmt::format("Area {} does not reach there", shape->area()));
   const std::size_t before = std::min(vertex, shape->points.size());
   const std::int32_t number = shape->area();
   shape->points.insert(shape->points.begin() + static_cast<std::ptrdiff_t>(before), *point);
@@ -363,192 +358,27 @@ MapEdit SetupMap::insertPoint(CGlobalKvs& root, MapFeatureId feature, std::size_
 MapEdit SetupMap::removeVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex) {
   const ShapeRule rule = shapeRule(feature.kind);
   const auto tooFew = [&] {
-    return refused(
-        fmt::format("{} {} keeps {} points at least", kindName(feature.kind), feature.number, rule.least));
+    return refusedEdit(fmt::format("{} {} keeps {} points at least", editKindName(feature.kind),
+                                   feature.number, rule.least));
   };
   if (isStructure(feature.kind)) {
     if (feature.number < 1 || feature.number > structureCount(root, feature.kind))
-      return refused(fmt::format("There is no {} {}", kindName(feature.kind), feature.number));
+      return refusedEdit(fmt::format("There is no {} {}", editKindName(feature.kind), feature.number));
     const std::size_t count = structureLine(root, feature.kind, feature.number).points.size();
-    if (vertex >= count) return refused(fmt::format("There is no point {}", vertex + 1));
+    if (vertex >= count) return refusedEdit(fmt::format("There is no point {}", vertex + 1));
     if (count <= rule.least) return tooFew();
     removeStructurePoint(root, feature.kind, feature.number, vertex);
     return made(feature, "point removed");
   }
   std::optional<GridShape> shape = shapeOf(root, feature);
   if (!shape || vertex >= shape->points.size())
-    return refused(fmt::format("{} {} has no point {}", kindName(feature.kind), feature.number, vertex + 1));
+    return refusedEdit(
+        fmt::format("{} {} has no point {}", editKindName(feature.kind), feature.number, vertex + 1));
   if (!rule.canGrow || shape->points.size() <= rule.least) return tooFew();
   shape->points.erase(shape->points.begin() + static_cast<std::ptrdiff_t>(vertex));
   shape->areas.pop_back();
   giveShape(root, feature, *shape);
   return made(feature, "point removed");
-}
-
-MapEdit SetupMap::addFeature(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points) {
-  scene(root);
-  return isStructure(kind) ? addStructure(root, kind, points) : addOnGrid(root, kind, points);
-}
-
-MapEdit SetupMap::addStructure(CGlobalKvs& root, MapKind kind, std::vector<MapPoint> points) {
-  const int number = structureCount(root, kind) + 1;
-  if (points.size() < 2) return refused("A line has two points at least");
-  if (number > LineStructure::kMost)
-    return refused(fmt::format("There are no more than {} of them", LineStructure::kMost));
-  if (kind != MapKind::dike && points.size() > LineStructure::kMostPoints)
-    return refused(fmt::format("A line has no more than {} points", LineStructure::kMostPoints));
-  setStructureCount(root, kind, number);
-  // A new one stands in the projection of the map, whatever that of the setup's other structures is.
-  const std::string local = CVdMapProjection::IDtoProjectionString(1);
-  giveProjection(root, kind, number,
-                 coordinates_.isLocal() ? local : coordinates_.projection().GetProjectionString());
-  for (std::size_t i = structureLine(root, kind, number).points.size(); i > 0; --i)
-    removeStructurePoint(root, kind, number, i - 1);
-  for (std::size_t i = 0; i < points.size(); ++i) insertStructurePoint(root, kind, number, i, points[i]);
-  return {.page = pageOfStructure(kind), .name = fmt::format("New {}", kindName(kind))};
-}
-
-MapEdit SetupMap::addOnGrid(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points) {
-  if (points.empty()) return refused("There are no points");
-  const auto outer = pick(points.front(), 1);
-  // What the outermost area alone has.
-  const auto onOuter = [&](std::size_t least) {
-    if (points.size() < least) return fmt::format("{} points are needed", least);
-    const bool isInside =
-        std::ranges::all_of(points, [this](MapPoint point) { return pick(point, 1).has_value(); });
-    return isInside ? std::string() : std::string("Area 1 does not reach there");
-  };
-  if (kind == MapKind::boundary) {
-    CBoundaryKvs& list = *root.boundary;
-    const MapArea* area = scene_.area(1);
-    if (!list.isUserSpecified())
-      return refused(
-          "The boundaries are found by the program; choose \"User specified\" on their page first");
-    if (area == nullptr || !area->isPlaced) return refused("Area 1 has no place on the map");
-    if (points.size() < 2) return refused("2 points are needed");
-    if (list.GetCount() >= CBoundaryKvs::kMostOnPage)
-      return refused(fmt::format("There are no more than {} boundaries", CBoundaryKvs::kMostOnPage));
-    const auto [j, k] = area->grid.pointOf(points[0]);
-    const auto [lastJ, lastK] = area->grid.pointOf(points[1]);
-    const GridPoint first = slideAlongBorder(j, k, area->nx, area->ny, {});
-    list.SetNoBoundaries(list.GetCount() + 1);
-    CBoundaryObjectKvs& boundary = list.at(list.GetCount());
-    boundary.first = first;
-    boundary.last = slideAlongBorder(lastJ, lastK, area->nx, area->ny, first);
-    return {.page = PageId::boundary, .name = "New boundary"};
-  }
-  if (kind == MapKind::source) {
-    CSourceSinkKvs& list = *root.sourceSink;
-    const auto first = pick(points.front(), 0);
-    const auto second = points.size() > 1 ? pick(points[1], 0) : first;
-    if (!first || !second) return refused("There is no area");
-    if (list.GetCount() >= CSourceSinkKvs::kMostSources)
-      return refused(fmt::format("There are no more than {} sources", CSourceSinkKvs::kMostSources));
-    list.SetNoSources(list.GetCount() + 1);
-    CSourceSinkObjectKvs& source = list.at(list.GetCount());
-    source.type = points.size() > 1 ? CSourceSinkObjectKvs::kPair : CSourceSinkObjectKvs::kIsolatedSource;
-    source.source = first->point;
-    source.sourceArea = first->area;
-    source.sink = second->point;
-    source.sinkArea = second->area;
-    return {.page = PageId::sourceAndSink, .name = "New source"};
-  }
-  if (kind == MapKind::massBudget) {
-    CMassBudgetKvs& list = *root.massBudget;
-    if (!root.moduleSelection->HasMassBudget())
-      return refused("Mass budgets need a transport module with a scheme that keeps them");
-    if (points.size() < shapeRule(kind).least) return refused("A polygon has three corners at least");
-    if (list.GetCount() >= CMassBudgetKvs::kMostOnPage)
-      return refused(fmt::format("There are no more than {} polygons", CMassBudgetKvs::kMostOnPage));
-    // In the finest area that holds all of it.
-    std::int32_t number = 0;
-    for (const MapArea& area : scene_.areas) {
-      const bool holds =
-          std::ranges::all_of(points, [&](MapPoint point) { return pointAt(area, point).has_value(); });
-      if (holds && (number == 0 || area.level >= scene_.area(number)->level)) number = area.number;
-    }
-    if (number == 0) return refused("No area holds the whole polygon");
-    list.SetNoPolygons(list.GetCount() + 1);
-    CMassBudgetItemKvs& polygon = list.at(list.GetCount());
-    polygon.associatedArea = number;
-    polygon.corners.clear();
-    for (const MapPoint point : points) polygon.corners.push_back(*pointAt(*scene_.area(number), point));
-    return {.page = PageId::massBudget, .name = "New polygon"};
-  }
-  if (isOutput(kind)) {
-    CNhdResultKvs& results = *root.nhdResult;
-    const std::size_t least = kind == MapKind::outputPoints ? 1 : 2;
-    if (const std::string fault = onOuter(least); !fault.empty()) return refused(fault);
-    if (results.outputs.GetCount() >= CNhdResultKvs::kMostOutputs)
-      return refused(fmt::format("There are no more than {} outputs", CNhdResultKvs::kMostOutputs));
-    const GridPoint first = outer->point;
-    GridPoint last = pick(points.back(), 1)->point;
-    if (kind == MapKind::outputMap && (first.j == last.j || first.k == last.k))
-      return refused("The rectangle is narrower than the grid's cells");
-    if (kind == MapKind::outputLine) {
-      const bool alongJ = std::abs(first.j - last.j) >= std::abs(first.k - last.k);
-      (alongJ ? last.k : last.j) = alongJ ? first.k : first.j;
-      if (first == last) return refused("The line is shorter than the grid's cells");
-    }
-    results.outputs.SetCount(results.outputs.GetCount() + 1);
-    const int number = results.outputs.GetCount();
-    CNhdResultObjectKvs& output = results.outputs.at(number);
-    output.TakeWhole();
-    if (kind == MapKind::outputPoints) {
-      output.type = CNhdResultObjectKvs::kPoints;
-    } else {
-      output.type = kind == MapKind::outputMap ? CNhdResultObjectKvs::kMap : CNhdResultObjectKvs::kLine;
-    }
-    GridShape shape;
-    if (kind == MapKind::outputPoints) {
-      for (const MapPoint point : points) shape.points.push_back(pick(point, 1)->point);
-    } else {
-      shape.points = {first, last};
-    }
-    shape.areas.assign(shape.points.size(), 1);
-    giveShape(root, idOf(kind, number, PageId::hdResult), shape);
-    return {.page = PageId::hdResult, .name = "New output"};
-  }
-  return refused(fmt::format("A {} can't be drawn on the map", kindName(kind)));
-}
-
-MapEdit SetupMap::removeFeature(CGlobalKvs& root, MapFeatureId feature) {
-  const int number = feature.number;
-  const auto gone = [&](PageId page) {
-    return MapEdit{.page = page, .name = fmt::format("{} {} removed", kindName(feature.kind), number)};
-  };
-  // What else is said of these stands under their numbers, so that the last one alone can go.
-  const auto removeLast = [&](int count, PageId page, const std::function<void()>& remove) {
-    if (number != count) return refused(fmt::format("Only the last one, {}, can be removed", count));
-    remove();
-    return gone(page);
-  };
-  if (isStructure(feature.kind)) {
-    if (number < 1 || number > structureCount(root, feature.kind))
-      return refused(fmt::format("There is no {} {}", kindName(feature.kind), number));
-    removeStructure(root, feature.kind, number);
-    return gone(pageOfStructure(feature.kind));
-  }
-  if (!shapeOf(root, feature))
-    return refused(fmt::format("There is no {} {}", kindName(feature.kind), number));
-  switch (feature.kind) {
-    case MapKind::boundary:
-      if (!root.boundary->isUserSpecified()) return refused("The boundaries are found by the program");
-      return removeLast(root.boundary->GetCount(), PageId::boundary,
-                        [&] { root.boundary->SetNoBoundaries(number - 1); });
-    case MapKind::source:
-      return removeLast(root.sourceSink->GetCount(), PageId::sourceAndSink,
-                        [&] { root.sourceSink->SetNoSources(number - 1); });
-    case MapKind::massBudget:
-      return removeLast(root.massBudget->GetCount(), PageId::massBudget,
-                        [&] { root.massBudget->SetNoPolygons(number - 1); });
-    default:
-      break;
-  }
-  if (feature.page == static_cast<std::int32_t>(PageId::hdResult))
-    return removeLast(root.nhdResult->outputs.GetCount(), PageId::hdResult,
-                      [&] { root.nhdResult->outputs.SetCount(number - 1); });
-  return refused("It is removed on its page");
 }
 
 }  // namespace gridbay

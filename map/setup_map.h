@@ -8,19 +8,13 @@
 #include "map/grid_headers.h"
 #include "map/grid_shapes.h"
 #include "map/map_coordinates.h"
+#include "map/map_edit.h"
 #include "map/map_editor.h"
 #include "map/structure_lines.h"
 #include "platform/result.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay {
-
-// What an edit on the map came to: why it can't be done, or the page and the name of the step.
-struct MapEdit {
-  std::string fault{};
-  PageId page = PageId::none;
-  std::string name{};
-};
 
 // Where the coordinates of an area's own file put its first point in its enclosing area.
 struct AreaSnap {
@@ -52,7 +46,8 @@ class SetupMap {
   MapEdit moveVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place);
   MapEdit insertVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place);
   MapEdit removeVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex);
-  MapEdit addFeature(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points);
+  MapEdit addFeature(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points,
+                     std::int32_t page = 0);
   MapEdit removeFeature(CGlobalKvs& root, MapFeatureId feature);
 
   GridHeaders& headers() { return headers_; }
@@ -68,6 +63,10 @@ class SetupMap {
   Shaped shaped(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place);
   MapEdit insertPoint(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place);
   MapEdit addOnGrid(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points);
+  MapEdit addModuleOutput(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points);
+  MapEdit addLineOrBox(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points);
+  // The number of the finest area that holds all points; 0 where none does.
+  std::int32_t finestHolding(const std::vector<MapPoint>& points) const;
   MapEdit addStructure(CGlobalKvs& root, MapKind kind, std::vector<MapPoint> points);
   void appendOnGrids(CGlobalKvs& root);
 

@@ -3,7 +3,9 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <array>
 #include <cmath>
+#include <utility>
 
 #include "map/map_areas.h"
 #include "structures/culvert.h"
@@ -48,6 +50,34 @@ void removeFrom(List& list, int number) {
 
 std::ptrdiff_t at(std::size_t vertex) {
   return static_cast<std::ptrdiff_t>(vertex);
+}
+
+// Whether a line has a part in an area, its points perhaps outside: in columns and rows of the grid a segment
+// is cut off at the four edges, and something of it is left.
+bool touches(const MapArea& area, const std::vector<MapPoint>& line) {
+  constexpr double kHalf = 0.5;
+  const std::array<double, 2> most{area.nx - kHalf, area.ny - kHalf};
+  for (std::size_t i = 0; i < line.size(); ++i) {
+    const std::array<double, 2> from = area.grid.pointOf(line[i]);
+    const std::array<double, 2> to = area.grid.pointOf(line[i + 1 < line.size() ? i + 1 : i]);
+    double first = 0;
+    double last = 1;
+    for (std::size_t along = 0; along < 2; ++along) {
+      const double way = to[along] - from[along];
+      double enters = (-kHalf - from[along]) / way;
+      double leaves = (most[along] - from[along]) / way;
+      if (way == 0) {
+        const bool isBetween = from[along] >= -kHalf && from[along] <= most[along];
+        enters = isBetween ? 0 : 2;
+        leaves = 1;
+      }
+      if (enters > leaves && way != 0) std::swap(enters, leaves);
+      first = std::max(first, enters);
+      last = std::min(last, leaves);
+    }
+    if (first <= last) return true;
+  }
+  return false;
 }
 
 constexpr MapKind kStructures[] = {MapKind::dike, MapKind::weir, MapKind::culvert};
@@ -169,9 +199,7 @@ void StructureLines::check(Known& known, const std::vector<MapArea>& areas) {
   known.outer = outer.grid;
   known.outerNx = outer.nx;
   known.outerNy = outer.ny;
-  const bool isInside = std::ranges::any_of(
-      *known.line, [&outer](MapPoint point) { return pointAt(outer, point).has_value(); });
-  known.fault = isInside ? "" : "lies outside all areas";
+  known.fault = touches(outer, *known.line) ? "" : "lies outside all areas";
 }
 
 void StructureLines::append(CGlobalKvs& root, MapCoordinates& coordinates, const std::vector<MapArea>& areas,

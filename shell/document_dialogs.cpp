@@ -8,6 +8,7 @@
 #include <QGridLayout>
 #include <QInputDialog>
 #include <QMessageBox>
+#include <QPointer>
 #include <QProgressDialog>
 #include <QSettings>
 #include <QVBoxLayout>
@@ -126,26 +127,25 @@ bool DocumentTab::chooseFileWithForm(const FileQuestion& question, Form& panel, 
   return true;
 }
 
-// The user can do nothing meanwhile but stop the work, and sees so once it has taken a moment.
+// The user can do nothing meanwhile but stop the work, and sees so once it has taken a moment. Where the
+// document is closed all the same, as at the end of a session, the work is to stop too.
 void DocumentTab::doLongWork(std::string_view title, const std::function<void(const Progress&)>& work) {
   constexpr int kParts = 1000;
   constexpr int kMoment = 500;  // milliseconds
-  QProgressDialog dialog(QString::fromUtf8(title.data(), static_cast<qsizetype>(title.size())), tr("Cancel"),
-                         0, kParts, this);
-  dialog.setWindowModality(Qt::ApplicationModal);
-  dialog.setMinimumDuration(kMoment);
-  dialog.setAutoClose(false);
-  dialog.setAutoReset(false);
-  dialog.setValue(0);
+  const QPointer dialog(new QProgressDialog(
+      QString::fromUtf8(title.data(), static_cast<qsizetype>(title.size())), tr("Cancel"), 0, kParts, this));
+  dialog->setWindowModality(Qt::ApplicationModal);
+  dialog->setMinimumDuration(kMoment);
+  dialog->setAutoClose(false);
+  dialog->setAutoReset(false);
+  dialog->setValue(0);
   work([&dialog](double done) {
     const int value = static_cast<int>(done * kParts);
-    if (value != dialog.value()) {
-      dialog.setValue(value);
-    } else {
-      QCoreApplication::processEvents();
-    }
-    return !dialog.wasCanceled();
+    if (dialog && value != dialog->value()) dialog->setValue(value);
+    QCoreApplication::processEvents();
+    return dialog && !dialog->wasCanceled();
   });
+  delete dialog;
 }
 
 // Picks the file, and an item for each request where the file has more than one; a file that does not meet

@@ -90,7 +90,7 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
   connect(summary_, &SummaryView::checkWanted, this, [this] { runCommand(kValidate); });
   fillTree();
   showFirstView();
-  connect(pane_, &PagePane::rowChosen, this, &DocumentTab::rowChosen);
+  connect(pane_, &PagePane::cellChosen, this, &DocumentTab::cellChosen);
   connect(filter_, &QLineEdit::textChanged, this, [this] { applyVisibility(); });
   connect(tree_, &QTreeWidget::currentItemChanged, this, [this] { showCurrentPage(); });
   connect(&watcher_, &QFileSystemWatcher::fileChanged, this, [this] {
@@ -261,7 +261,7 @@ void DocumentTab::showCurrentPage() {
   }
   cover_->setVisible(form == nullptr);
   pages_->setVisible(form != nullptr);
-  emit rowChosen(0);
+  emit cellChosen();
   showAdvice();
   emit pageShown();
 }

@@ -82,7 +82,7 @@ class DocumentTab final : public QSplitter, public SetupHost {
   enum class Keyboard { follows, stays };
   bool goToPlace(const PagePlace& place, Keyboard keyboard = Keyboard::follows);
   // The row (from 1, without headers) of the page that is at work; 0 for none.
-  int currentRow() const { return pane_->currentRow(); }
+  int currentRow() const { return pane_->currentCell().row; }
   // The item that is selected; 0 for none.
   std::int32_t currentPage() const;
   QString caption(std::int32_t id) const;
@@ -122,8 +122,8 @@ class DocumentTab final : public QSplitter, public SetupHost {
 
  signals:
   void documentChanged();
-  // Another page, or another row (from 1, 0 for none) of it.
-  void rowChosen(int row);
+  // Another page, or another cell of it.
+  void cellChosen();
   // The setup was checked, or there is another one whose check is not known.
   void checked();
   void saved();

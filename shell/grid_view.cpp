@@ -412,11 +412,12 @@ void GridView::currentChanged(const QModelIndex& current, const QModelIndex& pre
   rowHeader_->viewport()->update();
   columnHeader_->viewport()->update();
   const int row = current.isValid() ? current.row() + 1 : 0;
-  if (row == currentRow_) return;
-  currentRow_ = row;
-  model_->grid().OnCurrentRow(row);
-  emit edited();
-  emit rowChosen(row);
+  if (row != currentRow_) {
+    currentRow_ = row;
+    model_->grid().OnCurrentRow(row);
+    emit edited();
+  }
+  emit cellChosen();
 }
 
 bool GridView::goTo(const PagePlace& place) {

@@ -37,8 +37,8 @@ class GridView final : public QTableView {
  signals:
   // The model, or the current row, has changed.
   void edited();
-  // Another row (from 1, 0 for none) is the current one.
-  void rowChosen(int row);
+  // Another cell is the current one.
+  void cellChosen();
 
  protected:
   bool edit(const QModelIndex& index, EditTrigger trigger, QEvent* event) override;

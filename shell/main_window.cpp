@@ -16,6 +16,7 @@ namespace gridbay::shell {
 namespace {
 
 constexpr int kMessagesTopic = 1;  // of the help
+constexpr int kMapTopic = 2;
 
 constexpr const char* kRecentKey = "recent";
 constexpr const char* kGeometryKey = "window/geometry";
@@ -284,11 +285,14 @@ void MainWindow::startEngine(const EngineStart& start) {
 
 void MainWindow::showHelp() {
   DocumentTab* tab = currentDocument();
-  const int page = tab == nullptr ? 0 : tab->currentPage();
   QString error;
+  const QWidget* focused = QApplication::focusWidget();
+  const int page = tab == nullptr ? 0 : tab->currentPage();
   bool isShown = true;
-  if (messages_->isAncestorOf(QApplication::focusWidget())) {
+  if (messages_->isAncestorOf(focused)) {
     isShown = help_->showTopic(kMessagesTopic, messages_->windowTitle(), &error);
+  } else if (map_->isAncestorOf(focused)) {
+    isShown = help_->showTopic(kMapTopic, map_->windowTitle(), &error);
   } else if (page == 0) {
     isShown = help_->showTopic(0, tr("Overview"), &error);
   } else {

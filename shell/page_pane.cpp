@@ -139,9 +139,9 @@ PagePane::Part PagePane::makePart(Control& control, QWidget* parent, bool hasBod
     grid->cells().setReadOnly(readOnly_);
     // What a cell changes may show in other controls.
     connect(grid, &GridView::edited, this, &PagePane::refresh);
-    connect(grid, &GridView::rowChosen, this, [this, grid](int row) {
+    connect(grid, &GridView::cellChosen, this, [this, grid] {
       lastGrid_ = grid;
-      emit rowChosen(std::max(row - grid->cells().headerRows(), 0));
+      emit cellChosen();
     });
     return {&control, grid, nullptr, grid};
   }
@@ -274,16 +274,25 @@ QWidget* PagePane::widgetAt(const PagePlace& place) const {
   return found == parts_.end() ? nullptr : found->widget;
 }
 
-int PagePane::currentRow() const {
-  if (lastGrid_ == nullptr || !lastGrid_->currentIndex().isValid()) return 0;
-  return std::max(lastGrid_->currentIndex().row() + 1 - lastGrid_->cells().headerRows(), 0);
+PagePane::Cell PagePane::currentCell() const {
+  Cell cell;
+  if (lastGrid_ == nullptr || !lastGrid_->currentIndex().isValid()) return cell;
+  for (const Part& part : parts_) {
+    if (part.grid != nullptr) ++cell.table;
+    if (part.grid == lastGrid_) break;
+  }
+  const int headers = lastGrid_->cells().headerRows();
+  cell.row = std::max(lastGrid_->currentIndex().row() + 1 - headers, 0);
+  cell.column = lastGrid_->currentIndex().column() + 1;
+  cell.rows = lastGrid_->cells().rowCount() - headers;
+  return cell;
 }
 
 std::optional<QModelIndex> PagePane::pointCell() const {
   if (lastGrid_ == nullptr || !lastGrid_->currentIndex().isValid()) return std::nullopt;
   const QModelIndex index = lastGrid_->currentIndex();
   const CellStyle cell = lastGrid_->cells().style(index);
-  const bool isPoint = cell.value.starts_with('(') && pointOfText(cell.value).has_value();
+  const bool isPoint = cell.kind == CellKind::plain && pointOfText(cell.value).has_value();
   return isPoint && cell.editable() ? std::optional(index) : std::nullopt;
 }
 

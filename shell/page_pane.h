@@ -44,8 +44,15 @@ class PagePane final : public QScrollArea {
   // Brings a place of the page into view, and makes its cell the current one, where it is in a table. The
   // input or table that it is in, for who wants the focus there; null where there is none.
   QWidget* goTo(const PagePlace& place);
-  // The row (from 1, without headers) of the table that was last at work; 0 for none.
-  int currentRow() const;
+  // The cell that was last at work: its table, and row and column in it (from 1, without headers), with the
+  // number of rows that the table has. Row 0 for none.
+  struct Cell {
+    int table = 0;
+    int row = 0;
+    int column = 0;
+    int rows = 0;
+  };
+  Cell currentCell() const;
   // The cell that is at work, where it holds a point of a grid and takes another one.
   std::optional<QModelIndex> pointCell() const;
 
@@ -53,8 +60,8 @@ class PagePane final : public QScrollArea {
   QSize sizeHint() const override;
 
  signals:
-  // Another row (from 1, without headers; 0 for none) of a table is at work.
-  void rowChosen(int row);
+  // Another cell of a table is at work.
+  void cellChosen();
 
  private:
   // A control with what shows it: a field, a table, a frame, or a heading.

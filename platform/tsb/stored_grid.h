@@ -2,12 +2,15 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <functional>
+#include <memory>
 #include <span>
 #include <string>
 #include <vector>
 
 #include "platform/files/file_descriptor.h"
 #include "platform/result.h"
+#include "platform/tsb/packed_grid.h"
 
 namespace gridbay {
 
@@ -15,29 +18,52 @@ namespace gridbay {
 // is open no library takes part, so that several threads may read while another one uses data files.
 class StoredGrid {
  public:
-  // An item (from 1). Errors are those of TsbFile, and: not two-dimensional, or packed and larger than
-  // `kMostPacked` points, as a packed item is read at once.
-  static constexpr std::size_t kMostPacked = std::size_t{1} << 24;
-  static Result<StoredGrid> open(const std::string& path, std::size_t item);
+  // What the data file library says of an item.
+  struct Source {
+    std::string path;
+    std::size_t item = 1;  // from 1
+    std::size_t columns = 0;
+    std::size_t rows = 0;
+    float missing = 0;
+  };
+  // Errors are those of TsbFile, and: not two-dimensional, no such item.
+  static Result<Source> find(const std::string& path, std::size_t item);
 
-  std::size_t columns() const { return columns_; }
-  std::size_t rows() const { return rows_; }
+  // What is packed in a way of its own is read at once, and has no more points than this; what is packed as
+  // usual is read in parts.
+  static constexpr std::size_t kMostAtOnce = std::size_t{1} << 24;
+  // A larger packed item gets an overview of at most about so many points.
+  static constexpr std::size_t kOverviewPoints = std::size_t{1} << 22;
+  // Opens what was found. It may be called in any thread where `opensInAnyThread`, and takes long for large
+  // packed items; asked for every few rows whether it is cancelled, which is an error. Others: the values
+  // can't be reached.
+  static Result<StoredGrid> open(const Source& source, const std::function<bool()>& isCancelled = {});
+  static Result<StoredGrid> open(const std::string& path, std::size_t item);
+  static bool opensInAnyThread();
+
+  std::size_t columns() const { return source_.columns; }
+  std::size_t rows() const { return source_.rows; }
   // Stands for a missing value.
-  float missing() const { return missing_; }
-  // Points of a row (from 0) from a column on. False where the file can't be read any more.
-  bool read(std::size_t row, std::size_t firstColumn, std::span<float> values) const;
+  float missing() const { return source_.missing; }
+  // Points of a row (from 0) from a column on. Where no more than every `apart`-th point is looked at, they
+  // may be those of the nearest point of the overview. False where the file can't be read any more.
+  bool read(std::size_t row, std::size_t firstColumn, std::span<float> values, double apart = 1) const;
 
  private:
-  StoredGrid(FileDescriptor file, std::size_t columns, std::size_t rows, float missing)
-      : file_(std::move(file)), columns_(columns), rows_(rows), missing_(missing) {}
+  explicit StoredGrid(FileDescriptor file, Source source)
+      : file_(std::move(file)), source_(std::move(source)) {}
+  Outcome makeOverview(const std::function<bool()>& isCancelled);
 
   FileDescriptor file_;
-  std::size_t columns_;
-  std::size_t rows_;
-  float missing_;
+  Source source_;
   std::uint64_t place_ = 0;  // of the first value in the file
   bool isDouble_ = false;
-  std::vector<float> unpacked_;  // instead of the file
+  // Instead of the file:
+  std::vector<float> unpacked_;
+  std::unique_ptr<const PackedGrid> packed_;
+  std::vector<float> overview_;  // every n-th point of every n-th row
+  std::size_t overviewStep_ = 0;
+  std::size_t overviewColumns_ = 0;
 };
 
 }  // namespace gridbay

@@ -39,7 +39,8 @@ TabComparison::TabComparison(DocumentTab& tab) : QObject(&tab), tab_(tab), pane_
   connect(&timer_, &QTimer::timeout, this, &TabComparison::refresh);
   connect(&tab, &DocumentTab::documentChanged, &timer_, qOverload<>(&QTimer::start));
   connect(&tab, &DocumentTab::pageShown, this, &TabComparison::showPage);
-  connect(&tab, &DocumentTab::rowChosen, this, [this](int row) {
+  connect(&tab, &DocumentTab::cellChosen, this, [this] {
+    const int row = tab_.pane().currentCell().row;
     if (row > 0) pane_->goTo({.entries = {{row, 0}}});
     markPage();
   });

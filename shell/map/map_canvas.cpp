@@ -41,13 +41,15 @@ bool isSame(const std::vector<TerrainArea>& a, const std::vector<TerrainArea>& b
 
 }  // namespace
 
-MapCanvas::MapCanvas(QWidget* parent) : QWidget(parent), worker_(new TerrainWorker(this)) {
+MapCanvas::MapCanvas(QWidget* parent)
+    : QWidget(parent), worker_(new TerrainWorker(this)), backgrounds_(new MapBackgrounds(this)) {
   setFocusPolicy(Qt::StrongFocus);
   setMouseTracking(true);
   setAccessibleName(tr("Map"));
   setAttribute(Qt::WA_OpaquePaintEvent);
   frame_.size = size();
   connect(worker_, &TerrainWorker::painted, this, &MapCanvas::takePicture);
+  connect(backgrounds_, &MapBackgrounds::painted, this, qOverload<>(&QWidget::update));
   constexpr int kMoment = 80;  // milliseconds
   standStill_.setSingleShot(true);
   standStill_.setInterval(kMoment);
@@ -109,7 +111,7 @@ void MapCanvas::refresh() {
   forgetPlaced();
   if (editor_ == nullptr) return;
   drawing_.setScene(editor_->scene());
-  std::vector<TerrainArea> terrain = store_.open(scene());
+  std::vector<TerrainArea> terrain = store_.find(scene());
   if (isFitted_) {
     if (const std::optional<MapFrame> whole = wholeMap(scene(), size())) frame_ = *whole;
   }
@@ -124,6 +126,7 @@ void MapCanvas::refresh() {
   }
   requestTerrain();
   update();
+  emit sceneChanged();
 }
 
 void MapCanvas::fit() {
@@ -191,6 +194,7 @@ void MapCanvas::requestBase() {
 }
 
 void MapCanvas::requestTerrain() {
+  if (editor_ != nullptr) backgrounds_->request(frame_, scene().projectionText);
   if (terrain_.empty() || !drawing_.layers.test(placeOf(MapLayer::terrain)) || size().isEmpty()) return;
   const double ratio = devicePixelRatio();
   MapFrame frame = frame_;
@@ -222,7 +226,8 @@ void MapCanvas::takePicture(const TerrainPicture& picture) {
 }
 
 bool MapCanvas::isSettled() const {
-  if (terrain_.empty()) return true;
+  if (!backgrounds_->isSettled()) return false;
+  if (terrain_.empty() || !drawing_.layers.test(placeOf(MapLayer::terrain))) return true;
   const double ratio = devicePixelRatio();
   return fine_ && fine_->version == version_ && worker_->isIdle() && fine_->frame.centre == frame_.centre &&
          std::abs(fine_->frame.metresPerPixel * ratio - frame_.metresPerPixel) < kSameScale;
@@ -238,16 +243,36 @@ void MapCanvas::paintEvent(QPaintEvent*) {
         editor_ == nullptr ? tr("No setup is open.") : tr("No area has a grid with a place yet."));
     return;
   }
+  backgrounds_->paint(painter, frame_, false);
   if (drawing_.layers.test(placeOf(MapLayer::terrain))) paintTerrain(painter);
+  backgrounds_->paint(painter, frame_, true);
   paintPlaced(painter);
   if (grasp_) grasp_->paint(painter, frame_);
   drawing_.paintLegend(painter, frame_, style_, terrain_.empty() ? std::nullopt : scale_);
   paintHeldText(painter);
-  if (!store_.faults().isEmpty()) {
-    painter.setPen(faultColour(palette()));
-    painter.drawText(rect().adjusted(8, 6, -8, -6), Qt::AlignTop | Qt::AlignLeft | Qt::TextWordWrap,
-                     store_.faults().join('\n'));
+  paintFaults(painter);
+}
+
+// What can't be shown, and why, on a ground of its own.
+void MapCanvas::paintFaults(QPainter& painter) {
+  QStringList lines = store_.faults();
+  for (const MapArea& area : scene().areas) {
+    const QString fault = QString::fromStdString(area.fault);
+    if (!area.isPlaced && !lines.contains(fault)) lines << fault;
   }
+  for (const MapBackground& each : backgrounds_->all()) {
+    const QString told = MapBackgrounds::told(each);
+    if (each.isShown && !told.isEmpty()) lines << told;
+  }
+  if (lines.isEmpty()) return;
+  constexpr int kRoom = 60;  // for the arrow and the scale
+  const int flags = Qt::AlignTop | Qt::AlignLeft | Qt::TextWordWrap;
+  const QRect room = rect().adjusted(10, 8, -kRoom, -8);
+  const QString text = lines.join('\n');
+  painter.fillRect(painter.boundingRect(room, flags, text).adjusted(-6, -3, 6, 3),
+                   palette().color(QPalette::Base));
+  painter.setPen(faultColour(palette()));
+  painter.drawText(room, flags, text);
 }
 
 // From the coarsest to the finest; what is covered is left out.

@@ -7,6 +7,7 @@
 #include <functional>
 #include <memory>
 
+#include "shell/map/map_backgrounds.h"
 #include "shell/map/map_drawing.h"
 #include "shell/map/map_grasps.h"
 #include "shell/map/terrain_store.h"
@@ -28,6 +29,11 @@ enum class MapTool {
   outputPoint,
   outputLine,
   outputArea,
+  moduleOutputPoint,  // of the module that is chosen
+  moduleOutputLine,
+  moduleOutputArea,
+  discharge,
+  box,
   pick
 };
 
@@ -68,6 +74,8 @@ class MapCanvas final : public QWidget {
   const MapScene& scene() const { return drawing_.scene(); }
   MapEditor* editor() const { return editor_; }
   const std::vector<TerrainArea>& terrain() const { return terrain_; }
+  MapBackgrounds& backgrounds() { return *backgrounds_; }
+  const MapBackgrounds& backgrounds() const { return *backgrounds_; }
   // Whether the picture is of this frame, in full.
   bool isSettled() const;
   bool isHolding() const { return grasp_ != nullptr; }
@@ -93,6 +101,7 @@ class MapCanvas final : public QWidget {
   void failed(const QString& text);
   void toolChanged();
   void scaleChanged();
+  void sceneChanged();
 
  protected:
   bool event(QEvent* event) override;
@@ -111,6 +120,7 @@ class MapCanvas final : public QWidget {
   void paintTerrain(QPainter& painter);
   void paintPlaced(QPainter& painter);
   void paintHeldText(QPainter& painter);
+  void paintFaults(QPainter& painter);
   void forgetPlaced();
   void requestTerrain();
   void requestBase();
@@ -120,7 +130,8 @@ class MapCanvas final : public QWidget {
   void click(QPointF at);
   void chooseAt(QPointF at);
   void complete();
-  void chooseLast(MapKind kind);
+  void chooseLast(MapKind kind, std::int32_t page);
+  std::int32_t pageOfTool() const;
   void drop();
   // Whether it was made.
   bool edit(const std::function<std::string()>& change);
@@ -151,6 +162,7 @@ class MapCanvas final : public QWidget {
   std::optional<TerrainPicture> coarse_;
   std::optional<TerrainPicture> fine_;
   TerrainWorker* worker_;
+  MapBackgrounds* backgrounds_;
 
   // What is placed, as it was last drawn. Where that takes long it moves along with the map as a picture, and
   // is drawn anew once the map stands still.

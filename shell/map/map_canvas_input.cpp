@@ -6,6 +6,7 @@
 #include <QMouseEvent>
 #include <cmath>
 
+#include "core/page_id.h"
 #include "shell/map/map_canvas.h"
 
 namespace gridbay::shell {
@@ -40,15 +41,41 @@ std::optional<Clicks> clicksOf(MapTool tool) {
     case MapTool::culvert:
       return Clicks{MapKind::culvert, 2, kAny};
     case MapTool::outputPoint:
+    case MapTool::moduleOutputPoint:
       return Clicks{MapKind::outputPoints, 1, 1};
     case MapTool::outputLine:
+    case MapTool::moduleOutputLine:
       return Clicks{MapKind::outputLine, 2, 2};
+    case MapTool::discharge:
+      return Clicks{MapKind::discharge, 2, 2};
     default:
       return std::nullopt;
   }
 }
 
+// What a tool makes of a rectangle.
+std::optional<MapKind> rectangleOf(MapTool tool) {
+  if (tool == MapTool::outputArea || tool == MapTool::moduleOutputArea) return MapKind::outputMap;
+  return tool == MapTool::box ? std::optional(MapKind::box) : std::nullopt;
+}
+
 }  // namespace
+
+// The page of what the tool makes, where there are several; else 0.
+std::int32_t MapCanvas::pageOfTool() const {
+  switch (tool_) {
+    case MapTool::outputPoint:
+    case MapTool::outputLine:
+    case MapTool::outputArea:
+      return static_cast<std::int32_t>(PageId::hdResult);
+    case MapTool::moduleOutputPoint:
+    case MapTool::moduleOutputLine:
+    case MapTool::moduleOutputArea:
+      return scene().moduleOutputs;
+    default:
+      return 0;
+  }
+}
 
 void MapCanvas::setTool(MapTool tool) {
   drop();
@@ -88,8 +115,8 @@ void MapCanvas::startDrag(QPointF at) {
     grasp_ = graspNestedArea(*editor_, place, [this](MapPoint corner, MapPoint opposite) {
       emit nestedAreaWanted(corner, opposite);
     });
-  } else if (tool_ == MapTool::outputArea) {
-    grasp_ = graspRectangle(*editor_, MapKind::outputMap, place);
+  } else if (const std::optional<MapKind> kind = rectangleOf(tool_)) {
+    grasp_ = graspRectangle(*editor_, *kind, place, pageOfTool());
   } else if (tool_ == MapTool::select) {
     const MapHit hit = drawing_.hit(frame_, at);
     if (hit.feature && hit.vertex && hit.feature == drawing_.selection.feature) {
@@ -166,7 +193,7 @@ void MapCanvas::click(QPointF at) {
   }
   const std::optional<Clicks> clicks = clicksOf(tool_);
   if (!clicks) return;
-  if (!grasp_) grasp_ = graspNewFeature(*editor_, clicks->kind, clicks->least, clicks->most);
+  if (!grasp_) grasp_ = graspNewFeature(*editor_, clicks->kind, clicks->least, clicks->most, pageOfTool());
   if (grasp_->click(place)) complete();
   update();
 }
@@ -192,16 +219,18 @@ void MapCanvas::chooseAt(QPointF at) {
 void MapCanvas::complete() {
   const std::unique_ptr<MapGrasp> grasp = std::move(grasp_);
   const std::optional<Clicks> clicks = clicksOf(tool_);
-  const bool isNew = clicks || tool_ == MapTool::outputArea;
+  const std::optional<MapKind> kind = clicks ? std::optional(clicks->kind) : rectangleOf(tool_);
+  const std::int32_t page = pageOfTool();
   const bool isMade = edit([&grasp] { return grasp->commit(); });
-  if (isNew && isMade) chooseLast(clicks ? clicks->kind : MapKind::outputMap);
+  if (kind && isMade) chooseLast(*kind, page);
 }
 
 // The new one is the last of its kind.
-void MapCanvas::chooseLast(MapKind kind) {
+void MapCanvas::chooseLast(MapKind kind, std::int32_t page) {
   const MapFeature* last = nullptr;
   for (const MapFeature& feature : scene().features) {
-    if (feature.id.kind == kind && (last == nullptr || feature.id.number >= last->id.number)) last = &feature;
+    const bool isOf = feature.id.kind == kind && (page == 0 || feature.id.page == page);
+    if (isOf && (last == nullptr || feature.id.number >= last->id.number)) last = &feature;
   }
   if (last == nullptr) return;
   const MapFeature chosen = *last;
@@ -283,7 +312,7 @@ void MapCanvas::keyPressEvent(QKeyEvent* event) {
       }
       [[fallthrough]];
     case Qt::Key_Delete:
-      if (tool_ == MapTool::select) removeChosen();
+      if (!grasp_) removeChosen();
       return;
     case Qt::Key_Plus:
     case Qt::Key_Equal:

@@ -5,7 +5,6 @@
 #include <QFileInfo>
 #include <QHBoxLayout>
 #include <QMenu>
-#include <QProgressDialog>
 #include <QSplitter>
 #include <QToolButton>
 #include <algorithm>
@@ -13,19 +12,33 @@
 #include "core/page_id.h"
 #include "shell/grid_view.h"
 #include "shell/map/map_export.h"
+#include "shell/map/map_rows.h"
+#include "shell/map/map_settings.h"
 
 namespace gridbay::shell {
 namespace {
 
 constexpr auto kAreasPage = static_cast<std::int32_t>(PageId::bathymetry);
 constexpr auto kSourcesPage = static_cast<std::int32_t>(PageId::sourceAndSink);
-constexpr int kSinkColumn = 4;     // of that page, from 1
-constexpr double kFarthest = 1e5;  // metres above and below
+constexpr int kSinkColumn = 4;  // of that page, from 1
+const QString kPanelKey = "panel";
+const QString kFrameKey = "frame";
 
-QIcon swatch(const QColor& colour) {
-  QPixmap picture(14, 14);
-  picture.fill(colour);
-  return picture;
+// The part of the map that a setup was last seen with; nothing for the whole map.
+std::optional<MapFrame> keptFrame(const QString& setup) {
+  const QVariantList kept = MapSettings(setup).own(kFrameKey).toList();
+  if (kept.size() != 3 || !(kept[2].toDouble() > 0)) return std::nullopt;
+  return MapFrame{{kept[0].toDouble(), kept[1].toDouble()}, kept[2].toDouble(), {}};
+}
+
+void keepFrame(const QString& setup, const std::optional<MapFrame>& frame) {
+  QVariantList kept;
+  if (frame) kept = {frame->centre.east, frame->centre.north, frame->metresPerPixel};
+  MapSettings(setup).setOwn(kFrameKey, kept);
+}
+
+QString setupOf(DocumentTab& tab) {
+  return QString::fromStdString(tab.editor().path());
 }
 
 }  // namespace
@@ -35,6 +48,7 @@ MapDock::MapDock(QWidget* parent)
       tools_(new QToolBar(this)),
       canvas_(new MapCanvas(this)),
       readout_(new QLabel(this)),
+      panel_(new LayerPanel(*canvas_, this)),
       adviceStrip_(new AdviceStrip(this)) {
   setObjectName("map");
   toggleViewAction()->setShortcut(Qt::CTRL | Qt::Key_M);
@@ -42,7 +56,6 @@ MapDock::MapDock(QWidget* parent)
   auto* layout = new QVBoxLayout(content);
   layout->setContentsMargins(2, 2, 2, 2);
   layout->setSpacing(2);
-  panel_ = makeLayerPanel();
   panel_->hide();
   buildTools();
   auto* split = new QSplitter(content);
@@ -62,18 +75,16 @@ MapDock::MapDock(QWidget* parent)
   refreshTimer_.setSingleShot(true);
   connect(&refreshTimer_, &QTimer::timeout, this, [this] {
     if (tab_ == nullptr) return;
+    followSetup();
     canvas_->refresh();
     canvas_->setMarks(marksOf(tab_->advice(), canvas_->scene()));
-    followRow(tab_->currentRow());
+    followCell();
   });
   connect(this, &QDockWidget::visibilityChanged, this, [this](bool) { follow(); });
   connect(canvas_, &MapCanvas::pointed, this,
           [this](const QString& text) { readout_->setText(text.isEmpty() ? " " : text); });
-  connect(canvas_, &MapCanvas::featureChosen, this, [this](const MapFeature& feature) {
-    goToRow(static_cast<PageId>(feature.id.page), feature.row, feature.column);
-  });
-  connect(canvas_, &MapCanvas::areaChosen, this,
-          [this](int number) { goToRow(PageId::bathymetry, number, 0); });
+  connect(canvas_, &MapCanvas::featureChosen, this, &MapDock::showFeature);
+  connect(canvas_, &MapCanvas::areaChosen, this, [this](int number) { goToRow(kAreasPage, number, 0); });
   connect(canvas_, &MapCanvas::adviceChosen, this, [this](const std::vector<int>& advice) {
     if (tab_ != nullptr) adviceStrip_->showAdvice(tab_->advice(), advice);
   });
@@ -99,7 +110,6 @@ MapDock::MapDock(QWidget* parent)
     if (const auto found = toolActions_.find(canvas_->tool()); found != toolActions_.end())
       found->second->setChecked(true);
   });
-  connect(canvas_, &MapCanvas::scaleChanged, this, &MapDock::showScale);
 }
 
 void MapDock::buildTools() {
@@ -136,6 +146,13 @@ void MapDock::buildTools() {
   place->addAction(addTool(MapTool::outputPoint, tr("Output point"), tr("Click")));
   place->addAction(addTool(MapTool::outputLine, tr("Output line"), tr("Click both ends")));
   place->addAction(addTool(MapTool::outputArea, tr("Output area"), tr("Draw a rectangle")));
+  place->addSeparator();
+  place->addAction(addTool(MapTool::moduleOutputPoint, tr("Module output point"), tr("Click")));
+  place->addAction(addTool(MapTool::moduleOutputLine, tr("Module output line"), tr("Click both ends")));
+  place->addAction(addTool(MapTool::moduleOutputArea, tr("Module output area"), tr("Draw a rectangle")));
+  place->addAction(addTool(MapTool::discharge, tr("Discharge line"), tr("Click both ends")));
+  place->addAction(addTool(MapTool::box, tr("Box"), tr("Draw a rectangle")));
+  connect(canvas_, &MapCanvas::sceneChanged, this, &MapDock::showTools);
   auto* button = new QToolButton(tools_);
   button->setText(tr("Place"));
   button->setMenu(place);
@@ -150,88 +167,22 @@ void MapDock::buildTools() {
   tools_->addAction(tr("Whole map"), canvas_, &MapCanvas::fit);
   QAction* layers = tools_->addAction(tr("Layers"));
   layers->setCheckable(true);
-  connect(layers, &QAction::toggled, panel_, &QWidget::setVisible);
+  connect(layers, &QAction::toggled, this, [this](bool isOpen) {
+    panel_->setVisible(isOpen);
+    MapSettings({}).setValue(kPanelKey, isOpen);
+  });
+  layers->setChecked(MapSettings({}).value(kPanelKey, false).toBool());
   tools_->addAction(tr("Export..."), this, &MapDock::askExport);
 }
 
-QWidget* MapDock::makeLayerPanel() {
-  auto* panel = new QWidget(this);
-  auto* layout = new QVBoxLayout(panel);
-  layout->setContentsMargins(2, 0, 0, 0);
-  layers_ = new QListWidget(panel);
-  layers_->setAccessibleName(tr("Layers"));
-  // The topmost first, as they lie on each other.
-  for (std::size_t i = kMapLayers; i-- > 0;) {
-    const auto layer = static_cast<MapLayer>(i);
-    auto* item = new QListWidgetItem(swatch(layerColour(layer)), layerName(layer), layers_);
-    item->setFlags(Qt::ItemIsEnabled | Qt::ItemIsSelectable | Qt::ItemIsUserCheckable);
-    item->setCheckState(Qt::Checked);
-    item->setData(Qt::UserRole, static_cast<int>(i));
-  }
-  connect(layers_, &QListWidget::itemChanged, this, [this](const QListWidgetItem* item) {
-    canvas_->setLayer(static_cast<MapLayer>(item->data(Qt::UserRole).toInt()),
-                      item->checkState() == Qt::Checked);
-  });
-  colours_ = new QComboBox(panel);
-  colours_->addItems({tr("Even steps"), tr("Sea"), tr("Grey")});
-  colours_->setAccessibleName(tr("Colours"));
-  automatic_ = new QCheckBox(tr("Scale by the data"), panel);
-  automatic_->setChecked(true);
-  const auto makeLimit = [&](const QString& name) {
-    auto* limit = new QDoubleSpinBox(panel);
-    limit->setRange(-kFarthest, kFarthest);
-    limit->setDecimals(2);
-    limit->setSuffix(" m");
-    limit->setAccessibleName(name);
-    limit->setEnabled(false);
-    connect(limit, &QDoubleSpinBox::valueChanged, this, &MapDock::takeStyle);
-    return limit;
-  };
-  least_ = makeLimit(tr("Least"));
-  greatest_ = makeLimit(tr("Greatest"));
-  land_ = new QCheckBox(tr("Land in a colour"), panel);
-  zeroLine_ = new QCheckBox(tr("Zero line"), panel);
-  hillShade_ = new QCheckBox(tr("Hill shade"), panel);
-  layout->addWidget(layers_, 1);
-  layout->addWidget(colours_);
-  layout->addWidget(automatic_);
-  auto* limits = new QHBoxLayout();
-  limits->addWidget(least_);
-  limits->addWidget(greatest_);
-  layout->addLayout(limits);
-  for (QCheckBox* check : {land_, zeroLine_, hillShade_}) {
-    check->setChecked(true);
-    layout->addWidget(check);
-    connect(check, &QCheckBox::toggled, this, &MapDock::takeStyle);
-  }
-  connect(automatic_, &QCheckBox::toggled, this, &MapDock::takeStyle);
-  connect(colours_, &QComboBox::currentIndexChanged, this, &MapDock::takeStyle);
-  return panel;
-}
-
-void MapDock::takeStyle() {
-  if (isShowingScale_) return;
-  TerrainStyle style;
-  style.colours = static_cast<TerrainColours>(colours_->currentIndex());
-  style.land = land_->isChecked();
-  style.zeroLine = zeroLine_->isChecked();
-  style.hillShade = hillShade_->isChecked();
-  if (!automatic_->isChecked()) {
-    constexpr float kLeastRange = 0.01F;
-    const auto least = static_cast<float>(least_->value());
-    const float greatest = std::max(static_cast<float>(greatest_->value()), least + kLeastRange);
-    style.scale = TerrainScale{least, greatest, canvas_->scale().value_or(TerrainScale{}).steepest};
-  }
-  for (QDoubleSpinBox* limit : {least_, greatest_}) limit->setEnabled(!automatic_->isChecked());
-  canvas_->setStyle(style);
-}
-
-void MapDock::showScale() {
-  if (!automatic_->isChecked() || !canvas_->scale()) return;
-  isShowingScale_ = true;
-  least_->setValue(canvas_->scale()->least);
-  greatest_->setValue(canvas_->scale()->greatest);
-  isShowingScale_ = false;
+// What the module that is chosen has none of can't be drawn.
+void MapDock::showTools() {
+  const MapScene& scene = canvas_->scene();
+  for (const MapTool tool :
+       {MapTool::moduleOutputPoint, MapTool::moduleOutputLine, MapTool::moduleOutputArea})
+    toolActions_[tool]->setEnabled(scene.moduleOutputs != 0);
+  toolActions_[MapTool::discharge]->setEnabled(scene.moduleLines != 0);
+  toolActions_[MapTool::box]->setEnabled(scene.moduleBoxes != 0);
 }
 
 void MapDock::showDocument(DocumentTab* tab) {
@@ -245,21 +196,24 @@ void MapDock::follow() {
   if (tab == tab_) return;
   if (tab_ != nullptr) {
     frames_[tab_] = canvas_->isFitted() ? std::nullopt : std::optional(canvas_->frame());
-    disconnect(tab_, &DocumentTab::documentChanged, this, nullptr);
-    disconnect(tab_, &DocumentTab::rowChosen, this, nullptr);
-    disconnect(tab_, &DocumentTab::advised, this, nullptr);
+    keepFrame(setupOf(*tab_), frames_[tab_]);
+    for (const auto& signal : links_) disconnect(signal);
+    links_.clear();
   }
   tab_ = tab;
   if (tab == nullptr) {
     showAdvice();
     canvas_->setMarks({});
+    panel_->showSetup({});
     return canvas_->showMap(nullptr);
   }
-  connect(tab, &DocumentTab::documentChanged, this, &MapDock::refreshSoon);
-  connect(tab, &DocumentTab::rowChosen, this, &MapDock::followRow);
-  connect(tab, &DocumentTab::advised, this, &MapDock::showAdvice);
+  panel_->showSetup(setupOf(*tab));
+  links_ = {connect(tab, &DocumentTab::documentChanged, this, &MapDock::refreshSoon),
+            connect(tab, &DocumentTab::cellChosen, this, &MapDock::followCell),
+            connect(tab, &DocumentTab::advised, this, &MapDock::showAdvice),
+            connect(tab, &DocumentTab::saved, this, [this] { panel_->nameSetup(setupOf(*tab_)); })};
   if (!frames_.contains(tab)) {
-    frames_.insert(tab, std::nullopt);
+    frames_.insert(tab, keptFrame(setupOf(*tab)));
     connect(tab, &QObject::destroyed, this, [this](QObject* gone) {
       frames_.remove(gone);
       if (tab_ == nullptr) canvas_->showMap(nullptr);
@@ -267,7 +221,15 @@ void MapDock::follow() {
   }
   canvas_->showMap(&tab->editor().map(), frames_.value(tab));
   showAdvice();
-  followRow(tab->currentRow());
+  followCell();
+}
+
+// A tab may be there before the setup that is opened in it.
+void MapDock::followSetup() {
+  const QString setup = setupOf(*tab_);
+  if (setup == panel_->setup()) return;
+  panel_->showSetup(setup);
+  if (const std::optional<MapFrame> frame = keptFrame(setup)) canvas_->setFrame(*frame);
 }
 
 void MapDock::refreshSoon() {
@@ -280,27 +242,39 @@ void MapDock::showAdvice() {
   if (tab_ != nullptr) canvas_->setMarks(marksOf(tab_->advice(), canvas_->scene()));
 }
 
-// Lights up what the row of the page tells of. What is chosen already stays so, though another row tells of
-// it too.
-void MapDock::followRow(int row) {
+// Lights up what the cell of the page tells of. What is chosen already stays so, though the cell tells of
+// another one too, or the page has just been opened.
+void MapDock::followCell() {
   if (tab_ == nullptr) return;
   const std::int32_t page = tab_->currentPage();
-  if (page == kAreasPage && row > 0) return canvas_->selectFeature({}, row);
-  const auto isOf = [&](const MapFeature& feature) {
-    return feature.id.page == page && feature.row == row && row > 0;
-  };
-  const std::vector<MapFeature>& features = canvas_->scene().features;
+  const PagePane::Cell cell = tab_->pane().currentCell();
+  if (page == kAreasPage && cell.row > 0) return canvas_->selectFeature({}, cell.row);
+  const MapScene& scene = canvas_->scene();
+  const auto isOf = [&](const MapFeature& feature) { return tellsOf(scene, page, cell, feature); };
   const std::optional<MapFeatureId> chosen = canvas_->drawing().selection.feature;
   const MapFeature* now = chosen ? canvas_->drawing().feature(*chosen) : nullptr;
-  if (now != nullptr && now->id.page == page && (row == 0 || now->row == 0 || isOf(*now))) return;
-  const auto found = std::ranges::find_if(features, isOf);
-  canvas_->selectFeature(found == features.end() ? std::nullopt : std::optional(found->id));
+  const bool isOfPage = now != nullptr && (now->id.page == page || isFurtherPageOf(now->id.kind, page));
+  if (isOfPage && (cell.row == 0 || isOf(*now))) return;
+  const auto found = std::ranges::find_if(scene.features, isOf);
+  canvas_->selectFeature(found == scene.features.end() ? std::nullopt : std::optional(found->id));
+}
+
+// Stays on a page that says more of it.
+void MapDock::showFeature(const MapFeature& feature) {
+  if (tab_ == nullptr) return;
+  if (isFurtherPageOf(feature.id.kind, tab_->currentPage())) {
+    tab_->goToPlace({.page = static_cast<PageId>(tab_->currentPage()),
+                     .entries = {{feature.id.number, countOf(canvas_->scene(), feature.id.kind)}}},
+                    DocumentTab::Keyboard::stays);
+  } else {
+    goToRow(feature.id.page, feature.row, feature.column);
+  }
 }
 
 // The keyboard stays on the map.
-void MapDock::goToRow(PageId page, int row, int column) {
+void MapDock::goToRow(std::int32_t page, int row, int column) {
   if (tab_ == nullptr) return;
-  PagePlace place{.page = page, .column = column};
+  PagePlace place{.page = static_cast<PageId>(page), .column = column};
   if (row > 0) place.entries = {{row}};
   tab_->goToPlace(place, DocumentTab::Keyboard::stays);
 }
@@ -364,17 +338,9 @@ void MapDock::askNestedArea(MapPoint corner, MapPoint opposite) {
   if (save.exec() != QDialog::Accepted) return;
   if (tab_ == nullptr || tab_ != tab || canvas_->editor() == nullptr) return;
   tab_->commit();
-  MapEditor& editor = *canvas_->editor();
-  QProgressDialog progress(tr("Cutting the grid of the new area"), tr("Cancel"), 0, 100, this);
-  progress.setWindowModality(Qt::WindowModal);
   const std::string fault =
-      editor.addNestedArea(corner, opposite, open.selectedFiles().value(0).toStdString(),
-                           save.selectedFiles().value(0).toStdString(), [&progress](double part) {
-                             constexpr double kHundred = 100;
-                             progress.setValue(static_cast<int>(part * kHundred));
-                             return !progress.wasCanceled();
-                           });
-  progress.reset();
+      canvas_->editor()->addNestedArea(corner, opposite, open.selectedFiles().value(0).toStdString(),
+                                       save.selectedFiles().value(0).toStdString());
   if (!fault.empty()) emit failed(QString::fromStdString(fault));
   if (tab_ == nullptr) return;
   tab_->pane().refresh();

@@ -1,13 +1,9 @@
 #pragma once
 
 #include <QAction>
-#include <QCheckBox>
-#include <QComboBox>
 #include <QDockWidget>
-#include <QDoubleSpinBox>
 #include <QHash>
 #include <QLabel>
-#include <QListWidget>
 #include <QPersistentModelIndex>
 #include <QPointer>
 #include <QTimer>
@@ -15,6 +11,7 @@
 #include <map>
 
 #include "shell/document_tab.h"
+#include "shell/map/layer_panel.h"
 #include "shell/map/map_canvas.h"
 
 namespace gridbay::shell {
@@ -32,17 +29,13 @@ class MapDock final : public QDockWidget {
   void startPick();
 
   MapCanvas& canvas() { return *canvas_; }
-  QListWidget& layers() { return *layers_; }
+  LayerPanel& panel() { return *panel_; }
   QLabel& readout() { return *readout_; }
   // The advice of the mark that was clicked on last.
   AdviceStrip& adviceStrip() { return *adviceStrip_; }
   QToolBar& tools() { return *tools_; }
   QAction* toolAction(MapTool tool) { return toolActions_[tool]; }
   QAction* pickAction() { return pick_; }
-  QDoubleSpinBox& least() { return *least_; }
-  QDoubleSpinBox& greatest() { return *greatest_; }
-  QCheckBox& automatic() { return *automatic_; }
-  QComboBox& colours() { return *colours_; }
   // Writes the map as it is shown to a file, by its ending: png, svg or pdf. What is wrong, or empty.
   QString exportTo(const QString& path);
 
@@ -51,13 +44,13 @@ class MapDock final : public QDockWidget {
 
  private:
   void buildTools();
-  QWidget* makeLayerPanel();
-  void takeStyle();
-  void showScale();
+  void showTools();
   void follow();
-  void followRow(int row);
+  void followSetup();
+  void followCell();
+  void showFeature(const MapFeature& feature);
   void showAdvice();
-  void goToRow(PageId page, int row, int column);
+  void goToRow(std::int32_t page, int row, int column);
   void refreshSoon();
   void takePick(MapPoint place);
   void askNestedArea(MapPoint corner, MapPoint opposite);
@@ -66,25 +59,17 @@ class MapDock final : public QDockWidget {
   QPointer<DocumentTab> tab_;                        // that is shown here
   QPointer<DocumentTab> wanted_;                     // that is to be shown once the map is seen
   QHash<QObject*, std::optional<MapFrame>> frames_;  // nothing for the whole map
+  QList<QMetaObject::Connection> links_;             // to the one that is shown
   QToolBar* tools_;
   MapCanvas* canvas_;
   QLabel* readout_;
+  LayerPanel* panel_;
   AdviceStrip* adviceStrip_;
-  QWidget* panel_ = nullptr;
-  QListWidget* layers_ = nullptr;
-  QComboBox* colours_ = nullptr;
-  QCheckBox* automatic_ = nullptr;
-  QDoubleSpinBox* least_ = nullptr;
-  QDoubleSpinBox* greatest_ = nullptr;
-  QCheckBox* land_ = nullptr;
-  QCheckBox* zeroLine_ = nullptr;
-  QCheckBox* hillShade_ = nullptr;
   std::map<MapTool, QAction*> toolActions_;
   QAction* pick_ = nullptr;
   QTimer refreshTimer_;
   QPersistentModelIndex pickCell_;
   std::int32_t pickArea_ = 0;
-  bool isShowingScale_ = false;
 };
 
 }  // namespace gridbay::shell

@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <cmath>
 #include <limits>
+#include <span>
 
 #include "shell/tool_icons.h"
 
@@ -29,7 +30,7 @@ double distanceToSegment(QPointF at, QPointF a, QPointF b) {
   return distance(at, a + part * along);
 }
 
-QRectF coverOf(const std::vector<MapPoint>& points) {
+QRectF coverOf(std::span<const MapPoint> points) {
   double west = std::numeric_limits<double>::max();
   double south = west;
   double east = std::numeric_limits<double>::lowest();
@@ -48,6 +49,21 @@ constexpr double kMarkSize = 20;
 QRectF boxOfMark(QPointF place) {
   constexpr double kStalk = 12;
   return {place.x() - kMarkSize / 2, place.y() - kStalk - kMarkSize, kMarkSize, kMarkSize};
+}
+
+constexpr std::size_t kRun = 64;  // points
+
+// Of each run of points with the next point, at the end of a closed line the first one.
+std::vector<QRectF> runsOf(const MapFeature& feature) {
+  const std::span<const MapPoint> points(*feature.points);
+  std::vector<QRectF> runs;
+  for (std::size_t first = 0; first < points.size(); first += kRun) {
+    runs.push_back(coverOf(points.subspan(first, std::min(kRun + 1, points.size() - first))));
+    if (first + kRun < points.size()) continue;
+    const std::array ends{points.front(), points.back()};
+    if (feature.closed) runs.back() |= coverOf(ends).adjusted(-1e-9, -1e-9, 1e-9, 1e-9);
+  }
+  return runs;
 }
 
 // An arrow's head at the end of a line.
@@ -126,7 +142,8 @@ QPointF badgeOf(const QPolygonF& outline) {
 void MapDrawing::setScene(MapScene scene) {
   scene_ = std::move(scene);
   placed_.clear();
-  for (const MapFeature& feature : scene_.features) placed_.push_back({&feature, coverOf(*feature.points)});
+  for (const MapFeature& feature : scene_.features)
+    placed_.push_back({&feature, coverOf(*feature.points), runsOf(feature)});
   std::ranges::stable_sort(placed_, {}, [](const Placed& each) { return layerOf(each.feature->id.kind); });
   if (selection.feature && feature(*selection.feature) == nullptr) selection = {};
 }
@@ -147,7 +164,7 @@ void MapDrawing::paint(QPainter& painter, const MapFrame& frame) const {
            cover.bottom() >= low.north;
   };
   const MapFeature* lit = nullptr;
-  for (const auto& [feature, cover] : placed_) {
+  for (const auto& [feature, cover, runs] : placed_) {
     if (feature->points->empty() || !shows(layerOf(feature->id.kind)) || !isInView(cover)) continue;
     if (selection.feature == feature->id) {
       lit = feature;
@@ -363,6 +380,39 @@ void MapDrawing::paintLegend(QPainter& painter, const MapFrame& frame, const Ter
   }
 }
 
+MapDrawing::Nearest MapDrawing::nearestOf(const Placed& placed, const MapFrame& frame, QPointF at) {
+  const MapPoint low = frame.toMap(at + QPointF(-kNear, kNear));
+  const MapPoint high = frame.toMap(at + QPointF(kNear, -kNear));
+  const auto isNear = [&](const QRectF& cover) {
+    return cover.left() <= high.east && cover.right() >= low.east && cover.top() <= high.north &&
+           cover.bottom() >= low.north;
+  };
+  Nearest nearest;
+  if (!isNear(placed.cover)) return nearest;
+  const MapFeature& feature = *placed.feature;
+  const std::vector<MapPoint>& points = *feature.points;
+  const std::size_t segments =
+      feature.joined && points.size() > 1 ? points.size() - (feature.closed ? 0 : 1) : 0;
+  double leastToVertex = kNear;
+  double leastToSegment = kNear;
+  for (std::size_t run = 0; run < placed.runs.size(); ++run) {
+    if (!isNear(placed.runs[run])) continue;
+    for (std::size_t i = run * kRun; i < std::min((run + 1) * kRun, points.size()); ++i) {
+      const QPointF point = frame.toScreen(points[i]);
+      if (const double far = distance(at, point); far <= leastToVertex) {
+        nearest.vertex = i;
+        leastToVertex = far;
+      }
+      if (i >= segments) continue;
+      const double far = distanceToSegment(at, point, frame.toScreen(points[(i + 1) % points.size()]));
+      if (far > leastToSegment) continue;
+      nearest.segment = i;
+      leastToSegment = far;
+    }
+  }
+  return nearest;
+}
+
 MapHit MapDrawing::hit(const MapFrame& frame, QPointF at) const {
   MapHit hit;
   for (std::size_t i = marks.size(); shows(MapLayer::advice) && i-- > 0;) {
@@ -370,36 +420,13 @@ MapHit MapDrawing::hit(const MapFrame& frame, QPointF at) const {
     hit.mark = i;
     return hit;
   }
-  const auto nearestVertex = [&](const MapFeature& feature) {
-    std::optional<std::size_t> nearest;
-    double least = kNear;
-    for (std::size_t i = 0; i < feature.points->size(); ++i) {
-      const double far = distance(at, frame.toScreen((*feature.points)[i]));
-      if (far <= least) nearest = i;
-      least = std::min(least, far);
-    }
-    return nearest;
-  };
-  const auto nearestSegment = [&](const MapFeature& feature) {
-    std::optional<std::size_t> nearest;
-    double least = kNear;
-    const std::vector<MapPoint>& points = *feature.points;
-    const std::size_t segments =
-        feature.joined && points.size() > 1 ? points.size() - (feature.closed ? 0 : 1) : 0;
-    for (std::size_t i = 0; i < segments; ++i) {
-      const double far =
-          distanceToSegment(at, frame.toScreen(points[i]), frame.toScreen(points[(i + 1) % points.size()]));
-      if (far <= least) nearest = i;
-      least = std::min(least, far);
-    }
-    return nearest;
-  };
-  const auto find = [&](const MapFeature& feature) {
-    if (!shows(layerOf(feature.id.kind))) return false;
-    hit.vertex = nearestVertex(feature);
-    hit.segment = nearestSegment(feature);
+  const auto find = [&](const Placed& placed) {
+    if (!shows(layerOf(placed.feature->id.kind))) return false;
+    const Nearest nearest = nearestOf(placed, frame, at);
+    hit.vertex = nearest.vertex;
+    hit.segment = nearest.segment;
     if (!hit.vertex && !hit.segment) return false;
-    hit.feature = feature.id;
+    hit.feature = placed.feature->id;
     return true;
   };
   for (const MapArea& area : scene_.areas) {
@@ -407,10 +434,11 @@ MapHit MapDrawing::hit(const MapFrame& frame, QPointF at) const {
         (hit.area == 0 || area.level >= scene_.area(hit.area)->level))
       hit.area = area.number;
   }
-  const MapFeature* lit = selection.feature ? feature(*selection.feature) : nullptr;
-  if (lit != nullptr && find(*lit)) return hit;
+  const auto lit = std::ranges::find_if(
+      placed_, [this](const Placed& placed) { return selection.feature == placed.feature->id; });
+  if (lit != placed_.end() && find(*lit)) return hit;
   for (auto each = placed_.rbegin(); each != placed_.rend(); ++each) {
-    if (find(*each->feature)) return hit;
+    if (find(*each)) return hit;
   }
   if (!shows(MapLayer::outlines)) return hit;
   for (auto area = scene_.areas.rbegin(); area != scene_.areas.rend(); ++area) {

@@ -50,11 +50,18 @@ class MapDrawing {
   MapHit hit(const MapFrame& frame, QPointF at) const;
 
  private:
-  // A feature with what it covers on the map.
+  // A feature with what it covers on the map, and what each run of its points does, up to the point after it.
   struct Placed {
     const MapFeature* feature;
     QRectF cover;
+    std::vector<QRectF> runs;
   };
+  // The point and the segment of a feature that are nearest to a place.
+  struct Nearest {
+    std::optional<std::size_t> vertex;
+    std::optional<std::size_t> segment;
+  };
+  static Nearest nearestOf(const Placed& placed, const MapFrame& frame, QPointF at);
   bool shows(MapLayer layer) const { return layers.test(placeOf(layer)); }
   void paintAreas(QPainter& painter, const MapFrame& frame) const;
   void paintGridLines(QPainter& painter, const MapFrame& frame) const;

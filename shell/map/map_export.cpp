@@ -22,14 +22,17 @@ QString tr(const char* text) {
 void draw(QPainter& painter, const MapCanvas& canvas) {
   const MapFrame& frame = canvas.frame();
   painter.setClipRect(QRectF({0, 0}, frame.size));
+  canvas.backgrounds().paint(painter, frame, false);
   if (canvas.drawing().layers.test(placeOf(MapLayer::terrain)) && !canvas.terrain().empty()) {
     TerrainRequest request{canvas.terrain(), frame, canvas.terrainStyle()};
     request.frame.size *= kFiner;
     request.frame.metresPerPixel /= kFiner;
     request.style.scale = canvas.scale();
+    for (const TerrainArea& area : request.areas) area.values->open({});
     if (const auto picture = paintTerrain(request, 1, [] { return false; }))
       painter.drawImage(picture->frame.in(frame), picture->image);
   }
+  canvas.backgrounds().paint(painter, frame, true);
   canvas.drawing().paint(painter, frame);
   canvas.drawing().paintLegend(painter, frame, canvas.terrainStyle(),
                                canvas.terrain().empty() ? std::nullopt : canvas.scale());

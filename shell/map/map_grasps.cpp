@@ -102,8 +102,8 @@ class VertexGrasp final : public MapGrasp {
 
 class NewFeatureGrasp final : public MapGrasp {
  public:
-  NewFeatureGrasp(MapEditor& editor, MapKind kind, std::size_t least, std::size_t most)
-      : editor_(editor), kind_(kind), least_(least), most_(most) {}
+  NewFeatureGrasp(MapEditor& editor, MapKind kind, std::size_t least, std::size_t most, std::int32_t page)
+      : editor_(editor), kind_(kind), least_(least), most_(most), page_(page) {}
 
   void moveTo(MapPoint place) override { pointer_ = place; }
   bool click(MapPoint place) override {
@@ -129,21 +129,22 @@ class NewFeatureGrasp final : public MapGrasp {
     const std::optional<MapPick> pick = editor_.pick(pointer_);
     return pick ? QString::fromStdString(pointText(pick->point)) : QString();
   }
-  std::string commit() override { return editor_.addFeature(kind_, points_); }
+  std::string commit() override { return editor_.addFeature(kind_, points_, page_); }
 
  private:
   MapEditor& editor_;
   MapKind kind_;
   std::size_t least_;
   std::size_t most_;
+  std::int32_t page_;
   std::vector<MapPoint> points_;
   MapPoint pointer_;
 };
 
 class RectangleGrasp final : public MapGrasp {
  public:
-  RectangleGrasp(MapEditor& editor, MapKind kind, MapPoint corner)
-      : editor_(editor), kind_(kind), corner_(corner), opposite_(corner) {}
+  RectangleGrasp(MapEditor& editor, MapKind kind, MapPoint corner, std::int32_t page)
+      : editor_(editor), kind_(kind), page_(page), corner_(corner), opposite_(corner) {}
 
   void moveTo(MapPoint place) override { opposite_ = place; }
   void paint(QPainter& painter, const MapFrame& frame) const override {
@@ -151,12 +152,13 @@ class RectangleGrasp final : public MapGrasp {
     painter.drawRect(QRectF(frame.toScreen(corner_), frame.toScreen(opposite_)).normalized());
   }
   std::string commit() override {
-    return corner_ == opposite_ ? std::string() : editor_.addFeature(kind_, {corner_, opposite_});
+    return corner_ == opposite_ ? std::string() : editor_.addFeature(kind_, {corner_, opposite_}, page_);
   }
 
  private:
   MapEditor& editor_;
   MapKind kind_;
+  std::int32_t page_;
   MapPoint corner_;
   MapPoint opposite_;
 };
@@ -213,12 +215,13 @@ std::unique_ptr<MapGrasp> graspVertex(MapEditor& editor, const MapFeature& featu
 }
 
 std::unique_ptr<MapGrasp> graspNewFeature(MapEditor& editor, MapKind kind, std::size_t least,
-                                          std::size_t most) {
-  return std::make_unique<NewFeatureGrasp>(editor, kind, least, most);
+                                          std::size_t most, std::int32_t page) {
+  return std::make_unique<NewFeatureGrasp>(editor, kind, least, most, page);
 }
 
-std::unique_ptr<MapGrasp> graspRectangle(MapEditor& editor, MapKind kind, MapPoint corner) {
-  return std::make_unique<RectangleGrasp>(editor, kind, corner);
+std::unique_ptr<MapGrasp> graspRectangle(MapEditor& editor, MapKind kind, MapPoint corner,
+                                         std::int32_t page) {
+  return std::make_unique<RectangleGrasp>(editor, kind, corner, page);
 }
 
 std::unique_ptr<MapGrasp> graspNestedArea(MapEditor& editor, MapPoint corner,

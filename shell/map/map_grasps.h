@@ -39,11 +39,12 @@ class MapGrasp {
 std::unique_ptr<MapGrasp> graspArea(MapEditor& editor, const MapArea& area, MapPoint held);
 // A point of a feature.
 std::unique_ptr<MapGrasp> graspVertex(MapEditor& editor, const MapFeature& feature, std::size_t vertex);
-// A new feature, of as many clicks as it needs, or as the user makes.
+// A new feature, of as many clicks as it needs, or as the user makes; of the page where there are several
+// lists of its kind, else 0.
 std::unique_ptr<MapGrasp> graspNewFeature(MapEditor& editor, MapKind kind, std::size_t least,
-                                          std::size_t most);
+                                          std::size_t most, std::int32_t page);
 // A rectangle from a corner to the opposite one, that becomes a feature.
-std::unique_ptr<MapGrasp> graspRectangle(MapEditor& editor, MapKind kind, MapPoint corner);
+std::unique_ptr<MapGrasp> graspRectangle(MapEditor& editor, MapKind kind, MapPoint corner, std::int32_t page);
 // A rectangle that becomes a nested area; who asks for its files is told both corners.
 std::unique_ptr<MapGrasp> graspNestedArea(MapEditor& editor, MapPoint corner,
                                           std::function<void(MapPoint, MapPoint)> wanted);

@@ -43,7 +43,8 @@ struct Reach {
 // What an area's value shows; the land value and the missing one are no depths.
 class Kind {
  public:
-  explicit Kind(const TerrainArea& area) : land_(area.landValue), missing_(area.values->missing()) {}
+  explicit Kind(const TerrainArea& area)
+      : land_(area.landValue), missing_(area.values->opened()->missing()) {}
   float operator()(float value) const {
     return value == missing_ || std::isnan(value) ? kNothing : value >= land_ ? kLand : value;
   }
@@ -84,6 +85,9 @@ class Sampler {
     const auto [low, high] = std::ranges::minmax(columns);
     std::vector<float> row(high - low + 1);
     const Kind kind(area);
+    const StoredGrid& grid = *area.values->opened();
+    const double square = request_.frame.metresPerPixel * step_;
+    const double apart = square / std::max(std::abs(area.grid.stepJ.east), std::abs(area.grid.stepK.north));
     std::optional<std::size_t> shown;
     for (int y = along.first; y < along.last; ++y) {
       if (isCancelled_()) return false;
@@ -93,7 +97,7 @@ class Sampler {
         std::copy_n(out - values_.width, columns.size(), out);
         continue;
       }
-      if (!area.values->read(k, low, row)) std::ranges::fill(row, kNothing);
+      if (!grid.read(k, low, row, apart)) std::ranges::fill(row, kNothing);
       for (std::size_t i = 0; i < columns.size(); ++i) out[i] = kind(row[columns[i] - low]);
       shown = k;
     }
@@ -129,9 +133,11 @@ class Sampler {
     std::vector<float> sample(across * along);
     std::vector<float> row((across - 1) * strideJ + 1);
     const Kind kind(area);
+    const StoredGrid& grid = *area.values->opened();
+    const double apart = static_cast<double>(std::min(strideJ, strideK));
     for (std::size_t r = 0; r < along; ++r) {
       if (isCancelled_()) return false;
-      if (!area.values->read(first[1] + r * strideK, first[0], row)) std::ranges::fill(row, kNothing);
+      if (!grid.read(first[1] + r * strideK, first[0], row, apart)) std::ranges::fill(row, kNothing);
       for (std::size_t c = 0; c < across; ++c) sample[r * across + c] = kind(row[c * strideJ]);
     }
     for (int y = 0; y < values_.height; ++y) {
@@ -298,7 +304,7 @@ std::optional<TerrainPicture> paintTerrain(const TerrainRequest& request, int st
                     kNothing);
   Sampler sampler(request, step, isCancelled, values);
   for (const TerrainArea& area : request.areas) {
-    if (!sampler.add(area)) return std::nullopt;
+    if (area.values->opened() != nullptr && !sampler.add(area)) return std::nullopt;
   }
   const double square = request.frame.metresPerPixel * step;
   const TerrainScale scale = request.style.scale ? *request.style.scale : scaleOf(values, square);

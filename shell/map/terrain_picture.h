@@ -6,8 +6,8 @@
 #include <optional>
 #include <vector>
 
-#include "platform/tsb/stored_grid.h"
 #include "shell/map/map_frame.h"
+#include "shell/map/terrain_grid.h"
 
 namespace gridbay::shell {
 
@@ -35,7 +35,7 @@ struct TerrainStyle {
 
 // A grid in its place on the map.
 struct TerrainArea {
-  std::shared_ptr<const StoredGrid> values;
+  std::shared_ptr<TerrainGrid> values;
   MapGrid grid;
   float landValue = 0;
 };
@@ -61,8 +61,8 @@ struct TerrainPicture {
 QRgb terrainColour(TerrainColours colours, double part);
 QRgb landColour();
 
-// Paints the areas of a frame: for each square of `step` pixels the nearest point. Nothing when it was
-// cancelled, which is asked for every few rows.
+// Paints the areas of a frame whose grids are open: for each square of `step` pixels the nearest point.
+// Nothing when it was cancelled, which is asked for every few rows.
 std::optional<TerrainPicture> paintTerrain(const TerrainRequest& request, int step,
                                            const std::function<bool()>& isCancelled);
 

@@ -1,5 +1,7 @@
 #include "shell/map/terrain_worker.h"
 
+#include <QElapsedTimer>
+#include <algorithm>
 #include <utility>
 
 namespace gridbay::shell {
@@ -50,6 +52,28 @@ void TerrainWorker::deliver(TerrainPicture picture) {
       Qt::QueuedConnection);
 }
 
+// The smaller ones first. Where it takes a while, what is open by then is shown. False when stopped.
+bool TerrainWorker::openGrids(const TerrainRequest& request, const std::function<bool()>& isStopped) {
+  constexpr int kCoarse = 4;
+  constexpr qint64 kWhile = 100;  // milliseconds
+  std::vector<TerrainGrid*> grids;
+  for (const TerrainArea& area : request.areas) {
+    if (!area.values->isTried()) grids.push_back(area.values.get());
+  }
+  std::ranges::sort(grids, {}, [](const TerrainGrid* grid) { return grid->columns() * grid->rows(); });
+  QElapsedTimer timer;
+  timer.start();
+  for (TerrainGrid* grid : grids) {
+    if (timer.elapsed() > kWhile && grid != grids.front() && !request.isBase) {
+      if (auto picture = paintTerrain(request, kCoarse, isStopped)) deliver(*std::move(picture));
+      timer.restart();
+    }
+    grid->open(isStopped);
+    if (isStopped()) return false;
+  }
+  return true;
+}
+
 void TerrainWorker::work(const std::stop_token& stop) {
   constexpr int kCoarse = 4;
   while (std::optional<TerrainRequest> request = next(stop)) {
@@ -60,6 +84,7 @@ void TerrainWorker::work(const std::stop_token& stop) {
       return view_.has_value();
     };
     const bool isBase = request->isBase;
+    if (!openGrids(*request, isStopped)) return;
     std::optional<TerrainPicture> coarse = paintTerrain(*request, kCoarse, isStopped);
     if (!coarse) return;
     // The fine picture has the colours of the coarse one.

@@ -10,9 +10,9 @@
 
 namespace gridbay::shell {
 
-// Paints terrain in a thread of its own: of each request a coarse picture at once, and then the fine one. A
-// newer request takes the place of one that is not begun, and ends the fine one that is at work; pictures of
-// the whole map are never left out.
+// Opens grids and paints terrain in a thread of its own: of each request a coarse picture at once, and then
+// the fine one. A newer request takes the place of one that is not begun, and ends the fine one that is at
+// work; pictures of the whole map are never left out.
 class TerrainWorker final : public QObject {
   Q_OBJECT
  public:
@@ -27,6 +27,7 @@ class TerrainWorker final : public QObject {
 
  private:
   void work(const std::stop_token& stop);
+  bool openGrids(const TerrainRequest& request, const std::function<bool()>& isStopped);
   std::optional<TerrainRequest> next(const std::stop_token& stop);
   void deliver(TerrainPicture picture);
 

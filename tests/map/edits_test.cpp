@@ -95,12 +95,8 @@ TEST_F(MapEdits, ARectangleBecomesANestedArea) {
   EXPECT_EQ(shown.ny, 4);
   EXPECT_THAT(shown.fault, IsEmpty());
   const std::string made = folder.file("new.tsb2");
-  std::vector<double> progress;
-  const std::string fault = map->addNestedArea(at(13.8, 10.2), at(10.6, 8.9), area(1).fileName.absolute(),
-                                               made, [&progress](double done) {
-                                                 progress.push_back(done);
-                                                 return true;
-                                               });
+  const std::string fault =
+      map->addNestedArea(at(13.8, 10.2), at(10.6, 8.9), area(1).fileName.absolute(), made);
   if (theEdition.wetlandSweepKit) {
     EXPECT_EQ(fault, "This edition has one area");
     EXPECT_FALSE(std::filesystem::exists(made));
@@ -111,7 +107,8 @@ TEST_F(MapEdits, ARectangleBecomesANestedArea) {
   ASSERT_EQ(root().bathymetry->GetCount(), 3);
   EXPECT_EQ(area(3).origin, (GridPoint{11, 9}));
   EXPECT_EQ(area(3).enclosingArea, 1);
-  EXPECT_EQ(progress.back(), 1);
+  EXPECT_EQ(host.titles.back(), "Cutting the grid of the new area");
+  EXPECT_EQ(host.progress.back(), 1);
   EXPECT_THAT(map->scene().area(3)->fault, IsEmpty());
   EXPECT_NEAR(map->scene().area(3)->dx, 10, 1e-9);
   EXPECT_EQ(map->scene().area(3)->landValue, 10.0F);
@@ -181,8 +178,9 @@ TEST_F(MapEdits, NestedAreasThatCanNotBe) {
   EXPECT_THAT(add(at(12, 9), at(16, 12), folder.write("bad.tif", "no raster"), out), HasSubstr("bad.tif"));
   EXPECT_THAT(add(at(12, 9), at(16, 12), source, source), HasSubstr("a1.tsb2"));
   EXPECT_THAT(add(at(12, 9), at(16, 12), source, folder.file("no/such/new.tsb2")), HasSubstr("new.tsb2"));
-  EXPECT_THAT(map->addNestedArea(at(12, 9), at(16, 12), source, out, [](double) { return false; }),
-              HasSubstr("nothing is written"));
+  host.stopAt = 0;
+  EXPECT_THAT(add(at(12, 9), at(16, 12), source, out), HasSubstr("nothing is written"));
+  host.stopAt = 2;
   test::writeGrid(folder.file("far.tsb2"), {.geography = placeAt(300000, 5000000)});
   EXPECT_THAT(add(at(12, 9), at(16, 12), folder.file("far.tsb2"), out), HasSubstr("has no values"));
   EXPECT_FALSE(std::filesystem::exists(out));
@@ -283,7 +281,7 @@ TEST_F(MapEdits, OutputsAndPolygonsOnTheGrid) {
   EXPECT_EQ(outputs.at(3).type, CNhdResultObjectKvs::kLine);
   EXPECT_THAT(map->addFeature(MapKind::outputMap, {at(3, 4), at(3, 9)}), HasSubstr("narrower"));
   EXPECT_THAT(map->addFeature(MapKind::outputMap, {at(3, 4), at(30, 9)}), HasSubstr("does not reach"));
-  EXPECT_THAT(map->addFeature(MapKind::box, {at(3, 4)}), HasSubstr("can't be drawn"));
+  EXPECT_THAT(map->addFeature(MapKind::box, {at(3, 4)}), HasSubstr("has no boxes"));
 
   const std::vector<MapPoint> corners{at(6, 5), at(8, 5), at(8, 6)};
   EXPECT_THAT(map->addFeature(MapKind::massBudget, corners), HasSubstr("need a transport module"));
@@ -299,6 +297,116 @@ TEST_F(MapEdits, OutputsAndPolygonsOnTheGrid) {
   EXPECT_THAT(map->removeVertex(id(MapKind::massBudget, number), 0), IsEmpty());
   EXPECT_THAT(map->removeVertex(id(MapKind::massBudget, number), 0), HasSubstr("keeps 3 points"));
   EXPECT_THAT(map->moveVertex(id(MapKind::massBudget, number), 0, at(15, 12)), HasSubstr("does not reach"));
+}
+
+TEST_F(MapEdits, OutputsLinesAndBoxesOfTheModuleThatIsChosen) {
+  makeTwoAreas();
+  const MapScene& before = map->scene();
+  EXPECT_EQ(before.moduleOutputs + before.moduleLines + before.moduleBoxes, 0);
+  EXPECT_THAT(map->addFeature(MapKind::outputMap, {at(2, 2), at(4, 4)}, 23), HasSubstr("No module"));
+  EXPECT_THAT(map->addFeature(MapKind::discharge, {at(2, 2), at(4, 4)}), HasSubstr("has no discharge lines"));
+  struct Module {
+    std::int32_t number;
+    std::int32_t outputs;
+    std::int32_t lines;
+    std::int32_t boxes;
+  };
+  for (const Module& each : {Module{module::kAdvectionDispersion, 23, 20, 10},
+                             {module::kMudTransport, 99, 94, 49},
+                             {module::kMudTransportExpanded, 79, 75, 0},
+                             {module::kEcological, 121, 0, 0}}) {
+    SCOPED_TRACE(each.number);
+    root().moduleSelection->simulationType = each.number;
+    const MapScene& scene = map->scene();
+    EXPECT_EQ(scene.moduleOutputs, each.outputs);
+    EXPECT_EQ(scene.moduleLines, each.lines);
+    EXPECT_EQ(scene.moduleBoxes, each.boxes);
+    const auto last = [&](MapKind kind) {
+      int number = 0;
+      for (const MapFeature& feature : map->scene().features) {
+        if (feature.id.kind == kind && feature.id.page != 38) number = feature.id.number;
+      }
+      return number;
+    };
+    // Area 2 has three points for each of Area 1, from (5,4).
+    ASSERT_THAT(map->addFeature(MapKind::outputMap, {at(8, 6), at(6, 5)}, each.outputs), IsEmpty());
+    EXPECT_EQ(lastStep(), "New output");
+    const MapFeatureId output = id(MapKind::outputMap, last(MapKind::outputMap), each.outputs);
+    const MapFeature made = feature(map->scene(), MapKind::outputMap, output.number);
+    EXPECT_EQ(made.area, 2);
+    EXPECT_EQ(text(*made.points), text(std::vector{at(6, 5), at(8, 5), at(8, 6), at(6, 6)}));
+    ASSERT_THAT(map->addFeature(MapKind::outputLine, {at(2, 2), at(10, 3)}, each.outputs), IsEmpty());
+    EXPECT_EQ(feature(map->scene(), MapKind::outputLine, output.number + 1).area, 1);
+    ASSERT_THAT(map->addFeature(MapKind::outputPoints, {at(2, 3)}, each.outputs), IsEmpty());
+    EXPECT_THAT(map->addFeature(MapKind::outputMap, {at(2, 3), at(2, 9)}, each.outputs),
+                HasSubstr("narrower"));
+    EXPECT_THAT(map->addFeature(MapKind::outputMap, {at(2, 3), at(30, 9)}, each.outputs),
+                HasSubstr("No area"));
+    EXPECT_THAT(map->removeFeature(output), HasSubstr("Only the last one"));
+    EXPECT_THAT(map->removeFeature(id(MapKind::outputPoints, output.number + 2, each.outputs)), IsEmpty());
+    EXPECT_EQ(last(MapKind::outputPoints), 0);
+    for (const bool isLine : {true, false}) {
+      const std::int32_t page = isLine ? each.lines : each.boxes;
+      const MapKind kind = isLine ? MapKind::discharge : MapKind::box;
+      const std::string fault = map->addFeature(kind, {at(12, 9), at(6, 5)});
+      if (page == 0) {
+        EXPECT_THAT(fault, HasSubstr("has no"));
+        continue;
+      }
+      ASSERT_THAT(fault, IsEmpty());
+      EXPECT_EQ(lastStep(), isLine ? "New discharge line" : "New box");
+      const int number = last(kind);
+      EXPECT_EQ(feature(map->scene(), kind, number).area, 1);
+      EXPECT_EQ(feature(map->scene(), kind, number).points->front(), at(6, 5));
+      EXPECT_THAT(map->addFeature(kind, {at(2, 2), at(2, 2)}), HasSubstr("cells"));
+      EXPECT_THAT(map->removeFeature(id(kind, number, page)), IsEmpty());
+      EXPECT_EQ(last(kind), number - 1);
+    }
+  }
+}
+
+TEST_F(MapEdits, ATurnedRasterIsCutInParts) {
+  if (theEdition.wetlandSweepKit) GTEST_SKIP() << "one area";
+  makeTwoAreas();
+  // A plane over all of Area 1, turned against it, so that each row of the new grid crosses most of its rows.
+  const TsbGeography corner = placeAt(500000, 6000000 - 500, -30);
+  const std::string raster = folder.file("turned.tsb2");
+  test::writeGrid(raster, {.noJ = 3000, .noK = 3000, .dx = 0.5, .dy = 0.5, .geography = corner},
+                  [](int j, int k) { return static_cast<float>(-j - 2 * k); });
+  const std::string made = folder.file("new.tsb2");
+  ASSERT_THAT(map->addNestedArea(at(9, 9), at(18, 14), raster, made), IsEmpty());
+  const MapArea area = map->scene().areas.back();
+  const std::vector<float> all =
+      values(made, static_cast<std::size_t>(area.nx) * static_cast<std::size_t>(area.ny));
+  const CVdCartography turned("UTM-32", 500000, 6000000 - 500, -30);
+  for (const auto [j, k] :
+       {std::pair{0, 0}, {area.nx - 1, 0}, {5, area.ny - 1}, {area.nx - 1, area.ny - 1}}) {
+    const MapPoint place = area.grid.at(j, k);
+    double x = 0;
+    double y = 0;
+    turned.Proj2Xy(place.east, place.north, &x, &y);
+    const float got = all[static_cast<std::size_t>(k * area.nx + j)];
+    const bool isInside = x >= 0 && y >= 0 && x <= 1499 && y <= 1499;
+    EXPECT_NEAR(got, isInside ? -x / 0.5 - 2 * y / 0.5 : -5, 0.05) << j << "," << k;
+  }
+}
+
+TEST_F(MapEdits, AZoneThatAFileLeavesOutIsThatOfItsLongitude) {
+  if (theEdition.wetlandSweepKit) GTEST_SKIP() << "one area";
+  makeTwoAreas();
+  TsbGeography place = placeAt(500000, 6000000);
+  place.projection = "UTM";
+  setFile(1, {.noJ = 20, .noK = 16, .geography = place},
+          [](int j, int k) { return static_cast<float>(-j - 100 * k); });
+  EXPECT_EQ(text(map->scene().area(1)->grid.first), "500000,6000000");
+  const std::string made = folder.file("new.tsb2");
+  ASSERT_THAT(map->addNestedArea(at(11, 9), at(13, 10), area(1).fileName.absolute(), made), IsEmpty());
+  EXPECT_NEAR(values(made, 7)[0], -911, 1e-3);
+  root().nhdWeir->SetCount(1);
+  root().nhdWeir->at(1).coordinateType = "UTM";
+  root().nhdWeir->at(1).x = {500100, 500200};
+  root().nhdWeir->at(1).y = {6000100, 6000100};
+  EXPECT_THAT(feature(map->scene(), MapKind::weir).fault, HasSubstr("without a zone"));
 }
 
 TEST_F(MapEdits, LinesOfStructuresPointByPoint) {

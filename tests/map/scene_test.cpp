@@ -281,6 +281,16 @@ TEST_F(MapSceneTest, StructuresComeFromTheirOwnProjections) {
   EXPECT_THAT(feature(scene(), MapKind::weir).fault, HasSubstr("fewer than two points"));
   far.x = {500000, 500100};
   EXPECT_THAT(feature(scene(), MapKind::weir, 2).fault, IsEmpty());
+  // Across Area 1, with both ends outside; past its corner, with its box over it.
+  far.x = {499900, 500700};
+  far.y = {6000100, 6000300};
+  EXPECT_THAT(feature(scene(), MapKind::weir, 2).fault, IsEmpty());
+  far.x = {499900, 500100};
+  far.y = {6000400, 6000800};
+  EXPECT_THAT(feature(scene(), MapKind::weir, 2).fault, HasSubstr("lies outside all areas"));
+  far.x = {500000, 500000};
+  far.y = {5999000, 6001000};
+  EXPECT_THAT(feature(scene(), MapKind::weir, 2).fault, IsEmpty());
   setFile(1, {.noJ = 20, .noK = 16, .geography = placeAt(700000, 6000000)});
   EXPECT_THAT(feature(scene(), MapKind::weir, 2).fault, HasSubstr("lies outside all areas"));
 }

@@ -4,12 +4,14 @@
 
 #include <cmath>
 #include <filesystem>
+#include <fstream>
 #include <nlohmann/json.hpp>
 #include <numbers>
 #include <random>
 #include <utility>
 
 #include "platform/cartography/cartography.h"
+#include "platform/tsb/stored_grid.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_operations.h"
 #include "platform/tsb/tsb_writer.h"
@@ -534,6 +536,92 @@ TEST_F(Tsb, OtherProgramsPlaceAGridThatIsTurned) {
   }
   EXPECT_NEAR(transform[1], 20 * std::cos(std::numbers::pi / 6), 1e-6);
   EXPECT_NEAR(transform[4], -10, 1e-6);
+}
+
+// A grid that is read past the data file library, as it is or packed.
+class StoredGrids : public Tsb {
+ protected:
+  // The file packed anew by another program.
+  std::string packed(const std::vector<std::string>& how) {
+    std::vector<std::string> arguments(how);
+    const std::string made = folder.file("packed.tsb2");
+    arguments.insert(arguments.end(), {path, made});
+    EXPECT_EQ(test::runProgram("nccopy", arguments).status, 0);
+    return made;
+  }
+  static float surface(int j, int k) { return static_cast<float>(j * 1000 - k * 7) / 3; }
+};
+
+TEST_F(StoredGrids, AreTheSameHoweverTheyArePacked) {
+  test::writeGrid(path, {.noJ = 37, .noK = 23, .items = 2, .steps = 2}, surface);
+  const std::vector<std::vector<std::string>> ways{{"-d", "0"},
+                                                   {"-c", "time/1,y/23,x/37"},
+                                                   {"-d", "5", "-c", "time/1,y/10,x/8"},
+                                                   {"-d", "1", "-s", "-c", "time/1,y/7,x/37"},
+                                                   {"-d", "9", "-s", "-c", "time/2,y/5,x/6"}};
+  for (const auto& way : ways) {
+    SCOPED_TRACE(way.back());
+    Result<StoredGrid> grid = StoredGrid::open(packed(way), 2);
+    ASSERT_TRUE(grid) << grid.error();
+    EXPECT_EQ(grid->columns(), 37U);
+    EXPECT_EQ(grid->rows(), 23U);
+    std::vector<float> row(30);
+    for (std::size_t k = 0; k < 23; ++k) {
+      ASSERT_TRUE(grid->read(k, 5, row));
+      for (int i = 0; i < 30; ++i)
+        ASSERT_EQ(row[static_cast<std::size_t>(i)], surface(i + 5, static_cast<int>(k)));
+    }
+    EXPECT_FALSE(grid->read(23, 0, row));
+    EXPECT_FALSE(grid->read(0, 8, row));
+  }
+  EXPECT_FALSE(StoredGrid::open(path, 3));
+  EXPECT_FALSE(StoredGrid::find(path, 0));
+}
+
+TEST_F(StoredGrids, ALargePackedOneIsReadInPartsAndHasAnOverview) {
+  constexpr int kColumns = 4200;
+  constexpr int kRows = 4100;
+  static_assert(std::size_t{kColumns} * kRows > StoredGrid::kMostAtOnce);
+  test::writeGrid(path, {.noJ = kColumns, .noK = kRows}, surface);
+  const std::string file = packed({"-d", "1", "-c", "time/1,y/500,x/600"});
+  const Result<StoredGrid::Source> source = StoredGrid::find(file, 1);
+  ASSERT_TRUE(source);
+  int asked = 0;
+  const Result<StoredGrid> stopped = StoredGrid::open(*source, [&asked] { return ++asked > 3; });
+  EXPECT_FALSE(stopped);
+  EXPECT_EQ(asked, 4);
+  const Result<StoredGrid> grid = StoredGrid::open(*source);
+  ASSERT_TRUE(grid) << grid.error();
+  std::vector<float> row(kColumns);
+  for (const int k : {0, 499, 500, 2222, kRows - 1}) {
+    ASSERT_TRUE(grid->read(static_cast<std::size_t>(k), 0, row));
+    for (int j = 0; j < kColumns; ++j) ASSERT_EQ(row[static_cast<std::size_t>(j)], surface(j, k));
+    // Seen from afar, every value is that of a point not far away.
+    ASSERT_TRUE(grid->read(static_cast<std::size_t>(k), 0, row, 50));
+    for (int j = 0; j < kColumns; ++j)
+      ASSERT_NEAR(row[static_cast<std::size_t>(j)], surface(j, k), 3 * (1000 + 7) / 3.0) << j << "," << k;
+  }
+}
+
+TEST_F(StoredGrids, WhatIsDamagedIsNotRead) {
+  test::writeGrid(path, {.noJ = 300, .noK = 200}, surface);
+  const std::string file = packed({"-d", "5", "-c", "time/1,y/20,x/30"});
+  const Result<StoredGrid> grid = StoredGrid::open(file, 1);
+  ASSERT_TRUE(grid) << grid.error();
+  std::vector<float> row(300);
+  ASSERT_TRUE(grid->read(0, 0, row));
+  {
+    std::fstream damaged(file, std::ios::in | std::ios::out | std::ios::binary);
+    const auto size = static_cast<long>(std::filesystem::file_size(file));
+    damaged.seekp(size / 2);
+    damaged << std::string(static_cast<std::size_t>(size / 4), '\x55');
+  }
+  int unread = 0;
+  for (std::size_t k = 0; k < 200; ++k) unread += grid->read(k, 0, row) ? 0 : 1;
+  EXPECT_GT(unread, 0);
+  std::filesystem::resize_file(file, 100);
+  EXPECT_FALSE(grid->read(199, 0, row));
+  EXPECT_FALSE(StoredGrid::open(file, 1));
 }
 
 }  // namespace platform_tsb_test

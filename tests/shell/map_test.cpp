@@ -24,6 +24,8 @@ class MapTest : public DesktopFixture {
   static constexpr int kDikes = 31;
   static constexpr int kSources = 40;
   static constexpr int kOutputs = 38;
+  static constexpr int kModules = 35;
+  static constexpr int kMassBudgets = 34;
 
   MapCanvas& canvas() { return window_->map().canvas(); }
   const MapArea& area(int number) { return *canvas().scene().area(number); }
@@ -69,6 +71,49 @@ class MapTest : public DesktopFixture {
     return edit ? QString::fromStdString(edit->name) : QString();
   }
   GridModel& cells() { return tab().pane().findChild<GridView*>()->cells(); }
+  void chooseModule(const QString& name) {
+    QVERIFY(tab().goToPage(kModules));
+    for (auto* button : tab().pane().findChildren<QRadioButton*>()) {
+      if (button->text().remove('&') == name) button->click();
+    }
+    QCoreApplication::processEvents();
+  }
+  // The item of a layer or background in the list.
+  QListWidgetItem* layer(const QString& text) {
+    QListWidget& list = window_->map().panel().layers();
+    const auto found = list.findItems(text, Qt::MatchStartsWith);
+    return found.isEmpty() ? nullptr : found.front();
+  }
+  void press(const char* button) {
+    QToolButton* found = window_->map().panel().button(button);
+    QVERIFY2(found != nullptr && found->isEnabled(), button);
+    QTest::mouseClick(found, Qt::LeftButton);
+  }
+  QColor shownAt(QPointF at) {
+    settle();
+    QCoreApplication::processEvents();
+    return canvas().grab().toImage().pixelColor(at.toPoint());
+  }
+  // A raster over Area 1, black in the west and white in the east, in the projection of the
+  // map or in none.
+  QString halves(const QString& name, bool hasProjection) {
+    const MapArea& outer = area(1);
+    const MapPoint low = outer.grid.at(-0.5, -0.5);
+    const double width = outer.nx * outer.dx;
+    constexpr int kHalf = 20;  // columns
+    const QString row = QString("0 ").repeated(kHalf) + QString("100 ").repeated(kHalf) + "\n";
+    write(file("halves.asc"), (QString("ncols %1\nnrows %1\nxllcorner %2\nyllcorner %3\ncellsize %4\n")
+                                   .arg(2 * kHalf)
+                                   .arg(low.east, 0, 'f', 3)
+                                   .arg(low.north, 0, 'f', 3)
+                                   .arg(width / (2 * kHalf), 0, 'f', 3) +
+                               row.repeated(2 * kHalf))
+                                  .toUtf8());
+    QStringList arguments{"-q", file("halves.asc"), file(name)};
+    if (hasProjection) arguments = QStringList{"-a_srs", "EPSG:32632"} + arguments;
+    if (QProcess::execute("gdal_translate", arguments) != 0) qFatal("no raster");
+    return file(name);
+  }
   QString cell(int row, int column) {
     return QString::fromStdString(cells().style(cells().index(row - 1, column - 1)).value);
   }
@@ -458,20 +503,20 @@ class MapTest : public DesktopFixture {
 
   void layersAndColoursAreSet() {
     const QImage all = canvas().grab().toImage();
-    for (int i = 0; i < window_->map().layers().count(); ++i) {
-      QListWidgetItem* item = window_->map().layers().item(i);
+    for (int i = 0; i < window_->map().panel().layers().count(); ++i) {
+      QListWidgetItem* item = window_->map().panel().layers().item(i);
       if (item->text() == "Terrain") item->setCheckState(Qt::Unchecked);
     }
     QVERIFY(canvas().grab().toImage() != all);
     canvas().setLayer(MapLayer::terrain, true);
-    window_->map().automatic().setChecked(false);
-    window_->map().least().setValue(-2);
-    window_->map().greatest().setValue(3);
+    window_->map().panel().automatic().setChecked(false);
+    window_->map().panel().least().setValue(-2);
+    window_->map().panel().greatest().setValue(3);
     QCOMPARE(canvas().scale()->least, -2.0F);
     QCOMPARE(canvas().scale()->greatest, 3.0F);
-    window_->map().colours().setCurrentIndex(1);
+    window_->map().panel().colours().setCurrentIndex(1);
     QCOMPARE(canvas().terrainStyle().colours, TerrainColours::sea);
-    window_->map().automatic().setChecked(true);
+    window_->map().panel().automatic().setChecked(true);
     QTRY_VERIFY(canvas().scale() && canvas().scale()->least < -5);
   }
 
@@ -528,6 +573,332 @@ class MapTest : public DesktopFixture {
     QVERIFY(window_->map().exportTo(file("no/such/map.png")).contains("no/such/map.png"));
   }
 
+  void aRasterIsABackground() {
+    LayerPanel& panel = window_->map().panel();
+    panel.show();
+    canvas().setLayer(MapLayer::terrain, false);
+    canvas().setLayer(MapLayer::outlines, false);
+    canvas().setLayer(MapLayer::gridLines, false);
+    QCoreApplication::processEvents();
+    const QPointF west = screenOf(1, 10, 80);
+    const QPointF east = screenOf(1, area(1).nx - 10, 80);
+    const QColor paper = shownAt(west);
+    panel.addBackground(halves("halves.tif", true));
+    QVERIFY2(shownAt(west).lightness() < 10, qPrintable(shownAt(west).name()));
+    QVERIFY(shownAt(east).lightness() > 245);
+    QListWidgetItem* item = layer("halves.tif");
+    QVERIFY(item != nullptr);
+    QCOMPARE(panel.layers().row(item), panel.layers().count() - 1);  // below the terrain
+    QVERIFY(!item->text().contains("(!)"));
+    // Half of it, hidden, and above the terrain.
+    panel.layers().setCurrentItem(item);
+    panel.opacity().setValue(0);
+    QCOMPARE(shownAt(west), paper);
+    panel.opacity().setValue(100);
+    layer("halves.tif")->setCheckState(Qt::Unchecked);
+    QTRY_COMPARE(shownAt(west), paper);
+    layer("halves.tif")->setCheckState(Qt::Checked);
+    QTRY_VERIFY(shownAt(west).lightness() < 10);
+    canvas().setLayer(MapLayer::terrain, true);
+    QVERIFY(shownAt(west).lightness() > 10);
+    panel.layers().setCurrentItem(layer("halves.tif"));
+    press("Up");
+    QCOMPARE(panel.layers().row(layer("halves.tif")), panel.layers().count() - 2);
+    QVERIFY(shownAt(west).lightness() < 10);
+    press("Down");
+    QVERIFY(shownAt(west).lightness() > 10);
+    press("Up");
+    // It follows the map, and is exported with it.
+    canvas().zoom(2);
+    QVERIFY(shownAt(canvas().frame().toScreen(area(1).grid.at(area(1).nx * 0.4, 60))).lightness() < 10);
+    QCOMPARE(window_->map().exportTo(file("with.png")), QString());
+    const QPoint at = canvas().frame().toScreen(area(1).grid.at(area(1).nx * 0.4, 60)).toPoint();
+    QVERIFY(QImage(file("with.png")).pixelColor(at * 2).lightness() < 10);
+    press("Remove");
+    QVERIFY(layer("halves.tif") == nullptr);
+    QVERIFY(canvas().backgrounds().all().empty());
+    QVERIFY(undoName().isEmpty());
+  }
+
+  void aRasterOfAnotherProjectionIsBroughtToTheMap() {
+    const QString source = halves("halves.tif", true);
+    QCOMPARE(QProcess::execute("gdalwarp", {"-q", "-overwrite", "-t_srs", "EPSG:4326", "-ts", "400", "400",
+                                            source, file("far.tif")}),
+             0);
+    window_->map().panel().addBackground(file("far.tif"));
+    canvas().setLayer(MapLayer::terrain, false);
+    canvas().setLayer(MapLayer::gridLines, false);
+    const double middle = (area(1).nx - 1) / 2.0;
+    QVERIFY(shownAt(screenOf(1, middle - 6, 20)).lightness() < 10);
+    QVERIFY(shownAt(screenOf(1, middle + 6, 20)).lightness() > 245);
+    QVERIFY(shownAt(screenOf(1, middle - 6, 90)).lightness() < 10);
+    QVERIFY(shownAt(screenOf(1, middle + 6, 90)).lightness() > 245);
+  }
+
+  void linesAreABackgroundAboveTheTerrain() {
+    const auto from = *canvas().editor()->geographic(area(1).grid.at(5, 50));
+    const auto to = *canvas().editor()->geographic(area(1).grid.at(area(1).nx - 5, 50));
+    write(file("line.geojson"), QString(R"({"type":"FeatureCollection","features":[
+{"type":"Feature","properties":{},"geometry":{"type":"LineString","coordinates":[[%1,%2],[%3,%4]]}},
+{"type":"Feature","properties":{},"geometry":{"type":"MultiPoint","coordinates":[[%1,%2]]}},
+{"type":"Feature","properties":{},"geometry":null}]})")
+                                    .arg(from[0], 0, 'f', 9)
+                                    .arg(from[1], 0, 'f', 9)
+                                    .arg(to[0], 0, 'f', 9)
+                                    .arg(to[1], 0, 'f', 9)
+                                    .toUtf8());
+    LayerPanel& panel = window_->map().panel();
+    panel.addBackground(file("line.geojson"));
+    settle();
+    QCOMPARE(canvas().backgrounds().below(), std::size_t{0});
+    QVERIFY(panel.layers().row(layer("line.geojson")) < panel.layers().row(layer("Terrain")));
+    canvas().backgrounds().setColour(canvas().backgrounds().all()[0].id, QColor(255, 0, 255));
+    const QPoint middle = ((screenOf(1, 5, 50) + screenOf(1, area(1).nx - 5, 50)) / 2).toPoint();
+    int pink = 0;
+    for (int y = -2; y <= 2; ++y) {
+      const QColor colour = shownAt(middle + QPoint(0, y));
+      pink += colour.red() > 150 && colour.blue() > 150 && colour.green() < 120 ? 1 : 0;
+    }
+    QVERIFY(pink > 0);
+  }
+
+  void whatIsWrongWithABackgroundIsTold() {
+    LayerPanel& panel = window_->map().panel();
+    write(file("none.tif"), "no raster");
+    for (const QString& path : {file("none.tif"), file("gone.shp"), halves("loose.tif", false)})
+      panel.addBackground(path);
+    settle();
+    QCoreApplication::processEvents();
+    QVERIFY(layer("none.tif")->toolTip().contains("cannot show"));
+    QVERIFY(layer("gone.shp")->toolTip().contains("gone.shp"));
+    const QString loose = layer("loose.tif")->toolTip();
+    QVERIFY2(loose.contains("names no projection"), qPrintable(loose));
+    canvas().setLayer(MapLayer::terrain, false);
+    QVERIFY(shownAt(screenOf(1, 10, 80)).lightness() < 10);
+    QVERIFY(QFile::remove(file("loose.tif")));
+  }
+
+  void whatWasChosenIsKeptForEachSetup() {
+    window_->map().panel().addBackground(halves("halves.tif", true));
+    canvas().backgrounds().setOpacity(canvas().backgrounds().all()[0].id, 0.25);
+    settle();
+    layer("Dikes")->setCheckState(Qt::Unchecked);
+    window_->map().panel().colours().setCurrentIndex(2);
+    canvas().setFrame({area(2).grid.at(3, 4), 7, {}});
+    window_->close();
+    window_ = std::make_unique<MainWindow>(libraries());
+    window_->show();
+    QVERIFY(window_->openDocument(file("s.v27")) != nullptr);
+    QCoreApplication::processEvents();
+    QVERIFY(window_->map().isVisible());
+    QCOMPARE(canvas().backgrounds().all().size(), std::size_t{1});
+    QCOMPARE(canvas().backgrounds().all()[0].opacity, 0.25);
+    QVERIFY(!canvas().drawing().layers.test(placeOf(MapLayer::dikes)));
+    QCOMPARE(canvas().terrainStyle().colours, TerrainColours::grey);
+    QCOMPARE(canvas().frame().metresPerPixel, 7.0);
+    // Another setup begins with the colours, and with no backgrounds.
+    run("v27setup", {"new", "t.v27", "--force", "--area", "inlet.tsb2"});
+    QVERIFY(window_->openDocument(file("t.v27")) != nullptr);
+    QVERIFY(canvas().backgrounds().all().empty());
+    QCOMPARE(canvas().terrainStyle().colours, TerrainColours::grey);
+    QVERIFY(window_->openDocument(file("s.v27")) != nullptr);
+    QCOMPARE(canvas().backgrounds().all().size(), std::size_t{1});
+  }
+
+  void aPackedGridIsShownAsItIs() {
+    const QImage before = canvas().grab().toImage();
+    QCOMPARE(QProcess::execute("nccopy", {"-d", "5", "-s", file("inlet.tsb2"), file("packed.tsb2")}), 0);
+    run("v27setup", {"new", "p.v27", "--force", "--area", "estuary.tsb2", "--area", "packed.tsb2@36,33"});
+    QVERIFY(window_->openDocument(file("p.v27")) != nullptr);
+    QCoreApplication::processEvents();
+    QCOMPARE(canvas().terrain().size(), std::size_t{2});
+    settle();
+    QVERIFY(canvas().terrain()[1].values->opened() != nullptr);
+    const QPoint at = screenOf(2, 30, 30).toPoint();
+    QCOMPARE(canvas().grab().toImage().pixelColor(at), before.pixelColor(at));
+    QVERIFY(canvas().textAt(area(2).grid.at(30, 30)).contains(" m"));
+  }
+
+  void areasWithoutAPlaceAreTold() {
+    run("v27setup", {"new", "w.v27", "--force", "--area", "estuary.tsb2", "--area", "inlet.tsb2@36,33"});
+    QVERIFY(window_->openDocument(file("w.v27")) != nullptr);
+    tab().goToPage(kAreas);
+    const QImage before = canvas().grab().toImage();
+    QVERIFY(cells().setData(cells().index(1, 0), "gone.tsb2", Qt::EditRole));
+    QCoreApplication::processEvents();
+    QVERIFY(!area(2).isPlaced);
+    QVERIFY2(layer("Areas")->text().contains("1 without a place"), qPrintable(layer("Areas")->text()));
+    QVERIFY(layer("Areas")->toolTip().contains("Area 2: "));
+    // On the map itself too.
+    const QRect corner(10, 8, 100, 10);
+    settle();
+    QVERIFY(canvas().grab(corner).toImage() != before.copy(corner));
+    tab().undo();
+  }
+
+  void outputsOfTheModuleArePlacedAndRemoved() {
+    QVERIFY(!window_->map().toolAction(MapTool::moduleOutputArea)->isEnabled());
+    chooseModule("Hydrodynamic and Advection-Dispersion");
+    constexpr int kModuleOutputs = 23;
+    constexpr int kDischarges = 20;
+    const auto find = [this](MapKind kind, int page) -> const MapFeature* {
+      const MapFeature* last = nullptr;
+      for (const MapFeature& each : canvas().scene().features) {
+        if (each.id.kind == kind && each.id.page == page) last = &each;
+      }
+      return last;
+    };
+    const auto count = [this](int page) {
+      return std::ranges::count(canvas().scene().features, page,
+                                [](const MapFeature& each) { return each.id.page; });
+    };
+    const auto before = count(kModuleOutputs);
+    window_->map().toolAction(MapTool::moduleOutputArea)->trigger();
+    drag(screenOf(1, 5, 5), screenOf(1, 25, 15));
+    QCOMPARE(count(kModuleOutputs), before + 1);
+    QCOMPARE(tab().currentPage(), kModuleOutputs);
+    const MapFeature* made = find(MapKind::outputMap, kModuleOutputs);
+    QCOMPARE(tab().currentRow(), made->row);
+    QVERIFY(canvas().drawing().selection.feature == made->id);
+    // Removed right away, with the tool in hand.
+    canvas().setFocus();
+    QTest::keyClick(&canvas(), Qt::Key_Delete);
+    QCOMPARE(count(kModuleOutputs), before);
+    window_->map().toolAction(MapTool::moduleOutputPoint)->trigger();
+    click(screenOf(1, 12, 30));
+    window_->map().toolAction(MapTool::moduleOutputLine)->trigger();
+    click(screenOf(1, 5, 20));
+    click(screenOf(1, 25, 20));
+    QCOMPARE(count(kModuleOutputs), before + 2);
+    const auto lines = count(kDischarges);
+    window_->map().toolAction(MapTool::discharge)->trigger();
+    click(screenOf(1, 5, 25));
+    click(screenOf(1, 25, 35));
+    QCOMPARE(count(kDischarges), lines + 1);
+    QCOMPARE(tab().currentPage(), kDischarges);
+    window_->map().toolAction(MapTool::box)->trigger();
+    drag(screenOf(1, 5, 40), screenOf(1, 20, 50));
+    QVERIFY(find(MapKind::box, 10) != nullptr);
+    QCOMPARE(undoName(), QString("New box"));
+  }
+
+  void columnsAndFurtherPagesTellOfWhatIsPlaced() {
+    chooseModule("Hydrodynamic and Advection-Dispersion");
+    const auto addPolygon = [this](double j) {
+      return canvas().editor()->addFeature(
+          MapKind::massBudget,
+          {area(1).grid.at(j, 5), area(1).grid.at(j + 8, 5), area(1).grid.at(j + 8, 15)});
+    };
+    const std::string fault = addPolygon(5);
+    QVERIFY2(fault.empty(), fault.c_str());
+    QVERIFY(addPolygon(15).empty());
+    for (const double j : {8.0, 14.0})
+      QVERIFY(canvas().editor()->addFeature(MapKind::source, {area(1).grid.at(j, 30)}).empty());
+    canvas().refresh();
+    // A column of the polygons' page, and the other way round.
+    QVERIFY(tab().goToPage(kMassBudgets));
+    tab().pane().showCell(1, 2);
+    QVERIFY(canvas().drawing().selection.feature.has_value());
+    QCOMPARE(canvas().drawing().selection.feature->number, 2);
+    tab().pane().showCell(1, 1);
+    QCOMPARE(canvas().drawing().selection.feature->number, 1);
+    click(screenOf(1, 19, 5));
+    QCOMPARE(tab().pane().currentCell().column, 2);
+    // A corner, which is told without brackets, is picked on the map.
+    tab().pane().showCell(3, 2);
+    QVERIFY(tab().pane().pointCell().has_value());
+    window_->map().startPick();
+    click(screenOf(1, 16, 7));
+    QCOMPARE(cell(3, 2), QString("16,7"));
+    tab().undo();
+    // A count is no point.
+    tab().pane().showCell(2, 2);
+    QVERIFY(!tab().pane().pointCell().has_value());
+    // Pages that say more of sources, here those of the flow and of the module.
+    for (const int page : {41, 24}) {
+      QVERIFY(tab().goToPage(page));
+      tab().pane().focusOn({}, 1, 2, 2);
+      QVERIFY(canvas().drawing().selection.feature.has_value());
+      QCOMPARE(canvas().drawing().selection.feature->kind, MapKind::source);
+      QCOMPARE(canvas().drawing().selection.feature->number, 2);
+      click(screenOf(1, 8, 30));
+      QCOMPARE(tab().currentPage(), page);
+      QCOMPARE(tab().pane().currentCell().row, 1);
+      QCOMPARE(canvas().drawing().selection.feature->number, 1);
+    }
+    // And of boundaries: several rows for each, or a column.
+    int boundaries = 0;
+    while (feature(MapKind::boundary, boundaries + 1) != nullptr) ++boundaries;
+    QVERIFY(boundaries > 0);
+    for (const int page : {29, 9}) {
+      QVERIFY(tab().goToPage(page));
+      tab().pane().focusOn({}, 1, boundaries, boundaries);
+      QVERIFY(canvas().drawing().selection.feature.has_value());
+      QCOMPARE(canvas().drawing().selection.feature->kind, MapKind::boundary);
+      QCOMPARE(canvas().drawing().selection.feature->number, boundaries);
+    }
+  }
+
+  void whatWasJustDrawnIsRemovedByTheKey() {
+    window_->map().toolAction(MapTool::source)->trigger();
+    click(screenOf(1, 8, 10));
+    QVERIFY(feature(MapKind::source) != nullptr);
+    canvas().setFocus();
+    QTest::keyClick(&canvas(), Qt::Key_Delete);
+    QVERIFY(feature(MapKind::source) == nullptr);
+    QCOMPARE(canvas().tool(), MapTool::source);
+    // While a line is drawn nothing is removed.
+    window_->map().toolAction(MapTool::dike)->trigger();
+    click(screenOf(1, 20, 60));
+    QTest::keyClick(&canvas(), Qt::Key_Delete);
+    QVERIFY(canvas().isHolding());
+  }
+
+  void longLinesAreFoundAtEveryPoint() {
+    std::vector<MapPoint> points;
+    for (int i = 0; i < 300; ++i) points.push_back(area(1).grid.at(5 + i * 0.2, i % 2 == 0 ? 40 : 60));
+    QVERIFY(canvas().editor()->addFeature(MapKind::dike, points).empty());
+    canvas().refresh();
+    canvas().setFrame({points[150], 1, {}});
+    for (const std::size_t i : {std::size_t{148}, std::size_t{150}, std::size_t{152}}) {
+      const MapHit hit = canvas().drawing().hit(canvas().frame(), screenOf(points[i]));
+      QVERIFY(hit.feature && hit.feature->kind == MapKind::dike);
+      QCOMPARE(*hit.vertex, i);
+    }
+    // Between two points, where one run of points ends and the next begins.
+    for (const std::size_t i : {std::size_t{62}, std::size_t{63}, std::size_t{64}, std::size_t{298}}) {
+      const MapPoint middle{(points[i].east + points[i + 1].east) / 2,
+                            (points[i].north + points[i + 1].north) / 2};
+      canvas().setFrame({middle, 0.05, {}});
+      const MapHit hit = canvas().drawing().hit(canvas().frame(), screenOf(middle));
+      QVERIFY(hit.segment.has_value() && !hit.vertex);
+      QCOMPARE(*hit.segment, i);
+    }
+  }
+
+  void itHasAHelpPage() {
+    canvas().setFocus();
+    QTest::keyClick(window_->windowHandle(), Qt::Key_F1);
+    QVERIFY(window_->help().isVisible());
+    QVERIFY(window_->help().browser().toPlainText().startsWith("The map"));
+  }
+
+  void theCutOfAnAreaIsStoppedWhenTheSetupIsClosed() {
+    MapEditor* editor = canvas().editor();
+    const MapPoint a = area(1).grid.at(2, 2);
+    const MapPoint b = area(1).grid.at(30, 30);
+    const DocumentTab* closed = &tab();
+    QTimer::singleShot(0, qApp, [this] {
+      auto* tabs = window_->findChild<QTabWidget*>();
+      emit tabs->tabCloseRequested(tabs->currentIndex());
+    });
+    const std::string fault =
+        editor->addNestedArea(a, b, file("estuary.tsb2").toStdString(), file("cut.tsb2").toStdString());
+    QVERIFY(closed != window_->currentDocument());
+    QVERIFY(fault.find("closed") != std::string::npos);
+    QVERIFY(!QFile::exists(file("cut.tsb2")));
+  }
+
   void aTurnedGridIsPaintedPointByPoint() {
     TsbDefinition definition;
     definition.axes = {{.points = 40, .spacing = 10}, {.points = 30, .spacing = 10}};
@@ -538,14 +909,13 @@ class MapTest : public DesktopFixture {
       for (int j = 0; j < 40; ++j) values.push_back(-static_cast<double>(j + k));
     }
     QVERIFY(writer && writer->write(1, 0, std::span<const double>(values)) && writer->commit());
-    Result<StoredGrid> grid = StoredGrid::open(file("turned.tsb2").toStdString(), 1);
-    QVERIFY(static_cast<bool>(grid));
+    const auto grid = std::make_shared<TerrainGrid>(*StoredGrid::find(file("turned.tsb2").toStdString(), 1));
+    grid->open({});
+    QVERIFY(grid->opened() != nullptr);
     const double c = std::cos(0.5);
     const double s = std::sin(0.5);
     TerrainRequest request;
-    request.areas = {{std::make_shared<const StoredGrid>(std::move(*grid)),
-                      {{100, 100}, {10 * c, -10 * s}, {10 * s, 10 * c}},
-                      5}};
+    request.areas = {{grid, {{100, 100}, {10 * c, -10 * s}, {10 * s, 10 * c}}, 5}};
     request.frame = {{300, 150}, 1, {600, 500}};
     request.style = {.scale = TerrainScale{-70, 0, 1}, .hillShade = false, .zeroLine = false};
     const auto picture = paintTerrain(request, 1, [] { return false; });

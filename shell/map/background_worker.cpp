@@ -1,0 +1,163 @@
+#include "shell/map/background_worker.h"
+
+#include <QPainter>
+#include <utility>
+
+#include "shell/map/map_drawing.h"
+
+namespace gridbay::shell {
+namespace {
+
+BackgroundFrame pixelsOf(const MapFrame& frame) {
+  const MapPoint corner = frame.toMap({0, 0});
+  return {corner.east, corner.north, frame.metresPerPixel,
+          std::max(1, static_cast<int>(std::ceil(frame.size.width()))),
+          std::max(1, static_cast<int>(std::ceil(frame.size.height())))};
+}
+
+// Points of a line that fall on one pixel are left out.
+QPolygonF lineOf(const MapFrame& frame, const VectorFeature& feature) {
+  QPolygonF line;
+  for (const auto& [east, north] : feature.points) {
+    const QPointF at = frame.toScreen({east, north});
+    if (line.isEmpty() || (at - line.back()).manhattanLength() >= 1) line << at;
+  }
+  return line;
+}
+
+// False when cancelled.
+bool paintShapes(QImage& image, const Background& background, const MapFrame& frame, const QColor& colour,
+                 const std::function<bool()>& isCancelled) {
+  constexpr double kWidth = 1.5;
+  constexpr double kRadius = 3;
+  const QRectF all(QPointF(-kRadius, -kRadius), frame.size + QSizeF(2 * kRadius, 2 * kRadius));
+  QPainter painter(&image);
+  painter.setRenderHint(QPainter::Antialiasing);
+  painter.setPen(QPen(colour, kWidth));
+  painter.setBrush(colour);
+  for (const VectorLayer& layer : background.shapes()) {
+    for (const VectorFeature& feature : layer.features) {
+      if (isCancelled()) return false;
+      const QPolygonF line = lineOf(frame, feature);
+      const QRectF cover = line.boundingRect().adjusted(-kRadius, -kRadius, kRadius, kRadius);
+      if (!cover.intersects(all)) continue;
+      if (layer.shape == VectorShape::points || line.size() < 2) {
+        painter.drawEllipse(line.front(), kRadius, kRadius);
+      } else {
+        painter.drawPolyline(layer.shape == VectorShape::polygon ? QPolygonF(line + QPolygonF{{line.front()}})
+                                                                 : line);
+      }
+    }
+  }
+  return true;
+}
+
+}  // namespace
+
+BackgroundWorker::BackgroundWorker(QObject* parent)
+    : QObject(parent), thread_([this](const std::stop_token& stop) { work(stop); }) {}
+
+BackgroundWorker::~BackgroundWorker() {
+  thread_.request_stop();
+  thread_.join();
+}
+
+void BackgroundWorker::paint(BackgroundRequest request) {
+  {
+    const std::lock_guard lock(mutex_);
+    request_ = std::move(request);
+  }
+  wake_.notify_one();
+}
+
+bool BackgroundWorker::isIdle() const {
+  const std::lock_guard lock(mutex_);
+  return !request_ && !atWork_ && undelivered_ == 0;
+}
+
+std::optional<BackgroundRequest> BackgroundWorker::next(const std::stop_token& stop) {
+  std::unique_lock lock(mutex_);
+  atWork_ = false;
+  if (!wake_.wait(lock, stop, [this] { return request_.has_value(); })) return std::nullopt;
+  atWork_ = true;
+  return std::exchange(request_, std::nullopt);
+}
+
+void BackgroundWorker::deliver(BackgroundPicture picture) {
+  {
+    const std::lock_guard lock(mutex_);
+    ++undelivered_;
+  }
+  QMetaObject::invokeMethod(
+      this,
+      [this, picture = std::move(picture)] {
+        {
+          const std::lock_guard lock(mutex_);
+          --undelivered_;
+        }
+        emit painted(picture);
+      },
+      Qt::QueuedConnection);
+}
+
+BackgroundWorker::Opened* BackgroundWorker::openedOf(const QString& path, const std::string& projection,
+                                                     const std::function<bool()>& isCancelled) {
+  if (projection != projection_) opened_.clear();
+  projection_ = projection;
+  if (const auto found = opened_.find(path); found != opened_.end()) return &found->second;
+  Opened opened;
+  if (auto background = openBackground(path.toStdString(), projection, isCancelled)) {
+    opened.background = std::move(*background);
+  } else if (isCancelled()) {
+    return nullptr;
+  } else {
+    opened.fault = QString::fromStdString(background.error());
+  }
+  return &(opened_[path] = std::move(opened));
+}
+
+void BackgroundWorker::work(const std::stop_token& stop) {
+  while (const std::optional<BackgroundRequest> request = next(stop)) {
+    const auto isOutOfDate = [this, &stop] {
+      if (stop.stop_requested()) return true;
+      const std::lock_guard lock(mutex_);
+      return request_.has_value();
+    };
+    // The reading of a whole file goes on while the map moves.
+    const auto isStopped = [&stop] { return stop.stop_requested(); };
+    std::erase_if(opened_, [&request](const auto& each) {
+      return std::ranges::none_of(
+          request->sources, [&each](const BackgroundSource& source) { return source.path == each.first; });
+    });
+    for (const BackgroundSource& source : request->sources) {
+      if (isOutOfDate()) break;
+      Opened* opened = openedOf(source.path, request->projection, isStopped);
+      if (opened == nullptr) return;
+      BackgroundPicture picture{source.id, {}, request->frame, true, opened->fault, {}};
+      if (opened->background) {
+        const BackgroundFrame pixels = pixelsOf(request->frame);
+        picture.notice = QString::fromStdString(opened->background->notice());
+        picture.isRaster = opened->background->isRaster();
+        picture.image =
+            QImage(pixels.width, pixels.height,
+                   picture.isRaster ? QImage::Format_ARGB32 : QImage::Format_ARGB32_Premultiplied);
+        picture.image.fill(Qt::transparent);
+        std::string fault;
+        const std::span values(
+            reinterpret_cast<std::uint32_t*>(picture.image.bits()),
+            static_cast<std::size_t>(pixels.width) * static_cast<std::size_t>(pixels.height));
+        const bool isDone = picture.isRaster ? opened->background->paint(pixels, values, isOutOfDate, &fault)
+                                             : paintShapes(picture.image, *opened->background, request->frame,
+                                                           source.colour, isOutOfDate);
+        if (!isDone && fault.empty()) break;
+        if (!isDone) {
+          picture.image = QImage();
+          picture.fault = QString("cannot show \"%1\": %2").arg(source.path, QString::fromStdString(fault));
+        }
+      }
+      deliver(std::move(picture));
+    }
+  }
+}
+
+}  // namespace gridbay::shell

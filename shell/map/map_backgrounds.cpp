@@ -1,0 +1,184 @@
+#include "shell/map/map_backgrounds.h"
+
+#include <QFileInfo>
+#include <algorithm>
+#include <array>
+
+namespace gridbay::shell {
+namespace {
+
+// Of lines, one after the other.
+constexpr std::array<QRgb, 5> kColours{0xFF202020, 0xFF0B3C8C, 0xFF9C1C1C, 0xFF2E6B1F, 0xFF6A2C91};
+
+}  // namespace
+
+MapBackgrounds::MapBackgrounds(QObject* parent) : QObject(parent) {}
+
+std::size_t MapBackgrounds::placeOf(int id) const {
+  return static_cast<std::size_t>(std::ranges::find(all_, id, &MapBackground::id) - all_.begin());
+}
+
+const MapBackground* MapBackgrounds::of(int id) const {
+  const std::size_t place = placeOf(id);
+  return place < all_.size() ? &all_[place] : nullptr;
+}
+
+QString MapBackgrounds::told(const MapBackground& background) {
+  if (!background.picture) return {};
+  const BackgroundPicture& picture = *background.picture;
+  if (!picture.fault.isEmpty()) return picture.fault;
+  return picture.notice.isEmpty()
+             ? QString()
+             : QString("%1: %2").arg(QFileInfo(background.path).fileName(), picture.notice);
+}
+
+void MapBackgrounds::add(const QString& path) {
+  ++lastId_;
+  const QColor colour(kColours[static_cast<std::size_t>(lastId_) % kColours.size()]);
+  const auto place = all_.begin() + static_cast<std::ptrdiff_t>(below_);
+  all_.insert(place, {.id = lastId_, .path = QFileInfo(path).absoluteFilePath(), .colour = colour});
+  ++below_;
+  requestAgain();
+  emit changed();
+}
+
+void MapBackgrounds::remove(int id) {
+  const std::size_t place = placeOf(id);
+  if (place >= all_.size()) return;
+  all_.erase(all_.begin() + static_cast<std::ptrdiff_t>(place));
+  if (place < below_) --below_;
+  requestAgain();
+  emit changed();
+  emit painted();
+}
+
+void MapBackgrounds::move(int id, bool isUp) {
+  const std::size_t place = placeOf(id);
+  if (place >= all_.size()) return;
+  if (isUp && place + 1 == below_) {
+    --below_;
+  } else if (!isUp && place == below_) {
+    ++below_;
+  } else if (isUp && place + 1 < all_.size()) {
+    std::swap(all_[place], all_[place + 1]);
+  } else if (!isUp && place > 0) {
+    std::swap(all_[place], all_[place - 1]);
+  } else {
+    return;
+  }
+  emit changed();
+  emit painted();
+}
+
+void MapBackgrounds::setShown(int id, bool isShown) {
+  const std::size_t place = placeOf(id);
+  if (place >= all_.size() || all_[place].isShown == isShown) return;
+  all_[place].isShown = isShown;
+  requestAgain();
+  emit changed();
+  emit painted();
+}
+
+void MapBackgrounds::setOpacity(int id, double opacity) {
+  const std::size_t place = placeOf(id);
+  if (place >= all_.size() || all_[place].opacity == opacity) return;
+  all_[place].opacity = std::clamp(opacity, 0.0, 1.0);
+  emit changed();
+  emit painted();
+}
+
+void MapBackgrounds::setColour(int id, const QColor& colour) {
+  const std::size_t place = placeOf(id);
+  if (place >= all_.size() || !colour.isValid()) return;
+  all_[place].colour = colour;
+  requestAgain();
+  emit changed();
+}
+
+QVariantList MapBackgrounds::saved() const {
+  QVariantList list;
+  for (std::size_t i = 0; i < all_.size(); ++i) {
+    const MapBackground& each = all_[i];
+    list << QVariantMap{{"path", each.path},       {"shown", each.isShown},
+                        {"opacity", each.opacity}, {"colour", each.colour.name()},
+                        {"placed", each.hasPlace}, {"above", i >= below_}};
+  }
+  return list;
+}
+
+void MapBackgrounds::restore(const QVariantList& saved) {
+  all_.clear();
+  below_ = 0;
+  for (const QVariant& each : saved) {
+    const QVariantMap map = each.toMap();
+    const QString path = map["path"].toString();
+    if (path.isEmpty()) continue;
+    all_.push_back({.id = ++lastId_,
+                    .path = path,
+                    .isShown = map["shown"].toBool(),
+                    .opacity = std::clamp(map["opacity"].toDouble(), 0.0, 1.0),
+                    .colour = QColor(map["colour"].toString()),
+                    .hasPlace = map["placed"].toBool()});
+    if (!map["above"].toBool()) below_ = all_.size();
+  }
+  requestAgain();
+  emit changed();
+  emit painted();
+}
+
+void MapBackgrounds::request(const MapFrame& frame, const std::string& projection) {
+  if (frame == frame_ && projection == projection_) return;
+  frame_ = frame;
+  projection_ = projection;
+  requestAgain();
+}
+
+void MapBackgrounds::requestAgain() {
+  BackgroundRequest request{{}, frame_, projection_};
+  for (const MapBackground& each : all_) {
+    if (each.isShown) request.sources.push_back({each.id, each.path, each.colour});
+  }
+  if (frame_.size.isEmpty() || (worker_ == nullptr && request.sources.empty())) return;
+  if (worker_ == nullptr) {
+    worker_ = new BackgroundWorker(this);
+    connect(worker_, &BackgroundWorker::painted, this, &MapBackgrounds::take);
+  }
+  worker_->paint(std::move(request));
+}
+
+void MapBackgrounds::take(const BackgroundPicture& picture) {
+  const std::size_t place = placeOf(picture.id);
+  if (place >= all_.size()) return;
+  MapBackground& background = all_[place];
+  const QString before = told(background);
+  background.picture = picture;
+  bool isMoved = false;
+  if (!background.hasPlace && picture.fault.isEmpty()) {
+    background.hasPlace = true;
+    isMoved = true;
+    if (!picture.isRaster && place < below_) {
+      std::rotate(all_.begin() + static_cast<std::ptrdiff_t>(place),
+                  all_.begin() + static_cast<std::ptrdiff_t>(place) + 1,
+                  all_.begin() + static_cast<std::ptrdiff_t>(below_));
+      --below_;
+    }
+  }
+  if (isMoved || before != told(*of(picture.id))) emit changed();
+  emit painted();
+}
+
+void MapBackgrounds::paint(QPainter& painter, const MapFrame& frame, bool above) const {
+  const QRectF all({0, 0}, frame.size);
+  for (std::size_t i = above ? below_ : 0; i < (above ? all_.size() : below_); ++i) {
+    const MapBackground& each = all_[i];
+    if (!each.isShown || !each.picture || each.picture->image.isNull()) continue;
+    const QRectF place = each.picture->frame.in(frame);
+    if (!place.intersects(all)) continue;
+    painter.save();
+    painter.setOpacity(each.opacity);
+    painter.drawImage(place, each.picture->image);
+    painter.restore();
+  }
+}
+
+}  // namespace gridbay::shell
