@@ -208,7 +208,8 @@ void adviseFileNames(AdviceContext& context) {
 
 void adviseOutputSize(AdviceContext& context) {
   if (context.documentPath.empty() || !context.freeMegabytes) return;
-  for (const auto& [device, disk] : disksOf(context).all()) {
+  const Disks disks = disksOf(context);
+  for (const auto& [device, disk] : disks.all()) {
     const std::optional<double> room = context.freeMegabytes(disk.folder);
     if (!room || !(disk.megabytes > *room)) continue;
     PagePlace place{.page = PageId::hdResult};

@@ -1,5 +1,7 @@
 #include "compare/keyword_pages.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <map>
 #include <set>
@@ -13,6 +15,7 @@ namespace {
 
 constexpr std::size_t kMostKeywords = 500;
 constexpr std::size_t kMostRead = 1'000'000;  // fields and cells
+constexpr std::size_t kMostRows = 50;         // of one setup alone, that are told one by one
 constexpr std::size_t kMostColumns = 4;       // that tell what a row is
 
 const ShownCell* cellAt(const ShownTable& table, int row, int column) {
@@ -85,15 +88,27 @@ class PageComparer {
            static_cast<int>(i) + 1);
       }
     }
-    for (std::size_t row = rows; row < own.rows.size(); ++row) {
-      if (own.rows[row].isEntry)
-        at(add(of + own.rows[row].name, shownText(own.rows[row]), std::nullopt), table, own.rows[row].number,
-           0);
+    addRows(own, rows, of, table, &Difference::own);
+    addRows(other, rows, of, table, &Difference::other);
+  }
+
+  // Rows that only one has, from a place on; very many are told as one.
+  void addRows(const ShownTable& shown, std::size_t first, const std::string& of, int table,
+               std::optional<std::string> Difference::*side) {
+    if (shown.rows.size() > first + kMostRows) {
+      std::string name = shown.rows[first].name;
+      if (name.starts_with("Row ")) name.insert(3, "s");
+      const std::string& last = shown.rows.back().name;
+      name += " to " + last.substr(last.rfind(' ') + 1);
+      Difference& difference = add(of + name, std::nullopt, std::nullopt);
+      difference.*side = fmt::format("{} rows", shown.rows.size() - first);
+      return at(difference, table, shown.rows[first].number, 0);
     }
-    for (std::size_t row = rows; row < other.rows.size(); ++row) {
-      if (other.rows[row].isEntry)
-        at(add(of + other.rows[row].name, std::nullopt, shownText(other.rows[row])), table,
-           other.rows[row].number, 0);
+    for (std::size_t row = first; row < shown.rows.size(); ++row) {
+      if (!shown.rows[row].isEntry) continue;
+      Difference& difference = add(of + shown.rows[row].name, std::nullopt, std::nullopt);
+      difference.*side = shownText(shown.rows[row]);
+      at(difference, table, shown.rows[row].number, 0);
     }
   }
 

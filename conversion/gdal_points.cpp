@@ -72,7 +72,7 @@ class PointRaster final : public Raster {
   int rows() const override { return rows_; }
   RasterPlace place() const override { return {first_, {points_.spacing, 0}, {0, points_.spacing}}; }
   bool hasPlace() const override { return true; }
-  std::string otherUnit() const override { return {}; }
+  std::string otherUnit() const override { return points_.unit; }
   std::string projection() const override { return points_.projection; }
   std::optional<double> missingValue() const override { return kMissing; }
   std::size_t pointsAtOnce() const override { return std::size_t{1} << 16; }

@@ -6,6 +6,7 @@
 #include <array>
 #include <cmath>
 #include <limits>
+#include <numeric>
 #include <optional>
 #include <string_view>
 
@@ -25,23 +26,20 @@ std::string_view trimmed(std::string_view text) {
   return text.substr(first, text.find_last_not_of(kBlanks) - first + 1);
 }
 
-// How the lines of a file are divided. Commas are decimal ones where another separator does.
+// How the lines of a file are divided. Where commas don't divide them, they are decimal ones.
 struct Separation {
   char separator = ' ';  // a blank for any number of them
-  bool hasDecimalCommas = false;
 
   static Separation of(std::string_view line) {
-    Separation found;
-    const bool hasCommas = line.find(',') != line.npos;
     for (const char separator : {';', '\t'}) {
-      if (line.find(separator) != line.npos) return {separator, hasCommas};
+      if (line.find(separator) != line.npos) return {separator};
     }
-    if (!hasCommas) return found;
-    const std::vector<std::string_view> words = found.fieldsOf(line);
+    if (line.find(',') == line.npos) return {};
+    const std::vector<std::string_view> words = Separation().fieldsOf(line);
     const bool isDecimal = words.size() >= 3 && std::ranges::none_of(words, [](std::string_view word) {
                              return word.front() == ',' || word.back() == ',';
                            });
-    return {isDecimal ? ' ' : ',', isDecimal};
+    return {isDecimal ? ' ' : ','};
   }
 
   std::vector<std::string_view> fieldsOf(std::string_view line) const {
@@ -58,7 +56,7 @@ struct Separation {
 
   std::optional<double> numberOf(std::string_view field) const {
     std::string plain;
-    if (hasDecimalCommas && field.find(',') != field.npos) {
+    if (separator != ',' && field.find(',') != field.npos) {
       plain = field;
       plain[plain.find(',')] = '.';
       field = plain;
@@ -113,6 +111,22 @@ double PointSet::meanDistance() const {
   const auto [west, east] = std::ranges::minmax(x);
   const auto [south, north] = std::ranges::minmax(y);
   return std::sqrt((east - west) * (north - south) / static_cast<double>(x.size()));
+}
+
+bool PointSet::areInLine() const {
+  const double count = static_cast<double>(x.size());
+  const double east = std::accumulate(x.begin(), x.end(), 0.0) / count;
+  const double north = std::accumulate(y.begin(), y.end(), 0.0) / count;
+  double xx = 0;
+  double xy = 0;
+  double yy = 0;
+  for (std::size_t i = 0; i < x.size(); ++i) {
+    xx += (x[i] - east) * (x[i] - east);
+    xy += (x[i] - east) * (y[i] - north);
+    yy += (y[i] - north) * (y[i] - north);
+  }
+  constexpr double kNoWidth = 1e-12;
+  return !(xx * yy - xy * xy > kNoWidth * xx * yy);
 }
 
 bool holdsPoints(const std::string& path) {

@@ -17,6 +17,8 @@ struct PointSet {
   // Between neighbours, where the points were spread evenly over their extent; in the unit of the
   // coordinates.
   double meanDistance() const;
+  // No triangle can be made of them.
+  bool areInLine() const;
 };
 
 // Whether a file begins as a text of points does: with three numbers on a line, below one heading at most.

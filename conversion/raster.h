@@ -95,6 +95,7 @@ struct PointGrid {
   std::vector<double> y;
   std::vector<double> z;
   std::string projection;  // its full text; empty for none
+  std::string unit;        // of the coordinates where it is not metres
   double spacing = 1;
   double reach = 0;  // how far off a point counts, by distance
   Gridding gridding = Gridding::linear;

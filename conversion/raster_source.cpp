@@ -96,6 +96,8 @@ Result<std::unique_ptr<Raster>> warpedRaster(const RasterConversion& options, Ra
   if (!own) return Failure{own.error()};
   target.from = *own;
   if (isTsbRaster(options.in)) {
+    // A short name is not known to the raster library.
+    if (target.from.empty()) target.from = CVdMapProjection(raster.projection()).Wkt2();
     // Land stays land. Where more of it is to be sea, what is said of it counts.
     target.land = raster.landValue();
     if (target.land && options.land && *options.land > *target.land) target.land.reset();
@@ -157,8 +159,10 @@ Result<std::unique_ptr<Raster>> griddedPoints(const RasterConversion& options, C
     if (const Outcome done = reproject(*points, *own, *wanted); !done) return Failure{done.error()};
     projection = *wanted;
   }
+  const Result<std::string> inMetres = projection.empty() ? projection : projectionInMetres(projection);
+  if (!inMetres && !guessSpacing) return Failure{inMetres.error()};
   const double distance = points->meanDistance();
-  if (!(distance > 0)) return Failure{"The points lie on one line"};
+  if (points->areInLine()) return Failure{"The points lie on one line"};
   if (!options.resample && !guessSpacing) {
     return Failure{fmt::format("Points need the spacing of a grid: {} (they lie about {:.2g} apart)",
                                host.option("resample", "DX"), distance)};
@@ -169,6 +173,7 @@ Result<std::unique_ptr<Raster>> griddedPoints(const RasterConversion& options, C
                      .y = std::move(points->y),
                      .z = std::move(points->z),
                      .projection = projection,
+                     .unit = inMetres ? "" : "degrees",
                      .spacing = spacing,
                      .reach = kReach * std::max(distance, spacing),
                      .gridding = options.gridding.value_or(Gridding::linear)});

@@ -123,12 +123,13 @@ Result<ConvertedSeries> convertSeries(const SeriesConversion& options, Conversio
   if (form->columns.empty()) return unread("there are no values");
   if (form->columns.size() == 1)
     return unread(fmt::format("line {}: a time and at least one value are expected", options.skipLines + 1));
-  if (const Outcome given = giveItemTypes(*form, options, host); !given) return Failure{given.error()};
   if (const std::string fault = faultOf(*form); !fault.empty()) return Failure{fault};
+  if (const Outcome given = giveItemTypes(*form, options, host); !given) return Failure{given.error()};
+  if (const std::string fault = faultOfItems(*form); !fault.empty()) return Failure{fault};
   const Result<SeriesTable> table = readSeriesTable(text->view(), *form);
   if (!table) return unread(table.error());
   if (table->faultCount > 0) {
-    const auto& [line, why] = table->faults.front();
+    const auto& [line, text_, why] = table->faults.front();
     const bool mayBeHeading = isPlain && line <= static_cast<std::size_t>(options.skipLines) + 1;
     return unread(fmt::format(
         "line {}: {}{}", line, why,

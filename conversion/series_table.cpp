@@ -95,7 +95,8 @@ class Reader {
     }
     constexpr std::size_t kMostKept = 1000;
     ++table_.faultCount;
-    if (table_.faults.size() < kMostKept) table_.faults.push_back({number, std::move(row.fault)});
+    if (table_.faults.size() < kMostKept)
+      table_.faults.push_back({number, std::string(line), std::move(row.fault)});
   }
 
   std::string_view rest_;
@@ -106,10 +107,7 @@ class Reader {
 };
 
 TsbItem itemOf(const TableColumn& column) {
-  const QunUnit* base = qunBaseUnit(column.itemType);
-  TsbItem made{column.name, column.itemType, std::string(base == nullptr ? "" : base->text), true};
-  if (base == nullptr) made.type = item::kUndefined;
-  return made;
+  return {column.name, column.itemType, std::string(qunBaseUnit(column.itemType)->text), true};
 }
 
 }  // namespace
@@ -129,6 +127,19 @@ std::string faultOf(const TableForm& form) {
     return fmt::format("\"{}\" is no moment of the form YYYY-MM-DD hh:mm:ss", form.start);
   if (!qunAreEquivalent(form.timeUnit, "s"))
     return fmt::format("\"{}\" is no unit of time (s, min, h, d)", form.timeUnit);
+  return {};
+}
+
+std::string faultOfItems(const TableForm& form) {
+  for (const TableColumn& column : form.columns) {
+    if (column.role != Role::item) continue;
+    const QunItem* quantity = qunFindItem(column.itemType);
+    if (quantity == nullptr)
+      return fmt::format("What \"{}\" holds is not known: it needs an item type", column.name);
+    if (column.unit.empty() || qunAreEquivalent(column.unit, qunBaseUnit(quantity->code)->text)) continue;
+    return fmt::format("\"{}\" is no unit of {}, the item type of \"{}\"", column.unit, quantity->name,
+                       column.name);
+  }
   return {};
 }
 
@@ -157,10 +168,6 @@ Result<ConvertedSeries> writeSeriesTable(const SeriesTable& table, const SeriesT
   for (std::size_t i = 0; i < table.items.size(); ++i) {
     const TsbItem& made = definition.items[i];
     const CVdUnitConverter converter(table.items[i].unit, made.unit);
-    if (!table.items[i].unit.empty() && !converter.IsValid()) {
-      return Failure{fmt::format("\"{}\" is no unit of {}, the item type of \"{}\"", table.items[i].unit,
-                                 qunFindItem(made.type)->name, made.name)};
-    }
     for (std::size_t step = 0; step < steps; ++step) {
       const double given = table.values[i][step];
       const double value = std::isnan(given)             ? made.deleteValue

@@ -16,6 +16,7 @@ namespace gridbay {
 // A line that can't be taken.
 struct TableFault {
   std::size_t line = 0;  // from 1
+  std::string text;      // of the line
   std::string why;
 };
 
@@ -32,6 +33,8 @@ struct SeriesTable {
 
 // Why no table can be read by a form: no times, no items, no start; empty for nothing.
 std::string faultOf(const TableForm& form);
+// What is missing or wrong in what its items are: an item type, a unit that is none of it; empty for nothing.
+std::string faultOfItems(const TableForm& form);
 
 // Reads all lines. `reached` is told how much is done (0 to 1) and stops it by false. An error where there
 // are no lines of values; where all of them are at fault there are no times.
@@ -55,8 +58,8 @@ struct ConvertedSeries {
   std::string summary;  // the same for people, one line
 };
 
-// Writes the series, of at least one time, its values in the base units of their item types. An error leaves
-// what is at the path as it was.
+// Writes the series, of at least one time and of items without fault, its values in the base units of their
+// item types. An error leaves what is at the path as it was.
 Result<ConvertedSeries> writeSeriesTable(const SeriesTable& table, const SeriesTarget& target,
                                          ConversionHost& host);
 

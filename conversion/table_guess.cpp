@@ -17,7 +17,7 @@ namespace {
 
 using Role = TableColumn::Role;
 
-constexpr std::size_t kMostLines = 300'000;
+constexpr std::size_t kMostLines = 50'000;
 constexpr std::size_t kSampleLines = 60;
 constexpr std::size_t kMostFields = 500;
 

@@ -15,7 +15,7 @@ struct TableGuess {
 };
 
 // Looks at the first lines for separator, headings, names, units and item types; at all of them for the order
-// of dates and for missing values, up to some hundred thousand.
+// of dates and for missing values, up to some ten thousand.
 TableGuess guessTable(std::string_view text);
 // The same with what is known before it: the separator (0 to find it) and the number of heading lines (below
 // 0 to find it).

@@ -238,6 +238,10 @@ std::string unitOfHeading(std::string_view text) {
 
 int itemTypeOfHeading(std::string_view name, std::string_view unit) {
   const std::string small = lowered(name);
+  // "Level" is an item type of its own, and seldom meant.
+  for (const auto& [part, itemType] : kWords) {
+    if (part == small && fits(itemType, unit)) return itemType;
+  }
   for (const QunItem& quantity : qunItems()) {
     if (lowered(quantity.name) == small && fits(quantity.code, unit)) return quantity.code;
   }

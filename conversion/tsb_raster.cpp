@@ -79,9 +79,7 @@ class TsbRaster final : public Raster {
     }
     return {};
   }
-  std::string projection() const override {
-    return geography_ ? geography_->projection : std::string();
-  }
+  std::string projection() const override { return geography_ ? geography_->projection : std::string(); }
   std::optional<double> missingValue() const override { return definition().items[item_ - 1].deleteValue; }
 
   std::optional<float> landValue() const override {

@@ -1,5 +1,6 @@
 #include "mud_transport_expanded/waves.h"
 
+#include "core/table_code.h"
 #include "families/data_files.h"
 #include "mud_transport_expanded/forcings.h"
 #include "mud_transport_expanded/mud_transport_expanded_parts.h"

@@ -78,6 +78,7 @@ SetupSummary summaryOf(CGlobalKvs& model, const UnitChoices& units) {
     summary.lines.push_back(lineOf(*areas.GetItem(number), number));
     summary.gridsAreRead = summary.gridsAreRead && areas.GetItem(number)->isRead();
   }
+  summary.period = {model.simulationPeriod->start, model.simulationPeriod->End()};
   summary.lines.push_back(periodOf(*model.simulationPeriod, units));
   summary.lines.push_back(courantOf(areas, *model.simulationPeriod, summary.gridsAreRead));
   const CBoundaryKvs& boundaries = *model.boundary;

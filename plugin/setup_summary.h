@@ -1,9 +1,11 @@
 #pragma once
 
+#include <array>
 #include <cstdint>
 #include <string>
 #include <vector>
 
+#include "core/date_time.h"
 #include "platform/units/edit_style.h"
 
 namespace gridbay {
@@ -22,6 +24,8 @@ struct SetupSummary {
   };
 
   std::vector<Line> lines;
+  // Begin and end of the simulation.
+  std::array<DateTime, 2> period;
   // Whether the model holds the grids of all areas.
   bool gridsAreRead = false;
 };

@@ -130,7 +130,7 @@ struct Function {
   std::string name;
   std::vector<Argument> arguments;
   std::vector<const char*> types;
-  const char* doc = "";
+  std::string doc;
   // What is allowed where the body finds that what was given can't be, by std::invalid_argument.
   const char* allowed = "";
   Body body;

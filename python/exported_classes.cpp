@@ -268,8 +268,8 @@ Members<Model> addFloodModel(py::module_& module, const char* name, const char* 
 void addFloodModels(py::module_& module) {
   py::class_<OutputPosition>(module, "OutputPosition", py::module_local(),
                              "At which output a walk through them is; false behind the last one.")
-      .def_readonly("number", &OutputPosition::number)
-      .def("__bool__", &OutputPosition::operator bool);
+      .def_readonly("number", &OutputPosition::number, "Of the output, from 1; 0 behind the last one.")
+      .def("__bool__", &OutputPosition::operator bool, "Whether there is an output.");
 
   using Flood = Flooding_V27FlowModel;
   using Urban = UrbanFlooding_V27Flowmodel;
@@ -392,14 +392,45 @@ Argument nth(int (Climate::*count)()) {
   return indexIn<Climate>(count);
 }
 
+// The members over the value, the time series and the maps of one forcing.
+template <class No, class GetValue, class SetValue, class GetFile, class SetFile>
+void addForcing(Members<Climate>& climate, const std::string& name, const std::string& what,
+                const std::string& howMany, No countValues, GetValue getValue, SetValue setValue,
+                No countSeries, GetFile getSeries, SetFile setSeries, No countMaps, GetFile getMaps,
+                SetFile setMaps) {
+  const Argument file = fileName();
+  const auto add = [&](const std::string& member, auto function, std::vector<Argument> arguments,
+                       const std::string& doc) {
+    climate.add(member.c_str(), function, std::move(arguments), doc.c_str());
+  };
+  add("GetNo" + name + "Values", countValues, {},
+      "How many constants there are of " + what + "; 0 counts as none." + howMany);
+  add("Get" + name + "Values", getter(getValue), {nth(countValues)}, "The constant: " + what + ".");
+  add("Set" + name + "Values", setValue, {nth(countValues), {"value"}},
+      "Gives the constant another value: " + what + ".");
+  add("GetNo" + name + "TimeSeries", countSeries, {},
+      "How many time series there are of " + what + "." + howMany);
+  add("Get" + name + "FileItem", getter(getSeries), {nth(countSeries)},
+      "The file of the time series, and 1 for its item: " + what + ".");
+  add("Set" + name + "File", setSeries, {nth(countSeries), file},
+      "Gives the time series another file: " + what + ".");
+  add("GetNo" + name + "GridSeries", countMaps, {},
+      "How many maps in time there are of " + what + "." + howMany);
+  add("Get" + name + "GridFileItem", getter(getMaps), {nth(countMaps)},
+      "The file of the maps, and 1 for its item: " + what + ".");
+  add("Set" + name + "GridFile", setMaps, {nth(countMaps), file},
+      "Gives the maps another file: " + what + ".");
+}
+
 void addClimateChange(py::module_& module) {
   const Argument value{"value"};
   const Argument file = fileName();
-  Members<Climate>(
+  Members<Climate> climate(
       py::class_<Climate>(module, "CClimateChange_V27", py::module_local(),
                           "The forcings of a setup, to be looked at and replaced. Indices count, "
                           "from 1, what is of the kind. Members give 1, and what was asked for.")
-          .def(py::init<>()))
+          .def(py::init<>()));
+  climate
       .add(
           "ShowMessagesWith",
           [](Climate& model, MessageBox show) { ShowMessagesWith(model, std::move(show)); }, {{"show"}},
@@ -442,46 +473,46 @@ void addClimateChange(py::module_& module) {
           },
           {}, "1 and degrees; 0 in local coordinates.")
       .add("ResultOutputsHasAbsolutePath", &Climate::ResultOutputsHasAbsolutePath, {},
-           "1 where the name of an output has a folder.")
-      .add("GetNoPrecValues", &Climate::GetNoPrecValues)
-      .add("GetPrecValues", getter(&Climate::GetPrecValues), {nth(&Climate::GetNoPrecValues)})
-      .add("SetPrecValues", &Climate::SetPrecValues, {nth(&Climate::GetNoPrecValues), value})
-      .add("GetNoPrecTimeSeries", &Climate::GetNoPrecTimeSeries)
-      .add("GetPrecFileItem", getter(&Climate::GetPrecFileItem), {nth(&Climate::GetNoPrecTimeSeries)})
-      .add("SetPrecFile", &Climate::SetPrecFile, {nth(&Climate::GetNoPrecTimeSeries), file})
-      .add("GetNoPrecGridSeries", &Climate::GetNoPrecGridSeries)
-      .add("GetPrecGridFileItem", getter(&Climate::GetPrecGridFileItem), {nth(&Climate::GetNoPrecGridSeries)})
-      .add("SetPrecGridFile", &Climate::SetPrecGridFile, {nth(&Climate::GetNoPrecGridSeries), file})
-      .add("GetNoEvapValues", &Climate::GetNoEvapValues)
-      .add("GetEvapValues", getter(&Climate::GetEvapValues), {nth(&Climate::GetNoEvapValues)})
-      .add("SetEvapValues", &Climate::SetEvapValues, {nth(&Climate::GetNoEvapValues), value})
-      .add("GetNoEvapTimeSeries", &Climate::GetNoEvapTimeSeries)
-      .add("GetEvapFileItem", getter(&Climate::GetEvapFileItem), {nth(&Climate::GetNoEvapTimeSeries)})
-      .add("SetEvapFile", &Climate::SetEvapFile, {nth(&Climate::GetNoEvapTimeSeries), file})
-      .add("GetNoEvapGridSeries", &Climate::GetNoEvapGridSeries)
-      .add("GetEvapGridFileItem", getter(&Climate::GetEvapGridFileItem), {nth(&Climate::GetNoEvapGridSeries)})
-      .add("SetEvapGridFile", &Climate::SetEvapGridFile, {nth(&Climate::GetNoEvapGridSeries), file})
-      .add("GetNoTempValues", &Climate::GetNoTempValues)
-      .add("GetTempValues", getter(&Climate::GetTempValues), {nth(&Climate::GetNoTempValues)})
-      .add("SetTempValues", &Climate::SetTempValues, {nth(&Climate::GetNoTempValues), value})
-      .add("GetNoTempTimeSeries", &Climate::GetNoTempTimeSeries)
-      .add("GetTempFileItem", getter(&Climate::GetTempFileItem), {nth(&Climate::GetNoTempTimeSeries)})
-      .add("SetTempFile", &Climate::SetTempFile, {nth(&Climate::GetNoTempTimeSeries), file})
-      .add("GetNoTempGridSeries", &Climate::GetNoTempGridSeries)
-      .add("GetTempGridFileItem", getter(&Climate::GetTempGridFileItem), {nth(&Climate::GetNoTempGridSeries)})
-      .add("SetTempGridFile", &Climate::SetTempGridFile, {nth(&Climate::GetNoTempGridSeries), file})
-      .add("GetNoWLValue", &Climate::GetNoWLValue)
-      .add("GetNoWLTimeSeries", &Climate::GetNoWLTimeSeries)
-      .add("GetNoWLLineSeries", &Climate::GetNoWLLineSeries)
-      .add("GetWLvalueIDLocation", getter(&Climate::GetWLvalueIDLocation), {nth(&Climate::GetNoWLValue)})
-      .add("GetWLTSIDLocation", getter(&Climate::GetWLTSIDLocation), {nth(&Climate::GetNoWLTimeSeries)})
-      .add("GetWLLineIDLocation", getter(&Climate::GetWLLineIDLocation), {nth(&Climate::GetNoWLLineSeries)})
-      .add("GetWLValue", getter(&Climate::GetWLValue), {nth(&Climate::GetNoWLValue)})
-      .add("SetWLValue", &Climate::SetWLValue, {nth(&Climate::GetNoWLValue), value})
-      .add("GetWLFileItem", getter(&Climate::GetWLFileItem), {nth(&Climate::GetNoWLTimeSeries)})
-      .add("SetWLFile", &Climate::SetWLFile, {nth(&Climate::GetNoWLTimeSeries), file})
-      .add("GetWLLineFileItem", getter(&Climate::GetWLLineFileItem), {nth(&Climate::GetNoWLLineSeries)})
-      .add("SetWLLineFile", &Climate::SetWLLineFile, {nth(&Climate::GetNoWLLineSeries), file, item()});
+           "1 where the name of an output has a folder.");
+  using C = Climate;
+  const std::string once = " There is one at most.";
+  addForcing(climate, "Prec", "precipitation, mm per day", once, &C::GetNoPrecValues, &C::GetPrecValues,
+             &C::SetPrecValues, &C::GetNoPrecTimeSeries, &C::GetPrecFileItem, &C::SetPrecFile,
+             &C::GetNoPrecGridSeries, &C::GetPrecGridFileItem, &C::SetPrecGridFile);
+  addForcing(climate, "Evap", "evaporation, mm per day", once, &C::GetNoEvapValues, &C::GetEvapValues,
+             &C::SetEvapValues, &C::GetNoEvapTimeSeries, &C::GetEvapFileItem, &C::SetEvapFile,
+             &C::GetNoEvapGridSeries, &C::GetEvapGridFileItem, &C::SetEvapGridFile);
+  addForcing(climate, "Temp", "air temperature, degrees Celsius",
+             " There is one where just one component is the temperature.", &C::GetNoTempValues,
+             &C::GetTempValues, &C::SetTempValues, &C::GetNoTempTimeSeries, &C::GetTempFileItem,
+             &C::SetTempFile, &C::GetNoTempGridSeries, &C::GetTempGridFileItem, &C::SetTempGridFile);
+  const Argument level = nth(&C::GetNoWLValue);
+  const Argument series = nth(&C::GetNoWLTimeSeries);
+  const Argument line = nth(&C::GetNoWLLineSeries);
+  constexpr const char* kPlace =
+      "The number of the boundary among all of them, from 1, and its first and last point as \"(0,0) - "
+      "(0,243)\".";
+  climate
+      .add("GetNoWLValue", &C::GetNoWLValue, {},
+           "How many boundaries have a constant water level or a sine series, which counts by its mean.")
+      .add("GetNoWLTimeSeries", &C::GetNoWLTimeSeries, {},
+           "How many boundaries have water levels from a time series.")
+      .add("GetNoWLLineSeries", &C::GetNoWLLineSeries, {},
+           "How many boundaries have water levels from a series along the line.")
+      .add("GetWLvalueIDLocation", getter(&C::GetWLvalueIDLocation), {level}, kPlace)
+      .add("GetWLTSIDLocation", getter(&C::GetWLTSIDLocation), {series}, kPlace)
+      .add("GetWLLineIDLocation", getter(&C::GetWLLineIDLocation), {line}, kPlace)
+      .add("GetWLValue", getter(&C::GetWLValue), {level}, "The water level, or the mean of a sine series, m.")
+      .add("SetWLValue", &C::SetWLValue, {level, value},
+           "Gives the boundary another water level, or a sine series another mean, m.")
+      .add("GetWLFileItem", getter(&C::GetWLFileItem), {series},
+           "The file of water levels and its item, from 1.")
+      .add("SetWLFile", &C::SetWLFile, {series, file},
+           "Gives the boundary another time series; of the file item 1.")
+      .add("GetWLLineFileItem", getter(&C::GetWLLineFileItem), {line},
+           "The file of water levels along the line and its item, from 1.")
+      .add("SetWLLineFile", &C::SetWLLineFile, {line, file, item()},
+           "Gives the boundary another series along the line; an item below 1 is refused.");
 }
 
 }  // namespace

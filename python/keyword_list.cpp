@@ -21,6 +21,7 @@
 #include "ecology/model_definition.h"
 #include "pages/form_view.h"
 #include "pages/grid_wnd.h"
+#include "python/model_snapshot.h"
 #include "python/page_fields.h"
 #include "setup/gridbay_doc.h"
 #include "setup/member_keyword.h"
@@ -29,18 +30,6 @@
 
 namespace gridbay::python {
 namespace {
-
-using Values = std::vector<std::pair<ValueKind, std::string>>;
-struct Keyword {
-  std::string path;
-  Values values;
-};
-
-// The keywords of a tree with the sections that have any, in order.
-struct Snapshot {
-  std::vector<Keyword> keywords;
-  std::set<std::string> sections;
-};
 
 // A value that an edit has changed. Where the values are others in number it is the first that stands for
 // all.
@@ -64,84 +53,6 @@ struct Surface {
   std::function<void(const std::function<void(Form&)>& use)> with;
 };
 
-void list(const Node& section, const std::string& prefix, Snapshot& snapshot) {
-  std::unordered_map<std::string, int> seen;
-  for (const Node* node = section.first(); node != nullptr; node = node->next()) {
-    std::string name(node->name());
-    if (!node->isSection()) {
-      Keyword keyword{prefix + name, {}};
-      for (const Value& value : node->values()) keyword.values.emplace_back(value.kind(), value.text());
-      snapshot.keywords.push_back(std::move(keyword));
-      continue;
-    }
-    if (const int occurrence = ++seen[lowered(name)]; occurrence > 1) name += fmt::format("[{}]", occurrence);
-    snapshot.sections.insert(prefix + name);
-    list(*node, prefix + name + "/", snapshot);
-  }
-}
-
-Snapshot snapshotOf(CGlobalKvs& model) {
-  const KvsHandle file = kvsCreate();
-  model.Save(*file, {});
-  Snapshot snapshot;
-  const KvsSection target = kvsTargetByNameNum(*file, CGlobalKvs::kTarget, 1);
-  if (target != nullptr) list(*target, {}, snapshot);
-  return snapshot;
-}
-
-// A step of a path as the name of a list and the number of an item: "AREA_2", "weir_data[2]".
-struct ItemStep {
-  std::string list;  // with {} for the number
-  int number = 0;
-};
-std::optional<ItemStep> itemOf(std::string_view step) {
-  if (step.ends_with(']')) {
-    const NamedOccurrence occurrence = occurrenceOf(step);
-    return ItemStep{fmt::format("{}[{{}}]", occurrence.name), occurrence.number};
-  }
-  const std::size_t last = step.find_last_not_of("0123456789");
-  if (last == step.npos || last + 1 == step.size() || step[last] != '_') return std::nullopt;
-  const std::optional<std::int32_t> number = int32OfText(step.substr(last + 1));
-  if (!number) return std::nullopt;
-  return ItemStep{std::string(step.substr(0, last + 1)) + "{}", *number};
-}
-
-// Whether a path leads through no item but the first of each list.
-bool isOfFirstItems(std::string_view path) {
-  for (PathStep step = stepOf(path);; step = stepOf(step.rest)) {
-    if (const auto item = itemOf(step.first); item && item->number > 1 && !step.isLast()) return false;
-    if (step.isLast()) return true;
-  }
-}
-
-// The path of the like keyword in the first items.
-std::string inFirstItems(std::string_view path) {
-  std::string first;
-  for (PathStep step = stepOf(path);; step = stepOf(step.rest)) {
-    if (step.isLast()) return first + std::string(step.first);
-    const auto item = itemOf(step.first);
-    const bool isRepeated = item && step.first.ends_with(']');
-    first += !item || item->number == 1 ? std::string(step.first)
-             : isRepeated               ? occurrenceOf(step.first).name
-                                        : fmt::format(fmt::runtime(item->list), 1);
-    first += '/';
-  }
-}
-
-std::string parentOf(const std::string& path) {
-  const std::size_t slash = path.rfind('/');
-  return slash == path.npos ? std::string() : path.substr(0, slash);
-}
-std::string nameOf(const std::string& path) {
-  return path.substr(path.rfind('/') + 1);
-}
-
-bool looksLikeACount(const Keyword& keyword) {
-  const std::string name = lowered(nameOf(keyword.path));
-  return keyword.values.size() == 1 && keyword.values.front().first == ValueKind::integer &&
-         (name.find("number") != name.npos || name.starts_with("no") || name.find("_no") != name.npos);
-}
-
 class Collector {
  public:
   // The lists of the ecological model follow a definition.
@@ -161,6 +72,8 @@ class Collector {
       fill(1, 1);
       // What is chosen on one page decides what another one shows: each choice is made, all at once.
       for (std::size_t turn = 0; turn < kTurns; ++turn) {
+        // Twice, as one may bring up another.
+        chooseAll(turn);
         chooseAll(turn);
         const bool isLast = turn + 1 == kTurns;
         fill(isLast ? 2 : 1, isLast || turn == 0 ? 1 : 0);
@@ -227,10 +140,10 @@ class Collector {
           keyword.path.starts_with(kModuleSelection))
         continue;
       const auto& choices = list_.keywords[known->second].parts.front().choices;
-      if (keyword.values.front().first == ValueKind::boolean) {
-        set(keyword.path, turn < 2 ? turn == 0 : flags++ % 2 != turn % 2);
-      } else if (!choices.empty()) {
-        set(keyword.path, keyword.values.front().first, choices[turn % choices.size()].first);
+      if (!choices.empty()) {
+        set(keyword.path, keyword.values.front().first, choices[(turn + 1) % choices.size()].first);
+      } else if (keyword.values.front().first == ValueKind::boolean) {
+        set(keyword.path, turn < 2 ? turn == 0 : flags++ % 2 == turn % 2);
       }
     }
   }
@@ -263,9 +176,10 @@ class Collector {
         if (now < 0 || now > 100 || !set(keyword.path, now + 2)) continue;
         const Snapshot after = snapshot();
         bool any = false;
+        const std::set<std::string> known(before.sections.begin(), before.sections.end());
         for (const std::string& section : after.sections) {
           const auto item = itemOf(nameOf(section));
-          if (before.sections.contains(section) || !item || item->number < 2) continue;
+          if (known.contains(section) || !item || item->number < 2) continue;
           const std::string parent = parentOf(section);
           if (!isOfFirstItems(parent + "/x")) continue;
           any = true;

@@ -42,12 +42,16 @@ std::string headerOf(CV27SetupGridWnd& grid, int col) {
 // items; in a grid with neither the label before it.
 std::string labelOf(CV27SetupGridWnd& grid, const std::string& gridLabel, int row, int col) {
   std::string label = grid.ShowsHeaders() ? headerOf(grid, col) : std::string();
-  if (isNumber(label) && !grid.GetRowHeader(row).empty()) label = grid.GetRowHeader(row);
+  const std::string rowHeader = grid.GetRowHeader(row);
+  if (isNumber(label) && !rowHeader.empty()) label = rowHeader;
+  // "Boundary 1" in a row for each component.
+  const bool isColumnOfItem = isNumber(label.substr(label.rfind(' ') + 1)) && label.find(' ') != label.npos;
+  if (isColumnOfItem && label != rowHeader && !rowHeader.empty() && !isNumber(rowHeader)) label = gridLabel;
   if (label.empty()) label = textBefore(grid, row, col);
   CellStyle below;
   if (grid.GetStyleRowCol(1, col, below) == 1 && below.isHeader && !below.value.empty())
     label += (label.empty() ? "" : ", ") + below.value;
-  if (label.empty()) label = grid.GetRowHeader(row);
+  if (label.empty()) label = rowHeader;
   const bool isNameOfEntry = label.find('\n') != label.npos || isNumber(label);
   return label.empty() || isNameOfEntry ? gridLabel : label;
 }
@@ -113,10 +117,12 @@ std::vector<Field> fieldsOf(Form& form) {
   std::vector<Field> fields;
   for (std::size_t place = 0; place < form.controls().size(); ++place) {
     const Control& control = form.controls()[place];
+    const bool isOfFile =
+        place > 0 && form.controls()[place - 1].isFile && !form.controls()[place - 1].absent;
     if (control.grid != nullptr) {
       addCells(*control.grid, {.control = place, .label = control.name()}, fields);
     } else if (control.kind == ControlKind::button
-                   ? control.usable()
+                   ? control.usable() || isOfFile
                    : (control.isEdit() || control.isIndexed()) && !control.absent && !control.readOnly) {
       fields.push_back(fieldOf(control, place));
     }

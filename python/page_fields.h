@@ -32,7 +32,7 @@ struct Field {
 };
 
 // In the order of the page, of grids the first rows. A control that is disabled or hidden is there, too, as
-// its handler takes an edit all the same; but no such button.
+// its handler takes an edit all the same; but no such button, except that of a file.
 std::vector<Field> fieldsOf(Form& form);
 
 // Does what a user would: types the text, makes the choice of that name, sets the check to "0" or "1", or

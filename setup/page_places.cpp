@@ -87,17 +87,35 @@ constexpr PageRow kPages[] = {
      "MUD_TRANSPORT_MODULE/MT_PARAMETERS/SETTLING_AND_DEPOSITION/COMPONENT_/EROSION_COEFFICIENTS",
      {"component", "area"}},
     {PageId::mtMfSettlingAndDeposition, "MUD_TRANSPORT_MODULE/MT_PARAMETERS/SETTLING_AND_DEPOSITION"},
+    {PageId::mtWaveData, "MUD_TRANSPORT_MODULE/FORCING_FUNCTIONS/WAVE_DATA"},
     {PageId::mtMlSettlingAndDeposition, "", {"area"}},
-    {PageId::mtErosionForEachLayerCritical, "", {"layer", "area"}},
-    {PageId::mtErosionForEachLayerFactor, "", {"layer", "area"}},
-    {PageId::mtErosionForEachLayerFactor1, "", {"layer", "area"}},
-    {PageId::mtErosionForEachLayerFactor2, "", {"layer", "area"}},
-    {PageId::mtErosionForEachLayerPower, "", {"layer", "area"}},
-    {PageId::mtErosionForEachLayerDensity, "", {"layer", "area"}},
-    {PageId::mtConstantSliding, "", {"layer", "area"}},
-    {PageId::mtVariableSliding, "", {"area"}},
-    {PageId::mtTransitionBetweenLayers, "", {"layer", "area"}},
-    {PageId::mtBedRoughness, "", {"area"}},
+    {PageId::mtErosionForEachLayerCritical,
+     "MUD_TRANSPORT_MODULE/MT_PARAMETERS/EROSION_CHARACTERISTICS_FOR_EACH_LAYER/"
+     "CRITICAL_SHEARSTRESS_FOR_EROSION",
+     {"layer", "area"}},
+    {PageId::mtErosionForEachLayerFactor,
+     "MUD_TRANSPORT_MODULE/MT_PARAMETERS/EROSION_CHARACTERISTICS_FOR_EACH_LAYER/EROSION_COEFFICIENT_FACTOR",
+     {"layer", "area"}},
+    {PageId::mtErosionForEachLayerFactor1,
+     "MUD_TRANSPORT_MODULE/MT_PARAMETERS/EROSION_CHARACTERISTICS_FOR_EACH_LAYER/EROSION_COEFFICIENT_Factor1",
+     {"layer", "area"}},
+    {PageId::mtErosionForEachLayerFactor2,
+     "MUD_TRANSPORT_MODULE/MT_PARAMETERS/EROSION_CHARACTERISTICS_FOR_EACH_LAYER/EROSION_COEFFICIENT_FACTOR2",
+     {"layer", "area"}},
+    {PageId::mtErosionForEachLayerPower,
+     "MUD_TRANSPORT_MODULE/MT_PARAMETERS/EROSION_CHARACTERISTICS_FOR_EACH_LAYER/ALPHA_OR_POWER",
+     {"layer", "area"}},
+    {PageId::mtErosionForEachLayerDensity,
+     "MUD_TRANSPORT_MODULE/MT_PARAMETERS/EROSION_CHARACTERISTICS_FOR_EACH_LAYER/DENSITY_OF_BED_MATERIAL",
+     {"layer", "area"}},
+    {PageId::mtConstantSliding,
+     "MUD_TRANSPORT_MODULE/SLIDING/CONSTANT_SLIDING_COEFFICIENT",
+     {"layer", "area"}},
+    {PageId::mtVariableSliding, "MUD_TRANSPORT_MODULE/SLIDING/VARIABLE_SLIDING_COEFFICIENT", {"area"}},
+    {PageId::mtTransitionBetweenLayers,
+     "MUD_TRANSPORT_MODULE/TRANSITION_OF_MUD_BETWEEN_LAYERS",
+     {"layer", "area"}},
+    {PageId::mtBedRoughness, "MUD_TRANSPORT_MODULE/FORCING_FUNCTIONS/BED_ROUGHNESS", {"area"}},
     {PageId::mtLineDischarge, "", {"line"}},
     {PageId::mtBoxSummation, "", {"box"}},
     {PageId::mtResult, "MUD_TRANSPORT_MODULE/OUTPUT_SPECIFICATION/HOTSTART_FILES"},
@@ -205,18 +223,25 @@ constexpr FieldRow kFields[] = {
     {texts::invalidUpdateFrequency, "Update Frequency"},
 };
 
-// What stands in a text where a format has its first placeholder; nothing for a text of another format.
-std::optional<std::string> firstOf(const std::string& text, std::string_view format) {
-  const std::size_t place = format.find('%');
-  if (place == format.npos || text.compare(0, place, format, 0, place) != 0) return std::nullopt;
-  const std::string_view after = format.substr(place + 2);
-  const std::size_t end = text.find(after, place);
-  if (end == text.npos) return std::nullopt;
-  return text.substr(place, end - place);
-}
-
-bool isOfFormat(const std::string& text, std::string_view format) {
-  return text == format || firstOf(text, format).has_value();
+// What stands in a text for the first placeholder of a format; nothing for a text of another format.
+std::optional<std::string> firstOf(std::string_view text, std::string_view format) {
+  const std::size_t start = format.find('%');
+  if (!text.starts_with(format.substr(0, start))) return std::nullopt;
+  if (start == format.npos) return text == format ? std::optional<std::string>("") : std::nullopt;
+  std::optional<std::string> first;
+  text.remove_prefix(start);
+  for (format.remove_prefix(start); !format.empty();) {
+    // A placeholder with one letter, and what stands behind it.
+    constexpr std::size_t kPlaceholder = 2;
+    const std::size_t next = std::min(format.find('%', kPlaceholder), format.size());
+    const std::string_view between = format.substr(kPlaceholder, next - kPlaceholder);
+    const std::size_t end = between.empty() ? text.size() : text.find(between);
+    if (end == text.npos) return std::nullopt;
+    if (!first) first = text.substr(0, end);
+    text.remove_prefix(end + between.size());
+    format.remove_prefix(next);
+  }
+  return first;
 }
 
 // Whether a path lies in the place of a row; the numbers of its sections do not count.
@@ -308,7 +333,7 @@ PagePlace placeOfMessage(const CMessage& message) {
   PagePlace place{
       .page = message.page, .thing = thingOf(message.page, message.entries), .entries = message.entries};
   const auto* field = std::ranges::find_if(
-      kFields, [&](const FieldRow& each) { return isOfFormat(message.text, each.text.format); });
+      kFields, [&](const FieldRow& each) { return firstOf(message.text, each.text.format).has_value(); });
   if (field != std::end(kFields)) {
     place.field = field->field;
     place.fieldNumber = field->number;

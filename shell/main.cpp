@@ -26,7 +26,6 @@ void openFiles(MainWindow& window, const QStringList& paths) {
 void takeMaps(MainWindow& window, const std::function<void(const QString&)>& take) {
   constexpr int kWidth = 760;
   constexpr int kInView = 40;  // cells
-  constexpr std::int32_t kAreas = 27;
   MapCanvas& canvas = window.map().canvas();
   const auto settle = [&canvas] {
     do {

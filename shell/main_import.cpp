@@ -1,13 +1,17 @@
 // What is brought in from elsewhere, and where it goes.
 
+#include <QFileInfo>
+#include <QStatusBar>
+
 #include "shell/grid_view.h"
+#include "shell/import/series_import.h"
 #include "shell/import/terrain_import.h"
 #include "shell/main_window.h"
 
 namespace gridbay::shell {
 namespace {
 
-constexpr std::int32_t kAreasPage = 27;
+constexpr auto kAreasPage = static_cast<std::int32_t>(PageId::bathymetry);
 constexpr int kAreasFileColumn = 1;
 
 // The table of areas of a document, whose page is then open; null where the page is not shown.
@@ -61,6 +65,21 @@ std::vector<TerrainImport::Use> MainWindow::bathymetryUses() {
                     [this, i](const QString& map) { useBathymetry(*newDocument(i), 1, map); }});
   }
   return uses;
+}
+
+void MainWindow::importSeries() {
+  std::optional<Period> period;
+  QString folder;
+  if (DocumentTab* tab = currentDocument()) {
+    period = tab->editor().summary().period;
+    const QString path = QString::fromStdString(tab->editor().path());
+    if (!path.isEmpty()) folder = QFileInfo(path).absolutePath();
+  }
+  auto* dialog = new SeriesImport(period, folder, this);
+  dialog->setAttribute(Qt::WA_DeleteOnClose);
+  connect(dialog, &SeriesImport::imported, this,
+          [this](const QString&, const QString& summary) { statusBar()->showMessage(summary); });
+  dialog->open();
 }
 
 }  // namespace gridbay::shell

@@ -45,6 +45,9 @@ QMenu* MainWindow::buildFileMenu() {
   file->addSeparator();
   file->addAction(tr("Import &Terrain..."), QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_T), this,
                   [this] { importTerrain(); });
+  file->addAction(tr("Import &Series..."), QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_I), this,
+                  &MainWindow::importSeries);
+  file->addSeparator();
   compareWith_ = file->addAction(tr("Compare &With..."), QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_D), this,
                                  [this] { askCompare(); });
   merge_ = file->addAction(tr("&Merge..."), this, [this] { askMerge(); });

@@ -96,6 +96,7 @@ class MainWindow final : public QMainWindow {
   void showTabsOrStart();
   // Opens, and has the user save under, a name of his choice.
   void askOpen();
+  void importSeries();
   bool askSave();
   void askCompare();
   void askMerge();

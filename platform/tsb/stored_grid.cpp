@@ -83,7 +83,8 @@ std::optional<PackedLayout::Step> stepOf(H5Z_filter_t filter) {
   }
 }
 
-// Nothing for values that are packed in another way than usual, or in very large pieces.
+// Nothing for values that are packed in another way than usual, or in pieces that are very large or very
+// many.
 std::optional<PackedLayout> layoutOf(hid_t dataset, const StoredGrid::Source& source, bool isDouble) {
   const Handle properties(H5Dget_create_plist(dataset), H5Pclose);
   if (!properties || H5Pget_layout(properties.get()) != H5D_CHUNKED) return std::nullopt;
@@ -110,6 +111,9 @@ std::optional<PackedLayout> layoutOf(hid_t dataset, const StoredGrid::Source& so
     if (!step) return std::nullopt;
     layout.steps.push_back(*step);
   }
+  constexpr std::size_t kMostPieces = 1'000'000;
+  if ((source.rows / layout.pieceRows + 1) * (source.columns / layout.pieceColumns + 1) > kMostPieces)
+    return std::nullopt;
   std::array<hsize_t, kMostRank> at{};
   for (std::size_t row = 0; row < source.rows; row += layout.pieceRows) {
     for (std::size_t column = 0; column < source.columns; column += layout.pieceColumns) {

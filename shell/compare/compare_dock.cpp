@@ -24,8 +24,7 @@ CompareDock::CompareDock(QWidget* parent)
       list_(new QTreeWidget(this)),
       next_(new QAction(tr("&Next Difference"), this)),
       previous_(new QAction(tr("Pre&vious Difference"), this)),
-      take_(makeAction(tr("&Take Over"), QKeySequence(Qt::CTRL | Qt::ALT | Qt::Key_T),
-                       &TabComparison::takeOver)),
+      take_(makeAction(tr("&Take Over"), QKeySequence(Qt::ALT | Qt::Key_Left), &TabComparison::takeOver)),
       takePage_(makeAction(tr("Take Over &Page"), {}, &TabComparison::takeOverPage)),
       takeAll_(makeAction(tr("Take Over &All"), {}, &TabComparison::takeOverAll)),
       end_(makeAction(tr("&End"), {}, &TabComparison::end)) {

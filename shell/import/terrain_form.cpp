@@ -218,14 +218,23 @@ void TerrainForm::setFile(const QString& path) {
 }
 
 // What a modeller would give where the file leaves it open.
-bool TerrainForm::suggest(const RasterPreview& preview) {
+void TerrainForm::suggest(const RasterPreview& preview) {
   if (!land_->number()) land_->setNumber(preview.landValue.value_or(landAbove(preview)), kDigits);
   if (!preview.itemType.empty()) itemType_->setCurrentText(QString::fromStdString(preview.itemType));
   if (preview.isOfPoints) spacing_->setNumber(preview.spacing[0], 6);
-  const QString zone = preview.unit.empty() ? QString() : zoneOf(preview);
-  if (zone.isEmpty() || !reproject_->text().isEmpty()) return false;
-  reproject_->setText(zone);
-  spacing_->clear();
+}
+
+// The projection, and the spacing there, of what is in degrees; true where there was none.
+bool TerrainForm::suggestPlace(const RasterPreview& preview) {
+  const QString zone = preview.unit.empty() || !reproject_->text().isEmpty() ? QString() : zoneOf(preview);
+  if (!zone.isEmpty()) {
+    reproject_->setText(zone);
+    spacing_->clear();
+    return true;
+  }
+  // What comes of another projection has no round spacing of its own.
+  if (reproject_->text().isEmpty() || !spacing_->text().isEmpty()) return false;
+  spacing_->setNumber(roundNumber(preview.spacing[0]), 6);
   return true;
 }
 
@@ -241,13 +250,9 @@ bool TerrainForm::show(const RasterPreview& preview) {
     const QString own = QString::fromStdString(preview.projectionName);
     crs_->edit().setPlaceholderText(own.isEmpty() ? tr("none: local coordinates") : own);
   }
-  bool isChanged = isFresh_ && suggest(preview);
+  if (isFresh_) suggest(preview);
   isFresh_ = false;
-  // What comes of another projection has no round spacing of its own.
-  if (!isChanged && !reproject_->text().isEmpty() && spacing_->text().isEmpty()) {
-    spacing_->setNumber(roundNumber(preview.spacing[0]), 6);
-    isChanged = true;
-  }
+  const bool isChanged = suggestPlace(preview);
   spacing_->setPlaceholderText(tr("as it is: %1").arg(preview.spacing[0], 0, 'g', 6));
   takeExtent(preview);
   return isChanged;

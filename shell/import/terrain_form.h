@@ -55,7 +55,8 @@ class TerrainForm final : public QWidget {
   void browseFile();
   void browseTarget();
   void fill(QComboBox& box, const std::vector<std::string>& names);
-  bool suggest(const RasterPreview& preview);
+  void suggest(const RasterPreview& preview);
+  bool suggestPlace(const RasterPreview& preview);
   void takeExtent(const RasterPreview& preview);
   bool isWhole() const;
 

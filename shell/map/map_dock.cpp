@@ -49,7 +49,7 @@ MapDock::MapDock(QWidget* parent)
       canvas_(new MapCanvas(this)),
       readout_(new QLabel(this)),
       panel_(new LayerPanel(*canvas_, this)),
-      adviceStrip_(new AdviceStrip(this)) {
+      adviceStrip_(new AdviceStrip(canvas_)) {
   setObjectName("map");
   toggleViewAction()->setShortcut(Qt::CTRL | Qt::Key_M);
   auto* content = new QWidget(this);
@@ -66,9 +66,14 @@ MapDock::MapDock(QWidget* parent)
   readout_->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
   readout_->setAccessibleName(tr("Under the pointer"));
   readout_->setText(" ");
+  // On the map, which stays as it is when the strip comes and goes.
+  auto* over = new QVBoxLayout(canvas_);
+  over->addStretch();
+  over->addWidget(adviceStrip_);
+  adviceStrip_->setAutoFillBackground(true);
+  adviceStrip_->setCursor(Qt::ArrowCursor);
   layout->addWidget(tools_);
   layout->addWidget(split, 1);
-  layout->addWidget(adviceStrip_);
   layout->addWidget(readout_);
   setWidget(content);
 

@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <cmath>
 
+#include "platform/tsb/tsb_file.h"
+
 namespace gridbay::shell {
 
 const TerrainStore::Found& TerrainStore::foundOf(const MapArea& area) {
@@ -20,9 +22,14 @@ const TerrainStore::Found& TerrainStore::foundOf(const MapArea& area) {
 
 std::vector<TerrainArea> TerrainStore::find(const MapScene& scene) {
   std::vector<const MapArea*> areas;
+  std::vector<std::string> unknown;
   for (const MapArea& area : scene.areas) {
-    if (area.isPlaced && !area.file.empty()) areas.push_back(&area);
+    if (!area.isPlaced || area.file.empty()) continue;
+    areas.push_back(&area);
+    if (!found_.contains({area.file, area.item})) unknown.push_back(area.file);
   }
+  // The editor, which has looked at them, is a program part of its own.
+  if (unknown.size() > 1) TsbFile::lookAhead(unknown);
   // What the setup has no more is let go.
   std::erase_if(found_, [&areas](const auto& each) {
     return std::ranges::none_of(areas, [&](const MapArea* area) {

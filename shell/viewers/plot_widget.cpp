@@ -1,6 +1,7 @@
 #include "shell/viewers/plot_widget.h"
 
 #include <QDateTime>
+#include <array>
 
 #include "platform/units/units.h"
 
@@ -40,6 +41,12 @@ void PlotWidget::colour(QCPAxis& axis) const {
   axis.setSubTickPen(text);
   axis.setTickLabelColor(text);
   axis.setLabelColor(text);
+}
+
+QColor curveColour(std::size_t place) {
+  // Told apart on a light and on a dark ground, and by most eyes.
+  constexpr std::array<QRgb, 6> kColours{0x0072B2, 0xD55E00, 0x009E73, 0xCC79A7, 0xE69F00, 0x56B4E9};
+  return kColours[place % kColours.size()];
 }
 
 QString itemTitle(const TsbItem& item) {

@@ -32,6 +32,8 @@ class PlotWidget : public QCustomPlot {
   void colour(QCPAxis& axis) const;
 };
 
+// The colour of a curve by its place (from 0).
+QColor curveColour(std::size_t place);
 // "Water level [m]"
 QString itemTitle(const TsbItem& item);
 // The time of a step as people write it.

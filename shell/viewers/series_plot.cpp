@@ -1,16 +1,8 @@
 #include "shell/viewers/series_plot.h"
 
-#include <array>
 #include <vector>
 
 namespace gridbay::shell {
-namespace {
-
-// Told apart on a light and on a dark ground, and by most eyes.
-constexpr std::array<QRgb, 6> kColours{0x0072B2, 0xD55E00, 0x009E73, 0xCC79A7, 0xE69F00, 0x56B4E9};
-
-}  // namespace
-
 SeriesPlot::SeriesPlot(const TsbFile& file, QWidget* parent) : PlotWidget(parent), file_(file) {
   const TsbDefinition& definition = file.definition();
   if (isProfile()) {
@@ -52,7 +44,7 @@ QCPGraph* SeriesPlot::curve(std::size_t item) {
   }
   const TsbItem& description = definition.items[item - 1];
   QCPGraph* graph = addGraph();
-  graph->setPen(QPen(QColor(kColours[(item - 1) % kColours.size()]), 1.5));
+  graph->setPen(QPen(curveColour(item - 1), 1.5));
   graph->setName(itemTitle(description));
   QVector<QCPGraphData> points;
   points.reserve(static_cast<qsizetype>(count));

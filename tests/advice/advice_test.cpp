@@ -24,6 +24,7 @@
 #include "hydrodynamic/resistance.h"
 #include "hydrodynamic/result.h"
 #include "hydrodynamic/source_sink.h"
+#include "mud_transport/task_selection.h"
 #include "mud_transport/wave_data.h"
 #include "mud_transport_expanded/forcings.h"
 #include "mud_transport_expanded/sources.h"
@@ -514,6 +515,7 @@ TEST_F(AdviceTest, SeriesOfAllModules) {
       {PageId::mtWaveData, "", "MUD_TRANSPORT_MODULE/FORCING_FUNCTIONS/WAVE_DATA/File_Name",
        [&] {
          runs(module::kMudTransport);
+         model->nmtTaskSelection->multiFraction = false;
          model->nmtWaveData->description = CNmtWaveDataKvs::kIncluded;
          model->nmtWaveData->input = CNmtWaveDataKvs::kFromFile;
          model->nmtWaveData->file.fileName = file;

@@ -192,7 +192,7 @@ TEST_F(ConvertRaster, ToAnotherSpacingAndProjection) {
   EXPECT_THAT(refused({plain, out, "--land", "1", "--extent", "1,2,0,4"}),
               HasSubstr("--extent cannot be 1,2,0,4: it is the least easting"));
   EXPECT_THAT(refused({plain, out, "--land", "1", "--gridding", "linear"}),
-              HasSubstr("line 2: a point has three numbers"));
+              HasSubstr("line 2: \"nrows\" is no number for x"));
 }
 
 TEST_F(ConvertRaster, PointsAndAnExtent) {
@@ -663,7 +663,8 @@ TEST_F(ConvertSeries, WhatTheTableDoesNotTellIsAskedFor) {
       fails("d,what\n2020-01-01,1\n2020-01-02,2\n"),
       HasSubstr("What \"what\" holds is not seen from its name and unit: --item-type gives its item type"));
   EXPECT_THAT(fails("words\n"), HasSubstr("no table of times and values is seen in it"));
-  EXPECT_THAT(fails("d,Q\n2020-01-01,1\n2020-01-02,x\n"), HasSubstr("line 3: \"x\" is no number"));
+  EXPECT_THAT(fails("d,Q\n2020-01-01,1\n2020-01-02,2\n2020-01-03,3\n2020-01-04,x\n"),
+              HasSubstr("line 5: \"x\" is no number"));
   EXPECT_THAT(fails("a,Q\n3,1\n2,2\n"), HasSubstr("There is no column of times"));
 }
 

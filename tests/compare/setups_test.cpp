@@ -169,6 +169,13 @@ TEST_F(CompareSetups, AnEntryIsOneDifferenceOfEachPage) {
   }
 }
 
+TEST_F(CompareSetups, VeryManyEntriesAreOneDifference) {
+  const std::string own = make("a.v27", "flood.v27");
+  const SetupDifference found = compare(own, make("b.v27", "flood.v27", {kSources + "=60"}));
+  EXPECT_THAT(linesOf(found.differences),
+              Contains("Basic Parameters, Source and Sink|Rows 2 to 60|none <59 rows>"));
+}
+
 TEST_F(CompareSetups, AFileIsWhereItLeads) {
   const std::string own = make("a.v27", "flood.v27");
   const std::string elsewhere = make("deep/b.v27", "flood.v27");

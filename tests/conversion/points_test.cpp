@@ -68,7 +68,8 @@ TEST_F(Points, TextsOfManyForms) {
   for (const std::string_view text :
        {"1 2 3\n4 5 -6.5\n7 8 9\n", "1,2,3\n4,5,-6.5\n7,8,9", "1, 2, 3\n4, 5, -6.5\n7, 8, 9\n",
         "1;2;3\r\n4;5;-6.5\r\n7;8;9\r\n", "1;2;3,0\n4;5;-6,5\n7;8;9\n", "1\t2\t3\n4\t5\t-6.5\n7\t8\t9\n",
-        "1,0 2,0 3,0\n4 5 -6,5\n7 8 9\n", "East North Level\n  1   2   3 station A\n4 5 -65e-1\n+7 8 9\n",
+        "1,0 2,0 3,0\n4 5 -6,5\n7 8 9\n", "1 2 3\n4 5 -6,5\n7 8 9\n",
+        "East North Level\n  1   2   3 station A\n4 5 -65e-1\n+7 8 9\n",
         "# survey\n\nz,id,y,x\n3,a,2,1\n-6.5,b,5,4\n\n9,c,8,7\n",
         "Height (m);Easting (m);Northing (m)\n3;1;2\n-6.5;4;5\nNaN;0;0\n9;7;8\n"}) {
     const std::string path = folder.write("p.xyz", text);
@@ -88,7 +89,7 @@ TEST_F(Points, WhatIsNoPointIsToldWithItsLine) {
         {"1;2;3\n4;;6\n", "line 2: \"\" is no number for y"},
         {"1 2 3\n4 5 inf\n", "line 2: \"inf\" is no number for z"},
         {"1 2 3\n4 5 1e999\n", "line 2: \"1e999\" is no number for z"},
-        {"a b\nc d\n", "line 2: a point has three numbers"},
+        {"a b\nc d\n", "line 2: \"c\" is no number for x"},
         {"1 2 3\n4 5 6\n", "holds 2 points; a grid needs at least 3"},
         {"", "holds 0 points"}}) {
     const Result<PointSet> points = readPoints(folder.write("p.xyz", text));
@@ -163,7 +164,10 @@ TEST_F(Points, AreBroughtToAProjectionBeforeTheyAreGridded) {
   EXPECT_THAT(refused(wanted), HasSubstr("do not say in which projection they are: say so with option crs"));
   wanted.crs = "EPSG:4326";
   wanted.reproject.clear();
-  EXPECT_THAT(refused(wanted), HasSubstr("is in degrees"));
+  EXPECT_THAT(refused(wanted), HasSubstr("is in degrees: a grid wants a projection in metres"));
+  // Looked at they are what they are.
+  wanted.resample = std::nullopt;
+  EXPECT_EQ(previewRaster(wanted, 100, host)->unit, "degrees");
 }
 
 TEST_F(Points, WhatCanBeNoGrid) {
@@ -171,7 +175,7 @@ TEST_F(Points, WhatCanBeNoGrid) {
   EXPECT_THAT(refused({.in = in, .out = out, .land = 1.0F}),
               HasSubstr("Points need the spacing of a grid: option resample (they lie about 30 apart)"));
   EXPECT_THAT(refused({.in = in, .out = out, .land = 1.0F, .resample = 1e-4}),
-              HasSubstr("at that spacing their extent has"));
+              HasSubstr("The points can't be gridded: at that spacing their extent has"));
   EXPECT_THAT(refused({.in = in, .out = out, .land = 1.0F, .resample = 5000}),
               HasSubstr("at that spacing their extent has"));
   EXPECT_THAT(refused({.in = in, .out = out, .land = 1.0F, .crs = "nonsense", .resample = 10}),
@@ -181,11 +185,11 @@ TEST_F(Points, WhatCanBeNoGrid) {
               HasSubstr("lie on one line"));
   const std::string slanted = folder.write("slanted.xyz", "0 0 1\n10 10 2\n20 20 3\n35 35 3\n");
   EXPECT_THAT(refused({.in = slanted, .out = out, .land = 1.0F, .resample = 5, .gridding = Gridding::linear}),
-              HasSubstr("The points can't be gridded"));
+              HasSubstr("lie on one line"));
   EXPECT_THAT(refused({.in = folder.write("bad.xyz", "0 0 1\n10 0 2\n20 x 3\n"), .out = out, .land = 1.0F}),
               HasSubstr("line 3: \"x\" is no number for y"));
   // Stopped while it reads, and while it grids.
-  host.stopAt = 1;
+  host.stopAt = host.told + 1;
   EXPECT_EQ(refused({.in = in, .out = out, .land = 1.0F, .resample = 10}), kConversionStopped);
   host.stopAt = host.told + 2;
   EXPECT_EQ(refused({.in = in, .out = out, .land = 1.0F, .resample = 2}), kConversionStopped);
@@ -256,7 +260,7 @@ TEST_F(Points, AnExtentAndWaysToResample) {
 
 // Land is no height: none of it spreads to the sea, and the other way round.
 TEST_F(Points, AMapOfOursIsBroughtToAnotherSpacing) {
-  std::string rows = "ncols 8\nnrows 6\nxllcorner 0\nyllcorner 0\ncellsize 10\n";
+  std::string rows = "ncols 8\nnrows 6\nxllcorner 500000\nyllcorner 6000000\ncellsize 10\n";
   for (int row = 0; row < 6; ++row) rows += "-8 -8 -8 -8 20 20 20 20\n";
   const std::string own = folder.file("own.tsb2");
   ASSERT_TRUE(
@@ -271,7 +275,8 @@ TEST_F(Points, AMapOfOursIsBroughtToAnotherSpacing) {
   ASSERT_TRUE(convertRaster(wanted, host));
   EXPECT_NEAR(values()[7], -1, 1e-3);
   wanted.reproject = "UTM-33";
-  EXPECT_TRUE(convertRaster(wanted, host));
+  const Result<ConvertedRaster> made = convertRaster(wanted, host);
+  EXPECT_TRUE(made) << made.error();
 }
 
 }  // namespace conversion_points_test

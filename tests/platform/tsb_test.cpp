@@ -545,6 +545,7 @@ class StoredGrids : public Tsb {
   std::string packed(const std::vector<std::string>& how) {
     std::vector<std::string> arguments(how);
     const std::string made = folder.file("packed.tsb2");
+    arguments.insert(arguments.begin(), {"-M", "1"});  // small pieces too
     arguments.insert(arguments.end(), {path, made});
     EXPECT_EQ(test::runProgram("nccopy", arguments).status, 0);
     return made;
@@ -610,17 +611,15 @@ TEST_F(StoredGrids, WhatIsDamagedIsNotRead) {
   ASSERT_TRUE(grid) << grid.error();
   std::vector<float> row(300);
   ASSERT_TRUE(grid->read(0, 0, row));
+  // Written over where it lies: what was unpacked before is kept.
   {
     std::fstream damaged(file, std::ios::in | std::ios::out | std::ios::binary);
-    const auto size = static_cast<long>(std::filesystem::file_size(file));
-    damaged.seekp(size / 2);
-    damaged << std::string(static_cast<std::size_t>(size / 4), '\x55');
+    damaged << std::string(std::filesystem::file_size(file), '\x55');
   }
-  int unread = 0;
-  for (std::size_t k = 0; k < 200; ++k) unread += grid->read(k, 0, row) ? 0 : 1;
-  EXPECT_GT(unread, 0);
-  std::filesystem::resize_file(file, 100);
+  EXPECT_TRUE(grid->read(0, 0, row));
   EXPECT_FALSE(grid->read(199, 0, row));
+  std::filesystem::resize_file(file, 100);
+  EXPECT_FALSE(grid->read(100, 0, row));
   EXPECT_FALSE(StoredGrid::open(file, 1));
 }
 

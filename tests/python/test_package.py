@@ -34,6 +34,13 @@ def test_types_of_package_and_example(tmp_path, monkeypatch):
         ("slip.py", "4"), ("slip.py", "5"), ("slip.py", "6")], result.stdout + result.stderr  # fmt: skip
 
 
+def test_the_stubs_are_those_of_the_modules(monkeypatch):
+    monkeypatch.setenv("MYPYPATH", str(PACKAGE.parent))
+    result = run("-m", "mypy.stubtest", "--allowlist", pathlib.Path(__file__).with_name("stubtest_allowlist.txt"),
+                 "gridbay_setup._flow_model", "gridbay_setup._wetland_sweep_kit")  # fmt: skip
+    assert result.returncode == 0, result.stdout + result.stderr
+
+
 def test_help_tells_units_and_defaults():
     kind = type(gridbay_setup.new().nested_model_globals.flood_and_dry)
     words = f"print(pydoc.render_doc(m.{kind.__name__}, renderer=pydoc.plaintext))"

@@ -196,7 +196,7 @@ class CompareTest final : public DesktopFixture {
     QVERIFY(isMarked("Flood and Dry"));
     // By its key.
     QTest::keyClick(window_.get(), Qt::Key_F8, Qt::ShiftModifier);
-    QTest::keyClick(window_.get(), Qt::Key_T, Qt::ControlModifier | Qt::AltModifier);
+    QTest::keyClick(window_.get(), Qt::Key_Left, Qt::AltModifier);
     QCOMPARE(undoName(), QString("Take over Drying depth"));
   }
 

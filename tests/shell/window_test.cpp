@@ -542,7 +542,7 @@ class WindowTest final : public DesktopFixture {
     list.setFocus();
     QTest::keyClick(window_.get(), Qt::Key_F1);
     QVERIFY(window_->help().isVisible());
-    QVERIFY(window_->help().findChild<QTextBrowser*>()->toPlainText().startsWith("Messages and advice"));
+    QVERIFY(window_->help().browser().toPlainText().startsWith("Messages and advice"));
     // A field by its label, and one by the file that it holds.
     enter("Drying depth must be positive");
     QCOMPARE(tab().currentPage(), 26);
