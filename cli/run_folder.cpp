@@ -57,7 +57,10 @@ Result<RunFolder> RunFolder::create(const std::vector<std::string>& files) {
     const std::string path = inFolder(parent, fmt::format("run-{}", number));
     if (::mkdir(path.c_str(), 0777) == 0) {
       RunFolder folder(path, std::move(absolute));
-      if (Outcome written = folder.write(kMembers, members); !written) return Failure{written.error()};
+      if (Outcome written = folder.write(kMembers, members); !written) {
+        folder.remove();
+        return Failure{written.error()};
+      }
       return folder;
     }
     if (errno != EEXIST) return Failure{systemError("cannot make the folder", path)};
@@ -89,6 +92,18 @@ RunFolder::Member RunFolder::member(std::size_t number) const {
   if (member.isRunning) member.isGone = isGone(line.substr(kRunning.size()));
   member.status = int32OfText(line);
   return member;
+}
+
+bool RunFolder::areAllEnded() const {
+  for (std::size_t number = 1; number <= count(); ++number) {
+    if (!member(number).status) return false;
+  }
+  return true;
+}
+
+void RunFolder::remove() const {
+  std::error_code ignored;
+  fs::remove_all(path_, ignored);
 }
 
 Outcome RunFolder::setJob(const std::string& job) {

@@ -37,6 +37,8 @@ class RunFolder {
   // The number that Slurm gave its job; empty for a run on this machine.
   const std::string& job() const { return job_; }
 
+  // Whether each has its exit status.
+  bool areAllEnded() const;
   // Whether the process that makes the run has ended, so that nothing more will come of what is not done.
   bool isLeft() const;
 
@@ -45,6 +47,8 @@ class RunFolder {
   Outcome setRunning(std::size_t number, pid_t engine) const;
   Outcome setStatus(std::size_t number, int status) const;
   Outcome write(const std::string& name, const std::string& text) const;
+  // With all that is in it, of a run that never was.
+  void remove() const;
 
  private:
   RunFolder(std::string path, std::vector<std::string> files)

@@ -60,7 +60,10 @@ int check(const MembersRun& run, const Console& console) {
 }
 
 int submit(RunFolder& folder, const MembersRun& run, const Console& console) {
-  if (const Outcome done = slurm::submit(folder, run.engine); !done) return console.fail(done.error());
+  if (const Outcome done = slurm::submit(folder, run.engine); !done) {
+    if (folder.job().empty()) folder.remove();
+    return console.fail(done.error());
+  }
   console.out << fmt::format("Job {}: {}. \"{} run --status {}\" tells how they are\n", folder.job(),
                              counted(folder.count(), "setup"), toolName(), folder.path());
   return kClean;
@@ -113,16 +116,22 @@ int showRun(const std::string& path, const Console& console) {
   const Result<RunFolder> folder = RunFolder::open(path);
   if (!folder) return console.fail(folder.error());
   const bool isJob = !folder->job().empty();
-  // The queue first: what is no longer in it then has its status already.
+  // The queue before its members: what is no longer in it then has its status already.
   std::map<std::size_t, std::string> tasks;
   std::size_t taskCount = 1;
-  if (isJob) {
+  bool isQueueKnown = false;
+  const bool isAsked = isJob && !folder->areAllEnded();
+  if (isAsked) {
     Result<std::map<std::size_t, std::string>> queued = slurm::tasksOf(folder->job());
-    if (!queued) return console.fail(queued.error());
     const Result<std::size_t> count = slurm::taskCount(*folder);
-    if (!count) return console.fail(count.error());
-    tasks = std::move(*queued);
-    taskCount = *count;
+    isQueueKnown = queued && count;
+    if (isQueueKnown) {
+      tasks = std::move(*queued);
+      taskCount = *count;
+    } else {
+      console.note(fmt::format("What Slurm has ended itself is not known: {}",
+                               queued ? count.error() : queued.error()));
+    }
   }
   const bool isLeft = !isJob && folder->isLeft();
   std::size_t done = 0;
@@ -132,7 +141,7 @@ int showRun(const std::string& path, const Console& console) {
   std::size_t failed = 0;
   for (std::size_t number = 1; number <= folder->count(); ++number) {
     const RunFolder::Member member = folder->member(number);
-    const bool isEndedBySlurm = isJob && !tasks.contains((number - 1) % taskCount + 1);
+    const bool isEndedBySlurm = isQueueKnown && !tasks.contains((number - 1) % taskCount + 1);
     // An engine whose run has been left may be at work still.
     const bool isStopped = isLeft && (!member.isRunning || member.isGone);
     if (member.status == 0) {
@@ -151,6 +160,7 @@ int showRun(const std::string& path, const Console& console) {
   console.out << fmt::format("{}{}: {} done, {} failed, {} running, {} waiting\n{}",
                              isJob ? "Job " + folder->job() + ", " : "", counted(folder->count(), "setup"),
                              done, failed, running, waiting, failures);
+  if (isAsked && !isQueueKnown) return kCouldNotDoIt;
   return failed == 0 ? kClean : kFaultsFound;
 }
 

@@ -67,11 +67,7 @@ Outcome submit(RunFolder& folder, const std::string& engine) {
   const Result<std::string> job = outputOf(
       findProgram("sbatch"), {"--parsable", fmt::format("--array=1-{}", tasks), "--job-name=gridbay",
                               "--output=/dev/null", script, folder.path(), engine, std::to_string(tasks)});
-  if (!job) {
-    std::error_code ignored;
-    std::filesystem::remove_all(folder.path(), ignored);
-    return Failure{job.error()};
-  }
+  if (!job) return Failure{job.error()};
   // A cluster's name may stand behind the number.
   const std::string number(trimmed(std::string_view(*job).substr(0, job->find(';'))));
   if (const Outcome kept = folder.setJob(number); !kept)

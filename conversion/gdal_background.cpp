@@ -404,8 +404,9 @@ class VectorBackground final : public Background {
 // Of a file of several rasters the first one.
 Dataset openFile(const char* path) {
   const auto openAny = [](const char* name) {
-    return Dataset(
-        GDALOpenEx(name, GDAL_OF_RASTER | GDAL_OF_VECTOR | GDAL_OF_READONLY, nullptr, nullptr, nullptr));
+    return Dataset(GDALOpenEx(name,
+                              GDAL_OF_RASTER | GDAL_OF_VECTOR | GDAL_OF_READONLY | GDAL_OF_VERBOSE_ERROR,
+                              nullptr, nullptr, nullptr));
   };
   Dataset dataset = openAny(path);
   if (!dataset || GDALGetRasterCount(dataset.get()) > 0 || GDALDatasetGetLayerCount(dataset.get()) > 0)

@@ -26,7 +26,8 @@ struct FreeTexts {
 
 Dataset open(const char* path) {
   CPLErrorReset();
-  return Dataset(GDALOpenEx(path, GDAL_OF_RASTER | GDAL_OF_READONLY, nullptr, nullptr, nullptr));
+  return Dataset(
+      GDALOpenEx(path, GDAL_OF_RASTER | GDAL_OF_READONLY | GDAL_OF_VERBOSE_ERROR, nullptr, nullptr, nullptr));
 }
 
 // Entry `what` (NAME or DESC) of a raster in the file, from 1; null when there is none.

@@ -345,6 +345,7 @@ TEST_F(ConvertRaster, RastersInAFileAreListedAndChosen) {
   EXPECT_THAT(errors, HasSubstr("depth"));
   EXPECT_THAT(errors, HasSubstr(":speed)\n"));
   EXPECT_THAT(errors, Not(HasSubstr("no raster band")));
+  EXPECT_THAT(refused({folder.file("gone.asc"), out, "--land", "60"}), HasSubstr("does not exist"));
   ASSERT_EQ(runTool({"convert", "raster", file, out, "--land", "60", "--subdataset", "2"}).status, 0);
   EXPECT_EQ(values(9)[4], 2);
   ASSERT_EQ(

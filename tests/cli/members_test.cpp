@@ -289,6 +289,35 @@ TEST_F(Members, WithoutSlurmTheyRunHere) {
   EXPECT_THAT(ran.out, StartsWith("2 setups: 1 done, 1 failed"));
 }
 
+// Where Slurm is there but does not answer.
+TEST_F(Members, ASlurmThatDoesNotAnswer) {
+  const std::vector<std::string> files = make({"a", "b"});
+  fs::create_directory(folder.file("bin"));
+  for (const char* program : {"sbatch", "scontrol", "squeue"}) {
+    const std::string path = folder.write("bin/" + std::string(program), "#!/bin/sh\nexit 1\n");
+    ASSERT_EQ(::chmod(path.c_str(), 0755), 0);
+  }
+  const std::vector<std::string> noSlurm{"PATH=" + folder.file("bin")};
+  const ProgramRun ran = runTool({"run", "--slurm", "--engine", engine(), files[0], files[1]}, noSlurm);
+  EXPECT_EQ(ran.status, 2);
+  EXPECT_FALSE(fs::exists(out + "/run-1")) << "a folder of a run that never was";
+
+  // What is known of a job is told without it.
+  fs::create_directory(out + "/run-1");
+  folder.write("out/run-1/members", files[0] + "\n" + files[1] + "\n");
+  folder.write("out/run-1/job", "7\n");
+  folder.write("out/run-1/tasks", "2\n");
+  folder.write("out/run-1/1.status", "0\n");
+  const auto status = [&] { return runTool({"run", "--status", out + "/run-1"}, noSlurm); };
+  EXPECT_EQ(status().status, 2);
+  EXPECT_EQ(status().out, "Job 7, 2 setups: 1 done, 0 failed, 0 running, 1 waiting\n");
+  EXPECT_THAT(status().err, StartsWith("What Slurm has ended itself is not known: "));
+  folder.write("out/run-1/2.status", "0\n");
+  EXPECT_EQ(status().status, 0);
+  EXPECT_EQ(status().out, "Job 7, 2 setups: 2 done, 0 failed, 0 running, 0 waiting\n");
+  EXPECT_EQ(status().err, "");
+}
+
 // Runs the tool's words with a Slurm of the test's own; skips the test where it can't be had.
 class BySlurm : public Members {
  protected:
