@@ -1,5 +1,4 @@
 #include <array>
-#include <map>
 #include <string>
 #include <vector>
 
@@ -18,20 +17,14 @@ struct Options {
   std::string gridding;  // empty for none
 };
 
-const std::map<std::string, Resampling> kResamplings{
-    {"bilinear", Resampling::bilinear}, {"nearest", Resampling::nearest}, {"cubic", Resampling::cubic},
-    {"mean", Resampling::mean},         {"least", Resampling::least},     {"greatest", Resampling::greatest}};
-const std::map<std::string, Gridding> kGriddings{
-    {"linear", Gridding::linear}, {"nearest", Gridding::nearest}, {"idw", Gridding::inverseDistance}};
-
 int doConvert(const Options& options, const Console& console) {
   RasterConversion conversion = options.conversion;
   if (!options.window.empty())
     conversion.window = {options.window[0], options.window[1], options.window[2], options.window[3]};
   if (!options.extent.empty())
     conversion.extent = {options.extent[0], options.extent[1], options.extent[2], options.extent[3]};
-  conversion.resampling = kResamplings.at(options.resampling);
-  if (!options.gridding.empty()) conversion.gridding = kGriddings.at(options.gridding);
+  conversion.resampling = resamplingNames().at(options.resampling);
+  if (!options.gridding.empty()) conversion.gridding = griddingNames().at(options.gridding);
   return convertWith(convertRaster, std::move(conversion), console);
 }
 
@@ -80,7 +73,7 @@ void addConvertRaster(CLI::App& convert, Action& action) {
           "--resampling", given->resampling,
           "How values of other points come from those of the raster; bilinear becomes means where points "
           "lie wider")
-      ->check(CLI::IsMember(kResamplings))
+      ->check(CLI::IsMember(resamplingNames()))
       ->capture_default_str();
   command
       .add_option(
@@ -88,7 +81,7 @@ void addConvertRaster(CLI::App& convert, Action& action) {
           "IN is a text of points, which become a grid in this way: between the three around each point, "
           "as the nearest one, or as means of near ones by the inverse square of their distance (default "
           "for what is no raster: linear)")
-      ->check(CLI::IsMember(kGriddings));
+      ->check(CLI::IsMember(griddingNames()));
   command
       .add_option("--origin-x", options->originX,
                   "Easting of the first point written (m; default: as the raster lies)")

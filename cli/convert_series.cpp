@@ -1,5 +1,3 @@
-#include <map>
-
 #include "cli/commands.h"
 #include "cli/console_conversion.h"
 #include "conversion/series_conversion.h"
@@ -33,12 +31,10 @@ void addConvertSeries(CLI::App& convert, Action& action) {
   command.add_option("--skip-lines", options->skipLines, "Heading lines; the last one names the columns")
       ->check(CLI::NonNegativeNumber)
       ->capture_default_str();
-  const std::map<std::string, DateOrder> orders{
-      {"ymd", DateOrder::yearMonthDay}, {"dmy", DateOrder::dayMonthYear}, {"mdy", DateOrder::monthDayYear}};
   command
       .add_option("--dates", options->dateOrder,
                   "The order of dates that do not tell it themselves: ymd, dmy, mdy")
-      ->transform(CLI::CheckedTransformer(orders, CLI::ignore_case));
+      ->transform(CLI::CheckedTransformer(dateOrderNames(), CLI::ignore_case));
   addForce(command, options->force);
 }
 

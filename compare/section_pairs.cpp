@@ -7,6 +7,7 @@
 
 #include "core/nearest.h"
 #include "core/number_text.h"
+#include "setup/setup_path.h"
 
 namespace gridbay {
 namespace {
@@ -53,7 +54,7 @@ bool isNumber(ValueKind kind) {
   return kind == ValueKind::integer || kind == ValueKind::real;
 }
 
-bool sameValue(const Value& a, const Value& b) {
+bool equalValues(const Value& a, const Value& b) {
   if (a.text() == b.text()) return a.kind() == b.kind() || (isNumber(a.kind()) && isNumber(b.kind()));
   if (!isNumber(a.kind()) || !isNumber(b.kind())) return false;
   const std::optional<double> number = doubleOfText(a.text());
@@ -91,7 +92,7 @@ std::string stepOfNode(const Node& section, const Node& node) {
 }
 
 bool sameKeyword(const Node& a, const Node& b) {
-  return std::ranges::equal(a.values(), b.values(), sameValue);
+  return std::ranges::equal(a.values(), b.values(), equalValues);
 }
 
 bool sameNode(const Node* a, const Node* b) {
@@ -100,6 +101,11 @@ bool sameNode(const Node* a, const Node* b) {
   if (!a->isSection()) return sameKeyword(*a, *b);
   return std::ranges::all_of(groupsOf<2>({a, b}),
                              [](const NodeGroup<2>& group) { return sameNode(group[0], group[1]); });
+}
+
+std::optional<std::string> shownNode(const Node* node) {
+  if (node == nullptr) return std::nullopt;
+  return node->isSection() ? std::string() : shownValues(*node);
 }
 
 void writeNode(const Node& node, KvsFile& file) {

@@ -2,6 +2,7 @@
 
 #include <array>
 #include <cstddef>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -26,6 +27,9 @@ std::string stepOfNode(const Node& section, const Node& node);
 bool sameKeyword(const Node& a, const Node& b);
 // Either may be null.
 bool sameNode(const Node* a, const Node* b);
+
+// What a thing holds, for people: the values of a keyword, empty for a section, nothing for null.
+std::optional<std::string> shownNode(const Node* node);
 
 // Writes a thing with all that it holds under the cursor.
 void writeNode(const Node& node, KvsFile& file);

@@ -6,11 +6,6 @@
 namespace gridbay {
 namespace {
 
-std::optional<std::string> shown(const Node* node) {
-  if (node == nullptr) return std::nullopt;
-  return node->isSection() ? std::string() : shownValues(*node);
-}
-
 // The path of a thing that one of the two sections has at least.
 std::string pathOf(const std::string& prefix, const NodeGroup<2>& sections, const NodeGroup<2>& nodes) {
   const std::size_t holder = nodes[0] != nullptr ? 0 : 1;
@@ -25,7 +20,7 @@ void compare(const NodeGroup<2>& sections, const std::string& prefix,
     if (own != nullptr && other != nullptr && isSection) {
       compare(nodes, pathOf(prefix, sections, nodes) + "/", differences);
     } else if (own == nullptr || other == nullptr || !sameKeyword(*own, *other)) {
-      differences.push_back({pathOf(prefix, sections, nodes), isSection, shown(own), shown(other)});
+      differences.push_back({pathOf(prefix, sections, nodes), isSection, shownNode(own), shownNode(other)});
     }
   }
 }

@@ -59,11 +59,6 @@ const Node* countKeyword(const Node* section, std::size_t count) {
   return nullptr;
 }
 
-std::optional<std::string> shown(const Node* node) {
-  if (node == nullptr) return std::nullopt;
-  return node->isSection() ? std::string() : shownValues(*node);
-}
-
 class Merger {
  public:
   Merger(KvsFile& file, const MergeChoice& choose, MergedTree& merged)
@@ -155,7 +150,7 @@ class Merger {
       wanted = other;
       ++merged_.takenFromOther;
     } else {
-      merged_.conflicts.push_back({path(), isSection, shown(base), shown(own), shown(other)});
+      merged_.conflicts.push_back({path(), isSection, shownNode(base), shownNode(own), shownNode(other)});
       if (choose_(merged_.conflicts.back()) == MergeSide::other) wanted = other;
     }
     if (wanted != nullptr) writeNode(*wanted, file_);

@@ -212,6 +212,19 @@ std::vector<std::string> filesIn(const std::vector<std::string>& names) {
 
 }  // namespace
 
+const std::map<std::string, Resampling>& resamplingNames() {
+  static const std::map<std::string, Resampling> names{
+      {"bilinear", Resampling::bilinear}, {"nearest", Resampling::nearest},
+      {"cubic", Resampling::cubic},       {"mean", Resampling::mean},
+      {"least", Resampling::least},       {"greatest", Resampling::greatest}};
+  return names;
+}
+const std::map<std::string, Gridding>& griddingNames() {
+  static const std::map<std::string, Gridding> names{
+      {"linear", Gridding::linear}, {"nearest", Gridding::nearest}, {"idw", Gridding::inverseDistance}};
+  return names;
+}
+
 Result<ConvertedRaster> convertRaster(const RasterConversion& options, ConversionHost& host) {
   if (const Outcome fit = check(options, host); !fit) return Failure{fit.error()};
   if (const Outcome free = mayWrite(options.out, options.force, {&options.in, 1}, host.option("force"));

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <array>
+#include <map>
 #include <optional>
 #include <string>
 
@@ -34,6 +35,10 @@ struct RasterConversion {
   bool force = false;   // replaces a file that is there
   std::string history;  // how the map came about, a line of its history without the date
 };
+
+// What a user calls them: "bilinear", "idw".
+const std::map<std::string, Resampling>& resamplingNames();
+const std::map<std::string, Gridding>& griddingNames();
 
 // The map that was written.
 struct ConvertedRaster {

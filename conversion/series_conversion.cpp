@@ -101,6 +101,12 @@ Outcome giveItemTypes(TableForm& form, const SeriesConversion& options, const Co
 
 }  // namespace
 
+const std::map<std::string, DateOrder>& dateOrderNames() {
+  static const std::map<std::string, DateOrder> names{
+      {"ymd", DateOrder::yearMonthDay}, {"dmy", DateOrder::dayMonthYear}, {"mdy", DateOrder::monthDayYear}};
+  return names;
+}
+
 Result<ConvertedSeries> convertSeries(const SeriesConversion& options, ConversionHost& host) {
   if (const Outcome free = mayWrite(options.out, options.force, {&options.in, 1}, host.option("force"));
       !free)

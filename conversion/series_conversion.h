@@ -1,5 +1,6 @@
 #pragma once
 
+#include <map>
 #include <optional>
 #include <string>
 #include <vector>
@@ -23,6 +24,9 @@ struct SeriesConversion {
   std::string history;                 // how the series came about, a line of its history without the date
   std::optional<DateOrder> dateOrder = {};  // of dates that do not tell it themselves
 };
+
+// What a user calls them: "ymd", "dmy", "mdy".
+const std::map<std::string, DateOrder>& dateOrderNames();
 
 // Makes a time series from delimited text. An error leaves what is at the path as it was.
 Result<ConvertedSeries> convertSeries(const SeriesConversion& conversion, ConversionHost& host);

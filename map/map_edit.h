@@ -1,6 +1,7 @@
 #pragma once
 
 #include <string>
+#include <utility>
 
 #include "core/page_id.h"
 #include "map/map_scene.h"
@@ -14,8 +15,8 @@ struct MapEdit {
   std::string name{};
 };
 
-MapEdit refusedEdit(std::string fault);
-// "Weir", for the names of steps.
-std::string editKindName(MapKind kind);
+inline MapEdit refusedEdit(std::string fault) {
+  return {.fault = std::move(fault)};
+}
 
 }  // namespace gridbay

@@ -12,6 +12,7 @@
 #include "basic/source_sink.h"
 #include "hydrodynamic/result.h"
 #include "map/map_areas.h"
+#include "map/map_names.h"
 #include "map/module_outputs.h"
 #include "map/setup_map.h"
 #include "structures/line_structure.h"
@@ -69,7 +70,7 @@ MapEdit SetupMap::addStructure(CGlobalKvs& root, MapKind kind, std::vector<MapPo
   for (std::size_t i = structureLine(root, kind, number).points.size(); i > 0; --i)
     removeStructurePoint(root, kind, number, i - 1);
   for (std::size_t i = 0; i < points.size(); ++i) insertStructurePoint(root, kind, number, i, points[i]);
-  return {.page = pageOfStructure(kind), .name = fmt::format("New {}", editKindName(kind))};
+  return {.page = pageOfStructure(kind), .name = fmt::format("New {}", kindName(kind))};
 }
 
 MapEdit SetupMap::addOnGrid(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points) {
@@ -161,7 +162,7 @@ MapEdit SetupMap::addOnGrid(CGlobalKvs& root, MapKind kind, const std::vector<Ma
     giveShape(root, idOf(kind, number, PageId::hdResult), shape);
     return {.page = PageId::hdResult, .name = "New output"};
   }
-  return refusedEdit(fmt::format("A {} can't be drawn on the map", editKindName(kind)));
+  return refusedEdit(fmt::format("A {} can't be drawn on the map", kindName(kind)));
 }
 
 std::int32_t SetupMap::finestHolding(const std::vector<MapPoint>& points) const {
@@ -216,7 +217,7 @@ MapEdit SetupMap::addLineOrBox(CGlobalKvs& root, MapKind kind, const std::vector
 MapEdit SetupMap::removeFeature(CGlobalKvs& root, MapFeatureId feature) {
   const int number = feature.number;
   const auto gone = [&](PageId page) {
-    return MapEdit{.page = page, .name = fmt::format("{} {} removed", editKindName(feature.kind), number)};
+    return MapEdit{.page = page, .name = fmt::format("{} {} removed", kindName(feature.kind), number)};
   };
   // What else is said of these stands under their numbers, so that the last one alone can go.
   const auto removeLast = [&](int count, PageId page, const std::function<void()>& remove) {
@@ -226,12 +227,12 @@ MapEdit SetupMap::removeFeature(CGlobalKvs& root, MapFeatureId feature) {
   };
   if (isStructure(feature.kind)) {
     if (number < 1 || number > structureCount(root, feature.kind))
-      return refusedEdit(fmt::format("There is no {} {}", editKindName(feature.kind), number));
+      return refusedEdit(fmt::format("There is no {} {}", kindName(feature.kind), number));
     removeStructure(root, feature.kind, number);
     return gone(pageOfStructure(feature.kind));
   }
   if (!shapeOf(root, feature))
-    return refusedEdit(fmt::format("There is no {} {}", editKindName(feature.kind), number));
+    return refusedEdit(fmt::format("There is no {} {}", kindName(feature.kind), number));
   switch (feature.kind) {
     case MapKind::boundary:
       if (!root.boundary->isUserSpecified()) return refusedEdit("The boundaries are found by the program");

@@ -29,7 +29,7 @@ GridFrame frameOf(const GridHeader& header) {
 
 MapEdit made(MapFeatureId feature, std::string_view what) {
   return {.page = static_cast<PageId>(feature.page),
-          .name = fmt::format("{} {}, {}", editKindName(feature.kind), feature.number, what)};
+          .name = fmt::format("{} {}, {}", kindName(feature.kind), feature.number, what)};
 }
 
 std::string pointName(MapFeatureId feature, std::size_t vertex) {
@@ -230,8 +230,7 @@ SetupMap::Shaped SetupMap::shaped(CGlobalKvs& root, MapFeatureId feature, std::s
   Shaped result;
   std::optional<GridShape> shape = shapeOf(root, feature);
   if (!shape || vertex >= shape->points.size()) {
-    result.fault =
-        fmt::format("{} {} has no point {}", editKindName(feature.kind), feature.number, vertex + 1);
+    result.fault = fmt::format("{} {} has no point {}", kindName(feature.kind), feature.number, vertex + 1);
     return result;
   }
   std::vector<GridPoint>& points = shape->points;
@@ -291,7 +290,7 @@ MapEdit SetupMap::moveVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t
   scene(root);
   if (isStructure(feature.kind)) {
     if (feature.number < 1 || feature.number > structureCount(root, feature.kind))
-      return refusedEdit(fmt::format("There is no {} {}", editKindName(feature.kind), feature.number));
+      return refusedEdit(fmt::format("There is no {} {}", kindName(feature.kind), feature.number));
     const StructureLine line = structureLine(root, feature.kind, feature.number);
     if (vertex >= line.points.size())
       return refusedEdit(fmt::format("\"{}\" has no point {}", line.name, vertex + 1));
@@ -320,7 +319,7 @@ MapEdit SetupMap::insertVertex(CGlobalKvs& root, MapFeatureId feature, std::size
 MapEdit SetupMap::insertPoint(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place) {
   if (isStructure(feature.kind)) {
     if (feature.number < 1 || feature.number > structureCount(root, feature.kind))
-      return refusedEdit(fmt::format("There is no {} {}", editKindName(feature.kind), feature.number));
+      return refusedEdit(fmt::format("There is no {} {}", kindName(feature.kind), feature.number));
     const StructureLine line = structureLine(root, feature.kind, feature.number);
     if (vertex > line.points.size())
       return refusedEdit(fmt::format("\"{}\" has {} points", line.name, line.points.size()));
@@ -336,8 +335,7 @@ MapEdit SetupMap::insertPoint(CGlobalKvs& root, MapFeatureId feature, std::size_
   }
   std::optional<GridShape> shape = shapeOf(root, feature);
   if (!shape || !shapeRule(feature.kind).canGrow || shape->joined == (feature.kind == MapKind::outputPoints))
-    return refusedEdit(
-        fmt::format("{} {} takes no further points", editKindName(feature.kind), feature.number));
+    return refusedEdit(fmt::format("{} {} takes no further points", kindName(feature.kind), feature.number));
   if (feature.kind == MapKind::outputPoints) {
     const bool isOfFlow = feature.page == static_cast<std::int32_t>(PageId::hdResult);
     const auto* output = isOfFlow ? root.nhdResult->outputs.GetItem(feature.number) : nullptr;
@@ -358,12 +356,12 @@ MapEdit SetupMap::insertPoint(CGlobalKvs& root, MapFeatureId feature, std::size_
 MapEdit SetupMap::removeVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex) {
   const ShapeRule rule = shapeRule(feature.kind);
   const auto tooFew = [&] {
-    return refusedEdit(fmt::format("{} {} keeps {} points at least", editKindName(feature.kind),
-                                   feature.number, rule.least));
+    return refusedEdit(
+        fmt::format("{} {} keeps {} points at least", kindName(feature.kind), feature.number, rule.least));
   };
   if (isStructure(feature.kind)) {
     if (feature.number < 1 || feature.number > structureCount(root, feature.kind))
-      return refusedEdit(fmt::format("There is no {} {}", editKindName(feature.kind), feature.number));
+      return refusedEdit(fmt::format("There is no {} {}", kindName(feature.kind), feature.number));
     const std::size_t count = structureLine(root, feature.kind, feature.number).points.size();
     if (vertex >= count) return refusedEdit(fmt::format("There is no point {}", vertex + 1));
     if (count <= rule.least) return tooFew();
@@ -373,7 +371,7 @@ MapEdit SetupMap::removeVertex(CGlobalKvs& root, MapFeatureId feature, std::size
   std::optional<GridShape> shape = shapeOf(root, feature);
   if (!shape || vertex >= shape->points.size())
     return refusedEdit(
-        fmt::format("{} {} has no point {}", editKindName(feature.kind), feature.number, vertex + 1));
+        fmt::format("{} {} has no point {}", kindName(feature.kind), feature.number, vertex + 1));
   if (!rule.canGrow || shape->points.size() <= rule.least) return tooFew();
   shape->points.erase(shape->points.begin() + static_cast<std::ptrdiff_t>(vertex));
   shape->areas.pop_back();

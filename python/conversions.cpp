@@ -24,6 +24,16 @@ struct ItemTypes {
 struct MomentText {
   std::string text;
 };
+// One of several names.
+struct ResamplingName {
+  Resampling way;
+};
+struct GriddingName {
+  Gridding way;
+};
+struct DateOrderName {
+  DateOrder order;
+};
 // A function of what is done and the whole, or None.
 struct Progress {
   py::object function;
@@ -50,6 +60,30 @@ struct Taken<MomentText> {
     const auto [year, month, day, hour, minute, second] = momentOf(given.value, given.path);
     return {fmt::format("{:04}-{:02}-{:02} {:02}:{:02}:{:02}", year, month, day, hour, minute, second)};
   }
+};
+template <class Value>
+Value named(const std::map<std::string, Value>& names, const Given& given) {
+  const std::string name = textOf(given.value, given.path);
+  const auto found = names.find(name);
+  if (found != names.end()) return found->second;
+  std::string allowed;
+  for (const auto& [each, value] : names) allowed += (allowed.empty() ? "" : ", ") + each;
+  throw refusal(kWrongValue, given.path, shown(given.value), allowed);
+}
+template <>
+struct Taken<ResamplingName> {
+  static constexpr const char* kName = "str";
+  static ResamplingName from(const Given& given) { return {named(resamplingNames(), given)}; }
+};
+template <>
+struct Taken<GriddingName> {
+  static constexpr const char* kName = "str";
+  static GriddingName from(const Given& given) { return {named(griddingNames(), given)}; }
+};
+template <>
+struct Taken<DateOrderName> {
+  static constexpr const char* kName = "str";
+  static DateOrderName from(const Given& given) { return {named(dateOrderNames(), given)}; }
 };
 template <>
 struct Taken<Progress> {
@@ -140,9 +174,10 @@ void addConversions(py::module_& module) {
       module, "convert_raster",
       [](Path in, Path out, std::optional<float> land, std::optional<ItemTypeText> itemType,
          std::optional<int> band, std::optional<int> subdataset, std::optional<float> nodataAs,
-         std::string crs, std::string reproject, std::optional<double> resample,
-         std::optional<double> originX, std::optional<double> originY, int coarsen,
-         std::optional<std::array<int, 4>> window, bool force, std::string history, Progress progress) {
+         std::string crs, std::string reproject, std::optional<double> resample, ResamplingName resampling,
+         std::optional<GriddingName> gridding, std::optional<double> originX, std::optional<double> originY,
+         int coarsen, std::optional<std::array<int, 4>> window, std::optional<std::array<double, 4>> extent,
+         bool force, std::string history, Progress progress) {
         RasterConversion conversion{
             .in = std::move(in),
             .out = std::move(out),
@@ -154,44 +189,36 @@ void addConversions(py::module_& module) {
             .crs = std::move(crs),
             .reproject = std::move(reproject),
             .resample = resample,
+            .resampling = resampling.way,
+            .gridding = gridding ? std::optional(gridding->way) : std::nullopt,
             .originX = originX,
             .originY = originY,
             .coarsen = coarsen,
             .window = window,
+            .extent = extent,
             .force = force,
             .history = std::move(history)};
         return raster(std::move(conversion), progress.function);
       },
-      {file("source"),
-       file("target"),
-       {"land"},
-       {"item_type"},
-       {"band"},
-       {"subdataset"},
-       {"nodata_as"},
-       {"crs"},
-       {"reproject"},
-       {"resample"},
-       {"origin_x"},
-       {"origin_y"},
-       {"coarsen"},
-       {"window"},
-       {"force"},
-       {"history"},
-       {"progress"}},
+      {file("source"), file("target"), {"land"},     {"item_type"}, {"band"},
+       {"subdataset"}, {"nodata_as"},  {"crs"},      {"reproject"}, {"resample"},
+       {"resampling"}, {"gridding"},   {"origin_x"}, {"origin_y"},  {"coarsen"},
+       {"window"},     {"extent"},     {"force"},    {"history"},   {"progress"}},
       "Makes a map from a raster.");
   addFunction(
       module, "convert_series",
-      [](Path in, Path out, ItemTypes itemTypes, MomentText start, std::string timeUnit, int skipLines,
-         bool force, std::string history, Progress progress) {
+      [](Path in, Path out, std::optional<ItemTypes> itemTypes, std::optional<MomentText> start,
+         std::string timeUnit, int skipLines, std::optional<DateOrderName> dates, bool force,
+         std::string history, Progress progress) {
         return series({.in = std::move(in),
                        .out = std::move(out),
-                       .itemTypes = std::move(itemTypes.texts),
-                       .start = std::move(start.text),
+                       .itemTypes = itemTypes ? std::move(itemTypes->texts) : std::vector<std::string>(),
+                       .start = start ? std::move(start->text) : std::string(),
                        .timeUnit = std::move(timeUnit),
                        .skipLines = skipLines,
                        .force = force,
-                       .history = std::move(history)},
+                       .history = std::move(history),
+                       .dateOrder = dates ? std::optional(dates->order) : std::nullopt},
                       progress.function);
       },
       {file("source"),
@@ -200,6 +227,7 @@ void addConversions(py::module_& module) {
        {"start"},
        {"time_unit"},
        {"skip_lines"},
+       {"dates"},
        {"force"},
        {"history"},
        {"progress"}},

@@ -424,11 +424,15 @@ bool GridView::goTo(const PagePlace& place) {
   const int row = rowOf(place.entries);
   const int column = row < 0 ? -1 : columnOf(place, row);
   if (column < 0) return false;
+  goToCell(row, column);
+  return true;
+}
+
+void GridView::goToCell(int row, int column) {
   const bool outer = std::exchange(movingByKeys_, true);
   selectionModel()->setCurrentIndex(model_->index(row, column), QItemSelectionModel::ClearAndSelect);
   scrollTo(currentIndex());
   movingByKeys_ = outer;
-  return true;
 }
 
 // An entry may have several rows, and a title above them.

@@ -24,6 +24,8 @@ class GridView final : public QTableView {
   GridModel& cells() { return *model_; }
   // Makes the cell at a place of the page the current one, and opens no editor; false where there is none.
   bool goTo(const PagePlace& place);
+  // Makes a cell of the table itself (from 0, headers counted) the current one, and opens none.
+  void goToCell(int row, int column);
   // Hands over what is typed in a cell and not yet entered.
   void commitEdit();
 

@@ -81,10 +81,13 @@ def convert_raster(
     crs: str = "",
     reproject: str = "",
     resample: Optional[float] = None,
+    resampling: str = "bilinear",
+    gridding: Optional[str] = None,
     origin_x: Optional[float] = None,
     origin_y: Optional[float] = None,
     coarsen: int = 1,
     window: Optional[tuple[int, int, int, int]] = None,
+    extent: Optional[tuple[float, float, float, float]] = None,
     force: bool = False,
     progress: Optional[Progress] = None,
 ) -> ConvertedRaster:
@@ -93,16 +96,19 @@ def convert_raster(
     land: points at or above it are land (unit of the values, at least 0); a bathymetry needs it. item_type: code,
     name or beginning of a name; else as the file says, or Bathymetry. band, subdataset: which raster to take, from
     1. nodata_as: what stands for missing values, else the land value. crs: as EPSG:28356, UTM-32 or a full text,
-    else the raster's own. reproject: the projection to bring it to. resample: the spacing to bring it to (m).
+    else the raster's own. reproject: the projection to bring it to. resample: the spacing to bring it to (m),
+    which a text of points needs. resampling: bilinear, nearest, cubic, mean, least or greatest. gridding: how points
+    become a grid: linear, nearest or idw, else linear for what is no raster.
     origin_x, origin_y: easting and northing of the first point (m), else as it lies.
-    coarsen: every so many points. window: j0, k0, j1, k1, from 0, both ends counted, K from the south. force:
-    replaces a file that is there.
+    coarsen: every so many points. window: j0, k0, j1, k1, from 0, both ends counted, K from the south. extent:
+    west, south, east, north, in the projection of the map (m): only points within. force: replaces a file that is there.
     """
     name = file_name(source, "convert_raster(source)")
     converted = _native.convert_raster(
         name, file_name(target, "convert_raster(target)"), land=land, item_type=item_type, band=band,
-        subdataset=subdataset, nodata_as=nodata_as, crs=crs, reproject=reproject, resample=resample, origin_x=origin_x,
-        origin_y=origin_y, coarsen=coarsen, window=window, force=force, progress=progress,
+        subdataset=subdataset, nodata_as=nodata_as, crs=crs, reproject=reproject, resample=resample,
+        resampling=resampling, gridding=gridding, origin_x=origin_x, origin_y=origin_y, coarsen=coarsen, window=window,
+        extent=extent, force=force, progress=progress,
         history=f"gridbay_setup.convert_raster({name!r})",
     )  # fmt: skip
     return ConvertedRaster(**converted)
@@ -112,23 +118,26 @@ def convert_series(
     source: PathLike,
     target: PathLike,
     *,
-    item_type: Union[str, int, Sequence[Union[str, int]]],
-    start: datetime.datetime,
+    item_type: Union[str, int, Sequence[Union[str, int]], None] = None,
+    start: Optional[datetime.datetime] = None,
     time_unit: str = "s",
     skip_lines: int = 0,
+    dates: Optional[str] = None,
     force: bool = False,
     progress: Optional[Progress] = None,
 ) -> ConvertedSeries:
     """Makes a time series (*.tsb0) from lines of a time and values, between commas, semicolons, tabs or blanks.
 
-    item_type: one for all columns or a list with one for each: code, name or beginning of a name. start: the moment
-    of time 0, in whole seconds and no time zone. time_unit: s, min, h or d. skip_lines: heading lines, of which the last names the columns. force:
+    item_type: one for all columns or a list with one for each: code, name or beginning of a name; else as their names
+    and units say. start: the moment of time 0, in whole seconds and no time zone; the first column has the times
+    then, else dates, names and units are recognised. time_unit: s, min, h or d. skip_lines: heading lines, of which
+    the last names the columns. dates: the order of dates that do not tell it themselves, ymd, dmy or mdy. force:
     replaces a file that is there.
     """
     name = file_name(source, "convert_series(source)")
     converted = _native.convert_series(
         name, file_name(target, "convert_series(target)"), item_type=item_type, start=start, time_unit=time_unit,
-        skip_lines=skip_lines, force=force, progress=progress, history=f"gridbay_setup.convert_series({name!r})",
+        skip_lines=skip_lines, dates=dates, force=force, progress=progress, history=f"gridbay_setup.convert_series({name!r})",
     )  # fmt: skip
     return ConvertedSeries(**converted)
 

@@ -53,11 +53,13 @@ def new_grid(*, points: tuple[int, int], spacing: tuple[float, float], first: tu
              time_step: float) -> NewGrid: ...
 def convert_raster(source: _FileName, target: _FileName, *, land: Optional[float], item_type: Union[str, int, None],
                    band: Optional[int], subdataset: Optional[int], nodata_as: Optional[float], crs: str,
-                   reproject: str, resample: Optional[float], origin_x: Optional[float], origin_y: Optional[float],
-                   coarsen: int, window: Optional[tuple[int, int, int, int]], force: bool, history: str,
+                   reproject: str, resample: Optional[float], resampling: str,
+                   gridding: Optional[str], origin_x: Optional[float], origin_y: Optional[float],
+                   coarsen: int, window: Optional[tuple[int, int, int, int]],
+                   extent: Optional[tuple[float, float, float, float]], force: bool, history: str,
                    progress: Optional[Callable[[int, int], Optional[bool]]]) -> dict[str, Any]: ...
-def convert_series(source: _FileName, target: _FileName, *, item_type: Union[str, int, Sequence[Union[str, int]]],
-                   start: Union[str, datetime.datetime], time_unit: str, skip_lines: int, force: bool, history: str,
+def convert_series(source: _FileName, target: _FileName, *, item_type: Union[str, int, Sequence[Union[str, int]], None],
+                   start: Union[str, datetime.datetime, None], time_unit: str, skip_lines: int, dates: Optional[str], force: bool, history: str,
                    progress: Optional[Callable[[int, int], Optional[bool]]]) -> dict[str, Any]: ...
 def item_types() -> list[tuple[int, str, str]]: ...
 def keyword_list(definition: str) -> tuple[list[Any], list[Any]]: ...

@@ -71,7 +71,7 @@ void DifferenceMarks::show(PagePane& pane, const Difference& difference, bool wi
                        : pane.widgetOf(QString::fromStdString(difference.label), difference.labelNumber);
   if (input == nullptr) return;
   if (table != nullptr && difference.row <= table->model()->rowCount())
-    table->goTo(difference.row - 1, std::max(difference.column - 1, 0));
+    table->goToCell(difference.row - 1, std::max(difference.column - 1, 0));
   pane.ensureWidgetVisible(input);
   if (withFocus) input->setFocus(Qt::OtherFocusReason);
 }

@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <utility>
 
+#include "map/map_names.h"
 #include "shell/map/map_settings.h"
 #include "shell/shades.h"
 
@@ -176,7 +177,8 @@ void LayerPanel::tellScene() {
   }
   for (const MapFeature& feature : canvas_.scene().features) {
     if (feature.points->empty())
-      add(layerOf(feature.id.kind), QString("%1 %2").arg(kindName(feature.id.kind)).arg(feature.id.number),
+      add(layerOf(feature.id.kind),
+          QString("%1 %2").arg(QLatin1String(kindName(feature.id.kind))).arg(feature.id.number),
           feature.fault);
   }
   constexpr qsizetype kMostTold = 10;

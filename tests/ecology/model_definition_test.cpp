@@ -406,9 +406,9 @@ TEST_F(DefinitionFile, ReadingsAreTheSameWhereTheyDeclareTheSame) {
   choose(plain);
   CGlobalKvs first;
   first.AssignState(root);
-  const ModelDefinition* const held = &root.wqsModelDefinition->definition();
+  const ModelDefinition* const before = &root.wqsModelDefinition->definition();
   choose(plain);
-  EXPECT_NE(&root.wqsModelDefinition->definition(), held);
+  EXPECT_NE(&root.wqsModelDefinition->definition(), before);
   EXPECT_TRUE(root.wqsModelDefinition->SameState(*first.wqsModelDefinition));
   for (const std::string& other :
        {text("TRANSPORT \"NONE\"", "DESCRIPTION \"d\""), text("TRANSPORT \"AD\"", "DESCRIPTION \"e\""),

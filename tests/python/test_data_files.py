@@ -197,10 +197,14 @@ GRID = {"points": (3, 2), "spacing": (1, 1), "land": 1}
     ("convert_raster", RASTER, "crs", None, WrongType, "a text"),
     ("convert_raster", RASTER, "window", (1, 2, 3), WrongValue, "4 values, as a tuple"),
     ("convert_raster", RASTER, "window", "0123", WrongType, "a list"),
+    ("convert_raster", RASTER, "resampling", "best", WrongValue, "bilinear, cubic, greatest, least, mean, nearest"),
+    ("convert_raster", RASTER, "gridding", "spline", WrongValue, "idw, linear, nearest"),
+    ("convert_raster", RASTER, "extent", (0, 1), WrongValue, "4 values, as a tuple"),
+    ("convert_series", SERIES, "dates", "dd", WrongValue, "dmy, mdy, ymd"),
     ("convert_raster", RASTER, "force", "yes", WrongType, "True or False"),
     ("convert_raster", RASTER, "progress", 3, WrongType, "a function of two numbers, or None"),
     ("convert_series", SERIES, "item_type", [999, None], WrongType, "the code or name of an item type"),
-    ("convert_series", SERIES, "start", None, WrongType, "a datetime of whole seconds without a time zone"),
+    ("convert_series", SERIES, "start", 5, WrongType, "a datetime of whole seconds without a time zone"),
     ("convert_series", SERIES, "start", AWARE, WrongValue, "a datetime of whole seconds without a time zone"),
     ("convert_series", SERIES, "start", START.replace(microsecond=1), WrongValue, "a datetime of whole seconds"),
     ("convert_series", SERIES, "skip_lines", True, WrongType, "a whole number of 32 bits"),
@@ -232,3 +236,17 @@ def test_names_of_files_of_any_bytes(raster, tmp_path):
         gridbay_setup.open_data(name + ".tsb2").read(1, 1.5)
     with pytest.raises(WrongType, match=r"NewGrid.save\(path\): None "):
         gridbay_setup.new_grid(points=(3, 2), spacing=(1, 1), land=1).save(None)
+
+
+def test_points_and_tables_that_tell_what_they_hold(tmp_path):
+    points = tmp_path / "points.xyz"
+    points.write_text("x y z\n" + "".join(f"{10 * x} {10 * y} {x + y}\n" for x in range(4) for y in range(3)))
+    made = gridbay_setup.convert_raster(points, tmp_path / "points.tsb2", land=99, resample=10, gridding="nearest",
+                                        crs="UTM-32", extent=(10, 0, 30, 20))  # fmt: skip
+    assert made.points == (3, 3) and made.first == (10, 0)
+    assert gridbay_setup.open_data(tmp_path / "points.tsb2").read()[2, 1] == 4
+    table = tmp_path / "table.csv"
+    table.write_text("date;water level [m]\n01.02.2020 06:00;0,5\n01.02.2020 07:00;0,75\n")
+    assert gridbay_setup.convert_series(table, tmp_path / "table.tsb0", dates="dmy").items == 1
+    data = gridbay_setup.open_data(tmp_path / "table.tsb0")
+    assert data.start == datetime.datetime(2020, 2, 1, 6) and data.items[0].name == "water level"
