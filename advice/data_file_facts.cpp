@@ -198,7 +198,8 @@ DataFileFacts::~DataFileFacts() = default;
 DataFileFacts::Entry& DataFileFacts::entry(const std::string& path, std::size_t item) {
   std::unique_ptr<Entry>& found = entries_[{path, item}];
   const std::optional<FileStamp> stamp = fileStamp(path);
-  if (found == nullptr || found->stamp != stamp) {
+  // One that is in use in this look stays, whoever writes to its file.
+  if (found == nullptr || (found->stamp != stamp && !found->isUsed)) {
     found = std::make_unique<Entry>();
     found->stamp = stamp;
     found->path = path;

@@ -10,6 +10,7 @@
 #include <cmath>
 #include <limits>
 #include <memory>
+#include <string_view>
 
 #include "conversion/background.h"
 
@@ -401,6 +402,12 @@ class VectorBackground final : public Background {
   std::string notice_;
 };
 
+// The library behind that driver serves one thread, which is that of the window.
+bool isNetcdf(const char* path) {
+  const GDALDriverH driver = GDALIdentifyDriverEx(path, GDAL_OF_RASTER | GDAL_OF_VECTOR, nullptr, nullptr);
+  return driver != nullptr && std::string_view(GDALGetDriverShortName(driver)) == "netCDF";
+}
+
 // Of a file of several rasters the first one.
 Dataset openFile(const char* path) {
   const auto openAny = [](const char* name) {
@@ -423,6 +430,10 @@ extern "C" gridbay::Background* gridbayOpenBackground(const char* path, const ch
                                                       std::string* error) {
   GDALAllRegister();
   const gridbay::QuietErrors quiet;
+  if (gridbay::isNetcdf(path)) {
+    *error = "files of netCDF can't be read beside the window; make a GeoTIFF of it (gdal_translate)";
+    return nullptr;
+  }
   gridbay::Dataset dataset = gridbay::openFile(path);
   if (!dataset) {
     *error = gridbay::lastError("it is of no kind that can be read");

@@ -200,9 +200,9 @@ Outcome cutNestedGrid(const std::string& projection, const MapScene& scene, cons
   if ((*source)->bands() < 1) return Failure{fmt::format("\"{}\" holds no map", raster)};
   (*source)->choose(1);
   std::optional<Sampler> sampler;
+  float land = kNone;  // of the grid file that is cut from
   if (isGridFile) {
     TsbHeader header;
-    float land = kNone;
     if (tsbFileRead(raster, &header) == 0) {
       const Result<std::optional<float>> known = landValueOf(header.file->definition());
       if (known) land = known->value_or(kNone);
@@ -226,6 +226,10 @@ Outcome cutNestedGrid(const std::string& projection, const MapScene& scene, cons
     if (sampler) {
       if (const Outcome done = sampleRows(*sampler, place, first, rows, values); !done)
         return Failure{fmt::format("cannot cut from \"{}\": {}", raster, done.error())};
+      // Its land stays land by the value of the enclosing area.
+      for (float& value : values) {
+        if (value >= land) value = std::max(value, outer->landValue);
+      }
     } else if (!(*source)->read(first, values, &why)) {
       return Failure{fmt::format("cannot read \"{}\": {}", raster, why)};
     }

@@ -96,10 +96,12 @@ MapEdit SetupMap::addOnGrid(CGlobalKvs& root, MapKind kind, const std::vector<Ma
     const auto [j, k] = area->grid.pointOf(points[0]);
     const auto [lastJ, lastK] = area->grid.pointOf(points[1]);
     const GridPoint first = slideAlongBorder(j, k, area->nx, area->ny, {});
+    const GridPoint last = slideAlongBorder(lastJ, lastK, area->nx, area->ny, first);
+    if (last == first) return refusedEdit("The boundary is shorter than the spacing of Area 1");
     list.SetNoBoundaries(list.GetCount() + 1);
     CBoundaryObjectKvs& boundary = list.at(list.GetCount());
     boundary.first = first;
-    boundary.last = slideAlongBorder(lastJ, lastK, area->nx, area->ny, first);
+    boundary.last = last;
     return {.page = PageId::boundary, .name = "New boundary"};
   }
   if (kind == MapKind::source) {

@@ -330,8 +330,15 @@ void DocumentTab::showAdvice() {
 
 void DocumentTab::fixAdvice(std::size_t place) {
   if (place >= advice_.size()) return;
-  const Advice wanted = advice_[place];
+  Advice wanted = advice_[place];
   commit();
+  if (adviceTimer_.isActive()) {  // the setup is another one since
+    lookForAdvice();
+    const auto now = std::ranges::find_if(
+        advice_, [&](const Advice& each) { return each.kind == wanted.kind && each.place == wanted.place; });
+    if (now == advice_.end()) return;
+    wanted = *now;
+  }
   if (!editor_->makeFix(wanted)) return;
   editor_->refreshPage();
   pane_->refresh();
@@ -387,8 +394,9 @@ bool DocumentTab::replaceSetup(const std::function<bool()>& load) {
     advice_.clear();
     adviceTimer_.start();
   }
-  if (page == 0 || !goToPage(page)) showFirstView();
-  showCurrentPage();
+  const bool isShown = page != 0 && goToPage(page);
+  if (!isShown) showFirstView();
+  if (!isShown || !loaded) showCurrentPage();
   if (loaded) {
     showAdvice();
     emit documentChanged();

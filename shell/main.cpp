@@ -5,10 +5,12 @@
 #include <QPixmap>
 #include <functional>
 
+#include "core/page_place.h"
 #include "shell/appearance.h"
 #include "shell/main_window.h"
 
 using namespace gridbay::shell;
+using gridbay::PageId;
 
 namespace {
 

@@ -73,28 +73,42 @@ bool PackedGrid::unpack(const PackedLayout::Piece& piece, std::vector<float>& va
   return true;
 }
 
-const std::vector<float>* PackedGrid::piece(std::size_t number) const {
+void PackedGrid::keepAtMost(std::size_t values) const {
+  const std::size_t each = layout_.pieceColumns * layout_.pieceRows;
+  while (!uses_.empty() && kept_.size() * each > values) {
+    kept_.erase(uses_.back());
+    uses_.pop_back();
+  }
+}
+
+void PackedGrid::trim() const {
+  const std::lock_guard lock(mutex_);
+  keepAtMost(kMostKept);
+}
+
+const std::vector<float>* PackedGrid::piece(std::size_t number, std::size_t mostKept) const {
   if (const auto found = kept_.find(number); found != kept_.end()) {
     uses_.splice(uses_.begin(), uses_, found->second.use);
     return &found->second.values;
   }
   std::vector<float> values;
   if (!unpack(layout_.pieces[number], values)) return nullptr;
-  while (!uses_.empty() && (kept_.size() + 1) * values.size() > kMostKept) {
-    kept_.erase(uses_.back());
-    uses_.pop_back();
-  }
+  keepAtMost(mostKept - values.size());
   uses_.push_front(number);
   return &kept_.emplace(number, Kept{std::move(values), uses_.begin()}).first->second.values;
 }
 
 bool PackedGrid::read(std::size_t row, std::size_t firstColumn, std::span<float> values) const {
-  const std::size_t across = (layout_.columns + layout_.pieceColumns - 1) / layout_.pieceColumns;
+  if (values.empty()) return true;
+  // All that the row touches stays for the next one.
+  const std::size_t touched =
+      (firstColumn + values.size() - 1) / layout_.pieceColumns - firstColumn / layout_.pieceColumns + 1;
+  const std::size_t mostKept = std::max(kMostKept, touched * layout_.pieceColumns * layout_.pieceRows);
   const std::size_t rowInPiece = row % layout_.pieceRows;
   const std::lock_guard lock(mutex_);
   while (!values.empty()) {
     const std::vector<float>* held =
-        piece(row / layout_.pieceRows * across + firstColumn / layout_.pieceColumns);
+        piece(row / layout_.pieceRows * across() + firstColumn / layout_.pieceColumns, mostKept);
     if (held == nullptr) return false;
     const std::size_t columnInPiece = firstColumn % layout_.pieceColumns;
     const std::size_t count = std::min(values.size(), layout_.pieceColumns - columnInPiece);
@@ -104,6 +118,16 @@ bool PackedGrid::read(std::size_t row, std::size_t firstColumn, std::span<float>
     values = values.subspan(count);
     firstColumn += count;
   }
+  return true;
+}
+
+bool PackedGrid::readAtOnce(std::size_t row, std::size_t column, float& value) const {
+  const std::unique_lock lock(mutex_, std::try_to_lock);
+  if (!lock) return false;
+  const auto found = kept_.find(row / layout_.pieceRows * across() + column / layout_.pieceColumns);
+  if (found == kept_.end()) return false;
+  value =
+      found->second.values[row % layout_.pieceRows * layout_.pieceColumns + column % layout_.pieceColumns];
   return true;
 }
 

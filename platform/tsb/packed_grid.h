@@ -40,11 +40,15 @@ struct PackedLayout {
 class PackedGrid {
  public:
   static constexpr std::size_t kMostKept = std::size_t{1} << 24;  // values
-  // A piece must not have more values than are kept.
+  // A piece must not have more values than are kept. A row of pieces may: while rows of them are read it stays.
   PackedGrid(FileDescriptor file, PackedLayout layout) : file_(std::move(file)), layout_(std::move(layout)) {}
 
   // Points of a row from a column on, which must be there. False where the file is damaged or gone.
   bool read(std::size_t row, std::size_t firstColumn, std::span<float> values) const;
+  // A value that is at hand: false where it would have to be unpacked, or another thread is at work.
+  bool readAtOnce(std::size_t row, std::size_t column, float& value) const;
+  // Keeps no more than a grid that is looked at here and there.
+  void trim() const;
 
  private:
   struct Kept {
@@ -52,7 +56,9 @@ class PackedGrid {
     std::list<std::size_t>::iterator use;
   };
   // Null where it can't be unpacked.
-  const std::vector<float>* piece(std::size_t number) const;
+  const std::vector<float>* piece(std::size_t number, std::size_t mostKept) const;
+  void keepAtMost(std::size_t values) const;
+  std::size_t across() const { return (layout_.columns + layout_.pieceColumns - 1) / layout_.pieceColumns; }
   bool unpack(const PackedLayout::Piece& piece, std::vector<float>& values) const;
 
   FileDescriptor file_;

@@ -228,7 +228,13 @@ Outcome StoredGrid::makeOverview(const std::function<bool()>& isCancelled) {
     for (std::size_t j = 0; j < columns(); j += step) overview_.push_back(row[j]);
   }
   overviewStep_ = step;
+  packed_->trim();
   return {};
+}
+
+bool StoredGrid::readAtOnce(std::size_t row, std::size_t column, float& value) const {
+  if (packed_ && row < rows() && column < columns()) return packed_->readAtOnce(row, column, value);
+  return read(row, column, {&value, 1});
 }
 
 bool StoredGrid::read(std::size_t row, std::size_t firstColumn, std::span<float> values, double apart) const {

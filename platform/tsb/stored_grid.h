@@ -29,8 +29,8 @@ class StoredGrid {
   // Errors are those of TsbFile, and: not two-dimensional, no such item.
   static Result<Source> find(const std::string& path, std::size_t item);
 
-  // What is packed in a way of its own is read at once, and has no more points than this; what is packed as
-  // usual is read in parts.
+  // What is packed in a way of its own, or in larger pieces than this, is read at once, and has no more points
+  // than this; what is packed as usual is read in parts.
   static constexpr std::size_t kMostAtOnce = std::size_t{1} << 24;
   // A larger packed item gets an overview of at most about so many points.
   static constexpr std::size_t kOverviewPoints = std::size_t{1} << 22;
@@ -48,6 +48,8 @@ class StoredGrid {
   // Points of a row (from 0) from a column on. Where no more than every `apart`-th point is looked at, they
   // may be those of the nearest point of the overview. False where the file can't be read any more.
   bool read(std::size_t row, std::size_t firstColumn, std::span<float> values, double apart = 1) const;
+  // One value, for who can't wait: false also where it would have to be unpacked first.
+  bool readAtOnce(std::size_t row, std::size_t column, float& value) const;
 
  private:
   explicit StoredGrid(FileDescriptor file, Source source)

@@ -413,7 +413,35 @@ struct TsbFile::State {
     const std::size_t row = definition().axes.empty() ? 1 : definition().axes[0].points;
     if (definition().axes.size() != 2 || row == 0 || values.size() % row != 0)
       return fail("a part of it was asked for that is not of whole rows");
+    if (firstRow > 0) keepPieces(item);
     return readBlock(item, {step, 1}, {firstRow, values.size() / row}, values, get);
+  }
+
+  // Where rows are read one after the other, the library keeps all pieces that a row goes through: else it
+  // unpacks them again for each.
+  void keepPieces(std::size_t item) const {
+    if (item < 1 || item > content->itemVariables.size() || !openFile()) return;
+    const int variable = content->itemVariables[item - 1];
+    constexpr std::size_t kMostDimensions = 8;
+    std::array<std::size_t, kMostDimensions> piece{};
+    int storage = NC_CONTIGUOUS;
+    int dimensions = 0;
+    if (nc_inq_varndims(file->id(), variable, &dimensions) != NC_NOERR || dimensions < 2 ||
+        dimensions > static_cast<int>(kMostDimensions) ||
+        nc_inq_var_chunking(file->id(), variable, &storage, piece.data()) != NC_NOERR ||
+        storage != NC_CHUNKED)
+      return;
+    std::size_t bytes = sizeof(double);
+    for (int i = 0; i < dimensions; ++i) bytes *= piece[static_cast<std::size_t>(i)];
+    const std::size_t across = piece[static_cast<std::size_t>(dimensions) - 1];
+    bytes *= (definition().axes[0].points + across - 1) / across;
+    std::size_t held = 0;
+    std::size_t pieces = 0;
+    float preemption = 0;
+    constexpr std::size_t kMost = std::size_t{1} << 29;
+    if (nc_get_var_chunk_cache(file->id(), variable, &held, &pieces, &preemption) == NC_NOERR &&
+        held < bytes && bytes <= kMost)
+      nc_set_var_chunk_cache(file->id(), variable, bytes, pieces, preemption);
   }
 
   template <class Number, class Get>

@@ -48,7 +48,12 @@ LayerPanel::LayerPanel(MapCanvas& canvas, QWidget* parent)
   opacity_->setAccessibleName(tr("Opacity"));
   opacity_->setToolTip(tr("Opacity of the background"));
   connect(opacity_, &QSlider::valueChanged, this, [this](int value) {
-    if (!isShowing_) canvas_.backgrounds().setOpacity(chosen(), static_cast<double>(value) / kWhole);
+    if (isShowing_) return;
+    // The list stays as it is, and so does the slider that is at work.
+    isShowing_ = true;
+    canvas_.backgrounds().setOpacity(chosen(), static_cast<double>(value) / kWhole);
+    isShowing_ = false;
+    save();
   });
   colours_->addItems({tr("Even steps"), tr("Sea"), tr("Grey")});
   colours_->setAccessibleName(tr("Colours"));

@@ -107,10 +107,13 @@ void MapCanvas::showMap(MapEditor* editor, const std::optional<MapFrame>& frame)
 }
 
 void MapCanvas::refresh() {
-  if (isPressed_) drop();
+  // A press that has entered what was typed on the page still begins a drag.
+  const bool isFresh = isPressed_ && !isDragged_ && !isPanning_ && editor_ != nullptr;
+  if (isPressed_ && !isFresh) drop();
   forgetPlaced();
-  if (editor_ == nullptr) return;
+  if (editor_ == nullptr) return emit sceneChanged();
   drawing_.setScene(editor_->scene());
+  if (isFresh && !placesByClicks()) startDrag(pressed_);
   std::vector<TerrainArea> terrain = store_.find(scene());
   if (isFitted_) {
     if (const std::optional<MapFrame> whole = wholeMap(scene(), size())) frame_ = *whole;

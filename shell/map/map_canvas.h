@@ -127,6 +127,7 @@ class MapCanvas final : public QWidget {
   void takePicture(const TerrainPicture& picture);
   void showCursor(QPointF at);
   void startDrag(QPointF at);
+  bool placesByClicks() const;
   void click(QPointF at);
   void chooseAt(QPointF at);
   void complete();

@@ -107,6 +107,10 @@ void MapCanvas::mousePressEvent(QMouseEvent* event) {
   if (!isPanning_) startDrag(event->position());
 }
 
+bool MapCanvas::placesByClicks() const {
+  return clicksOf(tool_).has_value();
+}
+
 // What is under the pointer is held from now on, where it can be dragged.
 void MapCanvas::startDrag(QPointF at) {
   const MapPoint place = frame_.toMap(at);
@@ -355,6 +359,7 @@ void MapCanvas::removeChosen() {
 void MapCanvas::contextMenuEvent(QContextMenuEvent* event) {
   if (editor_ == nullptr || grasp_) return;
   chooseAt(event->pos());
+  if (drawing_.hit(frame_, event->pos()).mark) return;
   QMenu menu(this);
   menu.addAction(tr("Whole map"), this, &MapCanvas::fit);
   if (drawing_.selection.feature) {

@@ -276,7 +276,7 @@ void MapDrawing::paintFeature(QPainter& painter, const MapFrame& frame, const Ma
     drawLine();
   }
   paintMarks(painter, feature, line, colour);
-  if (isLit) paintHandles(painter, onScreen(frame, *feature.points));
+  if (isLit) paintHandles(painter, frame, *feature.points);
 }
 
 // The marks of points and arrows, and the label.
@@ -330,12 +330,15 @@ void MapDrawing::paintMarks(QPainter& painter, const MapFeature& feature, const 
 }
 
 // What can be grasped of the feature that is lit up; of a long one only a point that is chosen.
-void MapDrawing::paintHandles(QPainter& painter, const QPolygonF& line) const {
-  for (qsizetype i = 0; i < line.size(); ++i) {
-    const bool isChosen = selection.vertex == static_cast<std::size_t>(i);
+void MapDrawing::paintHandles(QPainter& painter, const MapFrame& frame,
+                              const std::vector<MapPoint>& points) const {
+  for (std::size_t i = 0; i < points.size(); ++i) {
+    const bool isChosen = selection.vertex == i;
+    if (points.size() > kLongLine && !isChosen) continue;
+    const QPointF point = frame.toScreen(points[i]);
     painter.setPen(QPen(Qt::black, 1));
     painter.setBrush(isChosen ? kLit : QColor(Qt::white));
-    painter.drawRect(QRectF(line[i].x() - 3.5, line[i].y() - 3.5, 7, 7));
+    painter.drawRect(QRectF(point.x() - 3.5, point.y() - 3.5, 7, 7));
   }
 }
 

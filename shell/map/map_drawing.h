@@ -69,7 +69,7 @@ class MapDrawing {
   void paintMarks(QPainter& painter, const MapFeature& feature, const QPolygonF& line,
                   const QColor& colour) const;
   void paintAdvice(QPainter& painter, const MapFrame& frame) const;
-  void paintHandles(QPainter& painter, const QPolygonF& line) const;
+  void paintHandles(QPainter& painter, const MapFrame& frame, const std::vector<MapPoint>& points) const;
 
   MapScene scene_;
   std::vector<Placed> placed_;

@@ -60,7 +60,7 @@ std::optional<float> TerrainStore::valueAt(const MapArea& area, GridPoint point)
       found == found_.end() || !found->second.grid ? nullptr : found->second.grid->opened();
   if (grid == nullptr || point.j < 0 || point.k < 0) return std::nullopt;
   float value = 0;
-  if (!grid->read(static_cast<std::size_t>(point.k), static_cast<std::size_t>(point.j), {&value, 1}) ||
+  if (!grid->readAtOnce(static_cast<std::size_t>(point.k), static_cast<std::size_t>(point.j), value) ||
       value == grid->missing() || std::isnan(value))
     return std::nullopt;
   return value;

@@ -35,6 +35,13 @@ std::optional<TerrainRequest> TerrainWorker::next(const std::stop_token& stop) {
   return std::exchange(view_ ? view_ : base_, std::nullopt);
 }
 
+// Whether the view that is asked for now has other grids alone.
+bool TerrainWorker::isUnwanted(const TerrainGrid& grid) const {
+  const std::lock_guard lock(mutex_);
+  return view_ && std::ranges::none_of(
+                      view_->areas, [&grid](const TerrainArea& area) { return area.values.get() == &grid; });
+}
+
 void TerrainWorker::deliver(TerrainPicture picture) {
   {
     const std::lock_guard lock(mutex_);
@@ -68,7 +75,8 @@ bool TerrainWorker::openGrids(const TerrainRequest& request, const std::function
       if (auto picture = paintTerrain(request, kCoarse, isStopped)) deliver(*std::move(picture));
       timer.restart();
     }
-    grid->open(isStopped);
+    // Another setup's map does not wait for it.
+    grid->open([&] { return isStopped() || isUnwanted(*grid); });
     if (isStopped()) return false;
   }
   return true;

@@ -28,6 +28,7 @@ class TerrainWorker final : public QObject {
  private:
   void work(const std::stop_token& stop);
   bool openGrids(const TerrainRequest& request, const std::function<bool()>& isStopped);
+  bool isUnwanted(const TerrainGrid& grid) const;
   std::optional<TerrainRequest> next(const std::stop_token& stop);
   void deliver(TerrainPicture picture);
 
