@@ -29,7 +29,7 @@ Result<std::optional<GridPoint>> given(const Options& options) {
 
 // A distance to the centimetre.
 std::string metres(double distance) {
-  return fmt::format("{:.4g} m", std::round(distance * 100) / 100);
+  return fmt::format("{} m", std::round(distance * 100) / 100);
 }
 
 std::string placeText(const CBathymetryObjectKvs& area, int number) {

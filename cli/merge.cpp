@@ -8,6 +8,7 @@
 
 #include "cli/commands.h"
 #include "compare/setup_merge.h"
+#include "platform/files/may_write.h"
 
 namespace gridbay::cli {
 namespace {
@@ -67,8 +68,8 @@ unsigned tellFaults(SetupFile& result, const Console& console) {
 }
 
 int merge(const Options& options, const Console& console) {
-  if (!options.force && std::filesystem::exists(options.out))
-    return console.fail(fmt::format("{} exists; --force replaces it", options.out));
+  if (const Outcome may = mayWrite(options.out, options.force, {}, "--force"); !may)
+    return console.fail(may.error());
   ConsoleMessageHost host(console);
   Result<SetupOnDisk> base = open(options.base, options, host);
   if (!base) return console.fail(base.error());

@@ -33,10 +33,7 @@ class DocumentComparison final : public SetupComparison {
     close();
     other_ = std::make_unique<SetupFile>(std::move(*opened));
     otherPath_ = path;
-    // What the document's file holds beside the model.
-    own_.reset();
-    if (Result<SetupFile> own = SetupFile::open(document_.path(), nullptr); own && !document_.path().empty())
-      own_ = std::make_unique<SetupFile>(std::move(*own));
+    readOwn();
     return {};
   }
   void close() override {
@@ -107,6 +104,7 @@ class DocumentComparison final : public SetupComparison {
     if (!baseSetup) return baseSetup.error();
     Result<SetupFile> otherSetup = SetupFile::open(other, nullptr);
     if (!otherSetup) return otherSetup.error();
+    readOwn();
     const std::string& path = document_.path();
     mergeBase_ = baseSetup->tree(path);
     mergeOther_ = otherSetup->tree(path);
@@ -134,6 +132,14 @@ class DocumentComparison final : public SetupComparison {
     std::string path;
     bool operator==(const Look&) const = default;
   };
+
+  // What the document's file holds beside the model.
+  void readOwn() {
+    own_.reset();
+    if (document_.path().empty()) return;
+    if (Result<SetupFile> own = SetupFile::open(document_.path(), nullptr))
+      own_ = std::make_unique<SetupFile>(std::move(*own));
+  }
 
   KvsHandle treeOf(CGlobalKvs& root) const {
     // A save may leave out what can't be written, of a copy only. The engine's options are in no model.

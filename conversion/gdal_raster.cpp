@@ -93,6 +93,8 @@ class GdalRaster final : public Raster {
     return text == nullptr ? "" : text;
   }
   std::optional<double> missingValue() const override { return missing_; }
+  // What is worked out takes a while for each point.
+  std::size_t pointsAtOnce() const override { return std::size_t{1} << (source_ ? 16 : 20); }
 
   bool read(int firstRow, std::span<float> values, std::string* error) override {
     const int count = static_cast<int>(values.size() / static_cast<std::size_t>(columns()));

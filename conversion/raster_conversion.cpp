@@ -114,8 +114,7 @@ Result<Target> define(const RasterConversion& options, const Raster& raster, con
   const std::string projection = isOwn ? raster.projection() : options.crs;
   const CVdMapProjection map(projection);
   if (!map.IsValid()) return Failure{fmt::format("\"{}\" is no projection that is known here", projection)};
-  if (const auto mapping = gridMappingOf(map.Wkt2()); mapping && mapping->name == kGeographicMapping)
-    return Failure{fmt::format("\"{}\" is in degrees: a grid wants a projection in metres", map.Name())};
+  if (Outcome metres = checkMetres(map); !metres) return Failure{metres.error()};
 
   const std::array<double, 2> first = layout.at(chosen.firstJ, chosen.firstK);
   Target target{{}, options.originX.value_or(first[0]), options.originY.value_or(first[1])};

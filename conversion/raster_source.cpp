@@ -71,8 +71,7 @@ Result<std::string> projectionInMetres(const std::string& text) {
   const CVdMapProjection map(text);
   if (!map.IsValid() || map.IsLocal())
     return Failure{fmt::format("\"{}\" is no projection that is known here", text)};
-  if (const auto mapping = gridMappingOf(map.Wkt2()); mapping && mapping->name == kGeographicMapping)
-    return Failure{fmt::format("\"{}\" is in degrees: a grid wants a projection in metres", map.Name())};
+  if (Outcome metres = checkMetres(map); !metres) return Failure{metres.error()};
   return map.Wkt2();
 }
 
@@ -180,6 +179,15 @@ Result<std::unique_ptr<Raster>> griddedPoints(const RasterConversion& options, C
 }
 
 }  // namespace
+
+Outcome checkMetres(const CVdMapProjection& projection) {
+  const std::string wanted = "a grid wants a projection in metres";
+  if (const auto mapping = gridMappingOf(projection.Wkt2()); mapping && mapping->name == kGeographicMapping)
+    return Failure{fmt::format("\"{}\" is in degrees: {}", projection.Name(), wanted)};
+  if (const double metres = projection.MetresPerUnit(); std::abs(metres - 1) > 1e-9)
+    return Failure{fmt::format("\"{}\" has a unit of {:.6g} m: {}", projection.Name(), metres, wanted)};
+  return {};
+}
 
 Result<RasterSource> openRasterSource(const RasterConversion& options, ConversionHost& host,
                                       bool guessSpacing) {

@@ -5,6 +5,7 @@
 #include "conversion/conversion_host.h"
 #include "conversion/raster.h"
 #include "conversion/raster_conversion.h"
+#include "platform/cartography/cartography.h"
 #include "platform/result.h"
 
 namespace gridbay {
@@ -14,6 +15,9 @@ struct RasterSource {
   std::unique_ptr<Raster> raster;
   bool isOfPoints = false;
 };
+
+// An error where a unit of the projection is none of a metre.
+Outcome checkMetres(const CVdMapProjection& projection);
 
 // Opens what the options name, and chooses what they ask for; the host is told what else there would be.
 // Points that are given no spacing have one by their mean distance where `guessSpacing`, else they are an

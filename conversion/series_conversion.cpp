@@ -19,6 +19,12 @@ namespace {
 
 using Role = TableColumn::Role;
 
+// The first that a line has; a blank where it has none.
+char separatorIn(std::string_view line) {
+  const std::size_t found = line.find_first_of(",;\t");
+  return found == line.npos ? ' ' : line[found];
+}
+
 // Times and values with nothing else: the first line of values tells how many, and the heading names them.
 TableForm plainForm(std::string_view text, const SeriesConversion& options) {
   TableForm form;
@@ -36,12 +42,11 @@ TableForm plainForm(std::string_view text, const SeriesConversion& options) {
       continue;
     }
     if (isBlankLine(line)) continue;
-    const std::size_t found = line.find_first_of(",;\t");
-    form.separator = found == line.npos ? ' ' : line[found];
+    form.separator = separatorIn(line);
     form.columns.resize(tableFields(line, form.separator).size());
     break;
   }
-  const std::vector<std::string_view> names = tableFields(heading, form.separator, 2);
+  const std::vector<std::string_view> names = tableFields(heading, separatorIn(heading), 2);
   for (std::size_t i = 0; i < form.columns.size(); ++i) {
     form.columns[i].role = i == 0 ? Role::time : Role::item;
     if (names.size() == form.columns.size()) form.columns[i].name = names[i];
@@ -59,6 +64,7 @@ Result<TableForm> recognisedForm(std::string_view text, const SeriesConversion& 
                                host.option("start"))};
   }
   if (options.dateOrder) guess.form.dateOrder = *options.dateOrder;
+  if (!options.dateOrder && !guess.dateOrderDoubt.empty()) guess.doubts.push_back(guess.dateOrderDoubt);
   for (const std::string& doubt : guess.doubts) host.note(doubt);
   return guess.form;
 }

@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <limits>
 #include <map>
 #include <optional>
 
@@ -62,7 +63,7 @@ class Guesser {
     guessItems();
   }
 
-  TableGuess result() { return {std::move(form_), std::move(doubts_)}; }
+  TableGuess result() { return {std::move(form_), std::move(doubts_), std::move(dateOrderDoubt_)}; }
 
  private:
   // The later ones of the first lines, where no heading stands any more.
@@ -256,6 +257,9 @@ class Guesser {
     std::string example;
     int highestFirst = 0;
     int highestSecond = 0;
+    int highestThird = 0;
+    int leastFirst = std::numeric_limits<int>::max();
+    int leastThird = leastFirst;
     bool hasOffset = false;
     eachRow([&](const std::vector<std::string_view>& fields) {
       const std::optional<WrittenDate> date = writtenDate(fields[column]);
@@ -266,6 +270,9 @@ class Guesser {
       if (!open) open = date;
       highestFirst = std::max(highestFirst, date->parts[0]);
       highestSecond = std::max(highestSecond, date->parts[1]);
+      highestThird = std::max(highestThird, date->parts[2]);
+      leastFirst = std::min(leastFirst, date->parts[0]);
+      leastThird = std::min(leastThird, date->parts[2]);
       return true;
     });
     if (hasOffset)
@@ -276,13 +283,23 @@ class Guesser {
     constexpr int kDays = 31;
     if (highestFirst > kDays) return;  // a year of two digits
     form_.dateOrder = highestSecond > kMonths ? DateOrder::monthDayYear : DateOrder::dayMonthYear;
+    // With years of two digits the last part may be the day.
+    if (highestThird <= kDays && highestSecond <= kMonths && open->separator == '-' &&
+        rises(column, DateOrder::yearMonthDay)) {
+      const bool isYearFirst = !rises(column, DateOrder::dayMonthYear) ||
+                               (leastFirst == highestFirst && leastThird < highestThird);
+      if (isYearFirst) form_.dateOrder = DateOrder::yearMonthDay;
+      dateOrderDoubt_ = fmt::format("Dates such as \"{}\" may have the year first or last: the {} is meant",
+                                    example, isYearFirst ? "first" : "last");
+      return;
+    }
     if (highestFirst > kMonths || highestSecond > kMonths) return;
     const bool risesByDay = rises(column, DateOrder::dayMonthYear);
     const bool risesByMonth = rises(column, DateOrder::monthDayYear);
     if (risesByMonth && !risesByDay) form_.dateOrder = DateOrder::monthDayYear;
     if (risesByMonth != risesByDay || open->separator == '.') return;
-    doubts_.push_back(fmt::format(
-        "Dates such as \"{}\" may be day/month/year or month/day/year: the first is meant", example));
+    dateOrderDoubt_ = fmt::format(
+        "Dates such as \"{}\" may be day/month/year or month/day/year: the first is meant", example);
   }
 
   bool rises(std::size_t column, DateOrder order) const {
@@ -330,6 +347,7 @@ class Guesser {
 
   TableForm form_;
   std::vector<std::string> doubts_;
+  std::string dateOrderDoubt_;
   std::vector<std::string_view> lines_;
   std::vector<std::string_view> sample_;
   std::vector<Kind> kinds_;

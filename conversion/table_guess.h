@@ -12,6 +12,7 @@ namespace gridbay {
 struct TableGuess {
   TableForm form;  // with no columns where the text is no table
   std::vector<std::string> doubts;
+  std::string dateOrderDoubt;  // one more, for who has not told the order of dates; empty for none
 };
 
 // Looks at the first lines for separator, headings, names, units and item types; at all of them for the order

@@ -144,9 +144,29 @@ std::vector<std::string_view> tableFields(std::string_view line, char separator,
   return fields;
 }
 
+namespace {
+
+// "1.150", "-12.345.678"
+bool hasThousandsPoints(std::string_view text) {
+  if (text.starts_with('-') || text.starts_with('+')) text.remove_prefix(1);
+  std::size_t digits = 0;
+  std::size_t groups = 0;
+  for (const char c : text) {
+    const bool isPoint = c == '.';
+    if (!isPoint && (c < '0' || c > '9')) return false;
+    if (isPoint && (groups == 0 ? digits < 1 || digits > 3 : digits != 3)) return false;
+    digits = isPoint ? 0 : digits + 1;
+    if (isPoint) ++groups;
+  }
+  return groups > 0 && digits == 3 && text.front() != '0';
+}
+
+}  // namespace
+
 std::optional<double> tableNumber(std::string_view text, bool decimalComma) {
-  if (!decimalComma || text.find(',') == text.npos) return doubleOfText(text);
+  if (!decimalComma) return doubleOfText(text);
   // Points and blanks stand between thousands then.
+  if (text.find(',') == text.npos && !hasThousandsPoints(text)) return doubleOfText(text);
   if (text.rfind('.') != text.npos && text.rfind('.') > text.find(',')) return std::nullopt;
   std::string plain;
   for (const char c : text) {

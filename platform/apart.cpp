@@ -21,27 +21,8 @@ namespace {
 
 constexpr char kHolds = 'y';
 constexpr char kDoesNotHold = 'n';
-constexpr unsigned kWaiting = 20;                // times as long as computing
-constexpr rlim_t kMostMemory = rlim_t{2} << 30;  // beyond what the process has
-
-// So that whatever happens to the copy ends it at once, and leaves neither a word nor a file.
-void expectTheWorst() {
-  for (const int signal : {SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGABRT, SIGALRM, SIGXCPU, SIGTERM, SIGINT})
-    ::signal(signal, SIG_DFL);
-  sigset_t none;
-  sigemptyset(&none);
-  ::sigprocmask(SIG_SETMASK, &none, nullptr);
-  ::prctl(PR_SET_DUMPABLE, 0);
-  const int nowhere = ::open("/dev/null", O_WRONLY | O_CLOEXEC);
-  ::dup2(nowhere, STDOUT_FILENO);
-  ::dup2(nowhere, STDERR_FILENO);
-  rlim_t pages = 0;
-  if (std::ifstream("/proc/self/statm") >> pages) {
-    const rlim_t most = pages * static_cast<rlim_t>(::sysconf(_SC_PAGESIZE)) + kMostMemory;
-    const rlimit limit{most, most};
-    ::setrlimit(RLIMIT_AS, &limit);
-  }
-}
+constexpr unsigned kWaiting = 20;                          // times as long as computing
+constexpr std::size_t kMostMemory = std::size_t{2} << 30;  // beyond what the process has
 
 // From now on; the limit is in whole seconds.
 void allowSeconds(unsigned seconds) {
@@ -56,7 +37,7 @@ void allowSeconds(unsigned seconds) {
 
 [[noreturn]] void makeChecks(std::size_t count, const std::function<bool(std::size_t)>& check,
                              unsigned seconds, const FileDescriptor& answers) {
-  expectTheWorst();
+  expectTheWorst(kMostMemory);
   try {
     for (std::size_t i = 0; i < count; ++i) {
       allowSeconds(seconds);
@@ -85,6 +66,25 @@ std::vector<bool> makeHere(std::size_t count, const std::function<bool(std::size
 }
 
 }  // namespace
+
+void expectTheWorst(std::size_t mostMemory) {
+  for (const int signal :
+       {SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGABRT, SIGALRM, SIGXCPU, SIGTERM, SIGINT, SIGHUP})
+    ::signal(signal, SIG_DFL);
+  sigset_t none;
+  sigemptyset(&none);
+  ::sigprocmask(SIG_SETMASK, &none, nullptr);
+  ::prctl(PR_SET_DUMPABLE, 0);
+  const int nowhere = ::open("/dev/null", O_WRONLY | O_CLOEXEC);
+  ::dup2(nowhere, STDOUT_FILENO);
+  ::dup2(nowhere, STDERR_FILENO);
+  rlim_t pages = 0;
+  if (std::ifstream("/proc/self/statm") >> pages) {
+    const rlim_t most = pages * static_cast<rlim_t>(::sysconf(_SC_PAGESIZE)) + mostMemory;
+    const rlimit limit{most, most};
+    ::setrlimit(RLIMIT_AS, &limit);
+  }
+}
 
 std::vector<bool> holdApart(std::size_t count, const std::function<bool(std::size_t)>& check,
                             unsigned seconds) {

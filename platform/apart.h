@@ -16,4 +16,8 @@ std::vector<bool> holdApart(std::size_t count, const std::function<bool(std::siz
 // The same for one check.
 bool holdsApart(const std::function<bool()>& check, unsigned seconds);
 
+// For a copy of this process that reads what may harm: whatever happens ends it at once, and it leaves
+// neither a word nor a file. It may take so many bytes beyond what the process has.
+void expectTheWorst(std::size_t mostMemory);
+
 }  // namespace gridbay

@@ -1,7 +1,6 @@
 #include "platform/work_apart.h"
 
 #include <poll.h>
-#include <sys/prctl.h>
 #include <sys/socket.h>
 #include <sys/wait.h>
 
@@ -14,6 +13,8 @@
 #include <cstring>
 #include <thread>
 #include <utility>
+
+#include "platform/apart.h"
 
 namespace gridbay {
 namespace {
@@ -45,12 +46,8 @@ bool isWanted(int line) {
 }
 
 [[noreturn]] void workFor(const WorkApart::Work& work, int line) {
-  for (const int signal : {SIGTERM, SIGINT, SIGHUP, SIGSEGV, SIGBUS, SIGFPE, SIGABRT})
-    ::signal(signal, SIG_DFL);
-  sigset_t none;
-  sigemptyset(&none);
-  ::sigprocmask(SIG_SETMASK, &none, nullptr);
-  ::prctl(PR_SET_DUMPABLE, 0);
+  constexpr std::size_t kMostMemory = std::size_t{8} << 30;
+  expectTheWorst(kMostMemory);
   try {
     constexpr double kWorthTelling = 0.002;
     double told = 0;
@@ -70,7 +67,7 @@ bool isWanted(int line) {
 
 }  // namespace
 
-Result<WorkApart> WorkApart::begin(const Work& work) {
+Result<WorkApart> WorkApart::begin(const Work& work, bool writes) {
   std::array<int, 2> ends{};
   if (::socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, ends.data()) != 0)
     return Failure{systemError("cannot start", "work beside this")};
@@ -82,12 +79,13 @@ Result<WorkApart> WorkApart::begin(const Work& work) {
     ::close(here.release());
     workFor(work, there.get());
   }
-  return WorkApart(std::move(here), process);
+  return WorkApart(std::move(here), process, writes);
 }
 
 WorkApart::WorkApart(WorkApart&& other) noexcept
     : line_(std::move(other.line_)),
       process_(std::exchange(other.process_, -1)),
+      writes_(other.writes_),
       read_(std::move(other.read_)),
       done_(other.done_),
       text_(std::move(other.text_)) {}
@@ -95,6 +93,7 @@ WorkApart::WorkApart(WorkApart&& other) noexcept
 WorkApart::~WorkApart() {
   if (process_ < 0) return;
   stop();
+  if (!writes_) ::kill(process_, SIGKILL);
   using namespace std::chrono_literals;
   const auto end = std::chrono::steady_clock::now() + 2s;
   while (::waitpid(process_, nullptr, WNOHANG) == 0) {

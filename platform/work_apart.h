@@ -20,8 +20,9 @@ class WorkApart {
   using Progress = std::function<bool(double done)>;
   using Work = std::function<std::string(const Progress& progress)>;
 
-  // Fails where no copy can be made. To be called by the one thread that uses the libraries.
-  static Result<WorkApart> begin(const Work& work);
+  // Fails where no copy can be made. To be called by the one thread that uses the libraries, or while others
+  // have a NoCopyNow. Work that writes nothing is ended at once when it is to stop.
+  static Result<WorkApart> begin(const Work& work, bool writes = true);
 
   WorkApart(WorkApart&& other) noexcept;
   WorkApart& operator=(WorkApart&&) = delete;
@@ -39,10 +40,12 @@ class WorkApart {
   void stop();
 
  private:
-  WorkApart(FileDescriptor line, pid_t process) : line_(std::move(line)), process_(process) {}
+  WorkApart(FileDescriptor line, pid_t process, bool writes)
+      : line_(std::move(line)), process_(process), writes_(writes) {}
 
   FileDescriptor line_;
   pid_t process_;
+  bool writes_;
   std::string read_;  // and not understood yet
   double done_ = 0;
   std::optional<std::string> text_;

@@ -28,9 +28,9 @@ void MainWindow::useBathymetry(DocumentTab& tab, int area, const QString& map) {
   tabs_->setCurrentWidget(&tab);
   tab.commit();
   GridModel* areas = areasOf(tab);
-  if (areas == nullptr) return;
-  const QModelIndex cell = areas->index(area - 1, kAreasFileColumn - 1);
-  if (cell.isValid()) areas->setData(cell, map, Qt::EditRole);
+  const QModelIndex cell = areas == nullptr ? QModelIndex() : areas->index(area - 1, kAreasFileColumn - 1);
+  if (!cell.isValid() || !areas->setData(cell, map, Qt::EditRole))
+    tell(tr("%1 can't be taken as area %2 of %3.").arg(map).arg(area).arg(tab.name()));
 }
 
 void MainWindow::importTerrain() {

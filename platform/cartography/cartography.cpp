@@ -67,6 +67,21 @@ bool CVdMapProjection::IsLocal(std::string_view text) {
 bool CVdMapProjection::IsLocal() const {
   return IsLocal(state_->text);
 }
+double CVdMapProjection::MetresPerUnit() const {
+  PJ_CONTEXT* context = state_->context.get();
+  if (!state_->crs) return 1;
+  // Of what has heights too, the part on the map.
+  const proj::Object part(proj_get_type(state_->crs.get()) == PJ_TYPE_COMPOUND_CRS
+                              ? proj_crs_get_sub_crs(context, state_->crs.get(), 0)
+                              : nullptr);
+  const proj::Object axes(proj_crs_get_coordinate_system(context, part ? part.get() : state_->crs.get()));
+  double factor = 1;
+  if (!axes || proj_cs_get_axis_info(context, axes.get(), 0, nullptr, nullptr, nullptr, &factor, nullptr,
+                                     nullptr, nullptr) == 0)
+    return 1;
+  return factor;
+}
+
 bool CVdMapProjection::IsValid() const {
   return IsLocal() || state_->crs != nullptr;
 }

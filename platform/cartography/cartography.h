@@ -20,6 +20,8 @@ class CVdMapProjection {
 
   // Whether the text names a projection; a local one does.
   bool IsValid() const;
+  // Of its easting and northing; 1 for local coordinates, and where nothing is said.
+  double MetresPerUnit() const;
   static bool IsLocal(std::string_view text);
   bool IsLocal() const;
   // A short name for people, as "WGS 84 / UTM zone 32N".

@@ -8,6 +8,7 @@
 #include <cmath>
 #include <optional>
 
+#include "platform/no_copy_now.h"
 #include "platform/tsb/netcdf_names.h"
 #include "platform/tsb/tsb_file.h"
 
@@ -188,6 +189,7 @@ Result<StoredGrid> StoredGrid::open(const Source& source, const std::function<bo
   if (!descriptor) return Failure{systemError("cannot open", source.path)};
   StoredGrid grid(std::move(descriptor), source);
   std::string fault;
+  std::optional<NoCopyNow> whileItIsOpened(std::in_place);
   H5E_BEGIN_TRY {
     const Handle file = openFile(source.path);
     const Handle dataset(file ? openItem(file.get(), source.item) : -1, H5Dclose);
@@ -207,6 +209,7 @@ Result<StoredGrid> StoredGrid::open(const Source& source, const std::function<bo
     }
   }
   H5E_END_TRY
+  whileItIsOpened.reset();
   if (!fault.empty()) return cannotShow(source.path, fault);
   if (grid.packed_) {
     if (const Outcome made = grid.makeOverview(isCancelled); !made)

@@ -1,5 +1,6 @@
 #include "shell/compare/tab_comparison.h"
 
+#include <QElapsedTimer>
 #include <QFileInfo>
 #include <QScrollBar>
 #include <algorithm>
@@ -49,16 +50,19 @@ TabComparison::TabComparison(DocumentTab& tab) : QObject(&tab), tab_(tab), pane_
     pane_->clear();
     disconnect(&tab_, nullptr, this, nullptr);
   });
-  const auto follow = [this](QScrollBar* from, QScrollBar* to) {
-    connect(from, &QScrollBar::valueChanged, this, [this, to](int value) {
+  scrollTogether(tab.pane().verticalScrollBar(), pane_->verticalScrollBar());
+}
+
+// A shorter one does not hold the other back.
+void TabComparison::scrollTogether(QScrollBar* a, QScrollBar* b) {
+  for (const auto& [from, to] : {std::pair(a, b), std::pair(b, a)}) {
+    connect(from, &QScrollBar::valueChanged, to, [this, other = to](int value) {
       if (isScrolling_) return;
       isScrolling_ = true;
-      to->setValue(value);
+      other->setValue(value);
       isScrolling_ = false;
     });
-  };
-  follow(tab.pane().verticalScrollBar(), pane_->verticalScrollBar());
-  follow(pane_->verticalScrollBar(), tab.pane().verticalScrollBar());
+  }
 }
 
 TabComparison::~TabComparison() = default;
@@ -86,7 +90,11 @@ QString TabComparison::otherName() const {
 
 void TabComparison::refresh() {
   timer_.stop();
+  QElapsedTimer took;
+  took.start();
   std::vector<Difference> found = comparison().differences();
+  // Of large setups it takes a while: then it waits until nothing has been edited for longer.
+  timer_.setInterval(std::max(kDelay, 10 * static_cast<int>(took.elapsed())));
   if (current_ >= 0 && (current_ >= static_cast<int>(found.size()) ||
                         found[static_cast<std::size_t>(current_)].thing !=
                             differences_[static_cast<std::size_t>(current_)].thing))
@@ -121,8 +129,7 @@ void TabComparison::joinScrolling() {
     GridView* other = pane_->tableAt(n);
     for (const auto bar :
          {&QAbstractScrollArea::verticalScrollBar, &QAbstractScrollArea::horizontalScrollBar}) {
-      connect((own->*bar)(), &QScrollBar::valueChanged, (other->*bar)(), &QScrollBar::setValue);
-      connect((other->*bar)(), &QScrollBar::valueChanged, (own->*bar)(), &QScrollBar::setValue);
+      scrollTogether((own->*bar)(), (other->*bar)());
     }
   }
 }

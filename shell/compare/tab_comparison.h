@@ -55,6 +55,7 @@ class TabComparison final : public QObject {
   void markPage();
   void markTree();
   void joinScrolling();
+  void scrollTogether(QScrollBar* a, QScrollBar* b);
   void take(const std::function<std::string(SetupComparison&)>& act);
   SetupComparison& comparison() { return tab_.editor().comparison(); }
 

@@ -4,9 +4,9 @@
 
 namespace gridbay::shell {
 
-void BackgroundWork::begin(const WorkApart::Work& work) {
+void BackgroundWork::begin(const WorkApart::Work& work, bool writes) {
   stop();
-  Result<WorkApart> begun = WorkApart::begin(work);
+  Result<WorkApart> begun = WorkApart::begin(work, writes);
   if (!begun) {
     QMetaObject::invokeMethod(
         this, [this] { emit ended(std::nullopt); }, Qt::QueuedConnection);

@@ -16,7 +16,7 @@ class BackgroundWork final : public QObject {
  public:
   explicit BackgroundWork(QObject* parent) : QObject(parent) {}
 
-  void begin(const WorkApart::Work& work);
+  void begin(const WorkApart::Work& work, bool writes);
   bool isRunning() const { return work_ != nullptr; }
   // Stops the work and waits for its end; what it would have told is not told any more.
   void stop();

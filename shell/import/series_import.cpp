@@ -119,6 +119,7 @@ SeriesImport::SeriesImport(std::optional<Period> period, QString folder, QWidget
   connect(import_, &QPushButton::clicked, this, &SeriesImport::importTable);
   connect(buttons, &QDialogButtonBox::rejected, this, &SeriesImport::reject);
   connect(columns_, &ColumnRows::changed, this, [this] {
+    isWanted_ = false;
     form_.columns = columns_->columns();
     rereading_.start();
   });
@@ -266,6 +267,7 @@ void SeriesImport::keyPressEvent(QKeyEvent* event) {
 }
 
 void SeriesImport::showTable(std::shared_ptr<const std::string> text, const QString& title) {
+  isWanted_ = false;
   text_ = std::move(text);
   title_ = title;
   sourceText_->setText(title);
@@ -280,6 +282,7 @@ void SeriesImport::takeGuess(TableGuess guess) {
   form_ = std::move(guess.form);
   QStringList doubts;
   for (const std::string& doubt : guess.doubts) doubts << textOf(doubt) + '.';
+  if (!guess.dateOrderDoubt.empty()) doubts << textOf(guess.dateOrderDoubt) + '.';
   doubts_->setText(doubts.join('\n'));
   doubts_->setVisible(!doubts.isEmpty());
   showForm();
@@ -323,6 +326,7 @@ void SeriesImport::orderTabs() {
 
 void SeriesImport::takeForm() {
   if (text_ == nullptr) return;
+  isWanted_ = false;
   form_.decimalComma = decimals_->currentIndex() == 1;
   form_.dateOrder = static_cast<DateOrder>(dates_->currentIndex());
   form_.start = start_->text().trimmed().toStdString();

@@ -195,10 +195,12 @@ void TerrainImport::read() {
   tell({}, false);
   if (form_->file().text().isEmpty()) return;
   enter(Stage::reading);
-  work_.begin([wanted = form_->preview()](const WorkApart::Progress& progress) {
-    FormConversion host(progress);
-    return packed(previewRaster(wanted, kMost, host));
-  });
+  work_.begin(
+      [wanted = form_->preview()](const WorkApart::Progress& progress) {
+        FormConversion host(progress);
+        return packed(previewRaster(wanted, kMost, host));
+      },
+      false);
 }
 
 void TerrainImport::takePreview(const std::optional<std::string>& bytes) {
@@ -283,10 +285,12 @@ void TerrainImport::startImport() {
   }
   enter(Stage::importing);
   tell(tr("Importing..."), false);
-  work_.begin([wanted](const WorkApart::Progress& progress) {
-    FormConversion host(progress);
-    return packed(convertRaster(wanted, host));
-  });
+  work_.begin(
+      [wanted](const WorkApart::Progress& progress) {
+        FormConversion host(progress);
+        return packed(convertRaster(wanted, host));
+      },
+      true);
 }
 
 void TerrainImport::takeImport(const std::optional<std::string>& bytes) {
@@ -309,6 +313,12 @@ void TerrainImport::cancel() {
   const bool wasImporting = stage_ == Stage::importing;
   work_.stop();
   delay_.stop();
+  if (!wasImporting) {  // what is seen is not what the form asks for
+    shown_.reset();
+    preview_->showPreview(nullptr, tr("The reading was stopped."));
+    histogram_->showHeights({});
+    summary_->clear();
+  }
   enter(Stage::ready);
   tell(wasImporting ? tr("The import was stopped; nothing is written.") : tr("The reading was stopped."),
        false);
@@ -323,6 +333,12 @@ void TerrainImport::keyPressEvent(QKeyEvent* event) {
   } else {
     QDialog::keyPressEvent(event);
   }
+}
+
+// Fields that lose the focus as they go have nobody to tell any more.
+TerrainImport::~TerrainImport() {
+  for (QObject* part : std::initializer_list<QObject*>{form_, preview_, histogram_})
+    disconnect(part, nullptr, this, nullptr);
 }
 
 void TerrainImport::done(int result) {

@@ -30,6 +30,7 @@ class TerrainImport final : public QDialog {
 
   // `uses` is asked for whenever a map has been made.
   TerrainImport(std::function<std::vector<Use>()> uses, QWidget* parent);
+  ~TerrainImport() override;
 
   TerrainForm& form() { return *form_; }
   TerrainPreview& preview() { return *preview_; }

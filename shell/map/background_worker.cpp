@@ -3,6 +3,7 @@
 #include <QPainter>
 #include <utility>
 
+#include "platform/no_copy_now.h"
 #include "shell/map/map_drawing.h"
 
 namespace gridbay::shell {
@@ -131,6 +132,7 @@ void BackgroundWorker::work(const std::stop_token& stop) {
     });
     for (const BackgroundSource& source : request->sources) {
       if (isOutOfDate()) break;
+      const NoCopyNow whileItIsRead;
       Opened* opened = openedOf(source.path, request->projection, isStopped);
       if (opened == nullptr) return;
       BackgroundPicture picture{source.id, {}, request->frame, true, opened->fault, {}};

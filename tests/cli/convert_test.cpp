@@ -111,6 +111,9 @@ TEST_F(ConvertRaster, WhatCannotBeDone) {
               HasSubstr("\"nonsense\" is no projection that is known"));
   EXPECT_THAT(refused({raster, out, "--land", "1", "--crs", "EPSG:4326"}),
               HasSubstr("\"WGS 84\" is in degrees: a grid wants a projection in metres"));
+  for (const char* option : {"--crs", "--reproject"})
+    EXPECT_THAT(refused({raster, out, "--land", "1", option, "EPSG:2263"}),
+                HasSubstr("has a unit of 0.304801 m: a grid wants a projection in metres"));
   EXPECT_THAT(refused({raster, out, "--land", "1", "--item-type", "7"}),
               HasSubstr("There is no item type 7"));
   for (const char* land : {"nan", "inf", "-0.1", "1e39", "high"})
@@ -345,7 +348,7 @@ TEST_F(ConvertRaster, RastersInAFileAreListedAndChosen) {
   EXPECT_THAT(errors, HasSubstr("depth"));
   EXPECT_THAT(errors, HasSubstr(":speed)\n"));
   EXPECT_THAT(errors, Not(HasSubstr("no raster band")));
-  EXPECT_THAT(refused({folder.file("gone.asc"), out, "--land", "60"}), HasSubstr("does not exist"));
+  EXPECT_THAT(refused({folder.file("gone.asc"), out, "--land", "60"}), HasSubstr("No such file"));
   ASSERT_EQ(runTool({"convert", "raster", file, out, "--land", "60", "--subdataset", "2"}).status, 0);
   EXPECT_EQ(values(9)[4], 2);
   ASSERT_EQ(

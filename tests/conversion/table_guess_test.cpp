@@ -220,11 +220,12 @@ TEST(TableGuess, RecognisesManyForms) {
   };
   for (const Case& it : cases) {
     SCOPED_TRACE(it.name);
-    const auto [form, doubts] = guessTable(it.text);
+    const auto [form, doubts, dateDoubt] = guessTable(it.text);
     EXPECT_EQ(form.separator, it.separator);
     EXPECT_EQ(form.decimalComma, it.decimalComma);
     EXPECT_EQ(form.headerLines, it.headerLines);
-    EXPECT_EQ(doubts.size(), it.doubts) << ::testing::PrintToString(doubts);
+    EXPECT_EQ(doubts.size() + (dateDoubt.empty() ? 0U : 1U), it.doubts)
+        << ::testing::PrintToString(doubts) << dateDoubt;
     const Result<SeriesTable> table = readSeriesTable(it.text, form);
     ASSERT_TRUE(table) << table.error();
     EXPECT_EQ(table->faultCount, 0U) << table->faults.front().why;
@@ -242,10 +243,11 @@ TEST(TableGuess, RecognisesManyForms) {
 TEST(TableGuess, TimesThatAreNumbersNeedAStart) {
   for (const auto& [heading, unit] : std::vector<std::pair<std::string, std::string>>{
            {"time [h]", "h"}, {"Minutes", "min"}, {"t (sec)", "s"}, {"days", "d"}}) {
-    auto [form, doubts] = guessTable(heading + ",Q\n0,1\n1,2\n2,4\n");
+    auto [form, doubts, dateDoubt] = guessTable(heading + ",Q\n0,1\n1,2\n2,4\n");
     EXPECT_EQ(form.columns[0].role, Role::time) << heading;
     EXPECT_EQ(form.timeUnit, unit) << heading;
     EXPECT_THAT(doubts, ElementsAre("The table does not tell the moment of time 0"));
+    EXPECT_EQ(dateDoubt, "");
     EXPECT_EQ(faultOf(form), "\"\" is no moment of the form YYYY-MM-DD hh:mm:ss");
     form.start = "2020-01-01 00:00:00";
     EXPECT_EQ(faultOf(form), "");
@@ -256,9 +258,13 @@ TEST(TableGuess, TimesThatAreNumbersNeedAStart) {
 }
 
 TEST(TableGuess, WhatIsAmbiguousIsSaid) {
-  EXPECT_THAT(
-      guessTable("d,Q\n1/2/2020,1\n2/2/2020,2\n").doubts,
-      ElementsAre("Dates such as \"1/2/2020\" may be day/month/year or month/day/year: the first is meant"));
+  EXPECT_EQ(guessTable("d,Q\n1/2/2020,1\n2/2/2020,2\n").dateOrderDoubt,
+            "Dates such as \"1/2/2020\" may be day/month/year or month/day/year: the first is meant");
+  const TableGuess guess = guessTable("d,Q\n20-01-01,1\n20-01-02,2\n20-01-03,3\n");
+  EXPECT_EQ(guess.form.dateOrder, DateOrder::yearMonthDay);
+  EXPECT_EQ(guess.dateOrderDoubt,
+            "Dates such as \"20-01-01\" may have the year first or last: the first is meant");
+  EXPECT_EQ(guessTable("d,Q\n01-02-20,1\n02-02-20,2\n").form.dateOrder, DateOrder::dayMonthYear);
   EXPECT_THAT(guessTable("d;Q\n2020-01-01;1,250\n2020-01-02;2,500\n").doubts,
               ElementsAre("The comma in \"1,250\" may part thousands; it is taken for the decimal one"));
   EXPECT_THAT(guessTable("d,Q\n2020-01-01,-9999\n2020-01-02,-9999\n2020-01-03,1\n").doubts,
@@ -269,6 +275,15 @@ TEST(TableGuess, WhatIsAmbiguousIsSaid) {
               ElementsAre("No column of times was found: say which one holds them"));
   EXPECT_THAT(guessTable("t,Q\n43831,1\n43832,2\n").doubts,
               ElementsAre("\"t\" is taken for days since 1899-12-30, as spreadsheets count"));
+}
+
+TEST(TableNumber, PointsBetweenThousands) {
+  EXPECT_EQ(tableNumber("1.150", true), 1150);
+  EXPECT_EQ(tableNumber("-12.345.678", true), -12345678);
+  EXPECT_EQ(tableNumber("1.050,5", true), 1050.5);
+  EXPECT_EQ(tableNumber("0.150", true), 0.15);
+  EXPECT_EQ(tableNumber("1.15", true), 1.15);
+  EXPECT_EQ(tableNumber("1.150", false), 1.15);
 }
 
 TEST(TableGuess, WhatIsKnownBeforeIsKept) {

@@ -247,6 +247,6 @@ def test_points_and_tables_that_tell_what_they_hold(tmp_path):
     assert gridbay_setup.open_data(tmp_path / "points.tsb2").read()[2, 1] == 4
     table = tmp_path / "table.csv"
     table.write_text("date;water level [m]\n01.02.2020 06:00;0,5\n01.02.2020 07:00;0,75\n")
-    assert gridbay_setup.convert_series(table, tmp_path / "table.tsb0", dates="dmy").items == 1
+    assert gridbay_setup.convert_series(table, tmp_path / "table.tsb0", dates="dmy").items == ["water level"]
     data = gridbay_setup.open_data(tmp_path / "table.tsb0")
     assert data.start == datetime.datetime(2020, 2, 1, 6) and data.items[0].name == "water level"

@@ -449,7 +449,7 @@ class GridViewTest : public QObject {
     const auto found = [&list] { return list()->findChild<ProjectionCompleter*>()->popup(); };
     // On this platform the window is not active again once a list has closed.
     const auto backToTheCell = [this] {
-      view_->goTo(0, GridOfAllKinds::kProjection - 1);
+      view_->goToCell(0, GridOfAllKinds::kProjection - 1);
       window_->activateWindow();
       view_->setFocus();
       QVERIFY(QTest::qWaitForWindowActive(window_));

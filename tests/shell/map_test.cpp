@@ -798,27 +798,27 @@ class MapTest : public DesktopFixture {
     canvas().refresh();
     // A column of the polygons' page, and the other way round.
     QVERIFY(tab().goToPage(kMassBudgets));
-    tab().pane().showCell(1, 2);
+    tab().pane().goTo({.entries = {{1}}, .column = 2});
     QVERIFY(canvas().drawing().selection.feature.has_value());
     QCOMPARE(canvas().drawing().selection.feature->number, 2);
-    tab().pane().showCell(1, 1);
+    tab().pane().goTo({.entries = {{1}}, .column = 1});
     QCOMPARE(canvas().drawing().selection.feature->number, 1);
     click(screenOf(1, 19, 5));
     QCOMPARE(tab().pane().currentCell().column, 2);
     // A corner, which is told without brackets, is picked on the map.
-    tab().pane().showCell(3, 2);
+    tab().pane().goTo({.entries = {{3}}, .column = 2});
     QVERIFY(tab().pane().pointCell().has_value());
     window_->map().startPick();
     click(screenOf(1, 16, 7));
     QCOMPARE(cell(3, 2), QString("16,7"));
     tab().undo();
     // A count is no point.
-    tab().pane().showCell(2, 2);
+    tab().pane().goTo({.entries = {{2}}, .column = 2});
     QVERIFY(!tab().pane().pointCell().has_value());
     // Pages that say more of sources, here those of the flow and of the module.
     for (const int page : {41, 24}) {
       QVERIFY(tab().goToPage(page));
-      tab().pane().focusOn({}, 1, 2, 2);
+      tab().pane().goTo({.entries = {{2, 2}}});
       QVERIFY(canvas().drawing().selection.feature.has_value());
       QCOMPARE(canvas().drawing().selection.feature->kind, MapKind::source);
       QCOMPARE(canvas().drawing().selection.feature->number, 2);
@@ -833,7 +833,7 @@ class MapTest : public DesktopFixture {
     QVERIFY(boundaries > 0);
     for (const int page : {29, 9}) {
       QVERIFY(tab().goToPage(page));
-      tab().pane().focusOn({}, 1, boundaries, boundaries);
+      tab().pane().goTo({.entries = {{boundaries, boundaries}}});
       QVERIFY(canvas().drawing().selection.feature.has_value());
       QCOMPARE(canvas().drawing().selection.feature->kind, MapKind::boundary);
       QCOMPARE(canvas().drawing().selection.feature->number, boundaries);

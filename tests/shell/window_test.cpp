@@ -529,6 +529,7 @@ class WindowTest final : public DesktopFixture {
     QVERIFY(line != nullptr);
     QCOMPARE(line->text(1), QString("Source and Sink"));
     QCOMPARE(line->text(2), QString("source 2"));
+    list.scrollToItem(line);
     QTest::mouseDClick(list.viewport(), Qt::LeftButton, {}, list.visualItemRect(line).center());
     QCOMPARE(tab().currentPage(), 40);
     auto* grid = tab().pane().findChild<GridView*>();

@@ -1,0 +1,23 @@
+#include "platform/no_copy_now.h"
+
+#include <pthread.h>
+
+namespace gridbay {
+namespace {
+
+std::recursive_mutex& librariesAtWork() {
+  static std::recursive_mutex mutex;
+  return mutex;
+}
+
+}  // namespace
+
+NoCopyNow::NoCopyNow() {
+  // For whoever makes the copy, of whatever program part.
+  [[maybe_unused]] static const int told =
+      ::pthread_atfork([] { librariesAtWork().lock(); }, [] { librariesAtWork().unlock(); },
+                       [] { librariesAtWork().unlock(); });
+  lock_ = std::unique_lock(librariesAtWork());
+}
+
+}  // namespace gridbay

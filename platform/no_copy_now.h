@@ -1,0 +1,17 @@
+#pragma once
+
+#include <mutex>
+
+namespace gridbay {
+
+// While a thread has one, no other one makes a copy of the process: what a library has locked by then would
+// stay locked in the copy for ever. For the work of libraries in threads of their own; a copy waits for it.
+class NoCopyNow {
+ public:
+  NoCopyNow();
+
+ private:
+  std::unique_lock<std::recursive_mutex> lock_;
+};
+
+}  // namespace gridbay
