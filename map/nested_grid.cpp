@@ -194,6 +194,11 @@ Outcome cutNestedGrid(const std::string& projection, const MapScene& scene, cons
   target.place = {{place.grid.first.east, place.grid.first.north},
                   {place.grid.stepJ.east, place.grid.stepJ.north},
                   {place.grid.stepK.east, place.grid.stepK.north}};
+  // A raster that names no projection, as texts of heights do, lies in that of the map.
+  if (!isGridFile && !isLocal) {
+    const Result<std::unique_ptr<Raster>> plain = openAnyRaster(raster, 0);
+    if (plain && (*plain)->projection().empty()) target.from = target.projection;
+  }
   const Result<std::unique_ptr<Raster>> source =
       isGridFile ? openTsbRaster(raster, 1) : openWarpedRaster(raster, 0, target);
   if (!source) return Failure{source.error()};

@@ -145,6 +145,10 @@ TEST_F(MapEdits, ANestedAreaIsCutFromARasterOfAnotherKind) {
   EXPECT_FLOAT_EQ(got[2], 7);
   EXPECT_FLOAT_EQ(got[5], -5);
   EXPECT_FLOAT_EQ(got[12], -5);
+  // The same where the file names no projection: it lies in that of the map.
+  document.Undo();
+  ASSERT_THAT(map->addNestedArea(at(12, 9), at(16, 12), plain, folder.file("plain.tsb2")), IsEmpty());
+  EXPECT_EQ(values(folder.file("plain.tsb2"), 13 * 10), got);
   // In another projection it is brought to that of Area 1, here with a turn of the grid as well.
   setFile(1, {.noJ = 20, .noK = 16, .geography = placeAt(500000, 6000000, 20)});
   const std::string other = folder.file("o.tif");

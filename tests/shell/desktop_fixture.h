@@ -27,11 +27,14 @@ class DesktopFixture : public QObject {
   }
 
  protected:
-  void makeFolder() {
+  void makeEmptyFolder() {
     folder_ = std::make_unique<QTemporaryDir>();
     QSettings::setDefaultFormat(QSettings::IniFormat);
     QSettings::setPath(QSettings::IniFormat, QSettings::UserScope, folder_->path());
     for (const char* home : {"XDG_DATA_HOME", "XDG_CONFIG_HOME"}) qputenv(home, folder_->path().toUtf8());
+  }
+  void makeFolder() {
+    makeEmptyFolder();
     run("make_estuary", {folder_->path()});
     for (const QString name : {"estuary", "inlet"})
       run("v27setup", {"convert", "raster", name + ".asc", name + ".tsb2", "--land", "5", "--crs", "UTM-32"});
@@ -40,6 +43,9 @@ class DesktopFixture : public QObject {
   void makeWindow() {
     QSettings().clear();
     run("v27setup", {"new", "s.v27", "--force", "--area", "estuary.tsb2", "--area", "inlet.tsb2@36,33"});
+    openWindow();
+  }
+  void openWindow() {
     window_ = std::make_unique<MainWindow>(libraries());
     window_->show();
     window_->activateWindow();

@@ -720,6 +720,31 @@ class MapTest : public DesktopFixture {
     QVERIFY(canvas().textAt(area(2).grid.at(30, 30)).contains(" m"));
   }
 
+  // For the eye, where a folder is named: a picture and depth lines as backgrounds.
+  void pictures() {
+    const QString folder = qEnvironmentVariable("GRIDBAY_PICTURES");
+    if (folder.isEmpty()) QSKIP("no folder is named");
+    write(file("colours.txt"), "-12 70 110 140\n-4 120 160 165\n0 205 200 160\n4 130 150 90\n12 95 120 70\n");
+    for (const QStringList& command :
+         {QStringList{"gdal_translate", "-q", "-a_srs", "EPSG:32632", file("estuary.asc"),
+                      file("heights.tif")},
+          {"gdaldem", "color-relief", "-q", file("heights.tif"), file("colours.txt"), file("chart.tif")},
+          {"gdal_contour", "-q", "-i", "2", file("heights.tif"), file("depths.geojson")}})
+      QCOMPARE(QProcess::execute(command.front(), command.mid(1)), 0);
+    for (const QString name : {"chart.tif", "depths.geojson"})
+      window_->map().panel().addBackground(file(name));
+    MapBackgrounds& backgrounds = canvas().backgrounds();
+    const int chart = backgrounds.all()[0].id;
+    backgrounds.move(chart, true);
+    backgrounds.setOpacity(chart, 0.6);
+    for (QAction* action : window_->map().tools().actions()) {
+      if (action->text() == "Layers") action->setChecked(true);
+    }
+    QCoreApplication::processEvents();
+    settle();
+    QVERIFY(window_->grab().save(folder + "/map-backgrounds.png"));
+  }
+
   void areasWithoutAPlaceAreTold() {
     run("v27setup", {"new", "w.v27", "--force", "--area", "estuary.tsb2", "--area", "inlet.tsb2@36,33"});
     QVERIFY(window_->openDocument(file("w.v27")) != nullptr);
