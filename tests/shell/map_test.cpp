@@ -733,6 +733,8 @@ class MapTest : public DesktopFixture {
       QCOMPARE(QProcess::execute(command.front(), command.mid(1)), 0);
     for (const QString name : {"chart.tif", "depths.geojson"})
       window_->map().panel().addBackground(file(name));
+    tab().goToPage(kAreas);
+    settle();
     MapBackgrounds& backgrounds = canvas().backgrounds();
     const int chart = backgrounds.all()[0].id;
     backgrounds.move(chart, true);

@@ -352,6 +352,9 @@ class TerrainImportTest : public DesktopFixture {
     const QString folder = qEnvironmentVariable("GRIDBAY_PICTURES");
     if (folder.isEmpty()) QSKIP("no folder is named");
     open("estuary.asc");
+    // Of no folder in particular.
+    QVERIFY(QDir::setCurrent(folder_->path()));
+    typeIn("file", "estuary.asc");
     typeIn("land", "2");
     TerrainPreview& picture = dialog().preview();
     const QRectF whole = dialog().form().window();
