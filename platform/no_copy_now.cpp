@@ -5,8 +5,9 @@
 namespace gridbay {
 namespace {
 
-std::recursive_mutex& librariesAtWork() {
-  static std::recursive_mutex mutex;
+// A plain one, which the copy may unlock too.
+std::mutex& librariesAtWork() {
+  static std::mutex mutex;
   return mutex;
 }
 

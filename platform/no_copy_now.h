@@ -11,7 +11,7 @@ class NoCopyNow {
   NoCopyNow();
 
  private:
-  std::unique_lock<std::recursive_mutex> lock_;
+  std::unique_lock<std::mutex> lock_;
 };
 
 }  // namespace gridbay

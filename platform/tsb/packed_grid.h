@@ -40,7 +40,8 @@ struct PackedLayout {
 class PackedGrid {
  public:
   static constexpr std::size_t kMostKept = std::size_t{1} << 24;  // values
-  // A piece must not have more values than are kept. A row of pieces may: while rows of them are read it stays.
+  // A piece must not have more values than are kept. A row of pieces may: while rows of them are read it
+  // stays.
   PackedGrid(FileDescriptor file, PackedLayout layout) : file_(std::move(file)), layout_(std::move(layout)) {}
 
   // Points of a row from a column on, which must be there. False where the file is damaged or gone.

@@ -3,12 +3,15 @@
 #include <gmock/gmock.h>
 #include <poll.h>
 
+#include <atomic>
 #include <chrono>
 #include <csignal>
 #include <filesystem>
 #include <fstream>
 #include <thread>
 
+#include "platform/apart.h"
+#include "platform/no_copy_now.h"
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay {
@@ -19,6 +22,21 @@ void waitForEnd(WorkApart& work) {
     pollfd line{work.descriptor(), POLLIN, 0};
     ASSERT_EQ(::poll(&line, 1, 10000), 1);
   } while (work.take());
+}
+
+TEST(NoCopyNow, ACopyWaitsForIt) {
+  std::atomic<bool> isHeld = false;
+  std::atomic<bool> isDone = false;
+  const std::jthread library([&] {
+    const NoCopyNow now;
+    isHeld = true;
+    std::this_thread::sleep_for(std::chrono::milliseconds(50));
+    isDone = true;
+  });
+  while (!isHeld) std::this_thread::yield();
+  EXPECT_TRUE(holdsApart([&] { return isDone.load(); }, 5));
+  // Copies of a copy are made as ever.
+  EXPECT_TRUE(holdsApart([] { return holdsApart([] { return true; }, 5); }, 5));
 }
 
 TEST(WorkApart, HandsBackATextAndTellsHowMuchIsDone) {
