@@ -29,8 +29,8 @@ class StoredGrid {
   // Errors are those of TsbFile, and: not two-dimensional, no such item.
   static Result<Source> find(const std::string& path, std::size_t item);
 
-  // What is packed in a way of its own, or in larger pieces than this, is read at once, and has no more points
-  // than this; what is packed as usual is read in parts.
+  // What is packed in a way of its own, or in larger pieces than this, is read at once, and has no more
+  // points than this; what is packed as usual is read in parts.
   static constexpr std::size_t kMostAtOnce = std::size_t{1} << 24;
   // A larger packed item gets an overview of at most about so many points.
   static constexpr std::size_t kOverviewPoints = std::size_t{1} << 22;

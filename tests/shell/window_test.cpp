@@ -530,7 +530,9 @@ class WindowTest final : public DesktopFixture {
     QCOMPARE(line->text(1), QString("Source and Sink"));
     QCOMPARE(line->text(2), QString("source 2"));
     list.scrollToItem(line);
-    QTest::mouseDClick(list.viewport(), Qt::LeftButton, {}, list.visualItemRect(line).center());
+    const QPoint place = list.visualItemRect(line).center();
+    QTest::mouseClick(list.viewport(), Qt::LeftButton, {}, place);
+    QTest::mouseDClick(list.viewport(), Qt::LeftButton, {}, place);
     QCOMPARE(tab().currentPage(), 40);
     auto* grid = tab().pane().findChild<GridView*>();
     QVERIFY(grid->hasFocus());
