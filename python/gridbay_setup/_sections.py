@@ -61,6 +61,13 @@ class Section:
     def __setitem__(self, path: str, value: Any) -> None:
         self._document.set(self._at(_checked(path)), value)
 
+    def __contains__(self, path: object) -> bool:
+        """Whether the model has a keyword or section of that path, from here."""
+        at = self._at(_checked(path))
+        return bool(self._document.has(at, False) or self._document.has(at, True))
+
+    __iter__ = None  # not a list: `paths` has all keywords
+
     def paths(self) -> list[str]:
         """The paths, from here, of all keywords that a save would write, in order."""
         skip = len(self._path) + 1 if self._path else 0
@@ -86,7 +93,7 @@ class Section:
         }
 
     def _unknown(self, name: str, verb: str) -> PathError:
-        names = [*self.fields(), *(n for n in dir(type(self)) if not n.startswith("_"))]
+        names = list(dict.fromkeys([*self.fields(), *(n for n in dir(type(self)) if not n.startswith("_"))]))
         near = difflib.get_close_matches(name, names, 3, 0.5)
         allowed = ", ".join(near or self.fields())
         where = self._path or "the setup"
@@ -341,6 +348,11 @@ class Items(Generic[S]):
             allowed = f"1 to {count}" if count else "none: the list is empty"
             raise RangeError(f"{path}: item {at} was given; allowed is {allowed}", path, str(at), allowed)
         return self._field.kind(self._section._document, item)
+
+    def __setitem__(self, number: int, item: object) -> None:
+        path = self._section._at(self._field.name.format(number))
+        raise WrongType(f"{path}: {item!r} ({type(item).__name__}) was given; allowed is to set what the item has, "
+                        "by its attributes", path, repr(item), "the attributes of the item")  # fmt: skip
 
     def __iter__(self) -> Iterator[S]:
         for number in range(1, len(self) + 1):

@@ -92,6 +92,9 @@ class Setup(Model):
 
     def same_as(self, other: Setup) -> bool:
         """Whether two setups of one edition are in the same exact state."""
+        if not isinstance(other, Setup):
+            raise WrongType(f"same_as(other): {other!r} ({type(other).__name__}) was given; allowed is a setup", "other",
+                            repr(other), "a setup")  # fmt: skip
         return self.kind == other.kind and bool(self._document.is_same(other._document))
 
     def detect_boundaries(self) -> int:
@@ -104,9 +107,9 @@ def _kind_of(path: str) -> str:
     return os.path.splitext(path)[1].lstrip(".").lower()
 
 
-def _edition_of(kind: str, given: str) -> ModuleType:
+def _edition_of(kind: str, given: str, form: str = "*.{}") -> ModuleType:
     if not isinstance(kind, str) or kind not in _EDITIONS:
-        allowed = " or ".join(f"*.{each}" for each in _EDITIONS)
+        allowed = " or ".join(form.format(each) for each in _EDITIONS)
         raise WrongValue(f"{given}: {kind!r} was given; allowed is {allowed}", str(given), repr(kind), allowed)
     return _EDITIONS[kind]
 
@@ -131,7 +134,7 @@ def new(
     which is the area before it otherwise. With areas, open boundaries and projection follow from the first one.
     start: of the simulation; time_step: s; time_steps: how many.
     """
-    setup = Setup(_edition_of(kind, kind).Document(), "")
+    setup = Setup(_edition_of(kind, "new(kind)", "{!r}").Document(), "")
     if isinstance(areas, (str, os.PathLike)) or not isinstance(areas, Iterable):
         raise WrongType(f"new(areas): {areas!r} ({type(areas).__name__}) was given; allowed is a list of grids",
                         "new(areas)", repr(areas), "a list of grids")  # fmt: skip

@@ -116,6 +116,22 @@ def test_paths_that_lead_nowhere(setup):
     assert not hasattr(setup.hydrodynamic, "nowhere")
 
 
+def test_what_is_in_a_setup(setup):
+    assert "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY" in setup
+    assert "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth" in setup
+    assert "FLOOD_AND_DRY/Nothing" not in setup.nested_model_globals
+    for wrong in (lambda: 3 in setup, lambda: setup.same_as(3)):
+        with pytest.raises(WrongType, match="3.* was given"):
+            wrong()
+    with pytest.raises(TypeError):
+        iter(setup)
+    areas = setup.nested_model_globals.bathymetry_selection.areas
+    with pytest.raises(WrongType, match=r"AREA_1: 3 \(int\) was given; allowed is to set what the item has"):
+        areas[1] = 3
+    with pytest.raises(WrongValue, match=r"new\(kind\): 'n.v27' was given; allowed is 'v27' or 'v27wsk'"):
+        gridbay_setup.new("n.v27")
+
+
 def test_lists_are_counted_resized_and_walked(setup):
     outputs = setup.hydrodynamic.output_specification.output_areas
     outputs.resize(3)
