@@ -4,10 +4,11 @@
 #   room(basic USES pages core platform SOURCES bathymetry.cpp ...)
 #
 # The sources of a room are compiled a few at a time: they include much the same, which costs more than they do.
-# What a source declares for itself alone has a name of its own in its room; APART compiles each by itself.
+# What a source declares for itself alone has a name of its own in its room; APART compiles each by itself, as where a
+# program is linked with a part of a room alone.
 function(room name)
   cmake_parse_arguments(ROOM "APART" "" "USES;SOURCES;LIBRARIES" ${ARGN})
-  if(GRIDBAY_FUZZ)  # opens no page
+  if(GRIDBAY_FUZZ AND NOT name STREQUAL "pages")  # opens no page
     list(FILTER ROOM_SOURCES EXCLUDE REGEX "_(page|pages|dialog|factory|doc)\\.cpp$|navigation_tree")
   endif()
   add_library(gridbay_${name} STATIC ${ROOM_SOURCES})
