@@ -4,11 +4,8 @@
 
 #include <algorithm>
 #include <array>
-#include <charconv>
-#include <cmath>
 #include <filesystem>
 #include <iterator>
-#include <limits>
 #include <map>
 #include <optional>
 #include <string_view>
@@ -19,18 +16,12 @@
 #include "platform/tsb/hdf5_check.h"
 #include "platform/tsb/known_files.h"
 #include "platform/tsb/netcdf_file.h"
-#include "platform/tsb/netcdf_names.h"
+#include "platform/tsb/tsb_definition_reader.h"
 
 namespace gridbay {
 namespace {
 
-// A compressed file can hold about this many times its own length; one that claims more is damaged or made to
-// harm.
-constexpr double kGreatestRatio = 1100;
 constexpr std::string_view kNoDataFile = "it is no data file, or it is damaged";
-constexpr std::size_t kMostItems = 10000;
-constexpr std::size_t kLongestText = 1 << 20;
-constexpr std::size_t kLongestBlock = 1 << 20;
 
 // Seconds of computing for a look at a file before it is opened: more where there may be much to unpack.
 unsigned secondsFor(std::uintmax_t size) {
@@ -59,238 +50,6 @@ std::uintmax_t sizeOf(const std::string& path) {
   return error ? 0 : size;
 }
 
-std::optional<std::string> textAttribute(int file, int variable, const char* name) {
-  nc_type type = NC_NAT;
-  std::size_t length = 0;
-  if (nc_inq_att(file, variable, name, &type, &length) != NC_NOERR || length > kLongestText)
-    return std::nullopt;
-  if (type == NC_STRING && length == 1) {
-    char* text = nullptr;
-    if (nc_get_att_string(file, variable, name, &text) != NC_NOERR || text == nullptr) return std::nullopt;
-    std::string copy(text);
-    nc_free_string(1, &text);
-    return copy;
-  }
-  if (type != NC_CHAR) return std::nullopt;
-  std::string text(length, '\0');
-  if (nc_get_att_text(file, variable, name, text.data()) != NC_NOERR) return std::nullopt;
-  text.resize(std::min(text.find('\0'), text.size()));
-  return text;
-}
-
-std::optional<double> numberAttribute(int file, int variable, const char* name) {
-  nc_type type = NC_NAT;
-  std::size_t length = 0;
-  double number = 0;
-  if (nc_inq_att(file, variable, name, &type, &length) != NC_NOERR || length != 1) return std::nullopt;
-  if (type == NC_CHAR || type == NC_STRING || nc_get_att_double(file, variable, name, &number) != NC_NOERR) {
-    return std::nullopt;
-  }
-  return number;
-}
-
-std::optional<int> integerAttribute(int file, int variable, const char* name) {
-  const std::optional<double> number = numberAttribute(file, variable, name);
-  if (!number || !(std::abs(*number) < 1e9)) return std::nullopt;
-  return static_cast<int>(*number);
-}
-
-// The dimensions of a variable as their lengths, or nothing when it is not there.
-std::optional<std::vector<std::size_t>> shapeOf(int file, int variable) {
-  int rank = 0;
-  if (nc_inq_varndims(file, variable, &rank) != NC_NOERR || rank < 0 || rank > 8) return std::nullopt;
-  std::vector<int> dimensions(static_cast<std::size_t>(rank));
-  if (nc_inq_vardimid(file, variable, dimensions.data()) != NC_NOERR) return std::nullopt;
-  std::vector<std::size_t> shape(dimensions.size());
-  for (std::size_t i = 0; i < shape.size(); ++i) {
-    if (nc_inq_dimlen(file, dimensions[i], &shape[i]) != NC_NOERR) return std::nullopt;
-  }
-  return shape;
-}
-
-// The library reads texts where it is asked for numbers, and forgets them.
-bool holdsNumbers(int file, int variable) {
-  nc_type type = NC_NAT;
-  return nc_inq_vartype(file, variable, &type) == NC_NOERR && type != NC_CHAR && type <= NC_MAX_ATOMIC_TYPE &&
-         type != NC_STRING;
-}
-
-std::optional<std::vector<double>> numbersOf(int file, int variable, std::size_t count) {
-  std::vector<double> numbers(count);
-  if (!holdsNumbers(file, variable) || nc_get_var_double(file, variable, numbers.data()) != NC_NOERR)
-    return std::nullopt;
-  return numbers;
-}
-
-// The moment after "since" in the units of a calendar axis.
-std::optional<std::array<std::int32_t, 6>> startOf(std::string_view text) {
-  std::array<std::int32_t, 6> parts{};
-  for (std::size_t i = 0; i < parts.size(); ++i) {
-    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), parts[i]);
-    if (error != std::errc()) return std::nullopt;
-    text.remove_prefix(static_cast<std::size_t>(end - text.data()));
-    if (!text.empty()) text.remove_prefix(1);
-  }
-  return parts;
-}
-
-// Reads the parts of a definition one after another; each step says what it could not find.
-class DefinitionReader {
- public:
-  DefinitionReader(int file, double fileSize, TsbDefinition& definition, std::vector<int>& itemVariables)
-      : file_(file), fileSize_(fileSize), definition_(definition), itemVariables_(itemVariables) {}
-
-  Outcome read() {
-    definition_.title = textAttribute(file_, NC_GLOBAL, tsb::kTitle).value_or("");
-    definition_.history = textAttribute(file_, NC_GLOBAL, tsb::kHistory).value_or("");
-    definition_.dataType = integerAttribute(file_, NC_GLOBAL, tsb::kDataType).value_or(0);
-    if (Outcome time = readTime(); !time) return time;
-    if (Outcome axes = readAxes(); !axes) return axes;
-    if (Outcome items = readItems(); !items) return items;
-    readGeography();
-    readCustomBlocks();
-    return {};
-  }
-
- private:
-  Outcome readTime() {
-    const std::optional<int> variable = findVariable(file_, tsb::kTime);
-    const auto shape = variable ? shapeOf(file_, *variable) : std::nullopt;
-    if (!shape || shape->size() != 1) return Failure{"it has no time axis"};
-    TsbTimeAxis& time = definition_.time;
-    time.count = shape->front();
-    if (time.count == 0) return Failure{"its time axis has no steps"};
-    if (!fits(time.count)) return Failure{"its time axis says more steps than the file can hold"};
-    const int type = integerAttribute(file_, *variable, tsb::kAxisType).value_or(0);
-    if (type < 1 || type > 4) return Failure{"its time axis is of an unknown kind"};
-    time.type = static_cast<TsbTimeAxisType>(type);
-    const std::string units = textAttribute(file_, *variable, "units").value_or("");
-    const std::size_t since = units.find(" since ");
-    time.unit = units.substr(0, since);
-    if (time.isCalendar()) {
-      constexpr std::size_t kSinceLength = 7;
-      const auto start =
-          since == units.npos ? std::nullopt : startOf(std::string_view(units).substr(since + kSinceLength));
-      if (!start) return Failure{"its time axis has no start date"};
-      time.start = *start;
-    }
-    if (time.isEquidistant()) {
-      const auto first = numberAttribute(file_, *variable, tsb::kFirst);
-      const auto step = numberAttribute(file_, *variable, tsb::kStep);
-      if (!first || !step) return Failure{"its equidistant time axis has no step"};
-      time.first = *first;
-      time.step = *step;
-      return {};
-    }
-    auto values = numbersOf(file_, *variable, time.count);
-    if (!values) return Failure{"its time axis cannot be read"};
-    time.values = *std::move(values);
-    return {};
-  }
-
-  Outcome readAxes() {
-    for (const char* name : tsb::kAxes) {
-      const std::optional<int> variable = findVariable(file_, name);
-      if (!variable) break;
-      const auto shape = shapeOf(file_, *variable);
-      const auto first = numberAttribute(file_, *variable, tsb::kFirst);
-      const auto spacing = numberAttribute(file_, *variable, tsb::kStep);
-      if (!shape || shape->size() != 1 || !first || !spacing) {
-        return Failure{"its axis " + std::string(name) + " is not equidistant"};
-      }
-      if (shape->front() == 0) return Failure{"its axis " + std::string(name) + " has no points"};
-      definition_.axes.push_back(
-          {shape->front(), *first, *spacing, textAttribute(file_, *variable, "units").value_or("")});
-    }
-    double points = 1;
-    for (const TsbGridAxis& axis : definition_.axes) points *= static_cast<double>(axis.points);
-    if (!fits(points)) return Failure{"its axes say more points than the file can hold"};
-    return {};
-  }
-
-  Outcome readItems() {
-    int count = 0;
-    if (nc_inq_nvars(file_, &count) != NC_NOERR || count < 0) return Failure{"its items cannot be read"};
-    std::map<int, int> byNumber;
-    for (int variable = 0; variable < count; ++variable) {
-      if (const auto number = integerAttribute(file_, variable, tsb::kItemNumber))
-        byNumber.emplace(*number, variable);
-    }
-    if (byNumber.empty()) return Failure{"it has no items (variables with an item type)"};
-    if (byNumber.size() > kMostItems) return Failure{"it has too many items"};
-    std::vector<std::size_t> wanted{definition_.time.count};
-    for (auto axis = definition_.axes.rbegin(); axis != definition_.axes.rend(); ++axis)
-      wanted.push_back(axis->points);
-    for (const auto& [number, variable] : byNumber) {
-      TsbItem item;
-      item.name = textAttribute(file_, variable, "long_name").value_or("");
-      item.type = integerAttribute(file_, variable, tsb::kItemType).value_or(item.type);
-      item.unit = textAttribute(file_, variable, "units").value_or("");
-      nc_type type = NC_NAT;
-      const bool typed =
-          nc_inq_vartype(file_, variable, &type) == NC_NOERR && (type == NC_FLOAT || type == NC_DOUBLE);
-      const auto shape = shapeOf(file_, variable);
-      if (!typed || !shape || *shape != wanted) {
-        return Failure{"its item \"" + item.name + "\" does not have the shape of its axes"};
-      }
-      item.isDouble = type == NC_DOUBLE;
-      item.deleteValue = numberAttribute(file_, variable, "_FillValue").value_or(item.deleteValue);
-      definition_.items.push_back(std::move(item));
-      itemVariables_.push_back(variable);
-    }
-    return {};
-  }
-
-  void readGeography() {
-    const std::optional<int> variable = findVariable(file_, tsb::kProjection);
-    if (!variable) return;
-    const auto name = textAttribute(file_, *variable, tsb::kProjectionName);
-    const auto longitude = numberAttribute(file_, *variable, tsb::kLongitude);
-    const auto latitude = numberAttribute(file_, *variable, tsb::kLatitude);
-    if (!name || !longitude || !latitude) return;
-    const double rotation = numberAttribute(file_, *variable, tsb::kRotation).value_or(0);
-    definition_.geography = TsbGeography{*name, *longitude, *latitude, rotation};
-  }
-
-  // A block that cannot be read stays in the row as such: who needs it finds out there.
-  void readCustomBlocks() {
-    int group = 0;
-    int count = 0;
-    if (nc_inq_grp_ncid(file_, tsb::kCustomBlocks, &group) != NC_NOERR) return;
-    if (nc_inq_nvars(group, &count) != NC_NOERR) return;
-    for (int variable = 0; variable < count; ++variable) {
-      TsbCustomBlock block{textAttribute(group, variable, tsb::kBlockName).value_or(""), {}, false};
-      const auto shape = shapeOf(group, variable);
-      if (shape && shape->size() == 1 && shape->front() <= kLongestBlock) {
-        block.values.resize(shape->front());
-        block.readable = holdsNumbers(group, variable) &&
-                         nc_get_var_float(group, variable, block.values.data()) == NC_NOERR;
-      }
-      definition_.customBlocks.push_back(std::move(block));
-    }
-  }
-
-  bool fits(auto count) const {
-    return static_cast<double>(count) * sizeof(float) <= fileSize_ * kGreatestRatio;
-  }
-
-  static std::optional<int> findVariable(int file, const char* name) {
-    int variable = 0;
-    return nc_inq_varid(file, name, &variable) == NC_NOERR ? std::optional(variable) : std::nullopt;
-  }
-
-  int file_;
-  double fileSize_;
-  TsbDefinition& definition_;
-  std::vector<int>& itemVariables_;
-};
-
-// What a file says of itself, and its items' variables in the library.
-struct Content {
-  TsbDefinition definition;
-  std::vector<int> itemVariables;
-};
-
 KnownFiles& knownFiles() {
   static KnownFiles files;
   return files;
@@ -298,12 +57,12 @@ KnownFiles& knownFiles() {
 
 // The contents of known files, by the state in which they were read: a model asks for its files at each
 // check, and to open one takes longer than most of what is done with it.
-std::map<FileStamp, std::shared_ptr<const Content>>& knownContents() {
-  static std::map<FileStamp, std::shared_ptr<const Content>> contents;
+std::map<FileStamp, std::shared_ptr<const TsbContent>>& knownContents() {
+  static std::map<FileStamp, std::shared_ptr<const TsbContent>> contents;
   return contents;
 }
 
-void keepContent(const FileStamp& state, const std::shared_ptr<const Content>& content) {
+void keepContent(const FileStamp& state, const std::shared_ptr<const TsbContent>& content) {
   constexpr std::size_t kMost = 64;
   if (knownContents().size() >= kMost) knownContents().clear();
   knownContents()[state] = content;
@@ -313,13 +72,13 @@ void keepContent(const FileStamp& state, const std::shared_ptr<const Content>& c
 
 struct TsbFile::State {
   State(std::string name, NetcdfFile open) : path(std::move(name)), file(std::move(open)) {}
-  State(std::string name, const FileStamp& as, std::shared_ptr<const Content> known)
+  State(std::string name, const FileStamp& as, std::shared_ptr<const TsbContent> known)
       : path(std::move(name)), knownAs(as), content(std::move(known)) {}
 
   std::string path;
   mutable std::optional<NetcdfFile> file;  // opened when it is read from
   std::optional<FileStamp> knownAs;        // where the content was read before
-  std::shared_ptr<const Content> content;
+  std::shared_ptr<const TsbContent> content;
 
   // Whether the library stands all that is asked of it for each file. Its reader was not written for files
   // that are made to harm, so it is tried apart.
@@ -355,11 +114,9 @@ struct TsbFile::State {
   }
 
   Outcome readDefinition() {
-    auto reading = std::make_shared<Content>();
+    auto reading = std::make_shared<TsbContent>();
     content = reading;
-    return DefinitionReader(file->id(), static_cast<double>(sizeOf(path)), reading->definition,
-                            reading->itemVariables)
-        .read();
+    return readTsbContent(file->id(), static_cast<double>(sizeOf(path)), *reading);
   }
 
   const TsbDefinition& definition() const { return content->definition; }
