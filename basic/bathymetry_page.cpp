@@ -43,10 +43,11 @@ void CBathymetryGrid::OnArea1FileChanged() {
   CBathymetryKvs& areas = *parts<BasicParts>().bathymetry;
   areas.OnArea1FileChanged();
   CBoundaryKvs& boundaries = *parts<BasicParts>().boundary;
-  if (boundaries.isUserSpecified()) return;
-  const bool ask = boundaries.GetCount() > 0;
-  if (!ask || document().host().askYesNo(formatted(texts::recalculateBoundaries)))
-    boundaries.RecalculateBoundaries();
+  if (!boundaries.isUserSpecified()) {
+    const bool ask = boundaries.GetCount() > 0;
+    if (!ask || document().host().askYesNo(formatted(texts::recalculateBoundaries)))
+      boundaries.RecalculateBoundaries();
+  }
   ResetDispersion();
 }
 

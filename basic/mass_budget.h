@@ -46,8 +46,7 @@ class CMassBudgetKvs final : public ListKvs<CMassBudgetKvs, CMassBudgetItemKvs> 
   using ListKvs::ListKvs;
 
   static constexpr auto table() {
-    return section("MASS_BUDGET", pinnedCount("NoOfPolygons", 0),
-                   flowModelOnly(items("POLYGON_%d", texts::polygonSectionMissing)));
+    return section("MASS_BUDGET", pinnedCount("NoOfPolygons", 0), flowModelOnly(items("POLYGON_%d")));
   }
 
   // A new polygon goes once around the inside of Area 1.

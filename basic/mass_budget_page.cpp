@@ -56,6 +56,13 @@ void CMassBudgetGrid::LayOut() {
     const GridPoint* point = corner(at);
     return point == nullptr ? std::string() : fmt::format("{},{}", point->j, point->k);
   };
+  corners.set = [corner](GridRow at, std::string_view text) {
+    GridPoint* held = corner(at);
+    const std::optional<GridPoint> typed = scannedBarePoint(text);
+    if (!typed || held == nullptr) return Stored::refused;
+    *held = *typed;
+    return Stored::taken;
+  };
 }
 
 CellGrid::Place CMassBudgetGrid::placeOf(int row, int col) {

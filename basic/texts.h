@@ -72,8 +72,6 @@ inline constexpr Text sinkCovered{"Sink no.%d is in a point that is covered by a
 inline constexpr Text sinkOnLand{"Sink no.%d is on land"};
 
 // Mass budget.
-inline constexpr Text polygonSectionMissing{
-    "Error in the KVS-FILE\nThe number of Polygon sections does not correspond to the given number"};
 inline constexpr Text invalidAssociatedArea{"Invalid associated area"};
 inline constexpr Text tooFewCorners{"To few corner points in polygon"};
 inline constexpr Text pointOutsideGrid{"Point is outside of grid"};

@@ -71,7 +71,7 @@ unsigned CWQSResultsItemKvs::Validate(ValidationList& messages, int) {
   check(isOutside(part.x, limits.lastJ) || isOutside(part.y, limits.lastK), texts::outputLimits);
   check(part.x.first > part.x.last || part.y.first > part.y.last, texts::outputStep);
   check(isWrongInterval(part.x) || isWrongInterval(part.y), texts::outputStep);
-  if (check(areWrongSteps(steps, limits.lastStep), texts::outputTimeSteps)) return 0;
+  if (check(areWrongSteps(steps, limits.lastStep + 1), texts::outputTimeSteps)) return 0;
   if (check(timeAveraged && steps.interval == 1, texts::averageOfOneStep)) return 0;
   const auto& allowed = kExtensions[static_cast<std::size_t>(extentOf(part))];
   check(std::ranges::find(allowed, extensionOf(file.text())) == allowed.end(), texts::wrongDimensionOfFile);

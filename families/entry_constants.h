@@ -1,5 +1,6 @@
 #pragma once
 
+#include <algorithm>
 #include <cstdint>
 #include <string>
 #include <tuple>
@@ -37,7 +38,7 @@ concept HasTips = requires(CKvsBase& object, const UnitChoices& units) {
 
 // Concentrations as a constant for each entry, or from a data file with an item for each. `Self` may have
 //   Value newConstant(int entry)          in place of 0
-//   int numberOnFile(int entry) const     where the numbers on file have another order than the entries
+//   bool isHeadLastOnFile() const         whether the first entry, salinity, comes behind all others on file
 //   unsigned CheckConstant(ValidationList& messages, int place, int entry)   a check of one constant, at
 //                                         place `place` of a list; it returns the number of faults
 template <class Self, class Module>
@@ -94,34 +95,55 @@ class EntryConstantsKvs : public TableKvs<Self> {
   }
 
   // A numbered keyword for each constant. Numbers that are missing keep their value; further ones are not
-  // read.
+  // read. Where the head is the last on file, its number goes by how many there are: then as many are taken
+  // as the file has, if the module carries so many.
   struct ConstantsRow {
     static constexpr Text kName{"Constant_Value_%d"};
 
-    static int entryOf(const Self& object, int number) {
-      if constexpr (requires { object.numberOnFile(1); }) {
-        for (int entry = 1; entry <= static_cast<int>(object.constants.size()); ++entry) {
-          if (object.numberOnFile(entry) == number) return entry;
-        }
-      }
+    static bool isHeadLast(const Self& object) {
+      if constexpr (requires { object.isHeadLastOnFile(); }) return object.isHeadLastOnFile();
+      return false;
+    }
+    // Of the number `number` among `count` on file.
+    static int entryOf(const Self& object, int number, int count) {
+      if (number < 1 || !isHeadLast(object)) return number;
+      return number == count ? 1 : number + 1;
+    }
+    static int countOf(const Self& object) { return static_cast<int>(object.constants.size()); }
+    static int countIn(KvsSection from) {
+      NumberedText name(kName);
+      int number = 0;
+      while (kvsKeywordByNameNum(from, name.of(number + 1), 1) != nullptr) ++number;
       return number;
     }
     void save(const Self& object, KvsFile& file, const std::string&) const {
       NumberedText name(kName);
-      for (int number = 1; number <= static_cast<int>(object.constants.size()); ++number) {
-        kvsPutParam(file, name.of(number), *const_cast<Self&>(object).Constant(entryOf(object, number)));
-      }
+      const int count = countOf(object);
+      for (int number = 1; number <= count; ++number)
+        kvsPutParam(file, name.of(number),
+                    *const_cast<Self&>(object).Constant(entryOf(object, number, count)));
     }
     void load(Self& object, KvsSection from, const std::string&) const {
       NumberedText name(kName);
-      for (int number = 1; number <= static_cast<int>(object.constants.size()); ++number)
-        kvsGetParam(from, name.of(number), object.Constant(entryOf(object, number)), 1, 1);
+      int count = countOf(object);
+      if (isHeadLast(object)) {
+        const int carried = Module::count(object);
+        const int onFile = countIn(from);
+        if (onFile > count || onFile == carried) {
+          object.SetNoConstants(std::max(count, std::min(onFile, carried)));
+          count = onFile;
+        }
+      }
+      for (int number = 1; number <= count; ++number) {
+        if (Value* constant = object.Constant(entryOf(object, number, count)))
+          kvsGetParam(from, name.of(number), constant, 1, 1);
+      }
     }
     void copy(Self& object, const Self& other) const { object.constants = other.constants; }
     static constexpr auto members() { return std::tuple(&EntryConstantsKvs::constants); }
     bool access(Self& object, std::string_view path, PathAccess& access) const {
       const std::optional<int> number = numberIn(path, kName);
-      Value* constant = number ? object.Constant(entryOf(object, *number)) : nullptr;
+      Value* constant = number ? object.Constant(entryOf(object, *number, countOf(object))) : nullptr;
       if (constant == nullptr) return false;
       if (access.what == PathAccess::What::write) kvsPutParam(*access.out, path, *constant);
       if (access.what == PathAccess::What::set) kvsGetParam(access.in, path, constant, 1, 1);

@@ -1,6 +1,12 @@
 #include "families/transport_results_page.h"
 
 namespace gridbay {
+namespace {
+
+// The dialog of a part goes by the limits of the first area, wherever an output is.
+constexpr int kFirstArea = 1;
+
+}  // namespace
 
 void TransportOutputColumns::ListOutput(const Output& output) {
   const auto kind = [output](GridRow row) { return resultFileKind(extentOf(output(row)->part)); };
@@ -11,7 +17,7 @@ void TransportOutputColumns::ListOutput(const Output& output) {
   Range("Time", 70, [output](GridRow row) { return &output(row)->steps; });
   Button("...", 20, [this, output](GridRow row) {
     TransportOutput& it = *output(row);
-    if (chooseResultPart(document(), resultLimits(GetKvs(), it.areaNumber), it.part, it.steps)) UpdateDoc();
+    if (chooseResultPart(document(), resultLimits(GetKvs(), kFirstArea), it.part, it.steps)) UpdateDoc();
   });
   ResultFile("Data File", 160, file);
   BrowseBeside(file);

@@ -4,10 +4,9 @@
 
 namespace gridbay {
 
-int CNmtSourceSinkObjectKvs::numberOnFile(int entry) const {
+bool CNmtSourceSinkObjectKvs::isHeadLastOnFile() const {
   const CNmtTaskSelectionKvs* task = mudTaskOf(const_cast<CNmtSourceSinkObjectKvs&>(*this));
-  if (task == nullptr || !task->includeSalinity) return entry;
-  return entry == 1 ? static_cast<int>(constants.size()) : entry - 1;
+  return task != nullptr && task->includeSalinity;
 }
 
 }  // namespace gridbay

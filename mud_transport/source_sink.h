@@ -13,8 +13,7 @@ class CNmtSourceSinkObjectKvs final : public SourceValuesKvs<CNmtSourceSinkObjec
 
   static constexpr PageId kPage = PageId::mtSourceSink;
 
-  // On file salinity, which is the first entry, comes last.
-  int numberOnFile(int entry) const;
+  bool isHeadLastOnFile() const;
 };
 
 class CNmtSourceSinkKvs final : public SourceValuesListKvs<CNmtSourceSinkKvs, CNmtSourceSinkObjectKvs> {

@@ -8,9 +8,8 @@ float CNmtExpSourceObjectKvs::newConstant(int entry) {
   return entry == 1 && carriesSalinity(*this) ? kSalinity : kFraction;
 }
 
-int CNmtExpSourceObjectKvs::numberOnFile(int entry) const {
-  if (!carriesSalinity(const_cast<CNmtExpSourceObjectKvs&>(*this))) return entry;
-  return entry == 1 ? static_cast<int>(constants.size()) : entry - 1;
+bool CNmtExpSourceObjectKvs::isHeadLastOnFile() const {
+  return carriesSalinity(const_cast<CNmtExpSourceObjectKvs&>(*this));
 }
 
 }  // namespace gridbay

@@ -15,7 +15,7 @@ class CNmtExpSourceObjectKvs final : public SourceValuesKvs<CNmtExpSourceObjectK
   static constexpr PageId kPage = PageId::mtExpSources;
 
   float newConstant(int entry);
-  int numberOnFile(int entry) const;
+  bool isHeadLastOnFile() const;
 };
 
 class CNmtExpSourcesKvs final : public SourceValuesListKvs<CNmtExpSourcesKvs, CNmtExpSourceObjectKvs> {

@@ -67,11 +67,14 @@ std::optional<double> scannedReal(std::string_view text) {
 }
 
 std::optional<GridPoint> scannedPoint(std::string_view text) {
-  for (const std::string_view form : {"(%d,%d)", "%d,%d"}) {
-    GridPoint point;
-    if (scan(text, form, {&point.j, &point.k}) == 2) return point;
-  }
-  return std::nullopt;
+  GridPoint point;
+  if (scan(text, "(%d,%d)", {&point.j, &point.k}) == 2) return point;
+  return scannedBarePoint(text);
+}
+
+std::optional<GridPoint> scannedBarePoint(std::string_view text) {
+  GridPoint point;
+  return scan(text, "%d,%d", {&point.j, &point.k}) == 2 ? std::optional(point) : std::nullopt;
 }
 
 std::optional<USubLine> scannedRange(std::string_view text) {

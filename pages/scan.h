@@ -26,6 +26,8 @@ std::optional<std::int32_t> scannedInteger(std::string_view text);
 std::optional<double> scannedReal(std::string_view text);
 // "(3,14)" and "3,14"
 std::optional<GridPoint> scannedPoint(std::string_view text);
+// "3,14" alone
+std::optional<GridPoint> scannedBarePoint(std::string_view text);
 // "0-100,5"; without an interval it is 1.
 std::optional<USubLine> scannedRange(std::string_view text);
 // An integer read plainly: "12x" is 12, "x" is 0.

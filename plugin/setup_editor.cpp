@@ -23,6 +23,7 @@ class Editor final : public SetupEditor {
   }
 
   bool open(const std::string& path) override {
+    dropPage();
     if (!document_.OnOpenDocument(path)) return false;
     tree_.OnInitialUpdate(&document_.root());
     update();
@@ -39,6 +40,7 @@ class Editor final : public SetupEditor {
     return written ? std::string() : written.error();
   }
   bool recover(const std::string& copy, const std::string& path) override {
+    dropPage();
     if (!document_.OnRecoverDocument(copy, path)) return false;
     tree_.OnInitialUpdate(&document_.root());
     update();
@@ -67,6 +69,8 @@ class Editor final : public SetupEditor {
     return items;
   }
   void applyRules() override { tree_.OnUpdate(&document_.root()); }
+  // A page that is left may still write; that is not for a model that has just been read.
+  void dropPage() { page_.reset(); }
   Form* openPage(std::int32_t id) override {
     std::string topic;
     std::string local;

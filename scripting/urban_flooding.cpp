@@ -1,5 +1,7 @@
 #include <algorithm>
 #include <array>
+#include <cstdint>
+#include <limits>
 #include <string_view>
 
 #include "basic/bathymetry.h"
@@ -90,7 +92,10 @@ void UrbanFlooding_V27Flowmodel::AddOutput_MapsAndTimeSeries(
   output.title = std::move(title);
   USubLine& steps = appendOutput(*model_, output).steps;
   const double span = double{static_cast<double>(steps.last)} - steps.first;
-  steps.interval = std::max(wholePart(span / numberOfSteps), 1);
+  const double interval = span / numberOfSteps;
+  // No number of steps gives an interval that no integer holds.
+  constexpr double kMost = std::numeric_limits<std::int32_t>::max();
+  steps.interval = interval <= kMost ? std::max(wholePart(interval), 1) : 1;
   tellUnsupported(*model_, type);
 }
 

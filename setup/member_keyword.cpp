@@ -5,17 +5,30 @@
 #include <algorithm>
 #include <cmath>
 
+#include "core/file_name.h"
 #include "core/number_text.h"
 #include "setup/setup_path.h"
 
 namespace gridbay {
 namespace {
 
-// Whether a keyword has these values; the model may hold a number with fewer digits.
-bool stands(const Node& keyword, const std::vector<Value>& wanted) {
-  return std::ranges::equal(keyword.values(), wanted, [](const Value& a, const Value& b) {
+// A file's name as a setup at `documentPath` writes it.
+std::string nameOnFile(std::string_view name, const std::string& documentPath) {
+  UFileName file;
+  file.Set(name, documentPath);
+  const KvsHandle written = kvsCreate();
+  file.Save(*written, documentPath);
+  return std::string(written->tree().root().first()->values().front().text());
+}
+
+// Whether a keyword has these values; the model may hold a number with fewer digits, and a file beside the
+// setup is written by its name from there.
+bool stands(const Node& keyword, const std::vector<Value>& wanted, const std::string& documentPath) {
+  return std::ranges::equal(keyword.values(), wanted, [&](const Value& a, const Value& b) {
     if (a.kind() == ValueKind::real) return floatOfText(a.text()) == floatOfText(b.text());
-    return a.text() == b.text();
+    if (a.text() == b.text()) return true;
+    const bool isFile = a.kind() == ValueKind::fileName || a.kind() == ValueKind::resultFileName;
+    return isFile && a.text() == nameOnFile(b.text(), documentPath);
   });
 }
 
@@ -49,7 +62,7 @@ bool MemberKeyword::set(const std::vector<Value>& values) {
   const KvsHandle before = std::move(written_);
   const Node& keyword = *before->tree().root().first();
   take(keyword.name(), values);
-  if (write() && stands(node(), values)) return true;
+  if (write() && stands(node(), values, documentPath_)) return true;
   take(keyword.name(), keyword.values());
   write();
   return false;

@@ -99,6 +99,7 @@ bool CV27SetupDoc::OnRecoverDocument(const std::string& copy, const std::string&
 
 void CV27SetupDoc::RecordEdit(PageId page, std::string name, bool continues) {
   history_.record(root(), page, std::move(name), continues, touched());
+  if (!history_.isSaved()) SetModifiedFlag();
 }
 
 void CV27SetupDoc::Undo() {

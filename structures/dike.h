@@ -82,6 +82,8 @@ class CNhdDikeObjectKvs final : public TableKvs<CNhdDikeObjectKvs> {
 
 class CNhdDikeKvs final : public ListKvs<CNhdDikeKvs, CNhdDikeObjectKvs> {
  public:
+  static constexpr bool kChecksItemsAlways = true;
+
   using ListKvs::ListKvs;
 
   static constexpr auto table() {

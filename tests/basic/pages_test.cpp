@@ -652,6 +652,7 @@ TEST_F(MassBudgetPage, Edits) {
   EXPECT_EQ(store(7, 2, "8,9"), 1);
   EXPECT_EQ(list().GetItem(2)->corners.back(), (GridPoint{8, 9}));
   EXPECT_EQ(store(7, 2, "8"), 0);
+  EXPECT_EQ(store(7, 2, "(3,4)"), 0);
   EXPECT_EQ(store(2, 2, "-1"), 0);
   EXPECT_EQ(store(2, 2, "x"), 0);
   EXPECT_EQ(list().GetItem(2)->corners.size(), 5U);

@@ -293,6 +293,21 @@ TEST_F(Tool, ANewCountIsASetting) {
   EXPECT_EQ(get("NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/SOURCE_SINK_2/Type"), "1\n");
 }
 
+TEST_F(Tool, AFileIsSetByAnyOfItsNames) {
+  makeSetup();
+  const std::string key = "NESTED_MODEL_GLOBALS/BATHYMETRY_SELECTION/AREA_1/DATA_FILE/FILE_NAME";
+  const std::filesystem::path beside = std::filesystem::path(setup).parent_path();
+  for (const auto& [given, written] :
+       {std::pair((beside / "g.tsb2").string(), std::string("g.tsb2")),
+        {(beside.parent_path() / "other" / "g.tsb2").string(), "../other/g.tsb2"},
+        {"../g.tsb2", "../g.tsb2"},
+        {"/var/g.tsb2", "/var/g.tsb2"}}) {
+    const ProgramRun run = runTool({"set", setup, key + "=" + given});
+    EXPECT_EQ(run.status, 0) << run.err;
+    EXPECT_EQ(get(key), "\"" + written + "\"\n");
+  }
+}
+
 TEST_F(Tool, ASettingThatCannotBeLeavesTheFile) {
   makeSetup();
   const std::string before = textOf(setup);

@@ -68,7 +68,6 @@ class MudWater : public ::testing::Test {
   test::TemporaryFolder folder;
   test::Model model;
   CGlobalKvs& root = model.root;
-  CNmtTaskSelectionKvs& task = *root.nmtTaskSelection;
 };
 
 class MudInitial : public MudWater {
@@ -326,6 +325,29 @@ TEST_F(MudPlaces, BoundariesKeepTheOrderOfTheList) {
   boundaries.at(2).constants = {1, 1};
   test::load(boundaries, text);
   EXPECT_EQ(boundaries.at(2).constants, (Floats{35, 0.5F}));
+}
+
+// A new source takes what is transported when it is made, a load makes it before the task is known.
+TEST_F(MudPlaces, NoConstantOfASourceIsLostOnFile) {
+  const auto reloaded = [this](int fractions, int layers) {
+    root.sourceSink->SetNoSources(0);
+    if (layers > 0) task.SetLayers(layers);
+    task.SetSalinity(true);
+    root.sourceSink->SetNoSources(1);
+    Floats& constants = sources.at(1).constants;
+    for (std::size_t i = 0; i < constants.size(); ++i) constants[i] = 30.0F - static_cast<float>(i);
+    const std::string saved = savedText(sources);
+    test::Model other;
+    other.root.sourceSink->SetNoSources(1);
+    if (layers > 0) other.root.nmtTaskSelection->SetLayers(layers);
+    if (fractions > 0) other.root.nmtTaskSelection->SetFractions(fractions);
+    other.root.nmtTaskSelection->SetSalinity(true);
+    test::load(*other.root.nmtSourceSink, saved);
+    task.SetSalinity(false);
+    return other.root.nmtSourceSink->at(1).constants;
+  };
+  EXPECT_EQ(reloaded(3, 0), (Floats{30, 29, 28, 27}));
+  EXPECT_EQ(reloaded(0, 2), (Floats{30, 29, 0}));
 }
 
 TEST_F(MudPlaces, SourcesHaveSalinityLastOnFile) {
@@ -605,6 +627,14 @@ TEST_F(MudResult, CountsIntoAllThatAModelWrites) {
   const double alone = root.nhdResult->TotalSizeMB();
   root.moduleSelection->simulationType = module::kMudTransport;
   EXPECT_DOUBLE_EQ(root.nhdResult->TotalSizeMB(), alone + double{results.OutputSizeMB()});
+  EXPECT_EQ(root.OutputOfModule().hotStartItems, 0);
+  results.generateHotStart = true;
+  task.SetFractions(4);
+  EXPECT_EQ(root.OutputOfModule().hotStartItems, 4 + 3);
+  task.SetSalinity(true);
+  EXPECT_EQ(root.OutputOfModule().hotStartItems, 4 + 3 + 1);
+  task.SetLayers(5);
+  EXPECT_EQ(root.OutputOfModule().hotStartItems, 1 + 5 + 1);
 }
 
 TEST_F(MudResult, Checks) {

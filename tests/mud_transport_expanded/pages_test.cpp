@@ -361,6 +361,11 @@ TEST_F(ExpandedMudPages, AnotherGridResetsTheDispersionUntilThatIsTheUsers) {
   host.chosenFile = folder.write("z.tsb2", "");
   grid("Areas").OnClickedButtonRowCol(2, 2);  // chosen for another area than the first
   EXPECT_EQ(dispersion.constantX, 5);
+  root().boundary->defaultPosition = 0;  // boundaries that are the user's own change nothing in that
+  host.chosenFile = folder.write("w.tsb2", "");
+  grid("Areas").OnClickedButtonRowCol(1, 2);
+  EXPECT_FLOAT_EQ(dispersion.constantX, 18);
+  dispersion.constantX = 5;
   document.Touch(PageId::mtExpDispersionCoef);
   EXPECT_EQ(grid("Areas").StoreStyleRowCol(2, 1, "x.tsb2"), 1);
   EXPECT_EQ(dispersion.constantX, 5);

@@ -204,8 +204,10 @@ TEST_F(ExpandedResult, SizesGoByTheChosenItems) {
   results.generateHotStart = true;
   EXPECT_EQ(results.hotStartItems(), 10);  // salinity, three fractions, and six masses
   root.moduleSelection->simulationType = module::kMudTransportExpanded;
-  EXPECT_EQ(root.OutputOfModule().hotStartItems, 10);
+  EXPECT_EQ(root.OutputOfModule().hotStartItems, 0);  // only those of dissolved and of mud transport count
   EXPECT_FLOAT_EQ(static_cast<float>(root.OutputOfModule().megabytes), results.OutputSizeMB());
+  task.includeXenobiotics = true;
+  EXPECT_FLOAT_EQ(static_cast<float>(root.OutputOfModule().megabytes), 2 * results.OutputSizeMB());
 }
 
 TEST_F(ExpandedResult, HotStartOnlyWithThatOfTheFlow) {

@@ -575,6 +575,23 @@ class DesktopTest : public DesktopFixture {
     QVERIFY(QFile::exists(file("s.v27")));
   }
 
+  // A page that writes when it is left doesn't write into what is read in place of its setup.
+  void aReloadTakesNothingFromThePageThatWasOpen() {
+    const QString start = "MUD_TRANSPORT_EXPANDED_MODULE/STARTING_CONDITIONS/Start_MT_at_HD_Time_Step=";
+    DocumentTab* tab = window_->currentDocument();
+    QVERIFY(tab->goToPage(39));
+    run("v27setup", {"set", "s.v27", "NESTED_MODEL_GLOBALS/MODULE_SELECTION/Simulation_Type=8", start + "7"});
+    QTRY_VERIFY(tab->notice().isVisible());
+    tab->notice().findChild<QPushButton*>("reload")->click();
+    QVERIFY(!tab->title().endsWith("*"));
+    QVERIFY(window_->saveDocument());
+    QVERIFY(textOf(file("s.v27")).contains("Start_MT_at_HD_Time_Step 7\n"));
+    QVERIFY(tab->goToPage(26));  // left as usual it is written, which is an edit
+    QVERIFY(tab->title().endsWith("*"));
+    QVERIFY(window_->saveDocument());
+    QVERIFY(textOf(file("s.v27")).contains("Start_MT_at_HD_Time_Step 0\n"));
+  }
+
   void editsOutliveASuddenEnd() {
     QProcess child;
     QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
