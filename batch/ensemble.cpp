@@ -47,13 +47,26 @@ void listResultNames(const Node& section, const std::string& prefix, std::vector
   }
 }
 
+std::vector<ResultName> resultNamesOf(const KvsFile& tree) {
+  std::vector<ResultName> names;
+  if (const Node* target = kvsTargetByNameNum(tree, CGlobalKvs::kTarget, 1); target != nullptr)
+    listResultNames(*target, {}, names);
+  return names;
+}
+
+// The files that the engine makes of a setup, each once.
+std::vector<std::string> resultsOf(const KvsFile& tree, const std::string& setup) {
+  std::set<std::string> files;
+  for (const ResultName& result : resultNamesOf(tree))
+    files.insert(absolutePath(result.name, folderOfFile(setup)));
+  return {files.begin(), files.end()};
+}
+
 // Makes one member after the other in the model of the common setup, which it brings back each time.
 class MemberMaker {
  public:
   MemberMaker(const Ensemble& ensemble, SetupFile base) : ensemble_(ensemble), setup_(std::move(base)) {
-    const KvsHandle tree = setup_.tree(ensemble.base);
-    if (const Node* target = kvsTargetByNameNum(*tree, CGlobalKvs::kTarget, 1); target != nullptr)
-      listResultNames(*target, {}, resultNames_);
+    resultNames_ = resultNamesOf(*setup_.tree(ensemble.base));
     // What a check reads of the data files is read again for each member.
     plain_.AssignState(setup_.model());
     hasOptions_ = std::ranges::any_of(ensemble.table.paths, isOption);
@@ -121,6 +134,7 @@ class MemberMaker {
         return report;
       }
       CollectingMessageHost host;
+      report.results = resultsOf(*saved, file);
       SetupFile setup = SetupFile::fromTree(std::move(saved), file, &host);
       report.notes = std::move(host.texts);
       checkInto(report, setup);
@@ -207,6 +221,28 @@ std::size_t othersIn(const Ensemble& ensemble) {
     if (name.extension() == kind && !own.contains(name.string())) ++others;
   }
   return others;
+}
+
+// Notes with each member the files that others make, too, and gives a warning for each such file.
+std::vector<std::string> tellShared(std::vector<MemberReport>& members) {
+  std::map<std::string, std::vector<MemberReport*>> makers;
+  for (MemberReport& member : members) {
+    for (const std::string& result : member.results) makers[result].push_back(&member);
+  }
+  std::vector<std::string> warnings;
+  for (const auto& [file, sharers] : makers) {
+    if (sharers.size() < 2) continue;
+    const std::string who = sharers.size() == members.size()
+                                ? fmt::format("all {} members", sharers.size())
+                                : fmt::format("{} members ({}, {}{})", sharers.size(), sharers[0]->name,
+                                              sharers[1]->name, sharers.size() > 2 ? ", ..." : "");
+    warnings.push_back(fmt::format("{} make \"{}\": each run replaces what another one made", who, file));
+    for (MemberReport* member : sharers)
+      member->notes.push_back(fmt::format("Warning: {} other member{} make{} \"{}\", too", sharers.size() - 1,
+                                          sharers.size() == 2 ? "" : "s", sharers.size() == 2 ? "s" : "",
+                                          file));
+  }
+  return warnings;
 }
 
 Outcome makeFolder(const std::string& folder) {
@@ -315,6 +351,7 @@ Result<EnsembleResult> makeEnsemble(const Ensemble& ensemble, MessageHost& host,
     if (report) result.members.push_back(*std::move(report));
   }
   result.isStopped = done < members.size();
+  result.warnings = tellShared(result.members);
   const Outcome csv = saveFile(ensemble.csvReport(), reportAsCsv(result.members));
   const Outcome json = saveFile(ensemble.jsonReport(), reportAsJson(result.members));
   for (const Outcome& saved : {csv, json, flushFiles(ensemble.folder)}) {

@@ -27,6 +27,7 @@ struct EnsembleResult {
   std::vector<MemberReport> members;  // those that were made, in the order of the table
   bool isStopped = false;             // before all of them were
   std::size_t others = 0;             // setups in the folder that are none of the table's members
+  std::vector<std::string> warnings;  // of files that the engines of several members make
 };
 
 // Makes the members and checks them, side by side on as many cores as there are, and writes both reports.
@@ -37,8 +38,9 @@ struct EnsembleResult {
 //
 // All values are tried before the first file is written: where one can't be set, no file is. The error tells
 // of each one its line and column. Then each file is whole or not there, whatever happens. A file that can't
-// be written ends the work; what was made until then is kept and reported. `host` is shown what the load of
-// the common setup has to say.
+// be written ends the work; what was made until then is kept and reported. That the engines of several
+// members make the same file, as by a name in the table, is a warning, and a note of each of them. `host` is
+// shown what the load of the common setup has to say.
 Result<EnsembleResult> makeEnsemble(const Ensemble& ensemble, MessageHost& host, const BatchWatch& watch);
 
 }  // namespace gridbay

@@ -30,6 +30,8 @@ std::string packed(const MemberReport& report) {
   add(report.error);
   add(std::to_string(report.notes.size()));
   for (const std::string& note : report.notes) add(note);
+  add(std::to_string(report.results.size()));
+  for (const std::string& result : report.results) add(result);
   add(std::to_string(report.faults));
   for (const CMessage& message : report.messages) {
     add(std::to_string(static_cast<int>(message.page)));
@@ -50,6 +52,8 @@ void unpack(const std::string& text, MemberReport& report) {
   report.error = next();
   report.notes.resize(std::stoul(next()));
   for (std::string& note : report.notes) note = next();
+  report.results.resize(std::stoul(next()));
+  for (std::string& result : report.results) result = next();
   report.faults = static_cast<unsigned>(std::stoul(next()));
   report.messages.clear();
   while (at < text.size()) {

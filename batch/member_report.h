@@ -16,6 +16,7 @@ struct MemberReport {
   std::vector<std::string> notes;  // what the load had to say
   unsigned faults = 0;
   ValidationList messages;
+  std::vector<std::string> results;  // the files that its engine makes, absolute; in no report
 
   bool isClean() const { return error.empty() && faults == 0; }
 };

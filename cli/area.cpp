@@ -82,38 +82,30 @@ int finish(SetupFile& setup, const Options& options, int number, SetupMap& map, 
   return kClean;
 }
 
-int add(const Options& options, const Console& console) {
-  const Result<std::optional<GridPoint>> at = given(options);
-  if (!at) return console.fail(at.error());
-  ConsoleMessageHost host(console);
-  Result<SetupFile> setup = SetupFile::open(options.setup, &host);
-  if (!setup) return console.fail(setup.error());
-  CGlobalKvs& root = setup->model();
+int add(const Options& options, SetupFile& setup, const std::optional<GridPoint>& at,
+        const Console& console) {
+  CGlobalKvs& root = setup.model();
   SetupMap map;
   const int enclosing = options.enclosing.value_or(1);
   if (enclosing < 1 || enclosing > root.bathymetry->GetCount())
     return console.fail(fmt::format("There is no area {} for it to lie in: the setup has {}", enclosing,
                                     root.bathymetry->GetCount()));
-  if (!*at && !options.snap)
+  if (!at && !options.snap)
     return console.fail("Say where it lies, with --at J,K, or take that from the grids with --snap");
   const std::string grid = std::filesystem::absolute(options.grid).lexically_normal().string();
   if (const GridHeader& header = map.headers().of(grid); !header.fault.empty())
     return console.fail(header.fault);
-  const MapEdit made = map.addArea(root, enclosing, at->value_or(GridPoint{}), grid);
+  const MapEdit made = map.addArea(root, enclosing, at.value_or(GridPoint{}), grid);
   if (!made.fault.empty()) return console.fail(made.fault);
   const int number = root.bathymetry->GetCount();
-  if (const Outcome done = place(map, root, number, *at, options.snap, console); !done)
+  if (const Outcome done = place(map, root, number, at, options.snap, console); !done)
     return console.fail(done.error() + "; the setup is unchanged");
-  return finish(*setup, options, number, map, console);
+  return finish(setup, options, number, map, console);
 }
 
-int move(const Options& options, const Console& console) {
-  const Result<std::optional<GridPoint>> at = given(options);
-  if (!at) return console.fail(at.error());
-  ConsoleMessageHost host(console);
-  Result<SetupFile> setup = SetupFile::open(options.setup, &host);
-  if (!setup) return console.fail(setup.error());
-  CGlobalKvs& root = setup->model();
+int move(const Options& options, SetupFile& setup, const std::optional<GridPoint>& at,
+         const Console& console) {
+  CGlobalKvs& root = setup.model();
   const int count = root.bathymetry->GetCount();
   if (options.number < 2 || options.number > count)
     return console.fail(
@@ -121,7 +113,7 @@ int move(const Options& options, const Console& console) {
                     "where its file says",
                     options.number, count));
   if (root.bathymetry->hotStart == 1) return console.fail("A hot start file says itself where its area lies");
-  if (!*at && !options.snap && !options.enclosing)
+  if (!at && !options.snap && !options.enclosing)
     return console.fail("Say where it lies, with --at J,K, or take that from the grids with --snap");
   if (options.enclosing &&
       (*options.enclosing < 1 || *options.enclosing > count || *options.enclosing == options.number))
@@ -132,17 +124,15 @@ int move(const Options& options, const Console& console) {
   if (options.enclosing) root.bathymetry->at(options.number).enclosingArea = *options.enclosing;
   SetupMap map;
   // A position that is not given is the one that the setup has.
-  const std::optional<GridPoint> held = *at ? *at : std::optional(root.bathymetry->at(options.number).origin);
+  const std::optional<GridPoint> held = at ? at : std::optional(root.bathymetry->at(options.number).origin);
   if (const Outcome done = place(map, root, options.number, held, options.snap, console); !done)
     return console.fail(done.error() + "; the setup is unchanged");
-  return finish(*setup, options, options.number, map, console);
+  return finish(setup, options, options.number, map, console);
 }
 
-int remove(const Options& options, const Console& console) {
-  ConsoleMessageHost host(console);
-  Result<SetupFile> setup = SetupFile::open(options.setup, &host);
-  if (!setup) return console.fail(setup.error());
-  CGlobalKvs& root = setup->model();
+int remove(const Options& options, SetupFile& setup, const std::optional<GridPoint>&,
+           const Console& console) {
+  CGlobalKvs& root = setup.model();
   const int count = root.bathymetry->GetCount();
   if (options.number < 1 || options.number > count)
     return console.fail(fmt::format("There is no area {}: the setup has {}", options.number, count));
@@ -166,9 +156,20 @@ int remove(const Options& options, const Console& console) {
       console.note(fmt::format("\"{}\" of page {} stands on it", feature.label, feature.id.page));
   }
   root.bathymetry->SetNoAreas(count - 1);
-  if (const int status = saveSetup(*setup, options.setup, console); status != kClean) return status;
+  if (const int status = saveSetup(setup, options.setup, console); status != kClean) return status;
   console.out << fmt::format("Area {} is removed; its grid file is left\n", options.number);
   return kClean;
+}
+
+// Opens the setup for an edit, which saves it, at the point that was given.
+template <int edit(const Options&, SetupFile&, const std::optional<GridPoint>&, const Console&)>
+int opened(const Options& options, const Console& console) {
+  const Result<std::optional<GridPoint>> at = given(options);
+  if (!at) return console.fail(at.error());
+  ConsoleMessageHost host(console);
+  Result<SetupFile> setup = SetupFile::open(options.setup, &host);
+  if (!setup) return console.fail(setup.error());
+  return edit(options, *setup, *at, console);
 }
 
 void addPosition(CLI::App& command, Options& options) {
@@ -184,16 +185,16 @@ void addArea(CLI::App& tool, Action& action) {
   CLI::App& area = *tool.add_subcommand("area", "Adds, moves and removes nested areas");
   area.require_subcommand(1);
   std::shared_ptr<Options> options;
-  CLI::App& adding =
-      addCommand(area, action, "add", "Adds an area of a grid file (default: in area 1)", add, options);
+  CLI::App& adding = addCommand(area, action, "add", "Adds an area of a grid file (default: in area 1)",
+                                opened<add>, options);
   adding.add_option("FILE", options->setup, "The setup")->required();
   adding.add_option("GRID", options->grid, "The grid file (*.tsb2)")->required();
   addPosition(adding, *options);
-  CLI::App& moving = addCommand(area, action, "move", "Places an area anew", move, options);
+  CLI::App& moving = addCommand(area, action, "move", "Places an area anew", opened<move>, options);
   moving.add_option("FILE", options->setup, "The setup")->required();
   moving.add_option("AREA", options->number, "Its number, from 2")->required();
   addPosition(moving, *options);
-  CLI::App& removing = addCommand(area, action, "remove", "Removes the last area", remove, options);
+  CLI::App& removing = addCommand(area, action, "remove", "Removes the last area", opened<remove>, options);
   removing.add_option("FILE", options->setup, "The setup")->required();
   removing.add_option("AREA", options->number, "Its number")->required();
 }

@@ -38,6 +38,12 @@ int ensemble(const Options& options, const Console& console) {
   console.out << fmt::format("{}: {} member{}, {} with faults; see {}\n", options.folder,
                              result->members.size(), result->members.size() == 1 ? "" : "s", faulty,
                              asked.csvReport());
+  constexpr std::size_t kMostWarnings = 20;
+  for (std::size_t i = 0; i < std::min(result->warnings.size(), kMostWarnings); ++i)
+    console.note("Warning: " + result->warnings[i]);
+  if (result->warnings.size() > kMostWarnings)
+    console.note(fmt::format("... and {} more of these; the reports have all",
+                             result->warnings.size() - kMostWarnings));
   if (result->others > 0)
     console.note(fmt::format("{} holds {} other setup{}, of which the reports tell nothing", options.folder,
                              result->others, result->others == 1 ? "" : "s"));

@@ -1,24 +1,15 @@
-#include <fmt/format.h>
+#include "setup/new_setup.h"
 
-#include <array>
+#include <fmt/format.h>
 
 #include "basic/bathymetry.h"
 #include "basic/boundary.h"
 #include "basic/simulation_period.h"
 #include "cli/commands.h"
-#include "core/edition.h"
 #include "platform/files/may_write.h"
-#include "platform/tsb/tsb_file.h"
 
 namespace gridbay::cli {
 namespace {
-
-// An area of the command line: a grid file and, for a nested one, where it lies.
-struct Area {
-  std::string file;
-  std::optional<GridPoint> origin;
-  std::optional<int> enclosing;
-};
 
 struct Options {
   std::string file;
@@ -32,16 +23,16 @@ struct Options {
 };
 
 // "grid.tsb2@12,7" is a file and a point; a file name may have an @ of its own.
-Area areaOf(const std::string& text) {
+NewArea areaOf(const std::string& text) {
   const std::size_t at = text.rfind('@');
-  if (at == text.npos) return {text, {}, {}};
+  if (at == text.npos) return {text};
   const std::optional<GridPoint> origin = pointOfText(std::string_view(text).substr(at + 1));
-  return origin ? Area{text.substr(0, at), origin, {}} : Area{text, {}, {}};
+  return origin ? NewArea{text.substr(0, at), origin} : NewArea{text};
 }
 
 // An --enclosing belongs to the --area before it.
-Result<std::vector<Area>> areasOf(const Options& options) {
-  std::vector<Area> areas;
+Result<std::vector<NewArea>> areasOf(const Options& options) {
+  std::vector<NewArea> areas;
   std::size_t nextArea = 0;
   std::size_t nextEnclosing = 0;
   for (const bool isArea : options.order) {
@@ -55,64 +46,20 @@ Result<std::vector<Area>> areasOf(const Options& options) {
       areas.back().enclosing = options.enclosing[nextEnclosing++];
     }
   }
-  for (std::size_t i = 0; i < areas.size(); ++i) {
-    if (i == 0 && areas[i].origin) return Failure{"The first area lies in no other: give it without @J,K"};
-    if (i > 0 && !areas[i].origin) {
-      return Failure{fmt::format("Area {} lies in another: say where, as {}@J,K", i + 1, areas[i].file)};
-    }
-    if (i == 0) continue;
-    if (areas[i].origin->j < 0 || areas[i].origin->k < 0) {
-      return Failure{fmt::format("Area {} cannot lie at {},{}: J and K count from 0", i + 1,
-                                 areas[i].origin->j, areas[i].origin->k)};
-    }
-    const int enclosing = areas[i].enclosing.value_or(static_cast<int>(i));
-    if (enclosing < 1 || enclosing > static_cast<int>(i)) {
-      return Failure{
-          fmt::format("Area {} cannot lie in area {}: --enclosing takes the number of an area before it{}",
-                      i + 1, enclosing, i == 1 ? ", which is 1" : fmt::format(", 1 to {}", i))};
-    }
-  }
   return areas;
 }
 
 int newSetup(const Options& options, const Console& console) {
-  const Result<std::vector<Area>> areas = areasOf(options);
+  const Result<std::vector<NewArea>> areas = areasOf(options);
   if (!areas) return console.fail(areas.error());
   std::vector<std::string> grids;
-  for (const Area& area : *areas) grids.push_back(area.file);
+  for (const NewArea& area : *areas) grids.push_back(area.file);
   if (const Outcome free = mayWrite(options.file, options.force, grids, "--force"); !free)
     return console.fail(free.error());
-  const int most = theEdition.wetlandSweepKit ? 1 : CBathymetryKvs::kMostAreas;
-  if (static_cast<int>(areas->size()) > most) {
-    return console.fail(fmt::format("The {} has at most {} area{}", theEdition.editorName.format, most,
-                                    most == 1 ? "" : "s"));
-  }
   ConsoleMessageHost host(console);
   SetupFile setup(&host);
   CGlobalKvs& model = setup.model();
-  if (!areas->empty()) model.bathymetry->SetNoAreas(static_cast<int>(areas->size()));
-  std::vector<std::array<std::size_t, 2>> sizes;
-  for (std::size_t i = 0; i < areas->size(); ++i) {
-    const Area& given = (*areas)[i];
-    const Result<TsbFile> file = TsbFile::open(given.file);
-    if (!file) return console.fail(file.error());
-    const std::vector<TsbGridAxis>& axes = file->definition().axes;
-    if (axes.size() != 2) return console.fail(fmt::format("\"{}\" holds no map", given.file));
-    sizes.push_back({axes[0].points, axes[1].points});
-    if (given.origin) {
-      const auto enclosing = static_cast<std::size_t>(given.enclosing.value_or(static_cast<int>(i)));
-      const auto [noJ, noK] = sizes[enclosing - 1];
-      if (static_cast<std::size_t>(given.origin->j) >= noJ ||
-          static_cast<std::size_t>(given.origin->k) >= noK) {
-        return console.fail(fmt::format("Area {} cannot lie at {},{}: area {} has {} x {} points", i + 1,
-                                        given.origin->j, given.origin->k, enclosing, noJ, noK));
-      }
-    }
-    CBathymetryObjectKvs& area = *model.bathymetry->GetArea(static_cast<int>(i) + 1);
-    area.fileName = given.file;
-    if (given.origin) area.origin = *given.origin;
-    if (given.enclosing) area.enclosingArea = *given.enclosing;
-  }
+  if (const auto fault = layAreas(model, *areas)) return console.fail(fault->text);
   if (!options.start.empty()) {
     const std::optional<DateTime> start = dateTimeOfText(options.start);
     if (!start)
@@ -121,12 +68,6 @@ int newSetup(const Options& options, const Console& console) {
   }
   if (options.step) model.simulationPeriod->timeStepInterval = static_cast<float>(*options.step);
   if (options.steps) model.simulationPeriod->noPointsInTime = *options.steps + 1;
-  if (!areas->empty()) {
-    std::string projection;
-    int coriolis = 0;
-    model.bathymetry->GetProjection(&projection, &coriolis);
-    model.boundary->RecalculateBoundaries();
-  }
   if (const int status = saveSetup(setup, options.file, console); status != kClean) return status;
   console.out << fmt::format("{}: {} area{}, {} open boundar{}\n", options.file, model.bathymetry->GetCount(),
                              model.bathymetry->GetCount() == 1 ? "" : "s", model.boundary->GetCount(),

@@ -126,17 +126,18 @@ class ScriptConversion final : public ConversionHost {
 // The result as a dictionary; an error as an exception.
 template <class Converted, class Conversion>
 py::dict convert(Result<Converted> (*work)(const Conversion&, ConversionHost&), const Conversion& conversion,
-                 const py::object& progress, auto fill) {
+                 const py::object& progress, std::string_view allowed, auto fill) {
   ScriptConversion host(progress);
   const Result<Converted> converted = work(conversion, host);
   if (!converted) {
-    const bool stopped = converted.error() == kConversionStopped;
-    const bool isOfFiles = !std::filesystem::exists(conversion.in) ||
-                           (!conversion.force && std::filesystem::exists(conversion.out));
-    throw Refusal{stopped     ? kStopped
-                  : isOfFiles ? kFileError
-                              : kWrongValue,
-                  converted.error(), conversion.in};
+    if (converted.error() == kConversionStopped) throw Refusal{kStopped, converted.error(), conversion.in};
+    if (!std::filesystem::exists(conversion.in))
+      throw fileRefusal(conversion.in, converted.error(), "a file that is there");
+    if (!conversion.force && std::filesystem::exists(conversion.out))
+      throw fileRefusal(conversion.out, converted.error(), kNewFile);
+    Refusal wrong = fileRefusal(conversion.in, converted.error(), allowed);
+    wrong.kind = kWrongValue;
+    throw wrong;
   }
   py::dict result;
   result["summary"] = textObject(converted->summary);
@@ -146,23 +147,25 @@ py::dict convert(Result<Converted> (*work)(const Conversion&, ConversionHost&), 
 }
 
 py::dict raster(RasterConversion conversion, const py::object& progress) {
-  return convert(convertRaster, conversion, progress, [](py::dict& result, const ConvertedRaster& made) {
-    result["points"] = py::make_tuple(made.points[0], made.points[1]);
-    result["spacing"] = py::make_tuple(made.spacing[0], made.spacing[1]);
-    result["first"] = py::make_tuple(made.first[0], made.first[1]);
-    result["rotation"] = made.rotation;
-    result["missing"] = made.missing;
-  });
+  return convert(convertRaster, conversion, progress, "a raster, and options that make a map of it",
+                 [](py::dict& result, const ConvertedRaster& made) {
+                   result["points"] = py::make_tuple(made.points[0], made.points[1]);
+                   result["spacing"] = py::make_tuple(made.spacing[0], made.spacing[1]);
+                   result["first"] = py::make_tuple(made.first[0], made.first[1]);
+                   result["rotation"] = made.rotation;
+                   result["missing"] = made.missing;
+                 });
 }
 
 py::dict series(SeriesConversion conversion, const py::object& progress) {
-  return convert(convertSeries, conversion, progress, [](py::dict& result, const ConvertedSeries& made) {
-    result["items"] = made.items;
-    result["steps"] = made.steps;
-    result["equidistant"] = made.equidistant;
-    result["first"] = made.first;
-    result["last"] = made.last;
-  });
+  return convert(convertSeries, conversion, progress, "a text, and options that make a time series of it",
+                 [](py::dict& result, const ConvertedSeries& made) {
+                   result["items"] = made.items;
+                   result["steps"] = made.steps;
+                   result["equidistant"] = made.equidistant;
+                   result["first"] = made.first;
+                   result["last"] = made.last;
+                 });
 }
 
 }  // namespace

@@ -57,7 +57,7 @@ template <class Real>
 py::array readStep(const TsbFile& file, int item, std::size_t step) {
   auto values = std::make_unique<std::vector<Real>>(file.definition().pointCount());
   if (const Outcome read = file.read(static_cast<std::size_t>(item), step, std::span<Real>(*values)); !read)
-    throw Refusal{kFileError, read.error(), file.path()};
+    throw fileRefusal(file.path(), read.error(), kReadableData);
   return arrayOver(std::move(values), shapeOf(file.definition()));
 }
 
@@ -66,13 +66,13 @@ py::array readAll(const TsbFile& file, int item) {
   const TsbDefinition& definition = file.definition();
   auto values = std::make_unique<std::vector<Real>>(definition.pointCount() * definition.time.count);
   if (const Outcome read = file.readSteps(static_cast<std::size_t>(item), 0, std::span<Real>(*values)); !read)
-    throw Refusal{kFileError, read.error(), file.path()};
+    throw fileRefusal(file.path(), read.error(), kReadableData);
   return arrayOver(std::move(values), shapeOf(definition, definition.time.count));
 }
 
 TsbFile openFile(const std::string& path) {
   Result<TsbFile> opened = TsbFile::open(path);
-  if (!opened) throw Refusal{kFileError, opened.error(), path};
+  if (!opened) throw fileRefusal(path, opened.error(), kReadableData);
   return std::move(*opened);
 }
 
@@ -136,7 +136,8 @@ class NewGrid {
       throw refuse("spacing", fmt::format("{}, {}", spacing[0], spacing[1]), "two numbers above 0 (m)");
     if (!(timeStep > 0)) throw refuse("time_step", fmt::format("{}", timeStep), "a number above 0 (s)");
     const Result<const QunItem*> quantity = itemTypeOfText(itemType, "gridbay_setup.item_types() lists them");
-    if (!quantity) throw Refusal{kWrongValue, "item_type: " + quantity.error(), "item_type", itemType};
+    if (!quantity)
+      throw refusal(kWrongValue, "item_type", "\"" + itemType + "\"", "a quantity. " + quantity.error());
     if ((*quantity)->code == item::kBathymetry && !land)
       throw refuse("land", "None", "a number for a bathymetry: points at or above it are land");
     definition_.time.type = TsbTimeAxisType::relativeEquidistant;
@@ -173,18 +174,19 @@ class NewGrid {
 
   void save(const std::string& path, const std::string& title, const std::string& history, bool force) {
     if (const Outcome free = mayWrite(path, force, {}, "force=True"); !free)
-      throw Refusal{kFileError, free.error(), path};
+      throw fileRefusal(path, free.error(), kNewFile);
     definition_.title = title;
     definition_.history = historyWith({}, history);
     Result<TsbWriter> writer = TsbWriter::create(path, definition_);
-    if (!writer) throw Refusal{kFileError, writer.error(), path};
+    if (!writer) throw fileRefusal(path, writer.error(), kWritableFile);
     const std::size_t points = definition_.pointCount();
     for (std::size_t step = 0; step < definition_.time.count; ++step) {
       const std::span<const float> values(values_.data() + step * points, points);
       if (const Outcome written = writer->write(1, step, values); !written)
-        throw Refusal{kFileError, written.error(), path};
+        throw fileRefusal(path, written.error(), kWritableFile);
     }
-    if (const Outcome written = writer->commit(); !written) throw Refusal{kFileError, written.error(), path};
+    if (const Outcome written = writer->commit(); !written)
+      throw fileRefusal(path, written.error(), kWritableFile);
   }
 
  private:

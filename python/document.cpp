@@ -2,12 +2,12 @@
 #include <pybind11/pybind11.h>
 #include <pybind11/stl.h>
 
+#include <array>
 #include <memory>
 #include <string>
 #include <unordered_map>
 #include <vector>
 
-#include "basic/bathymetry.h"
 #include "basic/boundary.h"
 #include "core/edition.h"
 #include "core/kdl_writer.h"
@@ -16,6 +16,7 @@
 #include "python/keyword_list.h"
 #include "setup/dlg_enumerator.h"
 #include "setup/member_keyword.h"
+#include "setup/new_setup.h"
 #include "setup/setup_file.h"
 #include "setup/setup_path.h"
 
@@ -24,8 +25,35 @@ namespace py = pybind11;
 
 namespace {
 
-// The highest number that an item of a list can have.
-constexpr int kMostItems = 65535;
+constexpr const char* kAreas =
+    "a grid file, and for a nested one (file, (J, K)) or (file, (J, K), number of an area before it)";
+
+}  // namespace
+
+template <>
+struct Taken<NewArea> {
+  static constexpr const char* kName = "str | tuple";
+  static NewArea from(const Given& given) {
+    if (!py::isinstance<py::tuple>(given.value)) return {fileGiven(given.value, given.path)};
+    const std::vector<py::object> pieces = piecesOf(given.value, given.path, kAreas);
+    if (pieces.empty() || pieces.size() > 3)
+      throw refusal(kWrongValue, given.path, shown(given.value), kAreas);
+    NewArea area{fileGiven(pieces[0], given.path)};
+    if (pieces.size() > 1) {
+      const auto [j, k] =
+          Taken<std::array<int, 2>>::from({given.argument, given.self, pieces[1], given.path});
+      area.origin = GridPoint{j, k};
+    }
+    if (pieces.size() > 2) area.enclosing = wholeOf(pieces[2], given.path);
+    return area;
+  }
+  static std::string fileGiven(py::handle value, const std::string& path) {
+    if (value.is_none()) throw refusal(kWrongType, path, shown(value), kAreas);
+    return fileOf(value, path);
+  }
+};
+
+namespace {
 
 // The paths of all keywords below a section, in order; of several sections of a name the n-th is "name[n]".
 void listKeywords(const Node& section, const std::string& prefix, std::vector<std::string>& paths) {
@@ -58,10 +86,22 @@ class Document {
   static std::unique_ptr<Document> open(const std::string& path) {
     auto document = std::make_unique<Document>();
     Result<SetupFile> opened = SetupFile::open(path, &document->said_);
-    if (!opened) throw Refusal{kFileError, opened.error(), path};
+    if (!opened) throw fileRefusal(path, opened.error(), kReadableSetup);
     document->setup_ = std::move(*opened);
     document->path_ = absolutePath(path, {});
     return document;
+  }
+
+  static std::unique_ptr<Document> withAreas(const std::vector<NewArea>& areas) {
+    auto document = std::make_unique<Document>();
+    const std::optional<AreaFault> fault = layAreas(document->setup_.model(), areas);
+    if (!fault) return document;
+    const std::string file = fault->area == 0 ? "" : areas[fault->area - 1].file;
+    if (fault->isOfFile) throw fileRefusal(file, fault->text, kReadableGrid);
+    throw refusal(
+        kWrongValue, "new(areas)",
+        fault->area == 0 ? fmt::format("{} areas", areas.size()) : fmt::format("area {}", fault->area),
+        fmt::format("{}. {}", kAreas, fault->text));
   }
 
   std::unique_ptr<Document> copy() {
@@ -79,7 +119,8 @@ class Document {
   bool isSame(Document& other) { return setup_.model().SameState(other.setup_.model()); }
 
   void save(const std::string& path) {
-    if (const Outcome saved = setup_.save(path); !saved) throw Refusal{kFileError, saved.error(), path};
+    if (const Outcome saved = setup_.save(path); !saved)
+      throw fileRefusal(path, saved.error(), kWritableFile);
     path_ = absolutePath(path, {});
   }
 
@@ -101,36 +142,29 @@ class Document {
       return objectOf(keyword->node(), keyword->takesAnyNumber());
     const KvsHandle tree = isOption(path) ? nullptr : setup_.tree(path_);
     const Result<const Node*> found = findPath(tree == nullptr ? setup_.source() : *tree, path);
-    if (!found) throw Refusal{kPathError, found.error(), path};
-    if ((*found)->isSection())
-      throw Refusal{kPathError, fmt::format("\"{}\" is a section; name a keyword in it", path), path};
+    if (!found) throw wrongPath(path, found.error(), path);
+    if ((*found)->isSection()) throw wrongPath(path, aSection(path), path, "a keyword in it");
     return objectOf(**found, false);
   }
 
   void set(const std::string& path, const py::object& given) {
+    // To look at what is given runs the script, which may change the setup: the keyword is found anew then.
     ParameterTree keeper;
     if (isOption(path)) {
-      const Result<const Node*> keyword = findPath(setup_.source(), path);
-      if (!keyword) throw Refusal{kPathError, keyword.error(), path, shown(given)};
-      if ((*keyword)->isSection()) throw aSection(path, given);
-      const std::vector<Value> values = valuesOf(given, **keyword, false, path, keeper);
-      setup_.replaceSource(withValues(setup_.source(), *keyword, values));
+      KvsFile now;
+      const Node& option = optionAt(path, given);
+      kvsAddKeyword(now, option.name());
+      for (const Value& value : option.values()) now.add(value.kind(), value.text());
+      const std::vector<Value> values = valuesOf(given, *now.tree().root().first(), false, path, keeper);
+      setup_.replaceSource(withValues(setup_.source(), &optionAt(path, given), values));
       return;
     }
-    Result<MemberKeyword> keyword = findKeyword(setup_.model(), path, path_);
-    if (!keyword) {
-      const KvsHandle tree = setup_.tree(path_);
-      const Result<const Node*> found = findPath(*tree, path);
-      if (found && (*found)->isSection()) throw aSection(path, given);
-      throw Refusal{kPathError,
-                    fmt::format("{} ({} was given)", found ? keyword.error() : found.error(), shown(given)),
-                    path, shown(given)};
-    }
-    const std::vector<Value> values =
-        valuesOf(given, keyword->node(), keyword->takesAnyNumber(), path, keeper);
-    if (keyword->set(values)) return;
-    const std::string stays = shownValues(keyword->node());
-    const std::string allowed = keyword->allowed(values);
+    const MemberKeyword now = keywordAt(path, given);
+    const std::vector<Value> values = valuesOf(given, now.node(), now.takesAnyNumber(), path, keeper);
+    MemberKeyword keyword = keywordAt(path, given);
+    if (keyword.set(values)) return;
+    const std::string stays = shownValues(keyword.node());
+    const std::string allowed = keyword.allowed(values);
     throw Refusal{
         kWrongValue,
         fmt::format("{} cannot be {} here: it stays {}; allowed is {}", path, shown(given), stays, allowed),
@@ -140,8 +174,15 @@ class Document {
   // Whether a path leads to a section or keyword of the model; of a name that is both, `section` asks for the
   // section.
   bool has(const std::string& path, bool section) {
+    const std::string name(withoutTarget(path));
     PathAccess look{.what = PathAccess::What::look, .onlySections = section};
-    return setup_.model().AccessPath(withoutTarget(path), look) && look.isSection == section;
+    if (!setup_.model().AccessPath(name, look) || look.isSection != section) return false;
+    if (!section) return true;
+    // A look passes what a file of another model may have.
+    const KvsHandle scratch = kvsCreate();
+    PathAccess write{
+        .what = PathAccess::What::write, .out = scratch.get(), .documentPath = &path_, .onlySections = true};
+    return setup_.model().AccessPath(name, write);
   }
 
   // How many items a list has whose sections are `name` with {} for the number, which counts from 1.
@@ -149,12 +190,12 @@ class Document {
     const auto isThere = [&](int number) { return has(fmt::format(fmt::runtime(name), number), true); };
     int there = 0;
     int step = 1;
-    while (there + step <= kMostItems && isThere(there + step)) {
+    while (isThere(there + step)) {
       there += step;
       step *= 2;
     }
     for (; step > 0; step /= 2) {
-      if (there + step <= kMostItems && isThere(there + step)) there += step;
+      if (isThere(there + step)) there += step;
     }
     return there;
   }
@@ -170,30 +211,44 @@ class Document {
   std::string text(const std::string& section) {
     const KvsHandle tree = setup_.tree(path_);
     const Result<std::string> text = section.empty() ? tree->text() : kdlText(sectionIn(*tree, section));
-    if (!text) throw Refusal{kFileError, text.error(), section};
+    if (!text) throw fileRefusal(section, text.error(), "what a file can hold");
     return *text;
   }
 
   // Open boundaries as they follow from the first area's grid, and its projection.
   int detectBoundaries() {
-    CGlobalKvs& model = setup_.model();
-    std::string projection;
-    int coriolis = 0;
-    model.bathymetry->GetProjection(&projection, &coriolis);
-    model.boundary->RecalculateBoundaries();
-    return model.boundary->GetCount();
+    followFirstGrid(setup_.model());
+    return setup_.model().boundary->GetCount();
   }
 
  private:
-  static Refusal aSection(const std::string& path, const py::object& given) {
-    return {kPathError,
-            fmt::format("\"{}\" is a section; name a keyword in it ({} was given)", path, shown(given)), path,
-            shown(given)};
+  const Node& optionAt(const std::string& path, const py::object& given) const {
+    const Result<const Node*> option = findPath(setup_.source(), path);
+    if (!option) throw wrongPath(path, option.error(), shown(given));
+    if ((*option)->isSection()) throw wrongPath(path, aSection(path), shown(given), "a keyword in it");
+    return **option;
+  }
+  MemberKeyword keywordAt(const std::string& path, const py::object& given) {
+    Result<MemberKeyword> keyword = findKeyword(setup_.model(), path, path_);
+    if (keyword) return std::move(*keyword);
+    const KvsHandle tree = setup_.tree(path_);
+    const Result<const Node*> found = findPath(*tree, path);
+    if (found && (*found)->isSection())
+      throw wrongPath(path, aSection(path), shown(given), "a keyword in it");
+    throw wrongPath(path, found ? keyword.error() : found.error(), shown(given), "a keyword that can be set");
+  }
+  static std::string aSection(const std::string& path) { return fmt::format("\"{}\" is a section", path); }
+  // The fault names the path; what was given is another thing where it is to be set.
+  static Refusal wrongPath(const std::string& path, const std::string& fault, const std::string& given,
+                           const std::string& allowed = "a keyword that the setup has") {
+    const std::string gave = given == path ? "" : fmt::format(" ({} was given)", given);
+    return {kPathError, fmt::format("{}{}; allowed is {}", fault, gave, allowed), path, given, allowed};
   }
   // The section of a path, though a keyword may have the same name.
   static const Node& sectionIn(const KvsFile& tree, const std::string& section) {
     const Result<const Node*> found = findPath(tree, section);
-    if (!found) throw Refusal{kPathError, found.error(), section};
+    constexpr const char* kAllowed = "a section that the setup has";
+    if (!found) throw wrongPath(section, found.error(), section, kAllowed);
     if ((*found)->isSection()) return **found;
     const std::size_t slash = section.rfind('/');
     const Result<const Node*> parent = findPath(tree, slash == section.npos ? "" : section.substr(0, slash));
@@ -201,7 +256,7 @@ class Document {
     const Node* own =
         parent ? (*parent)->section(name, static_cast<std::uint32_t>(std::max(number, 0))) : nullptr;
     if (own == nullptr)
-      throw Refusal{kPathError, fmt::format("\"{}\" is a keyword, not a section", section), section};
+      throw wrongPath(section, fmt::format("\"{}\" is a keyword, not a section", section), section, kAllowed);
     return *own;
   }
 
@@ -242,6 +297,10 @@ void addDocument(py::module_& module) {
   addFunction(
       module, "open", [](std::string path) { return py::object(py::cast(Document::open(path))); }, {file},
       "Reads a setup.");
+  addFunction(
+      module, "new",
+      [](std::vector<NewArea> areas) { return py::object(py::cast(Document::withAreas(areas))); },
+      {{"areas"}}, "A new setup with the defaults, over grids.");
 }
 
 // Tuples, as little more than the making of the package reads them.

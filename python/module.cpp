@@ -13,6 +13,11 @@ Refusal refusal(std::string_view kind, const std::string& path, const std::strin
   return {kind, fmt::format("{}: {} was given; allowed is {}", path, given, allowed), path, given, allowed};
 }
 
+Refusal fileRefusal(const std::string& path, const std::string& fault, std::string_view allowed) {
+  return {kFileError, fmt::format("{}; allowed is {}", fault, allowed), path, "\"" + path + "\"",
+          std::string(allowed)};
+}
+
 std::string shown(py::handle value) {
   constexpr std::size_t kMost = 200;
   std::string text;
@@ -48,7 +53,8 @@ void fill(py::module_& module) {
   addDocument(module);
   addConversions(module);
   addDataFiles(module);
-  addExportedClasses(module);
+  addFloodModels(module);
+  addClimateChange(module);
   addKeywordList(module);
 }
 

@@ -5,6 +5,7 @@
 #include "basic/boundary.h"
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
+#include "core/item_rows.h"
 #include "gridbay_setup/flood_models.h"
 #include "hydrodynamic/boundary.h"
 #include "hydrodynamic/eddy_viscosity.h"
@@ -26,12 +27,13 @@ auto& onlyEntry(auto& list) {
   return list.at(1);
 }
 
+static_assert(kMostObjects == kMostItems, "a script makes as many as the editor");
+
 // Objects by the thousand million would take all memory there is, and with it the calling program.
 void refuseHugeCount(int count, const char* what) {
-  constexpr int kMost = 100000;
-  if (count > kMost)
-    throw std::invalid_argument("There may be " + std::to_string(kMost) + " " + what + " at most, not " +
-                                std::to_string(count));
+  if (count > kMostObjects)
+    throw std::invalid_argument("There may be " + std::to_string(kMostObjects) + " " + what +
+                                " at most, not " + std::to_string(count));
 }
 
 std::uint32_t itemNumber(int number) {
@@ -357,8 +359,8 @@ void FloodModel::AddOutput_MapsAndTimeSeriesJK(int type, int useSubArea, int fir
                                                std::string title, std::vector<int> items) {
   const auto guard = model_->lock();
   appendOutput(*model_, {type, useSubArea, firstJ, firstK, lastJ, lastK, std::move(pointsJ),
-                         std::move(pointsK), usePeriod, modelTime(firstDate), modelTime(lastDate),
-                         timeStepFrequency, std::move(fileName), std::move(title), std::move(items)});
+                         std::move(pointsK), usePeriod, firstDate, lastDate, timeStepFrequency,
+                         std::move(fileName), std::move(title), std::move(items)});
   tellUnsupported(*model_, type);
 }
 
@@ -373,37 +375,13 @@ void FloodModel::GetNextOutputs_MapsJKAndTS(OutputPosition& position, int& type,
                                             DateTime& lastDate, int& timeStepFrequency, std::string& fileName,
                                             std::string& title, std::vector<int>& items) {
   const auto guard = model_->lock();
-  FloodOutput output{type,
-                     useSubArea,
-                     firstJ,
-                     firstK,
-                     lastJ,
-                     lastK,
-                     pointsJ,
-                     pointsK,
-                     usePeriod,
-                     modelTime(firstDate),
-                     modelTime(lastDate),
-                     timeStepFrequency,
-                     {},
-                     {},
-                     {}};
-  readOutput(*model_, position, output);
-  type = output.type;
-  useSubArea = output.useSubArea;
-  firstJ = output.firstJ;
-  firstK = output.firstK;
-  lastJ = output.lastJ;
-  lastK = output.lastK;
-  pointsJ = std::move(output.pointsJ);
-  pointsK = std::move(output.pointsK);
-  usePeriod = output.usePeriod;
-  firstDate = scriptTime(output.firstDate);
-  lastDate = scriptTime(output.lastDate);
-  timeStepFrequency = output.frequency;
-  fileName = std::move(output.fileName);
-  title = std::move(output.title);
-  items = std::move(output.items);
+  auto outputs = std::tie(type, useSubArea, firstJ, firstK, lastJ, lastK, pointsJ, pointsK, usePeriod,
+                          firstDate, lastDate, timeStepFrequency, fileName, title, items);
+  FloodOutput output;
+  output.fields() = outputs;
+  const int found = readOutput(*model_, position, output);
+  outputs = output.fields();
+  tellUnsupported(*model_, found);
 }
 
 void FloodModel::ClearHDResultOutputs() {

@@ -76,13 +76,13 @@ CNhdResultObjectKvs& appendOutput(ScriptedModel& model, const FloodOutput& given
     const auto stepOf = [&simulation](DateTime moment) {
       return wholeSteps(wholeSeconds(simulation.start, moment), double{simulation.timeStepInterval});
     };
-    output.steps.first = stepOf(given.firstDate);
-    output.steps.last = stepOf(given.lastDate);
+    output.steps.first = stepOf(modelTime(given.firstDate));
+    output.steps.last = stepOf(modelTime(given.lastDate));
   }
   return output;
 }
 
-void readOutput(ScriptedModel& model, scripting::OutputPosition& position, FloodOutput& given) {
+int readOutput(ScriptedModel& model, scripting::OutputPosition& position, FloodOutput& given) {
   const CSimulationPeriodKvs& simulation = *model.root.simulationPeriod;
   auto& outputs = model.root.nhdResult->outputs;
   const CNhdResultObjectKvs& output = outputs.at(position.number);
@@ -91,12 +91,14 @@ void readOutput(ScriptedModel& model, scripting::OutputPosition& position, Flood
   given.fileName = output.file.text();
   given.title = output.title;
   given.items = output.items;
-  if (output.type == CNhdResultObjectKvs::kPoints) {
-    given.type = kPointsType;
+  const int type = output.type == CNhdResultObjectKvs::kMap      ? kMapType
+                   : output.type == CNhdResultObjectKvs::kPoints ? kPointsType
+                                                                 : kNoType;
+  if (type != kNoType) given.type = type;
+  if (type == kPointsType) {
     given.pointsJ = output.pointsJ;
     given.pointsK = output.pointsK;
-  } else if (output.type == CNhdResultObjectKvs::kMap) {
-    given.type = kMapType;
+  } else if (type == kMapType) {
     const bool isWhole =
         isWholeGrid(output, model.root.bathymetry->GetItem(CNhdResultObjectKvs::kAreaNumber));
     given.useSubArea = isWhole ? 0 : 1;
@@ -107,8 +109,6 @@ void readOutput(ScriptedModel& model, scripting::OutputPosition& position, Flood
       given.lastK = output.part.y.last;
     }
   }
-  const bool isSupported =
-      output.type == CNhdResultObjectKvs::kPoints || output.type == CNhdResultObjectKvs::kMap;
 
   const bool isAllSteps =
       output.steps.first == 0 && output.steps.last == simulation.LastTimeStep() && output.steps.interval == 1;
@@ -119,10 +119,10 @@ void readOutput(ScriptedModel& model, scripting::OutputPosition& position, Flood
       return simulation.start.plusDays(std::trunc(double{seconds}) / kSecondsOfDay);
     };
     given.frequency = output.steps.interval;
-    given.firstDate = momentOf(output.steps.first);
-    given.lastDate = momentOf(output.steps.last);
+    given.firstDate = scriptTime(momentOf(output.steps.first));
+    given.lastDate = scriptTime(momentOf(output.steps.last));
   }
-  if (!isSupported) model.show(kUnsupportedType);
+  return type;
 }
 
 }  // namespace gridbay

@@ -86,8 +86,8 @@ void UrbanFlooding_V27Flowmodel::AddOutput_MapsAndTimeSeries(
   // One list alone, which is no point: callers rely on point outputs being of point (0, 0).
   if (type == kPoints) output.pointsJ = {static_cast<double>(output.firstK)};
   output.usePeriod = usePeriod;
-  output.firstDate = modelTime(firstDate);
-  output.lastDate = modelTime(lastDate);
+  output.firstDate = firstDate;
+  output.lastDate = lastDate;
   output.fileName = std::move(fileName);
   output.title = std::move(title);
   USubLine& steps = appendOutput(*model_, output).steps;

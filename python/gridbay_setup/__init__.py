@@ -12,7 +12,7 @@ All keywords of all parts are attributes, in small letters with underscores, and
 the file; lists count from 1. `help(type(setup.hydrodynamic.resistance))` tells what a section has, with units and
 defaults. Values are in the base units of the file. Errors are exceptions of `gridbay_setup.errors`.
 
-One setup is not to be used from two threads at a time; different ones may be.
+Different setups may be used from different threads; what comes of one that several use is told by `help(Setup)`.
 """
 
 from __future__ import annotations

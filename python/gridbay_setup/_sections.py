@@ -296,7 +296,8 @@ class Sub(Field, Generic[S]):
 
     def __set__(self, section: Section, value: Any) -> None:
         path = section._at(self.name)
-        raise PathError(f"{path} is a section; set a keyword in it ({value!r} was given)", path, repr(value))
+        raise PathError(f"{path} is a section ({value!r} was given); allowed is to set a keyword in it", path, repr(value),
+                        "to set a keyword in it")  # fmt: skip
 
 
 class ListOf(Field, Generic[S]):
@@ -322,8 +323,8 @@ class ListOf(Field, Generic[S]):
 
     def __set__(self, section: Section, value: Any) -> None:
         path = section._at(self.name.format("n"))
-        raise PathError(f"{path} is a list; resize it and set keywords of its items ({value!r} was given)", path,
-                        repr(value))  # fmt: skip
+        raise PathError(f"{path} is a list ({value!r} was given); allowed is to resize it, and to set keywords of its "
+                        "items", path, repr(value), "to resize it, and to set keywords of its items")  # fmt: skip
 
 
 class Items(Generic[S]):

@@ -44,7 +44,12 @@ class Message:
 
 
 class Setup(Model):
-    """A setup with all that it holds as attributes, and by path: setup["MODULE/SECTION/Keyword"]."""
+    """A setup with all that it holds as attributes, and by path: setup["MODULE/SECTION/Keyword"].
+
+    Different setups may be used from different threads. In one that several threads use, each reading and setting
+    of a keyword, each check and each save is done as a whole, one after the other; what two threads set is a mixture
+    of both, and a list may be shorter than it was when it was counted.
+    """
 
     __slots__ = ()
 
@@ -79,8 +84,8 @@ class Setup(Model):
         there is replaced, whole or not at all."""
         target = file_name(path, "save(path)") if path is not None else self.file
         if not target:
-            raise WrongValue("save: no path was given, and the setup has no file yet; allowed is the path of a "
-                             f"file *.{self.kind}", "path", "None", f"*.{self.kind}")  # fmt: skip
+            raise WrongValue("save(path): None was given, and the setup has no file yet; allowed is a file "
+                             f"*.{self.kind}", "save(path)", "None", f"*.{self.kind}")  # fmt: skip
         if _kind_of(target) != self.kind:
             raise WrongValue(f"{target}: a file of another kind was given; allowed is *.{self.kind}", target,
                              _kind_of(target), f"*.{self.kind}")  # fmt: skip
@@ -131,28 +136,11 @@ def new(
 
     kind: "v27" or "v27wsk", the edition. areas: the grid files, outermost first; a nested one as (file, (J, K)),
     the point of the enclosing grid that holds its first point, or (file, (J, K), number of the enclosing area),
-    which is the area before it otherwise. With areas, open boundaries and projection follow from the first one.
+    which is the area before it otherwise; with them the projection and the open boundaries that follow from the first
+    one. A place that cannot be is a WrongValue, a file that is no grid a FileError.
     start: of the simulation; time_step: s; time_steps: how many.
     """
-    setup = Setup(_edition_of(kind, "new(kind)", "{!r}").Document(), "")
-    if isinstance(areas, (str, os.PathLike)) or not isinstance(areas, Iterable):
-        raise WrongType(f"new(areas): {areas!r} ({type(areas).__name__}) was given; allowed is a list of grids",
-                        "new(areas)", repr(areas), "a list of grids")  # fmt: skip
-    given: list[Any] = list(areas)
-    bathymetry = setup.nested_model_globals.bathymetry_selection
-    if given:
-        bathymetry.areas.resize(len(given))
-    for number, area in enumerate(given, 1):
-        file, *where = area if isinstance(area, tuple) else (area,)
-        if number > 1 and not where:
-            raise WrongValue(f"areas: area {number} lies in another; allowed is ({file!r}, (J, K))", "areas",
-                             repr(area), "(file, (J, K))")  # fmt: skip
-        target = bathymetry.areas[number]
-        target.data_file.file_name = os.path.abspath(file_name(file, f"new(areas), area {number}"))
-        if where:
-            target.origin = where[0]
-        if number > 1:
-            target.enclosing_area = where[1] if len(where) > 1 else number - 1
+    setup = Setup(_edition_of(kind, "new(kind)", "{!r}").new(areas), "")
     period = setup.nested_model_globals.simulation_period
     if start is not None:
         period.start_time = start
@@ -160,6 +148,4 @@ def new(
         period.time_step_interval = time_step
     if time_steps is not None:
         period.number_of_timesteps = time_steps
-    if given:
-        setup.detect_boundaries()
     return setup

@@ -167,6 +167,40 @@ TEST_F(EnsembleMaking, AMemberIsWhatSetAndASaveThereMake) {
   EXPECT_THAT(memberText("s"), HasSubstr("\"own.tsb2\""));
 }
 
+TEST_F(EnsembleMaking, MembersThatMakeTheSameFileAreTold) {
+  const std::string maps = kOutput + "OUTPUT_AREA_1/File_Name";
+  const std::string points = kOutput + "OUTPUT_AREA_2/File_Name";
+  const auto warned = [&](const std::string& table) {
+    const Result<EnsembleResult> made = make(table, true);
+    EXPECT_TRUE(made) << made.error();
+    std::vector<std::string> notes;
+    for (const MemberReport& member : made->members) {
+      for (const std::string& note : member.notes) notes.push_back(member.name + ": " + note);
+      EXPECT_TRUE(member.error.empty());
+    }
+    return std::pair(made->warnings, notes);
+  };
+  const auto none = std::pair(std::vector<std::string>(), std::vector<std::string>());
+  EXPECT_EQ(warned("name," + kDrying + "\na,0.01\nb,0.02\n"), none);
+  EXPECT_EQ(warned("name," + maps + "\na,a.tsb2\nb,b.tsb2\n"), none);
+  // The same one by another spelling, and one that two of three have.
+  const std::string same = folder.file("out/same.tsb2");
+  const std::string two = folder.file("out/two.tsb2");
+  const auto [warnings, notes] = warned(
+      "name," + maps + "," + points + "\na,same.tsb2,two.tsb2\nb,./x/../same.tsb2,two.tsb2\nc,same.tsb2,\n");
+  EXPECT_THAT(warnings,
+              ElementsAre("all 3 members make \"" + same + "\": each run replaces what another one made",
+                          "2 members (a, b) make \"" + two + "\": each run replaces what another one made"));
+  EXPECT_THAT(notes, ElementsAre("a: Warning: 2 other members make \"" + same + "\", too",
+                                 "a: Warning: 1 other member makes \"" + two + "\", too",
+                                 "b: Warning: 2 other members make \"" + same + "\", too",
+                                 "b: Warning: 1 other member makes \"" + two + "\", too",
+                                 "c: Warning: 2 other members make \"" + same + "\", too"));
+  EXPECT_THAT(textOf(folder.file("out/report.csv")), HasSubstr("1 other member makes"));
+  EXPECT_EQ(nlohmann::json::parse(textOf(folder.file("out/report.json")))[2]["notes"][0],
+            "Warning: 2 other members make \"" + same + "\", too");
+}
+
 TEST_F(EnsembleMaking, TheReportsSayWhatAValidationOfEachFileSays) {
   const Result<EnsembleResult> made =
       make("name," + kDrying + "," + kGrid + "\nwell,,\ndry,-1,\naway,,none.tsb2\n");
@@ -373,6 +407,7 @@ TEST(MemberReport, ComesThroughAsItIs) {
   MemberReport report;
   report.error = "why\n";
   report.notes = {"one", std::string("t\0wo", 4)};
+  report.results = {"/out/a.tsb2", ""};
   report.faults = 3;
   report.messages = {{PageId::floodAndDry, "12:a\xFF;", Severity::dependedUpon},
                      {PageId::bathymetry, "", Severity::fault}};
@@ -380,6 +415,7 @@ TEST(MemberReport, ComesThroughAsItIs) {
   unpack(packed(report), other);
   EXPECT_EQ(other.error, report.error);
   EXPECT_EQ(other.notes, report.notes);
+  EXPECT_EQ(other.results, report.results);
   EXPECT_EQ(other.faults, report.faults);
   EXPECT_EQ(other.messages, report.messages);
 }

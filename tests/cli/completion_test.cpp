@@ -1,6 +1,10 @@
-// What the tool says to a shell that asks how a command line can go on, and the script by which bash asks.
+// What the tool says to a shell that asks how a command line can go on, and the scripts by which shells ask.
 
 #include <gmock/gmock.h>
+
+#include <algorithm>
+#include <filesystem>
+#include <map>
 
 #include "core/edition.h"
 #include "tests/support/grids.h"
@@ -12,6 +16,8 @@ namespace cli_completion_test {
 
 using test::runTool;
 using ::testing::HasSubstr;
+using ::testing::Not;
+namespace fs = std::filesystem;
 using Words = std::vector<std::string>;
 
 class Completion : public ::testing::Test {
@@ -97,6 +103,37 @@ TEST_F(Completion, BashCompletesByTheScript) {
   EXPECT_EQ(completed("convert series --item-type 'Manning n'").out, "Manning\\ number\n");
   EXPECT_EQ(completed("validate ''").out, "\n");
   EXPECT_EQ(completed("validate ''").err, "");
+}
+
+// A shell that is not here can't read its script: what stands in it is looked at in any case.
+TEST_F(Completion, ScriptsOfOtherShells) {
+  const std::string tool = fs::path(test::toolPath()).filename().string();
+  std::string function = "_" + tool + "_complete";
+  std::ranges::replace(function, '-', '_');
+  const std::map<std::string, std::pair<std::string, Words>> shells{
+      {"zsh",
+       {"-n",
+        {"#compdef " + tool + "\n", function + "() {\n",
+         "\"${words[1]}\" complete-words \"${(@)words[2,CURRENT]}\"", "_describe -t words " + tool + " ended",
+         "\"$funcstack[1]\" = _" + tool + " ]; then " + function,
+         "compdef " + function + " " + tool + "; fi\n"}}},
+      {"fish",
+       {"--no-execute",
+        {"function " + function + "\n",
+         "($words[1] complete-words $words[2..-1] (commandline -ct) 2>/dev/null)",
+         "complete -c " + tool + " -f -a '(" + function + ")'\n"}}}};
+  for (const auto& [shell, script] : shells) {
+    const auto& [parseOnly, parts] = script;
+    const test::ProgramRun run = runTool({"completion", shell});
+    EXPECT_EQ(run.status, 0) << run.err;
+    for (const std::string& part : parts) EXPECT_THAT(run.out, HasSubstr(part));
+    for (const char* left : {"@tool@", "@ask@", "@function@"}) EXPECT_THAT(run.out, Not(HasSubstr(left)));
+    for (const char* pair : {"[]", "{}"})
+      EXPECT_EQ(std::ranges::count(run.out, pair[0]), std::ranges::count(run.out, pair[1])) << shell << pair;
+    if (test::runProgram("which", {shell}).status != 0) continue;
+    const test::ProgramRun parsed = test::runProgram(shell, {parseOnly, folder.write("script", run.out)});
+    EXPECT_EQ(parsed.status, 0) << parsed.err;
+  }
 }
 
 TEST_F(Completion, AShellThatIsNone) {

@@ -12,6 +12,7 @@
 #include <sstream>
 #include <thread>
 
+#include "cli/progress.h"
 #include "core/edition.h"
 #include "platform/side_by_side.h"
 #include "tests/support/grids.h"
@@ -25,6 +26,7 @@ namespace fs = std::filesystem;
 using test::ProgramRun;
 using test::runTool;
 using test::textOf;
+using ::testing::EndsWith;
 using ::testing::HasSubstr;
 using ::testing::StartsWith;
 
@@ -59,6 +61,32 @@ class Started {
 
 void waitFor(const std::function<bool()>& condition) {
   for (int i = 0; i < 1000 && !condition(); ++i) std::this_thread::sleep_for(std::chrono::milliseconds(10));
+}
+
+// What is told of a hundred pieces that take a time each.
+std::string toldOf(bool onTerminal, std::chrono::milliseconds each) {
+  std::ostringstream out;
+  std::ostringstream err;
+  const cli::Console console{out, err, {}};
+  std::chrono::steady_clock::time_point now;
+  {
+    cli::Progress progress(console, "Members", 100, onTerminal, [&now] { return now; });
+    for (std::size_t done = 1; done <= 100; ++done) {
+      now += each;
+      progress.reached(done);
+    }
+  }
+  EXPECT_EQ(out.str(), "");
+  return err.str();
+}
+
+TEST(Progress, IsALineThatIsWrittenOverOnATerminalAlone) {
+  using std::chrono::milliseconds;
+  EXPECT_EQ(toldOf(true, milliseconds(2)), "");
+  EXPECT_THAT(toldOf(true, milliseconds(100)), StartsWith("\rMembers 3 %\rMembers 4 %"));
+  EXPECT_THAT(toldOf(true, milliseconds(100)), EndsWith("\rMembers 100 %\n"));
+  EXPECT_EQ(toldOf(false, milliseconds(99)), "");
+  EXPECT_EQ(toldOf(false, milliseconds(400)), "Members 25 %\nMembers 50 %\nMembers 75 %\nMembers 100 %\n");
 }
 
 class Members : public ::testing::Test {
@@ -118,6 +146,18 @@ TEST_F(Members, AnEnsembleIsMadeAndReported) {
   EXPECT_EQ(run.status, 0);
   EXPECT_EQ(run.out, out + ": 1 member, 0 with faults; see " + out + "/report.csv\n");
   EXPECT_EQ(runTool({"get", out + "/well" + kKind, kDrying}).out, "0.02\n");
+}
+
+TEST_F(Members, ThatSeveralMakeTheSameFileIsAWarning) {
+  const std::string outputs = "HYDRODYNAMIC_MODULE/OUTPUT_SPECIFICATION/";
+  ASSERT_EQ(runTool({"set", base, outputs + "Number_Of_Output_areas=1"}).err, "");
+  const ProgramRun run =
+      runTool({"ensemble", table("name," + outputs + "OUTPUT_AREA_1/File_Name\na,maps.tsb2\nb,maps.tsb2\n"),
+               base, out});
+  EXPECT_NE(run.status, 2);
+  EXPECT_EQ(run.err, "Warning: all 2 members make \"" + out +
+                         "/maps.tsb2\": each run replaces what another one made\n");
+  EXPECT_THAT(textOf(out + "/report.csv"), HasSubstr("Warning: 1 other member makes"));
 }
 
 TEST_F(Members, AnEnsembleThatCannotBe) {

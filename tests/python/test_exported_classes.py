@@ -146,9 +146,9 @@ def test_a_count_of_boundaries_below_0_only_makes_them_user_specified(flood, tmp
 def test_counts_that_cannot_be(flood):
     flood.setNoOfSourceSink(1)
     path = "Flooding_V27FlowModel.{}(count)".format
-    refused(WrongValue, path("setNoOfSourceSink"), "-1", "0 to 100000", flood.setNoOfSourceSink, -1)
-    refused(WrongValue, path("setNoOfSourceSink"), "100001", "0 to 100000", flood.setNoOfSourceSink, 100001)
-    refused(WrongValue, path("setNoOfBndCondition"), "100001", "100000 or less", flood.setNoOfBndCondition, 100001)
+    refused(WrongValue, path("setNoOfSourceSink"), "-1", "0 to 65535", flood.setNoOfSourceSink, -1)
+    refused(WrongValue, path("setNoOfSourceSink"), "65536", "0 to 65535", flood.setNoOfSourceSink, 65536)
+    refused(WrongValue, path("setNoOfBndCondition"), "65536", "65535 or less", flood.setNoOfBndCondition, 65536)
     assert flood.getNoOfSourceSink() == 1 and flood.getNoOfBndConditions() == 0
 
 

@@ -1,6 +1,8 @@
 """The package as a whole: types, documentation, the example."""
 
+import ast
 import csv
+import inspect
 import pathlib
 import subprocess
 import sys
@@ -37,8 +39,41 @@ def test_types_of_package_and_example(tmp_path, monkeypatch):
 def test_the_stubs_are_those_of_the_modules(monkeypatch):
     monkeypatch.setenv("MYPYPATH", str(PACKAGE.parent))
     result = run("-m", "mypy.stubtest", "--allowlist", pathlib.Path(__file__).with_name("stubtest_allowlist.txt"),
-                 "gridbay_setup._flow_model", "gridbay_setup._wetland_sweep_kit")  # fmt: skip
+                 "gridbay_setup._flow_model", "gridbay_setup._wetland_sweep_kit", "gridbay_setup.model")  # fmt: skip
     assert result.returncode == 0, result.stdout + result.stderr
+
+
+def documented(stub):
+    """The docstring of each class, function, member and attribute of a stub, by its name; without the private."""
+    def within(body, prefix):
+        for node, after in zip(body, [*body[1:], None]):
+            if isinstance(node, (ast.ClassDef, ast.FunctionDef)):
+                yield prefix + node.name, ast.get_docstring(node)
+                yield from within(node.body if isinstance(node, ast.ClassDef) else [], f"{prefix}{node.name}.")
+            elif isinstance(node, ast.AnnAssign) and prefix:
+                text = after.value.value if isinstance(after, ast.Expr) else None
+                yield prefix + node.target.id, text and inspect.cleandoc(text)
+
+    tree = ast.parse((PACKAGE / stub).read_text(encoding="utf-8"))
+    return {name: text for name, text in within(tree.body, "") if not name.split(".")[-1].startswith("_")}
+
+
+def test_the_stubs_say_what_help_says():
+    model = documented("model.pyi")
+    kinds = {name: kind for name, kind in vars(gridbay_setup.model).items()
+             if isinstance(kind, type) and kind.__module__ == "gridbay_setup.model"}  # fmt: skip
+    told = {name: kind.__doc__ for name, kind in kinds.items()}
+    told |= {f"{name}.{field}": what.__doc__ for name, kind in kinds.items() for field, what in kind.fields().items()}
+    assert model == told
+    depth = model["NestedModelGlobalsFloodAndDry.drying_depth"]
+    assert "(m)" in depth and "0.02 in a new setup" in depth
+    native = documented("_flow_model.pyi")
+    assert [name for name, text in native.items() if not text] == []
+    assert native["Flooding_V27FlowModel.setHDBndCondition_Value"].startswith("Formulation 1 is a level in m")
+    assert native["_FloodMembers.setRain_Value"] == "Millimetres per day."
+    assert "run one after the other" in native["CClimateChange_V27"]
+    lines = sum(len((PACKAGE / stub).read_text().splitlines()) for stub in ("model.pyi", "_flow_model.pyi"))
+    assert lines < 10000
 
 
 def test_help_tells_units_and_defaults():

@@ -99,9 +99,9 @@ def test_paths_that_lead_nowhere(setup):
         with pytest.raises(KeyError) as caught:
             setup[path] = 4
         assert path in str(caught.value) and "4" in str(caught.value)
-    with pytest.raises(PathError, match="is a section; name a keyword in it"):
+    with pytest.raises(PathError, match="is a section.*; allowed is a keyword in it"):
         setup["HYDRODYNAMIC_MODULE/RESISTANCE"]
-    with pytest.raises(PathError, match=r"is a section; name a keyword in it \(1 \(int\) was given\)"):
+    with pytest.raises(PathError, match=r"is a section \(1 \(int\) was given\); allowed is a keyword in it"):
         setup["HYDRODYNAMIC_MODULE/RESISTANCE"] = 1
     with pytest.raises(WrongType, match="A path is a text"):
         setup[1]
@@ -114,6 +114,20 @@ def test_paths_that_lead_nowhere(setup):
     with pytest.raises(PathError, match="is a list"):
         setup.hydrodynamic.resistance.areas = []
     assert not hasattr(setup.hydrodynamic, "nowhere")
+
+
+def test_a_value_that_takes_away_what_it_is_for(setup, tmp_path):
+    boundaries = setup.nested_model_globals.open_boundary.boundaries
+
+    class Sly:
+        def __iter__(self):
+            boundaries.resize(0)
+            return iter((1, 2))
+
+    boundaries.resize(1)
+    with pytest.raises(PathError, match="BOUNDARY_1/First_Point"):
+        boundaries[1].first_point = Sly()
+    assert len(boundaries) == 0 and setup.validate() is not None
 
 
 def test_what_is_in_a_setup(setup):
@@ -189,7 +203,7 @@ def test_messages_are_objects(setup):
 
 def test_save_and_open(setup, tmp_path, kind):
     setup = gridbay_setup.new(kind)
-    with pytest.raises(WrongValue, match="no path was given"):
+    with pytest.raises(WrongValue, match="None was given, and the setup has no file yet"):
         setup.save()
     with pytest.raises(WrongValue, match=r"allowed is \*\." + kind):
         setup.save(tmp_path / "x.txt")
@@ -244,7 +258,7 @@ def test_copies_and_options(setup, tmp_path):
 
 
 def test_new_with_nested_areas(grid, tmp_path):
-    with pytest.raises(WrongValue, match="area 2 lies in another"):
+    with pytest.raises(WrongValue, match="Area 2 lies in another: say where"):
         gridbay_setup.new(areas=[grid, grid])
     setup = gridbay_setup.new(areas=[grid, (grid, (3, 4)), (grid, (5, 5), 1)])
     areas = setup.nested_model_globals.bathymetry_selection.areas
@@ -301,6 +315,16 @@ def test_every_keyword_has_an_attribute(source):
                         names(item)
 
     names(setup)
+
+
+@pytest.mark.parametrize("source", [each for each in FILLED if each.stem == "oxygen"], ids=str)
+def test_lists_of_the_ecological_model_end_where_it_does(source):
+    ecology = gridbay_setup.open(source).bio_rig
+    variables = ecology.state_variables.state_variables
+    assert len(variables) == ecology["STATE_VARIABLES/NoOfComponents"] < 100
+    with pytest.raises(RangeError, match=f"allowed is 1 to {len(variables)}"):
+        variables[len(variables) + 1]
+    assert len(ecology.output_specification.additional_optional_output.additional_items) < 100
 
 
 def test_keywords_numbered_higher_than_those_of_a_new_setup(setup):

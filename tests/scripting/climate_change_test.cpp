@@ -1,6 +1,8 @@
 #include <gtest/gtest.h>
 
+#include <array>
 #include <stdexcept>
+#include <thread>
 #include <type_traits>
 
 #include "advection_dispersion/advection_dispersion_parts.h"
@@ -487,6 +489,27 @@ TEST_F(ClimateChange, OutputsWithFolders) {
     outputs.at(2).file = name;
     EXPECT_EQ(climate.ResultOutputsHasAbsolutePath(), result) << name;
   }
+}
+
+TEST_F(ClimateChange, ObjectsInTwoThreads) {
+  const std::string source = folder.file("source.v27");
+  climate.flows().precipitation = 6;
+  ASSERT_EQ(climate.SaveFile(source), 1);
+  std::array<double, 2> values{};
+  const auto change = [&](std::size_t which) {
+    for (int i = 0; i < 4; ++i) {
+      CClimateChange_V27 own;
+      const std::string target = folder.file("target" + std::to_string(which) + ".v27");
+      if (own.OpenFile(source) != 1 || own.SetPrecValues(1, static_cast<double>(which) + 7) != 1) return;
+      own.SaveFile(target);
+      own.OpenFile(target);
+      own.GetPrecValues(1, values[which]);
+    }
+  };
+  std::thread beside(change, 0);
+  change(1);
+  beside.join();
+  EXPECT_EQ(values, (std::array<double, 2>{7, 8}));
 }
 
 TEST_F(ClimateChange, CopiesShareTheModel) {

@@ -334,7 +334,7 @@ TEST_F(FloodModelTest, BoundaryCount) {
 TEST_F(FloodModelTest, HugeCountsAreRefused) {
   constexpr int kHuge = std::numeric_limits<int>::max();
   EXPECT_THROW(flood.setNoOfBndCondition(kHuge), std::invalid_argument);
-  EXPECT_THROW(flood.setNoOfBndCondition(100001), std::invalid_argument);
+  EXPECT_THROW(flood.setNoOfBndCondition(scripting::kMostObjects + 1), std::invalid_argument);
   EXPECT_THROW(flood.setNoOfSourceSink(kHuge), std::invalid_argument);
   EXPECT_EQ(flood.getNoOfBndConditions() + flood.getNoOfSourceSink(), 0);
   EXPECT_EQ(flood.global("OPEN_BOUNDARY/Default_Position"), "1");
@@ -722,6 +722,14 @@ TEST_F(FloodModelTest, OutputsOfOtherShapesAreGivenBack) {
   EXPECT_EQ(line.area(), (std::array{-1, -1, -1, -1, -1}));
   EXPECT_EQ(line.frequency, 1);
   EXPECT_EQ(flood.shown, Strings{"Unsupported output type"});
+  // A message box that throws does so when the output has been given.
+  output.title = "a line";
+  ShowMessagesWith(flood, [](const std::string& text) { throw std::runtime_error(text); });
+  Given given;
+  OutputPosition position = flood.GetOutputsListHeadPos();
+  EXPECT_THROW(given.next(flood, position), std::runtime_error);
+  EXPECT_EQ(given.title, "a line");
+  EXPECT_FALSE(position);
 }
 
 TEST_F(FloodModelTest, CopiesShareTheModel) {

@@ -19,7 +19,7 @@
 // and say what was given and what is there:
 //   setCoarseBathymetryFile, getCoarseBathymetryFile   the model has no area
 //   setHDBndCondition_File, setBndCondition_File       the format has no item to take the number
-//   setNoOfBndCondition, setNoOfSourceSink             a count above 100000; nothing is changed
+//   setNoOfBndCondition, setNoOfSourceSink             a count above kMostObjects; nothing is changed
 //   GetNextOutputs_MapsJKAndTS                         no output is at the position
 //   SaveFile                                           the items of an output can't be saved (saturation
 //   last)
@@ -160,12 +160,11 @@ class [[gnu::visibility("default")]] FloodModel {
 
 [[gnu::visibility("default")]] void ShowMessagesWith(FloodModel& model, MessageBox show);
 
-// The whole interface, by grid points and numbers of data formats.
-class [[gnu::visibility("default")]] Flooding_V27FlowModel : public FloodModel {
+// What the two interfaces below have alike.
+class [[gnu::visibility("default")]] FloodMembers : public FloodModel {
  public:
-  Flooding_V27FlowModel() = default;
-  // Drives the model of an object of another class.
-  explicit Flooding_V27FlowModel(const FloodModel& other) : FloodModel(other) {}
+  FloodMembers(const FloodMembers&) = default;
+  FloodMembers& operator=(const FloodMembers&) = default;
 
   using FloodModel::GetFileExtension;
   using FloodModel::LoadFile;
@@ -182,14 +181,37 @@ class [[gnu::visibility("default")]] Flooding_V27FlowModel : public FloodModel {
 
   using FloodModel::setInitialCondition_File;
   using FloodModel::setInitialCondition_Value;
+  using FloodModel::setNoOfBndCondition;
   using FloodModel::setResistance_File;
   using FloodModel::setResistance_Value;
+
+  using FloodModel::setEddyViscosity_IncludedWithDefaultValue;
+  using FloodModel::setEddyViscosity_NotIncluded;
+  using FloodModel::setEddyViscosity_Value;
+  using FloodModel::setRain_File;
+  using FloodModel::setRain_Value;
+
+  using FloodModel::ClearHDResultOutputs;
+  using FloodModel::GetOutputsListHeadPos;
+  using FloodModel::setOutput_MaximumFloodDepthAndExtend;
+
+ protected:
+  FloodMembers() = default;
+  explicit FloodMembers(const FloodModel& other) : FloodModel(other) {}
+  ~FloodMembers() = default;
+};
+
+// The whole interface, by grid points and numbers of data formats.
+class [[gnu::visibility("default")]] Flooding_V27FlowModel : public FloodMembers {
+ public:
+  Flooding_V27FlowModel() = default;
+  // Drives the model of an object of another class.
+  explicit Flooding_V27FlowModel(const FloodModel& other) : FloodMembers(other) {}
 
   using FloodModel::getHDBndCondition;
   using FloodModel::getNoOfBndConditions;
   using FloodModel::setHDBndCondition_File;
   using FloodModel::setHDBndCondition_Value;
-  using FloodModel::setNoOfBndCondition;
 
   using FloodModel::getHDSourceSink;
   using FloodModel::getNoOfSourceSink;
@@ -198,17 +220,8 @@ class [[gnu::visibility("default")]] Flooding_V27FlowModel : public FloodModel {
   using FloodModel::setHDSourceSink_Value;
   using FloodModel::setNoOfSourceSink;
 
-  using FloodModel::setEddyViscosity_IncludedWithDefaultValue;
-  using FloodModel::setEddyViscosity_NotIncluded;
-  using FloodModel::setEddyViscosity_Value;
-  using FloodModel::setRain_File;
-  using FloodModel::setRain_Value;
-
   using FloodModel::AddOutput_MapsAndTimeSeriesJK;
-  using FloodModel::ClearHDResultOutputs;
   using FloodModel::GetNextOutputs_MapsJKAndTS;
-  using FloodModel::GetOutputsListHeadPos;
-  using FloodModel::setOutput_MaximumFloodDepthAndExtend;
 };
 
 // A model of the Wetland Sweep Kit; it has no members of its own.
@@ -219,30 +232,11 @@ class [[gnu::visibility("default")]] Flooding_V27WSKFlowModel : public FloodMode
 };
 
 // The interface for who thinks in map coordinates and extensions of files.
-class [[gnu::visibility("default")]] UrbanFlooding_V27Flowmodel : public FloodModel {
+class [[gnu::visibility("default")]] UrbanFlooding_V27Flowmodel : public FloodMembers {
  public:
   UrbanFlooding_V27Flowmodel() = default;
-  explicit UrbanFlooding_V27Flowmodel(const FloodModel& other) : FloodModel(other) {}
+  explicit UrbanFlooding_V27Flowmodel(const FloodModel& other) : FloodMembers(other) {}
 
-  using FloodModel::GetFileExtension;
-  using FloodModel::LoadFile;
-  using FloodModel::SaveFile;
-
-  using FloodModel::setDryingFloodingDepth;
-  using FloodModel::SetSimulationPeriod;
-
-  using FloodModel::getCoarseBathymetryFile;
-  using FloodModel::getFineBathymetryFile;
-  using FloodModel::setCoarseBathymetryFile;
-  using FloodModel::setFineBathymetryFile;
-  using FloodModel::setOverlandSolverOption;
-
-  using FloodModel::setInitialCondition_File;
-  using FloodModel::setInitialCondition_Value;
-  using FloodModel::setResistance_File;
-  using FloodModel::setResistance_Value;
-
-  using FloodModel::setNoOfBndCondition;
   // As setHDBndCondition_Value.
   void setBndCondition_Value(int index, int firstJ, int firstK, int lastJ, int lastK, int formulation,
                              double value);
@@ -251,15 +245,6 @@ class [[gnu::visibility("default")]] UrbanFlooding_V27Flowmodel : public FloodMo
   void setBndCondition_File(int index, int firstJ, int firstK, int lastJ, int lastK, int formulation,
                             std::string fileName, int item);
 
-  using FloodModel::setEddyViscosity_IncludedWithDefaultValue;
-  using FloodModel::setEddyViscosity_NotIncluded;
-  using FloodModel::setEddyViscosity_Value;
-  using FloodModel::setRain_File;
-  using FloodModel::setRain_Value;
-
-  using FloodModel::ClearHDResultOutputs;
-  using FloodModel::GetOutputsListHeadPos;
-  using FloodModel::setOutput_MaximumFloodDepthAndExtend;
   // Another output, of the part of the map between two corners (metres in the projection of the area's file;
   // grid points where it has none). The number of steps is how many intervals the period is written in.
   // Coordinates of a point output have no effect: it is of point (0, 0).

@@ -17,6 +17,9 @@ struct DateTime {
   bool operator==(const DateTime&) const = default;
 };
 
+// How many boundaries or sources a script can make, as many as the editor.
+inline constexpr int kMostObjects = 65535;
+
 // Where a member that goes through the outputs is: at output `number`, from 1. A null position is behind the
 // last one.
 struct OutputPosition {

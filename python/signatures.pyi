@@ -2,7 +2,7 @@
 
 import datetime
 import os
-from typing import Any, Callable, NoReturn, Optional, Sequence, Union
+from typing import Any, Callable, Iterable, NoReturn, Optional, Sequence, Union
 
 import numpy
 import numpy.typing
@@ -32,6 +32,7 @@ class Document:
     def detect_boundaries(self) -> int: ...
 
 def open(path: _FileName) -> Document: ...
+def new(areas: Iterable[Any]) -> Document: ...
 
 class DataFile:
     def __init__(self, *args: NoReturn, **kwargs: NoReturn) -> None: ...
