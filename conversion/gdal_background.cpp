@@ -1,5 +1,4 @@
 #include <cpl_conv.h>
-#include <cpl_error.h>
 #include <cpl_string.h>
 #include <gdal.h>
 #include <gdal_alg.h>
@@ -10,19 +9,13 @@
 #include <cmath>
 #include <limits>
 #include <memory>
-#include <string_view>
 
 #include "conversion/background.h"
+#include "conversion/gdal_files.h"
 
 namespace gridbay {
 namespace {
 
-struct CloseDataset {
-  void operator()(GDALDatasetH dataset) const { GDALClose(dataset); }
-};
-struct FreeTexts {
-  void operator()(char** texts) const { CSLDestroy(texts); }
-};
 struct FreeReference {
   void operator()(OGRSpatialReferenceH reference) const { OSRDestroySpatialReference(reference); }
 };
@@ -38,27 +31,9 @@ struct FreeTransformer {
 struct FreeApproximation {
   void operator()(void* way) const { GDALDestroyApproxTransformer(way); }
 };
-using Dataset = std::unique_ptr<void, CloseDataset>;
 using Reference = std::unique_ptr<std::remove_pointer_t<OGRSpatialReferenceH>, FreeReference>;
 using Way = std::unique_ptr<std::remove_pointer_t<OGRCoordinateTransformationH>, FreeWay>;
 using Feature = std::unique_ptr<std::remove_pointer_t<OGRFeatureH>, FreeFeature>;
-
-// The library's errors stay out of the program's output, in the thread that this lives in.
-class QuietErrors {
- public:
-  QuietErrors() {
-    CPLPushErrorHandler(CPLQuietErrorHandler);
-    CPLErrorReset();
-  }
-  QuietErrors(const QuietErrors&) = delete;
-  QuietErrors& operator=(const QuietErrors&) = delete;
-  ~QuietErrors() { CPLPopErrorHandler(); }
-};
-
-std::string lastError(const char* otherwise) {
-  const std::string text = CPLGetLastErrorMsg();
-  return text.empty() ? otherwise : text;
-}
 
 constexpr const char* kNoProjection =
     "it names no projection, and is placed as if it were in that of the map";
@@ -73,9 +48,9 @@ Reference referenceOf(const std::string& projection) {
 // A raster as a picture: three bands are red, green and blue, one has a table of colours or is grey.
 class RasterBackground final : public Background {
  public:
-  static std::unique_ptr<Background> open(Dataset dataset, const std::string& projection,
+  static std::unique_ptr<Background> open(OpenedFile file, const std::string& projection,
                                           std::string* error) {
-    std::unique_ptr<RasterBackground> made(new RasterBackground(std::move(dataset)));
+    std::unique_ptr<RasterBackground> made(new RasterBackground(std::move(file)));
     if (!made->place(projection, error)) return nullptr;
     made->findColours();
     return made;
@@ -83,6 +58,7 @@ class RasterBackground final : public Background {
 
   bool isRaster() const override { return true; }
   const std::string& notice() const override { return notice_; }
+  const RasterNames& rasters() const override { return rasters_; }
   const std::vector<VectorLayer>& shapes() const override { return none_; }
 
   bool paint(const BackgroundFrame& frame, std::span<std::uint32_t> pixels,
@@ -116,14 +92,11 @@ class RasterBackground final : public Background {
     int readRows = 0;
   };
 
-  explicit RasterBackground(Dataset dataset) : dataset_(std::move(dataset)) {}
+  explicit RasterBackground(OpenedFile file)
+      : dataset_(std::move(file.dataset)), rasters_(std::move(file.rasters)) {}
 
   bool place(const std::string& projection, std::string* error) {
-    double transform[6] = {};
-    const bool hasPlace = GDALGetGeoTransform(dataset_.get(), transform) == CE_None ||
-                          GDALGetGCPCount(dataset_.get()) > 0 ||
-                          GDALGetMetadata(dataset_.get(), "RPC") != nullptr;
-    if (!hasPlace) {
+    if (!hasPlace(dataset_.get())) {
       *error = "it does not say where it lies";
       return false;
     }
@@ -147,9 +120,7 @@ class RasterBackground final : public Background {
   }
 
   void findColours() {
-    constexpr int kColours = 3;
-    const int bands = GDALGetRasterCount(dataset_.get());
-    for (int band = 1; band <= (bands >= kColours ? kColours : 1); ++band)
+    for (int band = 1; band <= shownBands(dataset_.get()); ++band)
       bands_.push_back(GDALGetRasterBand(dataset_.get(), band));
     if (bands_.size() == 1) table_ = GDALGetRasterColorTable(bands_.front());
     if (table_ != nullptr || GDALGetRasterDataType(bands_.front()) == GDT_Byte) return;
@@ -277,6 +248,7 @@ class RasterBackground final : public Background {
   }
 
   Dataset dataset_;
+  RasterNames rasters_;
   std::unique_ptr<void, FreeTransformer> way_;
   std::unique_ptr<void, FreeApproximation> quickWay_;
   std::vector<GDALRasterBandH> bands_;
@@ -310,6 +282,7 @@ class VectorBackground final : public Background {
 
   bool isRaster() const override { return false; }
   const std::string& notice() const override { return notice_; }
+  const RasterNames& rasters() const override { return none_; }
   bool paint(const BackgroundFrame&, std::span<std::uint32_t>, const std::function<bool()>&,
              std::string* error) override {
     *error = "it is no raster";
@@ -392,6 +365,7 @@ class VectorBackground final : public Background {
     for (VectorLayer* layer : {&rings_, &lines_, &points_}) shapes_.push_back(std::move(*layer));
   }
 
+  RasterNames none_;
   VectorLayer points_;
   VectorLayer lines_;
   VectorLayer rings_;
@@ -402,44 +376,18 @@ class VectorBackground final : public Background {
   std::string notice_;
 };
 
-// The library behind that driver serves one thread, which is that of the window.
-bool isNetcdf(const char* path) {
-  const GDALDriverH driver = GDALIdentifyDriverEx(path, GDAL_OF_RASTER | GDAL_OF_VECTOR, nullptr, nullptr);
-  return driver != nullptr && std::string_view(GDALGetDriverShortName(driver)) == "netCDF";
-}
-
-// Of a file of several rasters the first one.
-Dataset openFile(const char* path) {
-  const auto openAny = [](const char* name) {
-    return Dataset(GDALOpenEx(name,
-                              GDAL_OF_RASTER | GDAL_OF_VECTOR | GDAL_OF_READONLY | GDAL_OF_VERBOSE_ERROR,
-                              nullptr, nullptr, nullptr));
-  };
-  Dataset dataset = openAny(path);
-  if (!dataset || GDALGetRasterCount(dataset.get()) > 0 || GDALDatasetGetLayerCount(dataset.get()) > 0)
-    return dataset;
-  const char* first = CSLFetchNameValue(GDALGetMetadata(dataset.get(), "SUBDATASETS"), "SUBDATASET_1_NAME");
-  return first == nullptr ? std::move(dataset) : openAny(std::string(first).c_str());
-}
-
 }  // namespace
 }  // namespace gridbay
 
-extern "C" gridbay::Background* gridbayOpenBackground(const char* path, const char* projection,
+extern "C" gridbay::Background* gridbayOpenBackground(const char* path, const char* raster,
+                                                      const char* projection,
                                                       const std::function<bool()>* isCancelled,
                                                       std::string* error) {
   GDALAllRegister();
   const gridbay::QuietErrors quiet;
-  if (gridbay::isNetcdf(path)) {
-    *error = "files of netCDF can't be read beside the window; make a GeoTIFF of it (gdal_translate)";
-    return nullptr;
-  }
-  gridbay::Dataset dataset = gridbay::openFile(path);
-  if (!dataset) {
-    *error = gridbay::lastError("it is of no kind that can be read");
-    return nullptr;
-  }
-  if (GDALGetRasterCount(dataset.get()) > 0)
-    return gridbay::RasterBackground::open(std::move(dataset), projection, error).release();
-  return gridbay::VectorBackground::open(dataset, projection, *isCancelled, error).release();
+  gridbay::OpenedFile file = gridbay::openAnyFile(path, raster, error);
+  if (!file.dataset) return nullptr;
+  if (GDALGetRasterCount(file.dataset.get()) > 0)
+    return gridbay::RasterBackground::open(std::move(file), projection, error).release();
+  return gridbay::VectorBackground::open(file.dataset, projection, *isCancelled, error).release();
 }

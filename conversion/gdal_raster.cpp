@@ -10,19 +10,11 @@
 #include <iterator>
 #include <memory>
 
+#include "conversion/gdal_files.h"
 #include "conversion/raster.h"
 
 namespace gridbay {
 namespace {
-
-struct CloseDataset {
-  void operator()(GDALDatasetH dataset) const { GDALClose(dataset); }
-};
-using Dataset = std::unique_ptr<void, CloseDataset>;
-
-struct FreeTexts {
-  void operator()(char** texts) const { CSLDestroy(texts); }
-};
 
 Dataset open(const char* path) {
   CPLErrorReset();
@@ -307,42 +299,6 @@ class Warp {
     return options;
   }
 };
-
-// The chosen band of a raster in memory, with land as missing values from a value on; null with the reason.
-Dataset inMemory(Raster& raster, const std::optional<float>& land, std::string* error) {
-  constexpr float kMissing = -1e35F;
-  GDALAllRegister();
-  CPLSetErrorHandler(CPLQuietErrorHandler);
-  const int columns = raster.columns();
-  Dataset memory(GDALCreate(GDALGetDriverByName("MEM"), "", columns, raster.rows(), 1, GDT_Float32, nullptr));
-  if (!memory) {
-    *error = CPLGetLastErrorMsg();
-    return nullptr;
-  }
-  const RasterPlace at = raster.place();
-  double transform[6] = {
-      at.first[0] - at.nextColumn[0] / 2 - at.nextRow[0] / 2, at.nextColumn[0], at.nextRow[0],
-      at.first[1] - at.nextColumn[1] / 2 - at.nextRow[1] / 2, at.nextColumn[1], at.nextRow[1]};
-  GDALSetGeoTransform(memory.get(), transform);
-  GDALSetProjection(memory.get(), raster.projection().c_str());
-  const GDALRasterBandH band = GDALGetRasterBand(memory.get(), 1);
-  GDALSetRasterNoDataValue(band, kMissing);
-  const std::optional<double> missing = raster.missingValue();
-  std::vector<float> row(static_cast<std::size_t>(columns));
-  for (int number = 0; number < raster.rows(); ++number) {
-    if (!raster.read(number, row, error)) return nullptr;
-    for (float& value : row) {
-      const bool isMissing = !std::isfinite(value) || (missing && value == static_cast<float>(*missing));
-      if (isMissing || (land && value >= *land)) value = kMissing;
-    }
-    if (GDALRasterIO(band, GF_Write, 0, number, columns, 1, row.data(), columns, 1, GDT_Float32, 0, 0) !=
-        CE_None) {
-      *error = CPLGetLastErrorMsg();
-      return nullptr;
-    }
-  }
-  return memory;
-}
 
 }  // namespace
 }  // namespace gridbay

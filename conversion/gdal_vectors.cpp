@@ -5,14 +5,12 @@
 
 #include <memory>
 
+#include "conversion/gdal_files.h"
 #include "conversion/vector_file.h"
 
 namespace gridbay {
 namespace {
 
-struct CloseDataset {
-  void operator()(GDALDatasetH dataset) const { GDALClose(dataset); }
-};
 struct FreeReference {
   void operator()(OGRSpatialReferenceH reference) const { OSRDestroySpatialReference(reference); }
 };
@@ -22,7 +20,6 @@ struct FreeFeature {
 struct FreeGeometry {
   void operator()(OGRGeometryH geometry) const { OGR_G_DestroyGeometry(geometry); }
 };
-using Dataset = std::unique_ptr<void, CloseDataset>;
 using Reference = std::unique_ptr<std::remove_pointer_t<OGRSpatialReferenceH>, FreeReference>;
 using Feature = std::unique_ptr<std::remove_pointer_t<OGRFeatureH>, FreeFeature>;
 using Geometry = std::unique_ptr<std::remove_pointer_t<OGRGeometryH>, FreeGeometry>;

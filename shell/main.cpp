@@ -40,6 +40,8 @@ void takeMaps(MainWindow& window, const std::function<void(const QString&)>& tak
   window.resizeDocks({&window.map()}, {kWidth}, Qt::Horizontal);
   window.currentDocument()->goToPlace({.page = PageId::bathymetry, .entries = {{2}}});
   settle();
+  canvas.fit();
+  settle();
   take("map");
   const std::vector<gridbay::MapArea>& areas = canvas.scene().areas;
   if (!areas.empty() && areas.back().isPlaced) {

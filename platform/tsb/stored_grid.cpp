@@ -184,7 +184,7 @@ Result<StoredGrid> StoredGrid::open(const std::string& path, std::size_t item) {
   return open(*source);
 }
 
-Result<StoredGrid> StoredGrid::open(const Source& source, const std::function<bool()>& isCancelled) {
+Result<StoredGrid> StoredGrid::open(const Source& source, const Progress& progress) {
   FileDescriptor descriptor(::open(source.path.c_str(), O_RDONLY | O_CLOEXEC));
   if (!descriptor) return Failure{systemError("cannot open", source.path)};
   StoredGrid grid(std::move(descriptor), source);
@@ -212,13 +212,12 @@ Result<StoredGrid> StoredGrid::open(const Source& source, const std::function<bo
   whileItIsOpened.reset();
   if (!fault.empty()) return cannotShow(source.path, fault);
   if (grid.packed_) {
-    if (const Outcome made = grid.makeOverview(isCancelled); !made)
-      return cannotShow(source.path, made.error());
+    if (const Outcome made = grid.makeOverview(progress); !made) return cannotShow(source.path, made.error());
   }
   return grid;
 }
 
-Outcome StoredGrid::makeOverview(const std::function<bool()>& isCancelled) {
+Outcome StoredGrid::makeOverview(const Progress& progress) {
   const double points = static_cast<double>(columns()) * static_cast<double>(rows());
   if (points <= static_cast<double>(kMostAtOnce)) return {};
   const auto step =
@@ -226,7 +225,8 @@ Outcome StoredGrid::makeOverview(const std::function<bool()>& isCancelled) {
   std::vector<float> row(columns());
   overviewColumns_ = (columns() + step - 1) / step;
   for (std::size_t k = 0; k < rows(); k += step) {
-    if (isCancelled && isCancelled()) return Failure{"it was cancelled"};
+    const double done = static_cast<double>(k) / static_cast<double>(rows());
+    if (progress && !progress(done)) return Failure{"it was cancelled"};
     if (!packed_->read(k, 0, row)) return Failure{"a part of it can't be unpacked"};
     for (std::size_t j = 0; j < columns(); j += step) overview_.push_back(row[j]);
   }

@@ -34,10 +34,11 @@ class StoredGrid {
   static constexpr std::size_t kMostAtOnce = std::size_t{1} << 24;
   // A larger packed item gets an overview of at most about so many points.
   static constexpr std::size_t kOverviewPoints = std::size_t{1} << 22;
+  // Told how much is done, 0 to 1; false to cancel it.
+  using Progress = std::function<bool(double done)>;
   // Opens what was found. It may be called in any thread where `opensInAnyThread`, and takes long for large
-  // packed items; asked for every few rows whether it is cancelled, which is an error. Others: the values
-  // can't be reached.
-  static Result<StoredGrid> open(const Source& source, const std::function<bool()>& isCancelled = {});
+  // packed items; `progress` is asked every few rows. Errors: it was cancelled, the values can't be reached.
+  static Result<StoredGrid> open(const Source& source, const Progress& progress = {});
   static Result<StoredGrid> open(const std::string& path, std::size_t item);
   static bool opensInAnyThread();
 
@@ -54,7 +55,7 @@ class StoredGrid {
  private:
   explicit StoredGrid(FileDescriptor file, Source source)
       : file_(std::move(file)), source_(std::move(source)) {}
-  Outcome makeOverview(const std::function<bool()>& isCancelled);
+  Outcome makeOverview(const Progress& progress);
 
   FileDescriptor file_;
   Source source_;

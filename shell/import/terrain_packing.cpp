@@ -53,6 +53,9 @@ void pass(Packing& pack, RasterPreview& each) {
        each.hasPlace, each.isOfPoints, each.isOwnMap, each.unit, each.projection, each.projectionName,
        each.itemType, each.valueUnit, each.landValue, each.middle, each.bands, each.rasters);
 }
+void pass(Packing& pack, BackgroundCopy& each) {
+  pack(each.file, each.isWhole, each.isFull, each.rasters.all, each.rasters.shown);
+}
 void pass(Packing& pack, std::string& text) {
   pack(text);
 }
@@ -90,12 +93,20 @@ std::string packed(const Result<ConvertedRaster>& converted) {
   return packedResult(Result<std::string>(converted->summary));
 }
 
+std::string packed(const Result<BackgroundCopy>& copy) {
+  return packedResult(copy);
+}
+
 Result<RasterPreview> unpackedPreview(const std::string& bytes) {
   return unpackedResult<RasterPreview>(bytes);
 }
 
 Result<std::string> unpackedSummary(const std::string& bytes) {
   return unpackedResult<std::string>(bytes);
+}
+
+Result<BackgroundCopy> unpackedCopy(const std::string& bytes) {
+  return unpackedResult<BackgroundCopy>(bytes);
 }
 
 }  // namespace gridbay::shell

@@ -2,6 +2,7 @@
 
 #include <string>
 
+#include "conversion/background.h"
 #include "conversion/raster_preview.h"
 #include "platform/result.h"
 
@@ -10,8 +11,10 @@ namespace gridbay::shell {
 // What comes of work in a copy of this process, as bytes on its way back.
 std::string packed(const Result<RasterPreview>& preview);
 std::string packed(const Result<ConvertedRaster>& converted);
+std::string packed(const Result<BackgroundCopy>& copy);
 Result<RasterPreview> unpackedPreview(const std::string& bytes);
 // The words about the map that was made.
 Result<std::string> unpackedSummary(const std::string& bytes);
+Result<BackgroundCopy> unpackedCopy(const std::string& bytes);
 
 }  // namespace gridbay::shell

@@ -9,11 +9,14 @@
 namespace gridbay::shell {
 namespace {
 
-BackgroundFrame pixelsOf(const MapFrame& frame) {
-  const MapPoint corner = frame.toMap({0, 0});
-  return {corner.east, corner.north, frame.metresPerPixel,
-          std::max(1, static_cast<int>(std::ceil(frame.size.width()))),
-          std::max(1, static_cast<int>(std::ceil(frame.size.height())))};
+QString keyOf(const BackgroundSource& source) {
+  return source.copy.isEmpty() ? source.path + '\n' + source.raster : source.copy;
+}
+
+QStringList listOf(const std::vector<std::string>& texts) {
+  QStringList list;
+  for (const std::string& text : texts) list << QString::fromStdString(text);
+  return list;
 }
 
 // Points of a line that fall on one pixel are left out.
@@ -54,6 +57,13 @@ bool paintShapes(QImage& image, const Background& background, const MapFrame& fr
 }
 
 }  // namespace
+
+BackgroundFrame pixelsOf(const MapFrame& frame) {
+  const MapPoint corner = frame.toMap({0, 0});
+  return {corner.east, corner.north, frame.metresPerPixel,
+          std::max(1, static_cast<int>(std::ceil(frame.size.width()))),
+          std::max(1, static_cast<int>(std::ceil(frame.size.height())))};
+}
 
 BackgroundWorker::BackgroundWorker(QObject* parent)
     : QObject(parent), thread_([this](const std::stop_token& stop) { work(stop); }) {}
@@ -101,20 +111,24 @@ void BackgroundWorker::deliver(BackgroundPicture picture) {
       Qt::QueuedConnection);
 }
 
-BackgroundWorker::Opened* BackgroundWorker::openedOf(const QString& path, const std::string& projection,
+BackgroundWorker::Opened* BackgroundWorker::openedOf(const BackgroundSource& source,
+                                                     const std::string& projection,
                                                      const std::function<bool()>& isCancelled) {
   if (projection != projection_) opened_.clear();
   projection_ = projection;
-  if (const auto found = opened_.find(path); found != opened_.end()) return &found->second;
+  if (const auto found = opened_.find(keyOf(source)); found != opened_.end()) return &found->second;
   Opened opened;
-  if (auto background = openBackground(path.toStdString(), projection, isCancelled)) {
+  const std::string path = (source.copy.isEmpty() ? source.path : source.copy).toStdString();
+  if (source.copy.isEmpty() && needsBackgroundCopy(path)) {
+    opened.needsCopy = true;
+  } else if (auto background = openBackground(path, source.raster.toStdString(), projection, isCancelled)) {
     opened.background = std::move(*background);
   } else if (isCancelled()) {
     return nullptr;
   } else {
     opened.fault = QString::fromStdString(background.error());
   }
-  return &(opened_[path] = std::move(opened));
+  return &(opened_[keyOf(source)] = std::move(opened));
 }
 
 void BackgroundWorker::work(const std::stop_token& stop) {
@@ -126,20 +140,28 @@ void BackgroundWorker::work(const std::stop_token& stop) {
     };
     // The reading of a whole file goes on while the map moves.
     const auto isStopped = [&stop] { return stop.stop_requested(); };
+    std::optional<NoCopyNow> whileTheyAreClosed(std::in_place);
     std::erase_if(opened_, [&request](const auto& each) {
       return std::ranges::none_of(
-          request->sources, [&each](const BackgroundSource& source) { return source.path == each.first; });
+          request->sources, [&each](const BackgroundSource& source) { return keyOf(source) == each.first; });
     });
+    whileTheyAreClosed.reset();
     for (const BackgroundSource& source : request->sources) {
       if (isOutOfDate()) break;
       const NoCopyNow whileItIsRead;
-      Opened* opened = openedOf(source.path, request->projection, isStopped);
+      Opened* opened = openedOf(source, request->projection, isStopped);
       if (opened == nullptr) return;
-      BackgroundPicture picture{source.id, {}, request->frame, true, opened->fault, {}};
+      BackgroundPicture picture;
+      picture.id = source.id;
+      picture.frame = request->frame;
+      picture.fault = opened->fault;
+      picture.needsCopy = opened->needsCopy;
       if (opened->background) {
         const BackgroundFrame pixels = pixelsOf(request->frame);
         picture.notice = QString::fromStdString(opened->background->notice());
         picture.isRaster = opened->background->isRaster();
+        picture.rasters = listOf(opened->background->rasters().all);
+        picture.raster = QString::fromStdString(opened->background->rasters().shown);
         picture.image =
             QImage(pixels.width, pixels.height,
                    picture.isRaster ? QImage::Format_ARGB32 : QImage::Format_ARGB32_Premultiplied);

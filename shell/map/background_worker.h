@@ -18,7 +18,9 @@ namespace gridbay::shell {
 struct BackgroundSource {
   int id = 0;  // goes to the picture
   QString path;
-  QColor colour;  // of points and lines
+  QString raster;  // of several in the file, by its name; empty for the first that has a place
+  QColor colour;   // of points and lines
+  QString copy;    // what is read in its place, where it has one
 };
 
 struct BackgroundRequest {
@@ -32,9 +34,15 @@ struct BackgroundPicture {
   QImage image;  // clear where there is nothing; none where there is a fault
   MapFrame frame;
   bool isRaster = true;
-  QString fault;   // why it can't be shown
-  QString notice;  // what is to be told of it
+  QString fault;           // why it can't be shown
+  QString notice;          // what is to be told of it
+  bool needsCopy = false;  // it can be read from a copy alone, and there is none: no picture
+  QStringList rasters;     // in the file, where there are several
+  QString raster;          // the one that is shown
 };
+
+// The upper left corner and the pixels of a frame.
+BackgroundFrame pixelsOf(const MapFrame& frame);
 
 // Reads backgrounds and paints them in a thread of its own. A newer request takes the place of an older one,
 // which ends where it is.
@@ -54,11 +62,12 @@ class BackgroundWorker final : public QObject {
   struct Opened {
     std::unique_ptr<Background> background;
     QString fault;
+    bool needsCopy = false;
   };
   void work(const std::stop_token& stop);
   std::optional<BackgroundRequest> next(const std::stop_token& stop);
   // Nothing when cancelled.
-  Opened* openedOf(const QString& path, const std::string& projection,
+  Opened* openedOf(const BackgroundSource& source, const std::string& projection,
                    const std::function<bool()>& isCancelled);
   void deliver(BackgroundPicture picture);
 
@@ -68,7 +77,7 @@ class BackgroundWorker final : public QObject {
   bool atWork_ = false;
   int undelivered_ = 0;
   // Of the thread alone.
-  std::map<QString, Opened> opened_;
+  std::map<QString, Opened> opened_;  // by what opens them
   std::string projection_;
   std::jthread thread_;
 };

@@ -20,9 +20,11 @@ constexpr int kWhole = 100;        // percent
 constexpr int kLayerRole = Qt::UserRole;
 constexpr int kBackgroundRole = Qt::UserRole + 1;
 
-QIcon swatch(const QColor& colour) {
+// With a border that is seen on any ground.
+QIcon swatch(const QColor& colour, const QColor& border) {
   QPixmap picture(14, 14);
-  picture.fill(colour);
+  picture.fill(border);
+  QPainter(&picture).fillRect(1, 1, 12, 12, colour);
   return picture;
 }
 
@@ -33,6 +35,7 @@ LayerPanel::LayerPanel(MapCanvas& canvas, QWidget* parent)
       canvas_(canvas),
       layers_(new QListWidget(this)),
       opacity_(new QSlider(Qt::Horizontal, this)),
+      rasters_(new QComboBox(this)),
       colours_(new QComboBox(this)),
       automatic_(new QCheckBox(tr("Scale by the data"), this)),
       land_(new QCheckBox(tr("Land in a colour"), this)),
@@ -55,6 +58,13 @@ LayerPanel::LayerPanel(MapCanvas& canvas, QWidget* parent)
     isShowing_ = false;
     save();
   });
+  rasters_->setAccessibleName(tr("Raster in the file"));
+  rasters_->setToolTip(tr("Which of the rasters in the file is shown"));
+  rasters_->setMinimumContentsLength(8);
+  rasters_->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
+  connect(rasters_, &QComboBox::currentTextChanged, this, [this](const QString& name) {
+    if (!isShowing_) canvas_.backgrounds().setRaster(chosen(), name);
+  });
   colours_->addItems({tr("Even steps"), tr("Sea"), tr("Grey")});
   colours_->setAccessibleName(tr("Colours"));
   automatic_->setChecked(true);
@@ -75,6 +85,7 @@ LayerPanel::LayerPanel(MapCanvas& canvas, QWidget* parent)
   layout->addWidget(layers_, 1);
   layout->addWidget(makeButtons());
   layout->addWidget(opacity_);
+  layout->addWidget(rasters_);
   layout->addWidget(colours_);
   layout->addWidget(automatic_);
   auto* limits = new QHBoxLayout();
@@ -138,7 +149,7 @@ void LayerPanel::fillLayers() {
   layers_->clear();
   const MapBackgrounds& backgrounds = canvas_.backgrounds();
   const auto addItem = [this](const QColor& colour, const QString& text, bool isOn) {
-    auto* item = new QListWidgetItem(swatch(colour), text, layers_);
+    auto* item = new QListWidgetItem(swatch(colour, palette().color(QPalette::Mid)), text, layers_);
     item->setFlags(Qt::ItemIsEnabled | Qt::ItemIsSelectable | Qt::ItemIsUserCheckable);
     item->setCheckState(isOn ? Qt::Checked : Qt::Unchecked);
     return item;
@@ -205,6 +216,10 @@ void LayerPanel::showButtons() {
   button(tr("Colour..."))
       ->setEnabled(background != nullptr && background->picture && !background->picture->isRaster);
   const bool outer = std::exchange(isShowing_, true);
+  rasters_->clear();
+  if (background != nullptr) rasters_->addItems(background->rasters);
+  rasters_->setVisible(rasters_->count() > 1);
+  if (background != nullptr) rasters_->setCurrentText(background->raster);
   opacity_->setEnabled(background != nullptr);
   opacity_->setValue(background == nullptr ? kWhole
                                            : static_cast<int>(std::lround(background->opacity * kWhole)));
@@ -240,7 +255,7 @@ void LayerPanel::giveStyle() {
     constexpr float kLeastRange = 0.01F;
     const auto least = static_cast<float>(least_->value());
     const float greatest = std::max(static_cast<float>(greatest_->value()), least + kLeastRange);
-    style.scale = TerrainScale{least, greatest, canvas_.scale().value_or(TerrainScale{}).steepest};
+    style.scale = TerrainScale{least, greatest, steepest_};
   }
   for (QDoubleSpinBox* limit : {least_, greatest_}) limit->setEnabled(!automatic_->isChecked());
   canvas_.setStyle(style);
@@ -249,6 +264,7 @@ void LayerPanel::giveStyle() {
 void LayerPanel::showScale() {
   if (!automatic_->isChecked() || !canvas_.scale()) return;
   const bool outer = std::exchange(isShowing_, true);
+  steepest_ = canvas_.scale()->steepest;
   least_->setValue(canvas_.scale()->least);
   greatest_->setValue(canvas_.scale()->greatest);
   isShowing_ = outer;
@@ -271,6 +287,7 @@ void LayerPanel::save() {
   settings.setOwn("automatic", automatic_->isChecked());
   settings.setOwn("least", least_->value());
   settings.setOwn("greatest", greatest_->value());
+  settings.setOwn("steepest", steepest_);
   settings.setOwn("backgrounds", canvas_.backgrounds().saved());
 }
 
@@ -292,6 +309,8 @@ void LayerPanel::showSetup(const QString& path) {
   if (!automatic_->isChecked()) {
     least_->setValue(settings.own("least").toDouble());
     greatest_->setValue(settings.own("greatest").toDouble());
+    const QVariant steepest = settings.own("steepest");
+    steepest_ = steepest.isValid() && steepest.toFloat() > 0 ? steepest.toFloat() : TerrainScale{}.steepest;
   }
   canvas_.backgrounds().restore(settings.own("backgrounds").toList());
   isShowing_ = false;

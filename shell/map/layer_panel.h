@@ -30,8 +30,12 @@ class LayerPanel final : public QWidget {
   QDoubleSpinBox& least() { return *least_; }
   QDoubleSpinBox& greatest() { return *greatest_; }
   QCheckBox& automatic() { return *automatic_; }
+  QCheckBox& land() { return *land_; }
+  QCheckBox& zeroLine() { return *zeroLine_; }
+  QCheckBox& hillShade() { return *hillShade_; }
   QComboBox& colours() { return *colours_; }
   QSlider& opacity() { return *opacity_; }
+  QComboBox& rasters() { return *rasters_; }
   // By its text.
   QToolButton* button(const QString& text);
 
@@ -54,6 +58,7 @@ class LayerPanel final : public QWidget {
   QString setup_;
   QListWidget* layers_;
   QSlider* opacity_;
+  QComboBox* rasters_;  // in the file of a background that has several
   QComboBox* colours_;
   QCheckBox* automatic_;
   QDoubleSpinBox* least_;
@@ -61,6 +66,7 @@ class LayerPanel final : public QWidget {
   QCheckBox* land_;
   QCheckBox* zeroLine_;
   QCheckBox* hillShade_;
+  float steepest_ = 1;      // of the scale, which it goes by as the hill shade does
   bool isShowing_ = false;  // what is set is what the map has
 };
 

@@ -3,6 +3,7 @@
 #include <QFileInfo>
 #include <algorithm>
 #include <array>
+#include <utility>
 
 namespace gridbay::shell {
 namespace {
@@ -12,7 +13,15 @@ constexpr std::array<QRgb, 5> kColours{0xFF202020, 0xFF0B3C8C, 0xFF9C1C1C, 0xFF2
 
 }  // namespace
 
-MapBackgrounds::MapBackgrounds(QObject* parent) : QObject(parent) {}
+MapBackgrounds::MapBackgrounds(QObject* parent)
+    : QObject(parent), copies_([this] { return worker_->isIdle(); }, this) {
+  connect(&copies_, &BackgroundCopies::made, this, &MapBackgrounds::requestAgain);
+  connect(&copies_, &BackgroundCopies::failed, this, &MapBackgrounds::fail);
+  connect(&copies_, &BackgroundCopies::progressed, this, [this](int id, double done) {
+    if (const MapBackground* background = of(id)) emit reading(background->path, done);
+  });
+  connect(&copies_, &BackgroundCopies::ended, this, &MapBackgrounds::readingEnded);
+}
 
 std::size_t MapBackgrounds::placeOf(int id) const {
   return static_cast<std::size_t>(std::ranges::find(all_, id, &MapBackground::id) - all_.begin());
@@ -47,6 +56,7 @@ void MapBackgrounds::remove(int id) {
   if (place >= all_.size()) return;
   all_.erase(all_.begin() + static_cast<std::ptrdiff_t>(place));
   if (place < below_) --below_;
+  copies_.forget(id);
   requestAgain();
   emit changed();
   emit painted();
@@ -74,6 +84,7 @@ void MapBackgrounds::setShown(int id, bool isShown) {
   const std::size_t place = placeOf(id);
   if (place >= all_.size() || all_[place].isShown == isShown) return;
   all_[place].isShown = isShown;
+  if (!isShown) copies_.forget(id);
   requestAgain();
   emit changed();
   emit painted();
@@ -95,13 +106,26 @@ void MapBackgrounds::setColour(int id, const QColor& colour) {
   emit changed();
 }
 
+void MapBackgrounds::setRaster(int id, const QString& name) {
+  const std::size_t place = placeOf(id);
+  if (place >= all_.size() || all_[place].raster == name) return;
+  all_[place].raster = name;
+  requestAgain();
+  emit changed();
+}
+
+void MapBackgrounds::stopReading() {
+  for (const int id : copies_.stop()) setShown(id, false);
+}
+
 QVariantList MapBackgrounds::saved() const {
   QVariantList list;
   for (std::size_t i = 0; i < all_.size(); ++i) {
     const MapBackground& each = all_[i];
     list << QVariantMap{{"path", each.path},       {"shown", each.isShown},
                         {"opacity", each.opacity}, {"colour", each.colour.name()},
-                        {"placed", each.hasPlace}, {"above", i >= below_}};
+                        {"placed", each.hasPlace}, {"above", i >= below_},
+                        {"raster", each.raster}};
   }
   return list;
 }
@@ -109,6 +133,7 @@ QVariantList MapBackgrounds::saved() const {
 void MapBackgrounds::restore(const QVariantList& saved) {
   all_.clear();
   below_ = 0;
+  copies_.forgetAll();
   for (const QVariant& each : saved) {
     const QVariantMap map = each.toMap();
     const QString path = map["path"].toString();
@@ -118,6 +143,7 @@ void MapBackgrounds::restore(const QVariantList& saved) {
                     .isShown = map["shown"].toBool(),
                     .opacity = std::clamp(map["opacity"].toDouble(), 0.0, 1.0),
                     .colour = QColor(map["colour"].toString()),
+                    .raster = map["raster"].toString(),
                     .hasPlace = map["placed"].toBool()});
     if (!map["above"].toBool()) below_ = all_.size();
   }
@@ -136,7 +162,11 @@ void MapBackgrounds::request(const MapFrame& frame, const std::string& projectio
 void MapBackgrounds::requestAgain() {
   BackgroundRequest request{{}, frame_, projection_};
   for (const MapBackground& each : all_) {
-    if (each.isShown) request.sources.push_back({each.id, each.path, each.colour});
+    if (!each.isShown) continue;
+    BackgroundSource source{each.id, each.path, each.raster, each.colour, {}};
+    if (each.needsCopy) source.copy = copies_.of(source, frame_, projection_);
+    if (each.needsCopy && source.copy.isEmpty()) continue;
+    request.sources.push_back(std::move(source));
   }
   if (frame_.size.isEmpty() || (worker_ == nullptr && request.sources.empty())) return;
   if (worker_ == nullptr) {
@@ -146,13 +176,37 @@ void MapBackgrounds::requestAgain() {
   worker_->paint(std::move(request));
 }
 
-void MapBackgrounds::take(const BackgroundPicture& picture) {
+void MapBackgrounds::fail(int id, const QString& why) {
+  BackgroundPicture none;
+  none.id = id;
+  none.frame = frame_;
+  none.fault = why;
+  take(std::move(none));
+}
+
+void MapBackgrounds::take(BackgroundPicture picture) {
   const std::size_t place = placeOf(picture.id);
-  if (place >= all_.size()) return;
+  if (place >= all_.size() || !all_[place].isShown) return;
   MapBackground& background = all_[place];
+  if (picture.needsCopy) {
+    // The last picture stays until there is another one.
+    if (std::exchange(background.needsCopy, true)) return;
+    return requestAgain();
+  }
+  if (background.needsCopy && picture.fault.isEmpty()) {
+    const RasterNames& names = copies_.rastersOf(picture.id);
+    picture.raster = QString::fromStdString(names.shown);
+    picture.rasters.clear();
+    for (const std::string& name : names.all) picture.rasters << QString::fromStdString(name);
+  }
   const QString before = told(background);
+  const bool hasOtherRasters = background.rasters != picture.rasters && picture.fault.isEmpty();
+  if (hasOtherRasters) {
+    background.rasters = picture.rasters;
+    background.raster = picture.raster;
+  }
   background.picture = picture;
-  bool isMoved = false;
+  bool isMoved = hasOtherRasters;
   if (!background.hasPlace && picture.fault.isEmpty()) {
     background.hasPlace = true;
     isMoved = true;

@@ -5,7 +5,7 @@
 #include <optional>
 #include <vector>
 
-#include "shell/map/background_worker.h"
+#include "shell/map/background_copies.h"
 
 namespace gridbay::shell {
 
@@ -15,9 +15,12 @@ struct MapBackground {
   QString path;
   bool isShown = true;
   double opacity = 1;
-  QColor colour;  // of points and lines
+  QColor colour;        // of points and lines
+  QString raster = {};  // of several in the file, the one that is shown; empty until it is known
+  QStringList rasters = {};
   // Lines go above the terrain and pictures below it, unless the user has said otherwise.
   bool hasPlace = false;
+  bool needsCopy = false;  // it is read from a copy
   std::optional<BackgroundPicture> picture = {};
 };
 
@@ -41,6 +44,10 @@ class MapBackgrounds final : public QObject {
   void setShown(int id, bool isShown);
   void setOpacity(int id, double opacity);
   void setColour(int id, const QColor& colour);
+  // Another one of the rasters in its file, by the name.
+  void setRaster(int id, const QString& name);
+  // Stops the reading of files that takes long; they are not shown any more.
+  void stopReading();
 
   // All of it as the settings hold it.
   QVariantList saved() const;
@@ -50,16 +57,21 @@ class MapBackgrounds final : public QObject {
   void request(const MapFrame& frame, const std::string& projection);
   // Those above the terrain, or those below it.
   void paint(QPainter& painter, const MapFrame& frame, bool above) const;
-  bool isSettled() const { return worker_ == nullptr || worker_->isIdle(); }
+  bool isSettled() const { return (worker_ == nullptr || worker_->isIdle()) && copies_.isIdle(); }
 
  signals:
   // The list, or what is told of an entry.
   void changed();
   // There is another picture.
   void painted();
+  // Long reading is going on: of what, and how much is done, 0 to 1.
+  void reading(const QString& path, double done);
+  void readingEnded();
 
  private:
-  void take(const BackgroundPicture& picture);
+  void take(BackgroundPicture picture);
+  // No picture, but why there is none.
+  void fail(int id, const QString& why);
   void requestAgain();
   std::size_t placeOf(int id) const;
 
@@ -69,6 +81,7 @@ class MapBackgrounds final : public QObject {
   BackgroundWorker* worker_ = nullptr;  // once there is something to show
   MapFrame frame_;
   std::string projection_;
+  BackgroundCopies copies_;
 };
 
 }  // namespace gridbay::shell

@@ -19,14 +19,18 @@ constexpr double kMargin = 0.06;  // of the picture around the whole map
 constexpr double kTooCoarse = 6;  // a picture is drawn so much larger at most
 constexpr double kSameScale = 1e-9;
 
-// The whole map in a picture of a size.
+// The whole map in a picture of a size, beside the scale of colours.
 std::optional<MapFrame> wholeMap(const MapScene& scene, QSizeF size) {
   const std::optional<QRectF> extent = extentOf(scene);
   if (!extent || size.isEmpty()) return std::nullopt;
-  const QSizeF inside = size * (1 - 2 * kMargin);
+  constexpr double kScale = 70;        // pixels
+  constexpr double kMostScale = 0.15;  // of the width
+  const double left = kMargin * size.width();
+  const double right = std::max(left, std::min(kScale, kMostScale * size.width()));
+  const QSizeF inside(size.width() - left - right, size.height() * (1 - 2 * kMargin));
   const double metres =
       std::max({extent->width() / inside.width(), extent->height() / inside.height(), 1e-3});
-  return MapFrame{{extent->center().x(), extent->center().y()}, metres, size};
+  return MapFrame{{extent->center().x() + (right - left) / 2 * metres, extent->center().y()}, metres, size};
 }
 
 QString textOf(std::string_view name) {
@@ -252,8 +256,20 @@ void MapCanvas::paintEvent(QPaintEvent*) {
   paintPlaced(painter);
   if (grasp_) grasp_->paint(painter, frame_);
   drawing_.paintLegend(painter, frame_, style_, terrain_.empty() ? std::nullopt : scale_);
+  if (isByKeys_) paintCross(painter);
   paintHeldText(painter);
   paintFaults(painter);
+}
+
+// The place that keys point at.
+void MapCanvas::paintCross(QPainter& painter) {
+  constexpr double kArm = 9;
+  const QPointF middle = QRectF(rect()).center();
+  for (const QPen& pen : {QPen(Qt::white, 4), QPen(Qt::black, 1.5)}) {
+    painter.setPen(pen);
+    painter.drawLine(middle - QPointF(kArm, 0), middle + QPointF(kArm, 0));
+    painter.drawLine(middle - QPointF(0, kArm), middle + QPointF(0, kArm));
+  }
 }
 
 // What can't be shown, and why, on a ground of its own.

@@ -41,8 +41,9 @@ enum class MapTool {
 // the wheel zooms. The last picture of the terrain is shown in its place at once while a finer one is made.
 //
 // Points of what is selected, numbers and borders of areas are dragged; a double click on a line puts a point
-// in; Delete takes the chosen point out, or the feature. Esc drops what is held. Arrows, +, - and Home move
-// the map.
+// in; Delete takes the chosen point out, or the feature. Esc drops what is held. Arrows (with Shift finely),
+// +, - and Home move the map. Then a cross marks its middle, where Space does what a click does, and takes
+// hold of what is dragged and lets it go.
 class MapCanvas final : public QWidget {
   Q_OBJECT
  public:
@@ -115,12 +116,16 @@ class MapCanvas final : public QWidget {
   void keyPressEvent(QKeyEvent* event) override;
   void contextMenuEvent(QContextMenuEvent* event) override;
   void leaveEvent(QEvent* event) override;
+  void focusOutEvent(QFocusEvent* event) override;
 
  private:
   void paintTerrain(QPainter& painter);
   void paintPlaced(QPainter& painter);
   void paintHeldText(QPainter& painter);
   void paintFaults(QPainter& painter);
+  void paintCross(QPainter& painter);
+  void pointByKeys();
+  void pressMiddle();
   void forgetPlaced();
   void requestTerrain();
   void requestBase();
@@ -153,6 +158,8 @@ class MapCanvas final : public QWidget {
   Qt::MouseButton button_ = Qt::NoButton;  // that is pressed
   bool isPanning_ = false;
   bool isDragged_ = false;
+  bool isByKeys_ = false;  // the last move was made by keys
+  MapPoint heldAt_;        // by keys
 
   TerrainStyle style_;
   TerrainStore store_;

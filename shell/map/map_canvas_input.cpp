@@ -5,6 +5,7 @@
 #include <QMenu>
 #include <QMouseEvent>
 #include <cmath>
+#include <utility>
 
 #include "core/page_id.h"
 #include "shell/map/map_canvas.h"
@@ -15,7 +16,8 @@ namespace {
 constexpr double kDragged = 4;  // pixels that a click may slip
 constexpr double kWheelStep = 1.2;
 constexpr double kKeyZoom = 1.5;
-constexpr double kKeyPan = 60;  // pixels
+constexpr double kKeyPan = 60;     // pixels
+constexpr double kKeyFinePan = 2;  // with Shift
 
 // What a tool makes by clicks.
 struct Clicks {
@@ -137,6 +139,7 @@ void MapCanvas::startDrag(QPointF at) {
 
 void MapCanvas::mouseMoveEvent(QMouseEvent* event) {
   const QPointF at = event->position();
+  if (std::exchange(isByKeys_, false)) update();
   const QPointF way = at - last_;
   last_ = at;
   emit pointed(textAt(frame_.toMap(at)));
@@ -295,8 +298,35 @@ void MapCanvas::wheelEvent(QWheelEvent* event) {
   event->accept();
 }
 
+// What is held moves along with the middle of the map.
+void MapCanvas::pointByKeys() {
+  const QPointF middle = QRectF(rect()).center();
+  isByKeys_ = true;
+  last_ = middle;
+  if (grasp_) grasp_->moveTo(frame_.toMap(middle));
+  emit pointed(textAt(frame_.toMap(middle)));
+  update();
+}
+
+void MapCanvas::pressMiddle() {
+  if (editor_ == nullptr || isPressed_) return;
+  const QPointF middle = QRectF(rect()).center();
+  const MapPoint place = frame_.toMap(middle);
+  isByKeys_ = true;
+  last_ = middle;
+  if (grasp_ && !placesByClicks()) {
+    if (place.east != heldAt_.east || place.north != heldAt_.north) return complete();
+    drop();  // where it was taken: that is a click
+    return click(middle);
+  }
+  startDrag(middle);
+  heldAt_ = place;
+  if (!grasp_ || placesByClicks()) click(middle);
+}
+
 void MapCanvas::keyPressEvent(QKeyEvent* event) {
   MapFrame frame = frame_;
+  const double pan = event->modifiers().testFlag(Qt::ShiftModifier) ? kKeyFinePan : kKeyPan;
   switch (event->key()) {
     case Qt::Key_Escape:
       if (grasp_) {
@@ -320,27 +350,33 @@ void MapCanvas::keyPressEvent(QKeyEvent* event) {
       return;
     case Qt::Key_Plus:
     case Qt::Key_Equal:
-      return zoom(kKeyZoom);
+      zoom(kKeyZoom);
+      return pointByKeys();
     case Qt::Key_Minus:
-      return zoom(1 / kKeyZoom);
+      zoom(1 / kKeyZoom);
+      return pointByKeys();
     case Qt::Key_Home:
-      return fit();
+      fit();
+      return pointByKeys();
+    case Qt::Key_Space:
+      return pressMiddle();
     case Qt::Key_Left:
-      frame.pan({kKeyPan, 0});
+      frame.pan({pan, 0});
       break;
     case Qt::Key_Right:
-      frame.pan({-kKeyPan, 0});
+      frame.pan({-pan, 0});
       break;
     case Qt::Key_Up:
-      frame.pan({0, kKeyPan});
+      frame.pan({0, pan});
       break;
     case Qt::Key_Down:
-      frame.pan({0, -kKeyPan});
+      frame.pan({0, -pan});
       break;
     default:
       return QWidget::keyPressEvent(event);
   }
   setFrame(frame);
+  pointByKeys();
 }
 
 void MapCanvas::removeChosen() {
@@ -372,6 +408,11 @@ void MapCanvas::contextMenuEvent(QContextMenuEvent* event) {
 
 void MapCanvas::leaveEvent(QEvent*) {
   emit pointed({});
+}
+
+void MapCanvas::focusOutEvent(QFocusEvent* event) {
+  if (std::exchange(isByKeys_, false)) update();
+  QWidget::focusOutEvent(event);
 }
 
 }  // namespace gridbay::shell

@@ -11,7 +11,6 @@
 
 #include "core/page_id.h"
 #include "shell/grid_view.h"
-#include "shell/map/map_export.h"
 #include "shell/map/map_rows.h"
 #include "shell/map/map_settings.h"
 
@@ -49,7 +48,10 @@ MapDock::MapDock(QWidget* parent)
       canvas_(new MapCanvas(this)),
       readout_(new QLabel(this)),
       panel_(new LayerPanel(*canvas_, this)),
-      adviceStrip_(new AdviceStrip(canvas_)) {
+      adviceStrip_(new AdviceStrip(canvas_)),
+      readingStrip_(new WorkStrip(this)),
+      exportStrip_(new WorkStrip(this)),
+      export_(new MapExport(*canvas_)) {
   setObjectName("map");
   toggleViewAction()->setShortcut(Qt::CTRL | Qt::Key_M);
   auto* content = new QWidget(this);
@@ -58,6 +60,7 @@ MapDock::MapDock(QWidget* parent)
   layout->setSpacing(2);
   panel_->hide();
   buildTools();
+  buildStrips();
   auto* split = new QSplitter(content);
   split->addWidget(canvas_);
   split->addWidget(panel_);
@@ -74,6 +77,8 @@ MapDock::MapDock(QWidget* parent)
   adviceStrip_->setCursor(Qt::ArrowCursor);
   layout->addWidget(tools_);
   layout->addWidget(split, 1);
+  layout->addWidget(readingStrip_);
+  layout->addWidget(exportStrip_);
   layout->addWidget(readout_);
   setWidget(content);
 
@@ -85,7 +90,11 @@ MapDock::MapDock(QWidget* parent)
     canvas_->setMarks(marksOf(tab_->advice(), canvas_->scene()));
     followCell();
   });
-  connect(this, &QDockWidget::visibilityChanged, this, [this](bool) { follow(); });
+  // One behind another dock counts as visible, and only the signal tells.
+  connect(this, &QDockWidget::visibilityChanged, this, [this](bool isShown) {
+    isShown_ = isShown;
+    follow();
+  });
   connect(canvas_, &MapCanvas::pointed, this,
           [this](const QString& text) { readout_->setText(text.isEmpty() ? " " : text); });
   connect(canvas_, &MapCanvas::featureChosen, this, &MapDock::showFeature);
@@ -119,10 +128,17 @@ MapDock::MapDock(QWidget* parent)
 
 void MapDock::buildTools() {
   auto* group = new QActionGroup(this);
-  const auto addTool = [&](MapTool tool, const QString& text, const QString& tip) {
+  // Keys of one letter are those of the map, while it has the keyboard.
+  const auto giveKey = [this](QAction* action, const QKeySequence& key, const QString& tip) {
+    action->setShortcut(key);
+    action->setShortcutContext(Qt::WidgetShortcut);
+    action->setToolTip(QString("%1 (%2)").arg(tip, key.toString(QKeySequence::NativeText)));
+    canvas_->addAction(action);
+  };
+  const auto addTool = [&](MapTool tool, const QKeySequence& key, const QString& text, const QString& tip) {
     auto* action = new QAction(text, this);
     action->setCheckable(true);
-    action->setToolTip(tip);
+    giveKey(action, key, tip);
     group->addAction(action);
     connect(action, &QAction::triggered, this, [this, tool] {
       canvas_->setTool(tool);
@@ -132,31 +148,35 @@ void MapDock::buildTools() {
     return action;
   };
   tools_->setToolButtonStyle(Qt::ToolButtonTextOnly);
-  tools_->addAction(addTool(MapTool::select, tr("Select"), tr("Choose and drag what is placed")));
+  tools_->addAction(addTool(MapTool::select, Qt::Key_S, tr("Select"), tr("Choose and drag what is placed")));
   toolActions_[MapTool::select]->setChecked(true);
 
   auto* place = new QMenu(tr("Place"), this);
-  place->addAction(addTool(MapTool::nestedArea, tr("Nested area"), tr("Draw a rectangle")));
+  place->setToolTipsVisible(true);
+  place->addAction(addTool(MapTool::nestedArea, Qt::Key_N, tr("Nested area"), tr("Draw a rectangle")));
   place->addSeparator();
-  place->addAction(addTool(MapTool::source, tr("Source"), tr("Click")));
-  place->addAction(addTool(MapTool::pair, tr("Source and sink"), tr("Click both")));
-  place->addAction(addTool(MapTool::boundary, tr("Open boundary"), tr("Click both ends")));
+  place->addAction(addTool(MapTool::source, Qt::Key_Q, tr("Source"), tr("Click")));
+  place->addAction(addTool(MapTool::pair, Qt::Key_P, tr("Source and sink"), tr("Click both")));
+  place->addAction(addTool(MapTool::boundary, Qt::Key_B, tr("Open boundary"), tr("Click both ends")));
+  place->addAction(addTool(MapTool::massBudget, Qt::Key_M, tr("Mass budget polygon"),
+                           tr("Click the corners, Return ends")));
+  place->addSeparator();
+  place->addAction(addTool(MapTool::dike, Qt::Key_D, tr("Dike"), tr("Click the points, Return ends")));
+  place->addAction(addTool(MapTool::weir, Qt::Key_W, tr("Weir"), tr("Click the points, Return ends")));
+  place->addAction(addTool(MapTool::culvert, Qt::Key_C, tr("Culvert"), tr("Click the points, Return ends")));
+  place->addSeparator();
+  place->addAction(addTool(MapTool::outputPoint, Qt::Key_O, tr("Output point"), tr("Click")));
+  place->addAction(addTool(MapTool::outputLine, Qt::Key_L, tr("Output line"), tr("Click both ends")));
+  place->addAction(addTool(MapTool::outputArea, Qt::Key_A, tr("Output area"), tr("Draw a rectangle")));
+  place->addSeparator();
   place->addAction(
-      addTool(MapTool::massBudget, tr("Mass budget polygon"), tr("Click the corners, Return ends")));
-  place->addSeparator();
-  place->addAction(addTool(MapTool::dike, tr("Dike"), tr("Click the points, Return ends")));
-  place->addAction(addTool(MapTool::weir, tr("Weir"), tr("Click the points, Return ends")));
-  place->addAction(addTool(MapTool::culvert, tr("Culvert"), tr("Click the points, Return ends")));
-  place->addSeparator();
-  place->addAction(addTool(MapTool::outputPoint, tr("Output point"), tr("Click")));
-  place->addAction(addTool(MapTool::outputLine, tr("Output line"), tr("Click both ends")));
-  place->addAction(addTool(MapTool::outputArea, tr("Output area"), tr("Draw a rectangle")));
-  place->addSeparator();
-  place->addAction(addTool(MapTool::moduleOutputPoint, tr("Module output point"), tr("Click")));
-  place->addAction(addTool(MapTool::moduleOutputLine, tr("Module output line"), tr("Click both ends")));
-  place->addAction(addTool(MapTool::moduleOutputArea, tr("Module output area"), tr("Draw a rectangle")));
-  place->addAction(addTool(MapTool::discharge, tr("Discharge line"), tr("Click both ends")));
-  place->addAction(addTool(MapTool::box, tr("Box"), tr("Draw a rectangle")));
+      addTool(MapTool::moduleOutputPoint, Qt::SHIFT | Qt::Key_O, tr("Module output point"), tr("Click")));
+  place->addAction(addTool(MapTool::moduleOutputLine, Qt::SHIFT | Qt::Key_L, tr("Module output line"),
+                           tr("Click both ends")));
+  place->addAction(addTool(MapTool::moduleOutputArea, Qt::SHIFT | Qt::Key_A, tr("Module output area"),
+                           tr("Draw a rectangle")));
+  place->addAction(addTool(MapTool::discharge, Qt::Key_F, tr("Discharge line"), tr("Click both ends")));
+  place->addAction(addTool(MapTool::box, Qt::Key_X, tr("Box"), tr("Draw a rectangle")));
   connect(canvas_, &MapCanvas::sceneChanged, this, &MapDock::showTools);
   auto* button = new QToolButton(tools_);
   button->setText(tr("Place"));
@@ -169,15 +189,19 @@ void MapDock::buildTools() {
   pick_->setToolTip(tr("Pick on the map what the page's current cell is to hold (Ctrl+Shift+M)"));
   pick_->setShortcut(Qt::CTRL | Qt::SHIFT | Qt::Key_M);
   tools_->addSeparator();
-  tools_->addAction(tr("Whole map"), canvas_, &MapCanvas::fit);
+  QAction* whole = tools_->addAction(tr("Whole map"), canvas_, &MapCanvas::fit);
+  whole->setToolTip(tr("Whole map (Home)"));
   QAction* layers = tools_->addAction(tr("Layers"));
   layers->setCheckable(true);
+  giveKey(layers, Qt::Key_Y, tr("What is shown, and how"));
   connect(layers, &QAction::toggled, this, [this](bool isOpen) {
     panel_->setVisible(isOpen);
     MapSettings({}).setValue(kPanelKey, isOpen);
   });
   layers->setChecked(MapSettings({}).value(kPanelKey, false).toBool());
-  tools_->addAction(tr("Export..."), this, &MapDock::askExport);
+  giveKey(tools_->addAction(tr("Export..."), this, &MapDock::askExport), Qt::Key_E,
+          tr("Write the map to a file"));
+  for (auto* each : tools_->findChildren<QToolButton*>()) each->setFocusPolicy(Qt::StrongFocus);
 }
 
 // What the module that is chosen has none of can't be drawn.
@@ -197,11 +221,13 @@ void MapDock::showDocument(DocumentTab* tab) {
 
 // Shows what is wanted, while anyone can see it.
 void MapDock::follow() {
-  DocumentTab* tab = isVisible() ? wanted_.data() : nullptr;
+  DocumentTab* tab = isShown_ ? wanted_.data() : nullptr;
   if (tab == tab_) return;
   if (tab_ != nullptr) {
     frames_[tab_] = canvas_->isFitted() ? std::nullopt : std::optional(canvas_->frame());
     keepFrame(setupOf(*tab_), frames_[tab_]);
+    export_->cancel();
+    exportStrip_->hide();
     for (const auto& signal : links_) disconnect(signal);
     links_.clear();
   }
@@ -288,9 +314,8 @@ void MapDock::startPick() {
   if (wanted_ == nullptr) return;
   const std::optional<QModelIndex> cell = wanted_->pane().pointCell();
   if (!cell) return emit failed(tr("Choose a cell of the page that holds a point first."));
-  if (!isVisible()) show();
+  show();
   raise();
-  follow();
   if (tab_ == nullptr) return;
   pickCell_ = *cell;
   const std::int32_t page = tab_->currentPage();
@@ -352,8 +377,31 @@ void MapDock::askNestedArea(MapPoint corner, MapPoint opposite) {
   canvas_->refresh();
 }
 
-QString MapDock::exportTo(const QString& path) {
-  return exportMap(*canvas_, path);
+void MapDock::exportTo(const QString& path) {
+  export_->begin(path);
+}
+
+void MapDock::buildStrips() {
+  MapBackgrounds& backgrounds = canvas_->backgrounds();
+  connect(&backgrounds, &MapBackgrounds::reading, this, [this](const QString& path, double done) {
+    readingStrip_->showWork(tr("Reading %1").arg(QFileInfo(path).fileName()), done);
+  });
+  connect(&backgrounds, &MapBackgrounds::readingEnded, readingStrip_, &QWidget::hide);
+  connect(readingStrip_, &WorkStrip::cancelled, &backgrounds, &MapBackgrounds::stopReading);
+  connect(export_, &MapExport::progressed, this, [this](const QString& path, double done) {
+    exportStrip_->showWork(tr("Exporting %1").arg(QFileInfo(path).fileName()), done);
+  });
+  connect(export_, &MapExport::ended, this, [this](const QString& path, const QString& fault) {
+    exportStrip_->hide();
+    if (fault.isEmpty()) readout_->setText(tr("\"%1\" is written.").arg(path));
+    if (!fault.isEmpty()) emit failed(fault);
+    emit exported(path, fault);
+  });
+  connect(exportStrip_, &WorkStrip::cancelled, this, [this] {
+    export_->cancel();
+    exportStrip_->hide();
+    readout_->setText(tr("The export was stopped; nothing is written."));
+  });
 }
 
 void MapDock::askExport() {
@@ -365,7 +413,7 @@ void MapDock::askExport() {
   });
   dialog.setDefaultSuffix("png");
   if (dialog.exec() != QDialog::Accepted) return;
-  if (const QString fault = exportTo(dialog.selectedFiles().value(0)); !fault.isEmpty()) emit failed(fault);
+  exportTo(dialog.selectedFiles().value(0));
 }
 
 }  // namespace gridbay::shell

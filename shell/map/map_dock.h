@@ -13,6 +13,8 @@
 #include "shell/document_tab.h"
 #include "shell/map/layer_panel.h"
 #include "shell/map/map_canvas.h"
+#include "shell/map/map_export.h"
+#include "shell/map/work_strip.h"
 
 namespace gridbay::shell {
 
@@ -36,14 +38,20 @@ class MapDock final : public QDockWidget {
   QToolBar& tools() { return *tools_; }
   QAction* toolAction(MapTool tool) { return toolActions_[tool]; }
   QAction* pickAction() { return pick_; }
-  // Writes the map as it is shown to a file, by its ending: png, svg or pdf. What is wrong, or empty.
-  QString exportTo(const QString& path);
+  // Begins to write the map as it is shown to a file, by its ending: png, svg or pdf.
+  void exportTo(const QString& path);
+  // What goes on beside the window: backgrounds that are read, and an export.
+  WorkStrip& readingStrip() { return *readingStrip_; }
+  WorkStrip& exportStrip() { return *exportStrip_; }
 
  signals:
   void failed(const QString& text);
+  // An export has ended; what is wrong, or empty.
+  void exported(const QString& path, const QString& fault);
 
  private:
   void buildTools();
+  void buildStrips();
   void showTools();
   void follow();
   void followSetup();
@@ -65,11 +73,15 @@ class MapDock final : public QDockWidget {
   QLabel* readout_;
   LayerPanel* panel_;
   AdviceStrip* adviceStrip_;
+  WorkStrip* readingStrip_;
+  WorkStrip* exportStrip_;
+  MapExport* export_;
   std::map<MapTool, QAction*> toolActions_;
   QAction* pick_ = nullptr;
   QTimer refreshTimer_;
   QPersistentModelIndex pickCell_;
   std::int32_t pickArea_ = 0;
+  bool isShown_ = false;  // to the user: neither hidden nor behind another dock
 };
 
 }  // namespace gridbay::shell

@@ -51,6 +51,13 @@ QRectF boxOfMark(QPointF place) {
   return {place.x() - kMarkSize / 2, place.y() - kStalk - kMarkSize, kMarkSize, kMarkSize};
 }
 
+QRectF boxOfBadge(const QPainter& painter, QPointF middle, const QString& text) {
+  const QFontMetricsF metrics(painter.font());
+  const double height = metrics.height() + 2;
+  const double width = std::max(height, metrics.horizontalAdvance(text) + 8);
+  return {middle.x() - width / 2, middle.y() - height / 2, width, height};
+}
+
 constexpr std::size_t kRun = 64;  // points
 
 // Of each run of points with the next point, at the end of a closed line the first one.
@@ -76,10 +83,10 @@ QPolygonF arrowHead(QPointF from, QPointF to, double size) {
   return {{to, to - ahead + aside, to - ahead - aside}};
 }
 
-// A round length of about a fifth of the picture: 1, 2 or 5 with noughts.
-double roundLength(double metres) {
-  const double power = std::pow(10, std::floor(std::log10(metres)));
-  const double digit = metres / power;
+// The round number at or below another one: 1, 2 or 5 with noughts.
+double roundBelow(double value) {
+  const double power = std::pow(10, std::floor(std::log10(value)));
+  const double digit = value / power;
   return (digit >= 5 ? 5 : digit >= 2 ? 2 : 1) * power;
 }
 
@@ -121,13 +128,10 @@ QPolygonF outlineOf(const MapFrame& frame, const std::array<MapPoint, 4>& corner
 }
 
 void paintBadge(QPainter& painter, QPointF middle, const QString& text, const QColor& ground) {
-  const QFontMetricsF metrics(painter.font());
-  const double height = metrics.height() + 2;
-  const double width = std::max(height, metrics.horizontalAdvance(text) + 8);
-  const QRectF box(middle.x() - width / 2, middle.y() - height / 2, width, height);
+  const QRectF box = boxOfBadge(painter, middle, text);
   painter.setPen(QPen(Qt::white, 1));
   painter.setBrush(ground);
-  painter.drawRoundedRect(box, height / 2, height / 2);
+  painter.drawRoundedRect(box, box.height() / 2, box.height() / 2);
   painter.drawText(box, Qt::AlignCenter | Qt::TextDontClip, text);
 }
 
@@ -156,7 +160,8 @@ const MapFeature* MapDrawing::feature(const MapFeatureId& id) const {
 void MapDrawing::paint(QPainter& painter, const MapFrame& frame) const {
   painter.setRenderHint(QPainter::Antialiasing);
   if (shows(MapLayer::gridLines)) paintGridLines(painter, frame);
-  if (shows(MapLayer::outlines)) paintAreas(painter, frame);
+  Labels labels;
+  if (shows(MapLayer::outlines)) paintAreas(painter, frame, labels);
   const MapPoint low = frame.toMap({-40, frame.size.height() + 40});
   const MapPoint high = frame.toMap({frame.size.width() + 40, -40});
   const auto isInView = [&](const QRectF& cover) {
@@ -169,10 +174,11 @@ void MapDrawing::paint(QPainter& painter, const MapFrame& frame) const {
     if (selection.feature == feature->id) {
       lit = feature;
     } else {
-      paintFeature(painter, frame, *feature);
+      paintFeature(painter, frame, *feature, labels);
     }
   }
-  if (lit != nullptr) paintFeature(painter, frame, *lit);
+  if (lit != nullptr) paintFeature(painter, frame, *lit, labels);
+  paintLabels(painter, frame, labels);
   if (shows(MapLayer::advice)) paintAdvice(painter, frame);
 }
 
@@ -192,7 +198,7 @@ void MapDrawing::paintAdvice(QPainter& painter, const MapFrame& frame) const {
   }
 }
 
-void MapDrawing::paintAreas(QPainter& painter, const MapFrame& frame) const {
+void MapDrawing::paintAreas(QPainter& painter, const MapFrame& frame, Labels& labels) const {
   for (const MapArea& area : scene_.areas) {
     if (!area.isPlaced) continue;
     const QPolygonF outline = outlineOf(frame, area.corners);
@@ -204,8 +210,9 @@ void MapDrawing::paintAreas(QPainter& painter, const MapFrame& frame) const {
     painter.setPen(QPen(isWrong ? kFault : layerColour(MapLayer::outlines), isLit ? 2.5 : 1.5,
                         isWrong ? Qt::DashLine : Qt::SolidLine));
     painter.drawPolygon(outline);
-    paintBadge(painter, badgeOf(outline), QString::number(area.number),
-               isWrong ? kFault : layerColour(MapLayer::outlines));
+    const QString number = QString::number(area.number);
+    paintBadge(painter, badgeOf(outline), number, isWrong ? kFault : layerColour(MapLayer::outlines));
+    labels.taken.push_back(boxOfBadge(painter, badgeOf(outline), number));
   }
 }
 
@@ -252,7 +259,8 @@ void MapDrawing::paintGridLines(QPainter& painter, const MapFrame& frame) const 
   }
 }
 
-void MapDrawing::paintFeature(QPainter& painter, const MapFrame& frame, const MapFeature& feature) const {
+void MapDrawing::paintFeature(QPainter& painter, const MapFrame& frame, const MapFeature& feature,
+                              Labels& labels) const {
   const QPolygonF line = onScreen(frame, *feature.points);
   const bool isLit = selection.feature == feature.id;
   const bool isWrong = !feature.fault.empty();
@@ -276,10 +284,11 @@ void MapDrawing::paintFeature(QPainter& painter, const MapFrame& frame, const Ma
     drawLine();
   }
   paintMarks(painter, feature, line, colour);
+  addLabel(feature, line, colour, labels);
   if (isLit) paintHandles(painter, frame, *feature.points);
 }
 
-// The marks of points and arrows, and the label.
+// The marks of points and arrows.
 void MapDrawing::paintMarks(QPainter& painter, const MapFeature& feature, const QPolygonF& line,
                             const QColor& colour) const {
   constexpr double kRadius = 4.5;
@@ -319,14 +328,51 @@ void MapDrawing::paintMarks(QPainter& painter, const MapFeature& feature, const 
       if (line.size() == 1 || !feature.joined)
         for (const QPointF& point : line) painter.drawEllipse(point, 3, 3);
   }
+}
+
+void MapDrawing::addLabel(const MapFeature& feature, const QPolygonF& line, const QColor& colour,
+                          Labels& labels) const {
   constexpr double kLabelled = 40;  // pixels
+  constexpr double kMark = 6;
+  constexpr qsizetype kMostMarks = 64;
+  const bool isLit = selection.feature == feature.id;
+  const bool isOfPoints = feature.id.kind == MapKind::source || feature.id.kind == MapKind::outputPoints;
+  if (isOfPoints) {
+    for (const QPointF& point : line.mid(0, kMostMarks))
+      labels.taken.push_back({point.x() - kMark, point.y() - kMark, 2 * kMark, 2 * kMark});
+  }
   const bool isWide = line.boundingRect().width() + line.boundingRect().height() > kLabelled;
   if (feature.label.empty() || !(isWide || isLit || line.size() == 1)) return;
-  QPointF middle = line.size() == 2 ? (line.front() + line.back()) / 2 : line[line.size() / 2];
-  if (feature.id.kind == MapKind::source || feature.id.kind == MapKind::outputPoints)
-    middle = line.front() + QPointF(14, 0);
-  if (feature.closed) middle = line.boundingRect().center();
-  paintBadge(painter, middle, QString::fromStdString(feature.label), colour);
+  QPointF place = line.size() == 2 ? (line.front() + line.back()) / 2 : line[line.size() / 2];
+  if (isOfPoints) place = line.front();
+  if (feature.closed) place = line.boundingRect().center();
+  labels.all.push_back({place, QString::fromStdString(feature.label), colour, isOfPoints, isLit});
+}
+
+// The one that is lit up first. What has no room but on another one is left out, until one looks closer.
+void MapDrawing::paintLabels(QPainter& painter, const MapFrame& frame, Labels& labels) {
+  constexpr std::size_t kMost = 300;
+  constexpr double kApart = 10;
+  const QRectF all({0, 0}, frame.size);
+  std::ranges::stable_partition(labels.all, [](const Label& label) { return label.isLit; });
+  std::size_t painted = 0;
+  for (const Label& label : labels.all) {
+    if (painted == kMost) return;
+    const QRectF box = boxOfBadge(painter, label.place, label.text);
+    const QPointF aside(box.width() / 2 + kApart, 0);
+    const QPointF above(0, -(label.isBeside ? 2 : 1) * box.height());
+    std::array<QPointF, 5> shifts{QPointF(), above, -above, aside, -aside};
+    if (label.isBeside) shifts = {aside, -aside, above, -above, aside + above};
+    const auto free = std::ranges::find_if(shifts, [&](QPointF shift) {
+      const QRectF there = box.translated(shift);
+      return std::ranges::none_of(labels.taken, [&](const QRectF& each) { return each.intersects(there); });
+    });
+    if (!box.intersects(all) || (free == shifts.end() && !label.isLit)) continue;
+    const QPointF shift = free == shifts.end() ? shifts.front() : *free;
+    paintBadge(painter, label.place + shift, label.text, label.colour);
+    labels.taken.push_back(box.translated(shift));
+    ++painted;
+  }
 }
 
 // What can be grasped of the feature that is lit up; of a long one only a point that is chosen.
@@ -350,12 +396,17 @@ void MapDrawing::paintLegend(QPainter& painter, const MapFrame& frame, const Ter
   const double bottom = frame.size.height() - kMargin;
   painter.setRenderHint(QPainter::Antialiasing);
 
-  const double metres = roundLength(frame.size.width() / 4 * frame.metresPerPixel);
+  const double metres = roundBelow(frame.size.width() / 4 * frame.metresPerPixel);
   const double length = metres / frame.metresPerPixel;
-  painter.setPen(QPen(kHalo, 6, Qt::SolidLine, Qt::FlatCap));
-  painter.drawLine(QPointF(kMargin, bottom), QPointF(kMargin + length, bottom));
-  painter.setPen(QPen(Qt::black, 3, Qt::SolidLine, Qt::FlatCap));
-  painter.drawLine(QPointF(kMargin, bottom), QPointF(kMargin + length, bottom));
+  constexpr int kParts = 4;  // black and white in turn, which are seen on any ground
+  for (int i = 0; i < kParts; ++i) {
+    painter.setPen(QPen(Qt::black, 1));
+    painter.setBrush(i % 2 == 0 ? Qt::black : Qt::white);
+    painter.drawRect(QRectF(kMargin + length * i / kParts, bottom - 3, length / kParts, 6));
+  }
+  painter.setPen(QPen(kHalo, 1));
+  painter.setBrush(Qt::NoBrush);
+  painter.drawRect(QRectF(kMargin, bottom - 3, length, 6).adjusted(-1, -1, 1, 1));
   paintLegendText(painter, {kMargin + length / 2, bottom - 14}, lengthText(metres), Qt::AlignHCenter);
   paintLegendText(painter, {right, bottom}, QString::fromStdString(scene_.projection), Qt::AlignRight);
 
@@ -367,19 +418,32 @@ void MapDrawing::paintLegend(QPainter& painter, const MapFrame& frame, const Ter
 
   if (!scale || !shows(MapLayer::terrain)) return;
   constexpr int kBar = 130;
-  const QRectF bar(right - 14, kMargin + 64, 14, kBar);
-  if (bar.bottom() > bottom - 30) return;
-  for (int y = 0; y < kBar; ++y)
+  const QRectF bar(right - 14, kMargin + 74, 14, kBar);
+  if (bar.bottom() <= bottom - 30) paintScale(painter, bar, style.colours, *scale);
+}
+
+// With round numbers beside it.
+void MapDrawing::paintScale(QPainter& painter, const QRectF& bar, TerrainColours colours,
+                            const TerrainScale& scale) {
+  for (int y = 0; y < bar.height(); ++y)
     painter.fillRect(QRectF(bar.left(), bar.top() + y, bar.width(), 1.5),
-                     QColor(terrainColour(style.colours, 1 - y / (kBar - 1.0))));
+                     QColor(terrainColour(colours, 1 - y / (bar.height() - 1))));
   painter.setPen(Qt::black);
   painter.setBrush(Qt::NoBrush);
   painter.drawRect(bar);
-  constexpr int kTicks = 4;
-  for (int i = 0; i <= kTicks; ++i) {
-    const double value = scale->greatest + (scale->least - scale->greatest) * i / kTicks;
-    paintLegendText(painter, {bar.left() - 6, bar.top() + bar.height() * i / kTicks},
-                    QString::number(value, 'g', 4), Qt::AlignRight);
+  paintLegendText(painter, {bar.right(), bar.top() - 13}, "m", Qt::AlignRight);
+  constexpr double kTicks = 3;  // at least
+  const double least = scale.least;
+  const double range = scale.greatest - least;
+  if (!(range > 0)) return;
+  const double step = roundBelow(range / kTicks);
+  const int digits = std::max(0, -static_cast<int>(std::floor(std::log10(step))));
+  for (double n = std::ceil(least / step); n * step <= scale.greatest; ++n) {
+    const double y = bar.bottom() - bar.height() * (n * step - least) / range;
+    painter.setPen(QPen(Qt::black, 1));
+    painter.drawLine(QPointF(bar.left() - 3, y), QPointF(bar.left(), y));
+    paintLegendText(painter, {bar.left() - 8, y}, QString::number(n == 0 ? 0 : n * step, 'f', digits),
+                    Qt::AlignRight);
   }
 }
 

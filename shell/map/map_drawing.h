@@ -62,12 +62,30 @@ class MapDrawing {
     std::optional<std::size_t> segment;
   };
   static Nearest nearestOf(const Placed& placed, const MapFrame& frame, QPointF at);
+  // A name or number beside its feature, or on it.
+  struct Label {
+    QPointF place;
+    QString text;
+    QColor colour;
+    bool isBeside = false;  // the mark at the place stays free
+    bool isLit = false;
+  };
+  // What a picture has labels of, and what of it they leave free.
+  struct Labels {
+    std::vector<Label> all;
+    std::vector<QRectF> taken;
+  };
   bool shows(MapLayer layer) const { return layers.test(placeOf(layer)); }
-  void paintAreas(QPainter& painter, const MapFrame& frame) const;
+  void paintAreas(QPainter& painter, const MapFrame& frame, Labels& labels) const;
   void paintGridLines(QPainter& painter, const MapFrame& frame) const;
-  void paintFeature(QPainter& painter, const MapFrame& frame, const MapFeature& feature) const;
+  void paintFeature(QPainter& painter, const MapFrame& frame, const MapFeature& feature,
+                    Labels& labels) const;
   void paintMarks(QPainter& painter, const MapFeature& feature, const QPolygonF& line,
                   const QColor& colour) const;
+  void addLabel(const MapFeature& feature, const QPolygonF& line, const QColor& colour, Labels& labels) const;
+  static void paintLabels(QPainter& painter, const MapFrame& frame, Labels& labels);
+  static void paintScale(QPainter& painter, const QRectF& bar, TerrainColours colours,
+                         const TerrainScale& scale);
   void paintAdvice(QPainter& painter, const MapFrame& frame) const;
   void paintHandles(QPainter& painter, const MapFrame& frame, const std::vector<MapPoint>& points) const;
 

@@ -7,8 +7,6 @@
 #include <QSaveFile>
 #include <QSvgGenerator>
 
-#include "shell/map/map_canvas.h"
-
 namespace gridbay::shell {
 namespace {
 
@@ -18,50 +16,49 @@ QString tr(const char* text) {
   return QCoreApplication::translate("MapExport", text);
 }
 
+// What is written: the map, the part of it, and the terrain there, if any.
+struct Shown {
+  const MapCanvas& canvas;
+  MapFrame frame;
+  const std::optional<TerrainPicture>& terrain;
+};
+
 // In the pixels of the screen, whatever the painter's device.
-void draw(QPainter& painter, const MapCanvas& canvas) {
-  const MapFrame& frame = canvas.frame();
+void draw(QPainter& painter, const Shown& shown) {
+  const auto& [canvas, frame, terrain] = shown;
   painter.setClipRect(QRectF({0, 0}, frame.size));
   canvas.backgrounds().paint(painter, frame, false);
-  if (canvas.drawing().layers.test(placeOf(MapLayer::terrain)) && !canvas.terrain().empty()) {
-    TerrainRequest request{canvas.terrain(), frame, canvas.terrainStyle()};
-    request.frame.size *= kFiner;
-    request.frame.metresPerPixel /= kFiner;
-    request.style.scale = canvas.scale();
-    for (const TerrainArea& area : request.areas) area.values->open({});
-    if (const auto picture = paintTerrain(request, 1, [] { return false; }))
-      painter.drawImage(picture->frame.in(frame), picture->image);
-  }
+  if (terrain) painter.drawImage(terrain->frame.in(frame), terrain->image);
   canvas.backgrounds().paint(painter, frame, true);
   canvas.drawing().paint(painter, frame);
   canvas.drawing().paintLegend(painter, frame, canvas.terrainStyle(),
-                               canvas.terrain().empty() ? std::nullopt : canvas.scale());
+                               terrain ? std::optional(terrain->scale) : std::nullopt);
 }
 
-bool writePicture(const MapCanvas& canvas, QIODevice& file) {
-  QImage image((canvas.frame().size * kFiner).toSize(), QImage::Format_RGB32);
+bool writePicture(const Shown& shown, QIODevice& file) {
+  QImage image((shown.frame.size * kFiner).toSize(), QImage::Format_RGB32);
   image.fill(Qt::white);
   image.setDevicePixelRatio(kFiner);
   QPainter painter(&image);
-  draw(painter, canvas);
+  draw(painter, shown);
   return painter.end() && image.save(&file, "PNG");
 }
 
-bool writeDrawing(const MapCanvas& canvas, QIODevice& file) {
+bool writeDrawing(const Shown& shown, QIODevice& file) {
   QSvgGenerator drawing;
   drawing.setOutputDevice(&file);
-  drawing.setSize(canvas.frame().size.toSize());
-  drawing.setViewBox(QRectF({0, 0}, canvas.frame().size));
+  drawing.setSize(shown.frame.size.toSize());
+  drawing.setViewBox(QRectF({0, 0}, shown.frame.size));
   drawing.setTitle(tr("Map"));
   QPainter painter;
   if (!painter.begin(&drawing)) return false;
-  draw(painter, canvas);
+  draw(painter, shown);
   return painter.end();
 }
 
-bool writePage(const MapCanvas& canvas, QIODevice& file) {
+bool writePage(const Shown& shown, QIODevice& file) {
   QPdfWriter page(&file);
-  const QSizeF size = canvas.frame().size;
+  const QSizeF size = shown.frame.size;
   page.setPageSize(QPageSize(QPageSize::A4));
   page.setPageOrientation(size.width() > size.height() ? QPageLayout::Landscape : QPageLayout::Portrait);
   page.setTitle(tr("Map"));
@@ -74,24 +71,88 @@ bool writePage(const MapCanvas& canvas, QIODevice& file) {
   QFont font = painter.font();
   font.setPixelSize(12);
   painter.setFont(font);
-  draw(painter, canvas);
+  draw(painter, shown);
   return painter.end();
+}
+
+using Write = bool (*)(const Shown&, QIODevice&);
+
+// Null for another ending.
+Write writerOf(const QString& path) {
+  const QString ending = QFileInfo(path).suffix().toLower();
+  return ending == "png"   ? writePicture
+         : ending == "svg" ? writeDrawing
+         : ending == "pdf" ? writePage
+                           : nullptr;
 }
 
 }  // namespace
 
-QString exportMap(const MapCanvas& canvas, const QString& path) {
-  const QString ending = QFileInfo(path).suffix().toLower();
-  bool (*write)(const MapCanvas&, QIODevice&) = ending == "png"   ? writePicture
-                                                : ending == "svg" ? writeDrawing
-                                                : ending == "pdf" ? writePage
-                                                                  : nullptr;
-  if (write == nullptr) return tr("A map is exported to a file that ends in .png, .svg or .pdf.");
-  QSaveFile file(path);
-  if (!file.open(QIODevice::WriteOnly)) return tr("cannot write \"%1\": %2").arg(path, file.errorString());
-  if (!write(canvas, file) || !file.commit())
-    return tr("cannot write \"%1\": %2").arg(path, file.errorString());
+MapExport::MapExport(MapCanvas& canvas) : QObject(&canvas), canvas_(canvas) {
+  constexpr int kMoment = 20;  // milliseconds
+  timer_.setInterval(kMoment);
+  connect(&timer_, &QTimer::timeout, this, &MapExport::look);
+}
+
+void MapExport::begin(const QString& path) {
+  cancel();
+  path_ = path;
+  if (writerOf(path) == nullptr)
+    return end(tr("A map is exported to a file that ends in .png, .svg or .pdf."));
+  frame_ = canvas_.frame();
+  if (canvas_.drawing().layers.test(placeOf(MapLayer::terrain))) terrain_ = canvas_.terrain();
+  if (!terrain_.empty()) {
+    TerrainRequest request{terrain_, frame_, canvas_.terrainStyle()};
+    request.frame.size *= kFiner;
+    request.frame.metresPerPixel /= kFiner;
+    if (!request.style.scale) request.style.scale = canvas_.scale();
+    worker_ = std::make_unique<TerrainWorker>(nullptr);
+    connect(worker_.get(), &TerrainWorker::painted, this, [this](const TerrainPicture& picture) {
+      if (picture.isFinal) picture_ = picture;
+    });
+    worker_->paint(std::move(request));
+  }
+  elapsed_.start();
+  timer_.start();
+}
+
+void MapExport::cancel() {
+  timer_.stop();
+  worker_.reset();
+  picture_.reset();
+  terrain_.clear();
+}
+
+double MapExport::done() const {
+  constexpr double kOpening = 0.9;  // of the whole
+  double points = 0;
+  double opened = 0;
+  for (const TerrainArea& area : terrain_) {
+    const double all = static_cast<double>(area.values->columns()) * static_cast<double>(area.values->rows());
+    points += all;
+    opened += all * area.values->progress();
+  }
+  return points > 0 ? kOpening * opened / points : kOpening;
+}
+
+void MapExport::look() {
+  constexpr qint64 kWhile = 200;  // milliseconds
+  const bool isReady = (terrain_.empty() || picture_) && canvas_.backgrounds().isSettled();
+  if (isReady) return end(write());
+  if (elapsed_.elapsed() > kWhile) emit progressed(path_, done());
+}
+
+QString MapExport::write() const {
+  QSaveFile file(path_);
+  if (!file.open(QIODevice::WriteOnly)) return tr("cannot write \"%1\": %2").arg(path_, file.errorString());
+  if (!writerOf(path_)({canvas_, frame_, picture_}, file) || !file.commit())
+    return tr("cannot write \"%1\": %2").arg(path_, file.errorString());
   return {};
+}
+
+void MapExport::end(const QString& fault) {
+  cancel();
+  emit ended(path_, fault);
 }
 
 }  // namespace gridbay::shell

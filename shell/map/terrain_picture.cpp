@@ -211,7 +211,7 @@ class Painter {
       colours_[static_cast<std::size_t>(i)] = terrainColour(style_.colours, i / (kColours - 1.0));
     // Between pixels of one cell there is no slope: it is taken over a cell at least, of the grid in the
     // middle.
-    constexpr int kFarthest = 32;
+    constexpr int kFarthest = 256;
     double cell = 0;
     for (const TerrainArea& area : request.areas) {
       const auto [column, row] = area.grid.pointOf(request.frame.centre);
@@ -254,8 +254,8 @@ class Painter {
   // By the light from the north-west.
   QRgb shaded(QRgb colour, int x, int y, float value) const {
     const auto near = [&](int nx, int ny) {
-      if (nx < 0 || ny < 0 || nx >= values_.width || ny >= values_.height) return value;
-      const float other = values_.at(nx, ny);
+      const float other =
+          values_.at(std::clamp(nx, 0, values_.width - 1), std::clamp(ny, 0, values_.height - 1));
       return std::isfinite(other) ? other : value;
     };
     const float rise = near(x + apart_, y) - near(x - apart_, y) + near(x, y + apart_) - near(x, y - apart_);

@@ -588,7 +588,10 @@ TEST_F(StoredGrids, ALargePackedOneIsReadInPartsAndHasAnOverview) {
   const Result<StoredGrid::Source> source = StoredGrid::find(file, 1);
   ASSERT_TRUE(source);
   int asked = 0;
-  const Result<StoredGrid> stopped = StoredGrid::open(*source, [&asked] { return ++asked > 3; });
+  const Result<StoredGrid> stopped = StoredGrid::open(*source, [&asked](double done) {
+    EXPECT_TRUE(done >= 0 && done < 0.1);
+    return ++asked <= 3;
+  });
   EXPECT_FALSE(stopped);
   EXPECT_EQ(asked, 4);
   const Result<StoredGrid> grid = StoredGrid::open(*source);
@@ -602,6 +605,43 @@ TEST_F(StoredGrids, ALargePackedOneIsReadInPartsAndHasAnOverview) {
     for (int j = 0; j < kColumns; ++j)
       ASSERT_NEAR(row[static_cast<std::size_t>(j)], surface(j, k), 3 * (1000 + 7) / 3.0) << j << "," << k;
   }
+}
+
+TEST_F(StoredGrids, ARowOfPiecesThatIsMoreThanIsKeptStaysWhileItIsRead) {
+  constexpr int kColumns = 34000;
+  constexpr int kPieceRows = 500;
+  constexpr int kPieceColumns = 1000;
+  static_assert(std::size_t{kColumns} * kPieceRows > PackedGrid::kMostKept);
+  test::writeGrid(path, {.noJ = kColumns, .noK = kPieceRows + 2}, surface);
+  const Result<StoredGrid> grid = StoredGrid::open(packed({"-d", "1", "-c", "time/1,y/500,x/1000"}), 1);
+  ASSERT_TRUE(grid) << grid.error();
+  const auto atHand = [&grid](std::size_t row) {
+    std::size_t count = 0;
+    for (std::size_t j = 0; j < kColumns; j += kPieceColumns) {
+      float value = 0;
+      if (!grid->readAtOnce(row, j, value)) continue;
+      EXPECT_EQ(value, surface(static_cast<int>(j), static_cast<int>(row)));
+      ++count;
+    }
+    return count;
+  };
+  constexpr std::size_t kPieces = kColumns / kPieceColumns;
+  constexpr std::size_t kMost = PackedGrid::kMostKept / (kPieceRows * kPieceColumns);
+  EXPECT_LE(atHand(0) + atHand(kPieceRows), kMost);  // opened, and looked at here and there
+  std::vector<float> row(kColumns);
+  for (const std::size_t k : {0U, 1U, 499U}) {
+    ASSERT_TRUE(grid->read(k, 0, row));
+    for (int j = 0; j < kColumns; ++j)
+      ASSERT_EQ(row[static_cast<std::size_t>(j)], surface(j, static_cast<int>(k)));
+    EXPECT_EQ(atHand(k), kPieces);
+  }
+  ASSERT_TRUE(grid->read(kPieceRows, 0, row));
+  EXPECT_EQ(row.back(), surface(kColumns - 1, kPieceRows));
+  EXPECT_EQ(atHand(kPieceRows), kPieces);
+  EXPECT_EQ(atHand(0), 0U);
+  // A part of a row goes back to what is kept.
+  ASSERT_TRUE(grid->read(0, 0, std::span(row).first(10)));
+  EXPECT_LE(atHand(0) + atHand(kPieceRows), kMost);
 }
 
 TEST_F(StoredGrids, WhatIsDamagedIsNotRead) {

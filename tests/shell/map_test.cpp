@@ -7,6 +7,7 @@
 #include <QSignalSpy>
 #include <QToolTip>
 #include <cmath>
+#include <set>
 
 #include "platform/tsb/tsb_writer.h"
 #include "platform/units/units.h"
@@ -114,6 +115,26 @@ class MapTest : public DesktopFixture {
     if (QProcess::execute("gdal_translate", arguments) != 0) qFatal("no raster");
     return file(name);
   }
+  static void runTool(const QStringList& command) {
+    if (QProcess::execute(command.front(), command.mid(1)) != 0) qFatal("%s", qPrintable(command.join(' ')));
+  }
+  // The same halves as netCDF, by the name of its file.
+  QString netcdf(const QString& name, const QStringList& options = {}) {
+    runTool(QStringList{"gdal_translate", "-q", "-of", "netCDF"} + options +
+            QStringList{halves("halves.tif", true), file(name)});
+    return file(name);
+  }
+  // What is wrong with an export, or empty.
+  QString exported(const QString& name) {
+    QSignalSpy ended(&window_->map(), &MapDock::exported);
+    window_->map().exportTo(file(name));
+    if (ended.isEmpty()) ended.wait(30000);
+    return ended.isEmpty() ? "it has not ended" : ended[0][1].toString();
+  }
+  void showBackgroundsAlone() {
+    for (const MapLayer each : {MapLayer::terrain, MapLayer::gridLines, MapLayer::outlines})
+      canvas().setLayer(each, false);
+  }
   QString cell(int row, int column) {
     return QString::fromStdString(cells().style(cells().index(row - 1, column - 1)).value);
   }
@@ -153,6 +174,28 @@ class MapTest : public DesktopFixture {
     QTest::keyClick(window_.get(), Qt::Key_M, Qt::ControlModifier);
     QVERIFY(window_->map().isVisible());
     QVERIFY(canvas().editor() != nullptr);
+  }
+
+  void behindAnotherDockItDoesNothing() {
+    window_->tabifyDockWidget(&window_->map(), &window_->help());
+    window_->help().show();
+    window_->help().raise();
+    QTRY_VERIFY(canvas().editor() == nullptr);
+    tab().goToPage(kAreas);
+    QVERIFY(cells().setData(cells().index(1, 2), "40,30", Qt::EditRole));
+    QCoreApplication::processEvents();
+    QVERIFY(canvas().terrain().empty());
+    window_->map().raise();
+    QTRY_VERIFY(canvas().editor() != nullptr);
+    QCOMPARE(area(2).origin.j, 40);
+    tab().undo();
+    // Picking brings it to the front.
+    tab().goToPlace({.page = PageId::bathymetry, .entries = {{2}}, .column = 3});
+    window_->help().raise();
+    QTRY_VERIFY(canvas().editor() == nullptr);
+    window_->map().startPick();
+    QTRY_VERIFY(canvas().editor() != nullptr);
+    QCOMPARE(canvas().tool(), MapTool::pick);
   }
 
   void itsPlaceIsKeptWithTheWindow() {
@@ -558,7 +601,7 @@ class MapTest : public DesktopFixture {
   void itIsExported() {
     settle();
     for (const QString name : {"map.png", "map.svg", "map.pdf"}) {
-      QCOMPARE(window_->map().exportTo(file(name)), QString());
+      QCOMPARE(exported(name), QString());
       QVERIFY(QFileInfo(file(name)).size() > 5000);
     }
     const QImage picture(file("map.png"));
@@ -570,8 +613,52 @@ class MapTest : public DesktopFixture {
     QFile page(file("map.pdf"));
     QVERIFY(page.open(QFile::ReadOnly));
     QCOMPARE(page.read(5), QByteArray("%PDF-"));
-    QVERIFY(!window_->map().exportTo(file("map.bmp")).isEmpty());
-    QVERIFY(window_->map().exportTo(file("no/such/map.png")).contains("no/such/map.png"));
+    QVERIFY(exported("map.bmp").contains(".svg"));
+    QVERIFY(exported("no/such/map.png").contains("no/such/map.png"));
+  }
+
+  void theExportWaitsForAGridThatIsNotOpen() {
+    constexpr std::size_t kPoints = 6000;
+    TsbDefinition definition;
+    definition.time.type = TsbTimeAxisType::relativeEquidistant;
+    definition.axes = {{.points = kPoints, .spacing = 10}, {.points = kPoints, .spacing = 10}};
+    definition.items = {{.name = "Bathymetry", .type = item::kBathymetry, .unit = "m"}};
+    definition.geography = TsbGeography{"UTM-32", 9, 54};
+    Result<TsbWriter> writer = TsbWriter::create(file("fine.tsb2").toStdString(), definition);
+    QVERIFY(static_cast<bool>(writer));
+    for (std::size_t k = 0; k < kPoints; ++k) {
+      // Uneven, so that the unpacking takes a while.
+      std::vector<float> row(kPoints);
+      for (std::size_t j = 0; j < kPoints; ++j)
+        row[j] = (k < kPoints / 2 ? -2.0F : -9.0F) + static_cast<float>((j * 7919 + k * 104729) % 97) * 1e-3F;
+      QVERIFY(static_cast<bool>(writer->writeRows(1, 0, k, row)));
+    }
+    QVERIFY(static_cast<bool>(writer->commit()));
+    runTool({"nccopy", "-d", "1", file("fine.tsb2"), file("large.tsb2")});
+    run("v27setup", {"new", "l.v27", "--force", "--area", "large.tsb2"});
+    window_->map().hide();
+    QVERIFY(window_->openDocument(file("l.v27")) != nullptr);
+    window_->map().show();
+    const TerrainGrid& grid = *canvas().terrain()[0].values;
+    QSignalSpy ended(&window_->map(), &MapDock::exported);
+    // Stopped, and nothing is written.
+    window_->map().exportTo(file("stopped.png"));
+    QVERIFY(!grid.isTried());
+    QTRY_VERIFY(window_->map().exportStrip().isVisible());
+    QTest::mouseClick(&window_->map().exportStrip().cancel(), Qt::LeftButton);
+    QVERIFY(!window_->map().exportStrip().isVisible());
+    QVERIFY(!QFile::exists(file("stopped.png")));
+    window_->map().exportTo(file("large.png"));
+    QVERIFY(ended.isEmpty());  // it goes on beside the window
+    QVERIFY(ended.wait(30000));
+    QCOMPARE(ended[0][1].toString(), QString());
+    QVERIFY(grid.opened() != nullptr);
+    settle();
+    const QPoint at = screenOf(1, kPoints / 2.0, kPoints / 4.0).toPoint();
+    const QColor shown = canvas().grab().toImage().pixelColor(at);
+    const QColor written = QImage(file("large.png")).pixelColor(2 * at);
+    QVERIFY2(std::abs(written.green() - shown.green()) < 40, qPrintable(written.name() + " " + shown.name()));
+    for (const char* name : {"fine.tsb2", "large.tsb2"}) QFile::remove(file(name));
   }
 
   void aRasterIsABackground() {
@@ -612,7 +699,7 @@ class MapTest : public DesktopFixture {
     // It follows the map, and is exported with it.
     canvas().zoom(2);
     QVERIFY(shownAt(canvas().frame().toScreen(area(1).grid.at(area(1).nx * 0.4, 60))).lightness() < 10);
-    QCOMPARE(window_->map().exportTo(file("with.png")), QString());
+    QCOMPARE(exported("with.png"), QString());
     const QPoint at = canvas().frame().toScreen(area(1).grid.at(area(1).nx * 0.4, 60)).toPoint();
     QVERIFY(QImage(file("with.png")).pixelColor(at * 2).lightness() < 10);
     press("Remove");
@@ -679,12 +766,172 @@ class MapTest : public DesktopFixture {
     QVERIFY(QFile::remove(file("loose.tif")));
   }
 
+  void filesOfNetcdfAreReadFromCopies() {
+    // Two at once, one of which has a second variable, the other way round.
+    const QString one = netcdf("one.nc", {"-co", "FORMAT=NC4"});
+    runTool(
+        {"gdal_translate", "-q", "-scale", "0", "100", "100", "0", file("halves.tif"), file("turned.tif")});
+    runTool({"gdalbuildvrt", "-q", "-separate", file("both.vrt"), file("halves.tif"), file("turned.tif")});
+    runTool({"gdal_translate", "-q", "-of", "netCDF", file("both.vrt"), file("both.nc")});
+    write(file("broken.nc"), QByteArray("CDF\x01").append(60, '\x7f'));
+    LayerPanel& panel = window_->map().panel();
+    panel.show();
+    showBackgroundsAlone();
+    QCoreApplication::processEvents();
+    const QPointF west = screenOf(1, 10, 80);
+    const QPointF east = screenOf(1, area(1).nx - 10, 80);
+    QSignalSpy reading(&canvas().backgrounds(), &MapBackgrounds::reading);
+    panel.addBackground(one);
+    panel.addBackground(file("both.nc"));
+    panel.addBackground(file("broken.nc"));
+    QVERIFY2(shownAt(west).lightness() < 10, qPrintable(shownAt(west).name()));
+    QVERIFY(shownAt(east).lightness() > 245);
+    QVERIFY(reading.count() >= 3);
+    QVERIFY(!window_->map().readingStrip().isVisible());
+    QVERIFY2(layer("broken.nc")->toolTip().contains("cannot show"),
+             qPrintable(layer("broken.nc")->toolTip()));
+    for (const char* name : {"one.nc", "both.nc"}) QVERIFY(!layer(name)->text().contains("(!)"));
+    // Only the file of several lets one choose.
+    panel.layers().setCurrentItem(layer("one.nc"));
+    QVERIFY(!panel.rasters().isVisible());
+    panel.layers().setCurrentItem(layer("both.nc"));
+    QVERIFY(panel.rasters().isVisible());
+    QCOMPARE(panel.rasters().currentText(), QString("Band1"));
+    QCOMPARE(panel.rasters().count(), 2);
+    panel.rasters().setCurrentText("Band2");
+    QVERIFY2(shownAt(west).lightness() > 245, qPrintable(shownAt(west).name()));
+    QVERIFY(shownAt(east).lightness() < 10);
+    // All of that after a restart.
+    window_->close();
+    window_ = std::make_unique<MainWindow>(libraries());
+    window_->show();
+    QVERIFY(window_->openDocument(file("s.v27")) != nullptr);
+    QCoreApplication::processEvents();
+    showBackgroundsAlone();
+    QCOMPARE(canvas().backgrounds().all()[1].raster, QString("Band2"));
+    QVERIFY2(shownAt(screenOf(1, 10, 80)).lightness() > 245, qPrintable(shownAt(screenOf(1, 10, 80)).name()));
+  }
+
+  void netcdfHasPlacesOfEachPointAndFeaturesToo() {
+    // A grid that leans over, with its longitudes and latitudes, which have no place of their own.
+    constexpr int kColumns = 8;
+    constexpr int kRows = 6;
+    QStringList east;
+    QStringList north;
+    QStringList depths;
+    for (int k = 0; k < kRows; ++k) {
+      for (int j = 0; j < kColumns; ++j) {
+        const auto at = *canvas().editor()->geographic(area(1).grid.at(
+            (area(1).nx - 1) * (j + 0.02 * k) / kColumns, (area(1).ny - 1) * k / (kRows - 1.0)));
+        east << QString::number(at[0], 'f', 9);
+        north << QString::number(at[1], 'f', 9);
+        depths << (j < kColumns / 2 ? "0" : "100");
+      }
+    }
+    write(file("leaning.cdl"), QString(R"(netcdf leaning { dimensions: y = %1; x = %2; variables:
+double lat(y,x); lat:units = "degrees_north"; double lon(y,x); lon:units = "degrees_east";
+float depth(y,x); depth:coordinates = "lon lat"; float code(y,x); data: lat = %3; lon = %4; depth = %5; })")
+                                   .arg(kRows)
+                                   .arg(kColumns)
+                                   .arg(north.join(','), east.join(','), depths.join(','))
+                                   .toUtf8());
+    runTool({"ncgen", "-o", file("leaning.nc"), file("leaning.cdl")});
+    const auto place = *canvas().editor()->geographic(area(1).grid.at(30, 40));
+    write(file("place.geojson"),
+          QString(R"({"type":"FeatureCollection","features":[{"type":"Feature","properties":{"a":1},
+"geometry":{"type":"Point","coordinates":[%1,%2]}}]})")
+              .arg(place[0], 0, 'f', 9)
+              .arg(place[1], 0, 'f', 9)
+              .toUtf8());
+    runTool({"ogr2ogr", "-f", "netCDF", "-dsco", "GEOMETRY_ENCODING=WKT", file("place.nc"),
+             file("place.geojson")});
+    showBackgroundsAlone();
+    window_->map().panel().addBackground(file("leaning.nc"));
+    settle();
+    QVERIFY2(layer("leaning.nc")->toolTip() == file("leaning.nc"),
+             qPrintable(layer("leaning.nc")->toolTip()));
+    // Of the four variables the one that has a place.
+    QCOMPARE(canvas().backgrounds().all()[0].rasters, QStringList({"lat", "lon", "depth", "code"}));
+    QCOMPARE(canvas().backgrounds().all()[0].raster, QString("depth"));
+    const QColor west = shownAt(screenOf(1, area(1).nx * 0.2, 80));
+    QVERIFY2(west.lightness() < 10, qPrintable(west.name()));
+    QVERIFY(shownAt(screenOf(1, area(1).nx * 0.7, 80)).lightness() > 245);
+    window_->map().panel().addBackground(file("place.nc"));
+    settle();
+    QVERIFY2(!layer("place.nc")->text().contains("(!)"), qPrintable(layer("place.nc")->toolTip()));
+    const MapBackground& points = canvas().backgrounds().all()[1];
+    QVERIFY(!points.picture->isRaster);
+    QCOMPARE(shownAt(screenOf(1, 30, 40)), points.colour);
+  }
+
+  void aMapOfOurOwnIsABackground() {
+    showBackgroundsAlone();
+    const QPointF land = screenOf(1, 5, 5);
+    const QColor paper = shownAt(land);
+    window_->map().panel().addBackground(file("estuary.tsb2"));
+    settle();
+    QVERIFY2(layer("estuary.tsb2")->toolTip() == file("estuary.tsb2"),
+             qPrintable(layer("estuary.tsb2")->toolTip()));
+    Result<TsbFile> grid = TsbFile::open(area(1).file);
+    std::vector<float> row(static_cast<std::size_t>(area(1).nx));
+    int shownPoints = 0;
+    for (const int k : {5, 40, 80}) {
+      QVERIFY(static_cast<bool>(grid->readRows(1, 0, static_cast<std::size_t>(k), row)));
+      for (const int j : {5, 20, 60}) {
+        const bool isLand = row[static_cast<std::size_t>(j)] >= area(1).landValue;
+        QCOMPARE(shownAt(screenOf(1, j, k)) == paper, isLand);
+        shownPoints += isLand ? 0 : 1;
+      }
+    }
+    QVERIFY(shownPoints > 0);
+  }
+
+  void aLargeFileOfNetcdfIsReadWhereTheMapIs() {
+    const QString large = netcdf("large.nc", {"-ot", "Byte", "-outsize", "5000", "5000"});
+    showBackgroundsAlone();
+    QSignalSpy reading(&canvas().backgrounds(), &MapBackgrounds::reading);
+    // Stopped as soon as it begins.
+    const auto stop = connect(&canvas().backgrounds(), &MapBackgrounds::reading, this, [this] {
+      QTimer::singleShot(0, &window_->map().readingStrip().cancel(), &QToolButton::click);
+    });
+    window_->map().panel().addBackground(large);
+    QTRY_VERIFY(!canvas().backgrounds().all()[0].isShown);
+    disconnect(stop);
+    settle();
+    QVERIFY(!canvas().backgrounds().all()[0].picture.has_value());
+    QVERIFY(!window_->map().readingStrip().isVisible());
+    layer("large.nc")->setCheckState(Qt::Checked);
+    QTRY_VERIFY(canvas().backgrounds().all()[0].picture.has_value());
+    const double middle = (area(1).nx - 1) / 2.0;
+    QVERIFY(shownAt(screenOf(1, middle - 3, 80)).lightness() < 10);
+    const int bright = shownAt(screenOf(1, middle + 3, 80)).lightness();
+    QVERIFY2(bright > 90, qPrintable(QString::number(bright)));
+    // Near by it is read anew, once, in all its points.
+    reading.clear();
+    canvas().setFrame({area(1).grid.at(middle, 80), area(1).dx / 100, {}});
+    const QPointF centre(canvas().width() / 2.0, canvas().height() / 2.0);
+    QVERIFY(shownAt(centre - QPointF(8, 0)).lightness() < 10);
+    QVERIFY(shownAt(centre + QPointF(8, 0)).lightness() > 90);
+    QVERIFY(!reading.isEmpty());
+    reading.clear();
+    canvas().zoom(2);
+    settle();
+    QVERIFY(reading.isEmpty());
+    QFile::remove(large);
+  }
+
   void whatWasChosenIsKeptForEachSetup() {
     window_->map().panel().addBackground(halves("halves.tif", true));
     canvas().backgrounds().setOpacity(canvas().backgrounds().all()[0].id, 0.25);
     settle();
     layer("Dikes")->setCheckState(Qt::Unchecked);
     window_->map().panel().colours().setCurrentIndex(2);
+    for (QCheckBox* check : {&window_->map().panel().zeroLine(), &window_->map().panel().hillShade(),
+                             &window_->map().panel().land(), &window_->map().panel().automatic()})
+      check->setChecked(false);
+    window_->map().panel().least().setValue(-7);
+    const TerrainStyle style = canvas().terrainStyle();
+    QVERIFY(style.scale->steepest != TerrainScale{}.steepest);
     canvas().setFrame({area(2).grid.at(3, 4), 7, {}});
     window_->close();
     window_ = std::make_unique<MainWindow>(libraries());
@@ -695,7 +942,9 @@ class MapTest : public DesktopFixture {
     QCOMPARE(canvas().backgrounds().all().size(), std::size_t{1});
     QCOMPARE(canvas().backgrounds().all()[0].opacity, 0.25);
     QVERIFY(!canvas().drawing().layers.test(placeOf(MapLayer::dikes)));
-    QCOMPARE(canvas().terrainStyle().colours, TerrainColours::grey);
+    QCOMPARE(style.scale->least, -7.0F);
+    QVERIFY(!style.zeroLine && !style.hillShade && !style.land);
+    QVERIFY(canvas().terrainStyle() == style);
     QCOMPARE(canvas().frame().metresPerPixel, 7.0);
     // Another setup begins with the colours, and with no backgrounds.
     run("v27setup", {"new", "t.v27", "--force", "--area", "inlet.tsb2"});
@@ -880,6 +1129,115 @@ class MapTest : public DesktopFixture {
     click(screenOf(1, 20, 60));
     QTest::keyClick(&canvas(), Qt::Key_Delete);
     QVERIFY(canvas().isHolding());
+  }
+
+  void allIsDoneByKeysToo() {
+    const auto key = [this](int each, Qt::KeyboardModifiers with = {}) {
+      QTest::keyClick(&canvas(), static_cast<Qt::Key>(each), with);
+      QCoreApplication::processEvents();
+    };
+    const auto lookAt = [this](int number, double j, double k) {
+      canvas().setFrame({area(number).grid.at(j, k), area(1).dx / 10, {}});
+    };
+    canvas().setFocus();
+    QVERIFY(canvas().hasFocus());
+    // Each tool has a key of its own, which is told.
+    std::set<QString> keys;
+    for (int i = 0; i < static_cast<int>(MapTool::pick); ++i) {
+      const QAction* action = window_->map().toolAction(static_cast<MapTool>(i));
+      QVERIFY(!action->shortcut().isEmpty() && keys.insert(action->shortcut().toString()).second);
+      QVERIFY(action->toolTip().contains(action->shortcut().toString(QKeySequence::NativeText)));
+    }
+    for (auto* button : window_->map().tools().findChildren<QToolButton*>())
+      QVERIFY(!button->isVisible() || button->focusPolicy() == Qt::StrongFocus);
+    // A source, by the middle of the map.
+    lookAt(1, 8, 10);
+    key(Qt::Key_Q);
+    QCOMPARE(canvas().tool(), MapTool::source);
+    key(Qt::Key_Space);
+    QVERIFY(feature(MapKind::source) != nullptr);
+    QVERIFY(std::abs(feature(MapKind::source)->points->front().east - area(1).grid.at(8, 10).east) < 0.01);
+    // It is taken, carried along, and let go.
+    key(Qt::Key_S);
+    QCOMPARE(canvas().tool(), MapTool::select);
+    key(Qt::Key_Space);
+    QVERIFY(canvas().isHolding());
+    key(Qt::Key_Right);
+    key(Qt::Key_Up, Qt::ShiftModifier);
+    QVERIFY2(window_->map().readout().text().contains("area 1 (14,10)"),
+             qPrintable(window_->map().readout().text()));
+    key(Qt::Key_Space);
+    QVERIFY(!canvas().isHolding());
+    QVERIFY(std::abs(feature(MapKind::source)->points->front().east - area(1).grid.at(14, 10).east) < 0.01);
+    // Taken and let go at once it is chosen, and Delete removes it.
+    key(Qt::Key_Space);
+    key(Qt::Key_Space);
+    QVERIFY(!canvas().isHolding());
+    QCOMPARE(undoName(), QString("Source 1, point 1"));
+    key(Qt::Key_Delete);
+    QVERIFY(feature(MapKind::source) == nullptr);
+    // A dike of two points, and an output area.
+    key(Qt::Key_D);
+    key(Qt::Key_Space);
+    key(Qt::Key_Right);
+    key(Qt::Key_Space);
+    key(Qt::Key_Return);
+    QCOMPARE(feature(MapKind::dike)->points->size(), std::size_t{2});
+    lookAt(1, 8, 10);
+    key(Qt::Key_A);
+    key(Qt::Key_Space);
+    QVERIFY(canvas().isHolding());
+    key(Qt::Key_Right);
+    key(Qt::Key_Up);
+    key(Qt::Key_Space);
+    QCOMPARE(tab().currentPage(), kOutputs);
+    // The border of an area is chosen, and moved.
+    canvas().setFocus();
+    key(Qt::Key_S);
+    lookAt(2, -0.5, 20);
+    const GridPoint before = area(2).origin;
+    key(Qt::Key_Space);
+    key(Qt::Key_Space);
+    QCOMPARE(canvas().drawing().selection.area, 2);
+    QCOMPARE(area(2).origin.j, before.j);
+    key(Qt::Key_Space);
+    key(Qt::Key_Right);
+    key(Qt::Key_Space);
+    QCOMPARE(area(2).origin.j, before.j + 6);
+    // The list of layers, and a layer by Space.
+    key(Qt::Key_Y);
+    QListWidget& layers = window_->map().panel().layers();
+    QVERIFY(layers.isVisible());
+    layers.setFocus();
+    layers.setCurrentItem(layer("Terrain"));
+    QTest::keyClick(&layers, Qt::Key_Space);
+    QVERIFY(!canvas().drawing().layers.test(placeOf(MapLayer::terrain)));
+  }
+
+  void labelsDoNotCoverEachOther() {
+    const auto labelled = [this] {
+      QImage picture(canvas().size(), QImage::Format_RGB32);
+      picture.fill(Qt::white);
+      QPainter painter(&picture);
+      MapFrame frame = canvas().frame();
+      canvas().drawing().paint(painter, frame);
+      painter.end();
+      return picture;
+    };
+    window_->map().toolAction(MapTool::source)->trigger();
+    click(screenOf(1, 8, 10));
+    window_->map().toolAction(MapTool::select)->trigger();
+    click(screenOf(1, 20, 60));
+    const QImage one = labelled();
+    // Another one on the same place has its number on the other side.
+    QVERIFY(canvas().editor()->addFeature(MapKind::source, {area(1).grid.at(8, 10)}).empty());
+    canvas().refresh();
+    const QImage two = labelled();
+    const QPoint place = screenOf(1, 8, 10).toPoint();
+    const QRect right(place + QPoint(12, -3), QSize(12, 6));
+    const QRect left(place - QPoint(24, 3), QSize(12, 6));
+    QVERIFY(one.copy(right) == two.copy(right));
+    QVERIFY(one.copy(left) != two.copy(left));
   }
 
   void longLinesAreFoundAtEveryPoint() {
