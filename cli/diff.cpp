@@ -20,19 +20,6 @@ struct Options {
   bool json = false;
 };
 
-// Values of very many numbers are told in part.
-std::string shortened(std::string text) {
-  constexpr std::size_t kMost = 120;
-  if (text.size() <= kMost) return text;
-  std::size_t end = kMost;
-  while (end > 0 && (static_cast<unsigned char>(text[end]) & 0xC0U) == 0x80U) --end;
-  return text.substr(0, end) + "...";
-}
-
-std::optional<std::string> shortened(const std::optional<std::string>& text) {
-  return text ? std::optional(shortened(*text)) : std::nullopt;
-}
-
 Json jsonOf(const std::optional<std::string>& value) {
   return value ? Json(*value) : Json(nullptr);
 }

@@ -43,19 +43,20 @@ void tellUnknown(SetupOnDisk& source, const Console& console) {
 
 std::string lineOf(const MergeQuestion& question) {
   const std::string base =
-      question.base ? fmt::format(", {} in the base", question.base->empty() ? "nothing" : *question.base)
-                    : std::string();
-  return fmt::format("{}: {}{}\n", question.thing, wordsOf(question.own, question.other, "A", "B"), base);
+      question.base
+          ? fmt::format("{} in the base", question.base->empty() ? "nothing" : shortened(*question.base))
+          : std::string("not in the base");
+  return fmt::format("{}{}{}: {}, {}\n", question.pageName, question.pageName.empty() ? "" : ": ",
+                     question.thing, wordsOf(shortened(question.own), shortened(question.other), "A", "B"),
+                     base);
 }
 
-Json jsonOf(const MergeQuestion& question, const std::string& path) {
+Json jsonOf(const MergeQuestion& question) {
   const auto value = [](const std::optional<std::string>& text) {
     return text ? Json(*text) : Json(nullptr);
   };
-  return {{"path", path},
-          {"thing", question.thing},
-          {"base", value(question.base)},
-          {"a", value(question.own)},
+  return {{"path", question.path},     {"page", question.page},        {"pageName", question.pageName},
+          {"thing", question.thing},   {"base", value(question.base)}, {"a", value(question.own)},
           {"b", value(question.other)}};
 }
 
@@ -84,8 +85,8 @@ int merge(const Options& options, const Console& console) {
   const MergeSide side = options.takesOther ? MergeSide::other : MergeSide::own;
   MergedTree merged = mergeSetups(sources, options.out, [side](const MergeConflict&) { return side; });
   const std::vector<MergeQuestion> questions =
-      questionsOf(merged.conflicts, *sources.own.setup.tree(options.out),
-                  *sources.other.setup.tree(options.out), options.out);
+      questionsOf(merged.conflicts, *sources.base.setup.tree(options.out),
+                  *sources.own.setup.tree(options.out), *sources.other.setup.tree(options.out), options.out);
   const bool isWritten = questions.empty() || options.takesOwn || options.takesOther;
   unsigned faults = 0;
   if (isWritten) {
@@ -94,9 +95,10 @@ int merge(const Options& options, const Console& console) {
     faults = tellFaults(result, console);
   }
   if (options.json) {
-    Json report{{"conflicts", Json::array()}, {"takenFromB", merged.takenFromOther}, {"written", isWritten}};
-    for (std::size_t i = 0; i < questions.size(); ++i)
-      report["conflicts"].push_back(jsonOf(questions[i], merged.conflicts[i].path));
+    Json report{{"base", options.base}, {"a", options.own},           {"b", options.other},
+                {"out", options.out},   {"conflicts", Json::array()}, {"takenFromB", merged.takenFromOther},
+                {"written", isWritten}};
+    for (const MergeQuestion& question : questions) report["conflicts"].push_back(jsonOf(question));
     if (isWritten) report["faults"] = faults;
     console.out << report.dump(2, ' ', false, Json::error_handler_t::replace) << '\n';
     return questions.empty() ? kClean : kFaultsFound;

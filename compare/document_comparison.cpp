@@ -6,8 +6,9 @@
 #include <set>
 
 #include "compare/compared_model.h"
+#include "compare/difference_packing.h"
 #include "compare/setup_merge.h"
-#include "setup/setup_path.h"
+#include "platform/packing.h"
 
 namespace gridbay {
 namespace {
@@ -33,55 +34,72 @@ class DocumentComparison final : public SetupComparison {
     close();
     other_ = std::make_unique<SetupFile>(std::move(*opened));
     otherPath_ = path;
-    readOwn();
     return {};
   }
   void close() override {
     page_ = nullptr;
     shown_.reset();
-    otherFile_.reset();
     other_.reset();
     found_ = {};
-    state_.reset();
+    foundAt_.reset();
+    ++begun_;
   }
   bool isOpen() const override { return other_ != nullptr; }
   std::string otherPath() const override { return otherPath_; }
 
-  const std::vector<Difference>& differences() override {
-    if (other_ == nullptr) return found_.differences;
-    const Look now{document_.ModelState(), document_.path()};
-    if (state_ == now) return found_.differences;
-    ownFile_ = treeOf(document_.root());
-    otherFile_ = other_->tree(document_.path());
-    found_ = compareFiles(*ownFile_, *otherFile_, document_.path(), document_.units());
-    compareRest(own_.get(), *other_, document_.path(), otherPath_, found_);
-    state_ = now;
-    return found_.differences;
+  std::string compare() const override {
+    if (other_ == nullptr) return {};
+    const std::string& path = document_.path();
+    SetupFile& own = document_.file();
+    // What was found in other units, or of another file, is in other words.
+    const bool isLike = foundAt_ && foundAt_->path == path && foundAt_->begun == begun_;
+    SetupDifference found = compareFiles(*own.tree(path), *other_->tree(path), path, document_.units(),
+                                         isLike ? &found_ : nullptr);
+    compareRest(&own, *other_, path, otherPath_, found);
+    Look at = now();
+    Packing pack;
+    pack(at.state, at.path, at.begun);
+    return std::move(pack.bytes()) + packed(std::move(found));
   }
+  bool take(const std::string& bytes) override {
+    Look at;
+    Packing pack(bytes);
+    pack(at.state, at.path, at.begun);
+    SetupDifference found;
+    if (other_ == nullptr || at != now() || !unpack(bytes.substr(pack.place()), found)) return false;
+    found_ = std::move(found);
+    foundAt_ = at;
+    return true;
+  }
+  bool isCurrent() const override { return other_ != nullptr && foundAt_ == now(); }
+  const std::vector<Difference>& differences() const override { return found_.differences; }
 
   Form* openPage(std::int32_t id) override {
     page_ = nullptr;
     if (other_ == nullptr) return nullptr;
-    shown_.reset();
-    shownFile_ = other_->tree(document_.path());
-    shown_ = std::make_unique<ComparedModel>(*shownFile_, document_.path(), document_.units());
+    if (shown_ == nullptr || shownPath_ != document_.path()) {
+      shown_.reset();
+      shownPath_ = document_.path();
+      shownFile_ = other_->tree(shownPath_);
+      shown_ = std::make_unique<ComparedModel>(*shownFile_, shownPath_, document_.units());
+    }
     page_ = shown_->page(id);
-    if (page_ == nullptr || !shown_->isVisible(id)) return nullptr;
+    if (page_ == nullptr || !shown_->isVisible(id)) return page_ = nullptr, nullptr;
+    page_->OnUpdate();
     makeReadOnly(page_->form());
     return &page_->form();
   }
   void unitsChanged() override {
-    state_.reset();
-    if (page_ == nullptr) return;
-    shown_->setUnits(document_.units());
-    page_->OnUpdate();
+    ++begun_;
+    if (shown_ != nullptr) shown_->setUnits(document_.units());
+    if (page_ != nullptr) page_->OnUpdate();
   }
 
   std::string takeOver(std::size_t place) override {
     if (place >= found_.differences.size()) return "There is no such difference any more";
     const Difference& wanted = found_.differences[place];
     const std::string name = wanted.thing.empty() ? wanted.pageName : wanted.thing;
-    return take({wanted.keywords.begin(), wanted.keywords.end()}, wanted.page, "Take over " + name);
+    return takeKeywords({wanted.keywords.begin(), wanted.keywords.end()}, wanted.page, "Take over " + name);
   }
   std::string takeOverPage(std::int32_t id) override {
     std::set<std::string> paths;
@@ -91,84 +109,105 @@ class DocumentComparison final : public SetupComparison {
       paths.insert(difference.keywords.begin(), difference.keywords.end());
       name = difference.pageName;
     }
-    return take(paths, id, "Take over " + name);
+    return takeKeywords(paths, id, "Take over " + (name.empty() ? "what is on no page" : name));
   }
   std::string takeOverAll() override {
     std::set<std::string> paths;
     for (const KeywordDifference& keyword : found_.keywords) paths.insert(keyword.path);
-    return take(paths, 0, "Take over all");
+    return takeKeywords(paths, 0, "Take over all");
   }
 
-  std::string startMerge(const std::string& base, const std::string& other) override {
+  std::string startMerge(const std::string& base, const std::string& own, const std::string& other) override {
+    merge_ = {};
     Result<SetupFile> baseSetup = SetupFile::open(base, nullptr);
     if (!baseSetup) return baseSetup.error();
     Result<SetupFile> otherSetup = SetupFile::open(other, nullptr);
     if (!otherSetup) return otherSetup.error();
-    readOwn();
-    const std::string& path = document_.path();
-    mergeBase_ = baseSetup->tree(path);
-    mergeOther_ = otherSetup->tree(path);
-    mergeOwn_ = treeOf(document_.root());
-    const MergedTree merged = mergeTrees(*mergeBase_, *mergeOwn_, *mergeOther_,
-                                         [](const MergeConflict&) { return MergeSide::own; });
-    questions_ = questionsOf(merged.conflicts, *mergeOwn_, *mergeOther_, path, document_.units());
-    conflicts_ = merged.conflicts;
+    std::optional<SetupFile> ownSetup;
+    if (!own.empty()) {
+      Result<SetupFile> opened = SetupFile::open(own, nullptr);
+      if (!opened) return opened.error();
+      ownSetup = std::move(*opened);
+    }
+    // Names of files in the result start where those of its first setup do.
+    const std::string& path = merge_.path = own.empty() ? document_.path() : own;
+    merge_.base = baseSetup->tree(path);
+    merge_.own = ownSetup ? ownSetup->tree(path) : document_.file().tree(path);
+    merge_.other = otherSetup->tree(path);
+    merge_.source = withOptions(ownSetup ? ownSetup->source() : document_.file().source(), *merge_.own);
+    merge_.isOfFiles = ownSetup.has_value();
+    merge_.conflicts = mergeTrees(*merge_.base, *merge_.own, *merge_.other, [](const MergeConflict&) {
+                         return MergeSide::own;
+                       }).conflicts;
+    for (const MergeConflict& conflict : merge_.conflicts) merge_.questions.push_back(questionOf(conflict));
     return {};
   }
-  std::vector<MergeQuestion>& questions() override { return questions_; }
+  std::string wordQuestions() const override {
+    return packed(questionsOf(merge_.conflicts, *merge_.base, *merge_.own, *merge_.other, merge_.path,
+                              document_.units()));
+  }
+  bool takeQuestions(const std::string& words) override {
+    std::vector<MergeQuestion> questions;
+    if (!unpack(words, questions) || questions.size() != merge_.questions.size()) return false;
+    merge_.questions = std::move(questions);
+    return true;
+  }
+  std::vector<MergeQuestion>& questions() override { return merge_.questions; }
   std::string finishMerge() override {
+    if (merge_.own == nullptr) return "There is nothing to merge";
     std::map<std::string, MergeSide> sides;
-    for (std::size_t i = 0; i < conflicts_.size(); ++i)
-      sides[conflicts_[i].path] = questions_[i].takesOther ? MergeSide::other : MergeSide::own;
-    const MergedTree merged = mergeTrees(*mergeBase_, *mergeOwn_, *mergeOther_,
+    for (const MergeQuestion& question : merge_.questions)
+      sides[question.path] = question.takesOther ? MergeSide::other : MergeSide::own;
+    const MergedTree merged = mergeTrees(*merge_.base, *merge_.own, *merge_.other,
                                          [&](const MergeConflict& conflict) { return sides[conflict.path]; });
-    return bring(*mergeOwn_, *merged.file, 0, "Merge");
+    const KvsHandle before =
+        merge_.isOfFiles ? document_.file().tree(document_.path()) : std::move(merge_.own);
+    const Merge merge = std::move(merge_);
+    merge_ = {};
+    return bring({*before, *merged.file, *merge.source, merge.path}, 0, "Merge");
   }
 
  private:
-  // What the last look was at.
+  // What a look was at: the state of the setup and its path, which setup was beside it, and in which units.
   struct Look {
-    std::uint64_t state;
-    std::string path;
+    std::uint64_t state = 0;
+    std::string path = {};
+    std::uint64_t begun = 0;
     bool operator==(const Look&) const = default;
   };
+  Look now() const { return {document_.ModelState(), document_.path(), begun_}; }
 
-  // What the document's file holds beside the model.
-  void readOwn() {
-    own_.reset();
-    if (document_.path().empty()) return;
-    if (Result<SetupFile> own = SetupFile::open(document_.path(), nullptr))
-      own_ = std::make_unique<SetupFile>(std::move(*own));
-  }
-
-  KvsHandle treeOf(CGlobalKvs& root) const {
-    // A save may leave out what can't be written, of a copy only. The engine's options are in no model.
-    CGlobalKvs copy;
-    copy.AssignState(root);
-    if (own_ != nullptr) copy.SetSourceFile(&own_->source());
-    KvsHandle file = kvsCreate();
-    copy.Save(*file, document_.path());
-    return file;
-  }
-
-  std::string take(const std::set<std::string>& paths, std::int32_t page, const std::string& name) {
-    if (other_ == nullptr || ownFile_ == nullptr) return "There is nothing to take over";
-    if (std::ranges::all_of(paths, [](const std::string& path) { return isOption(path); }))
+  std::string takeKeywords(const std::set<std::string>& paths, std::int32_t page, const std::string& name) {
+    if (other_ == nullptr) return "There is nothing to take over";
+    if (!isCurrent()) return "The setup has been edited since it was compared";
+    if (paths.empty())
       return "What makes this difference is not known: take over the keywords that it follows from, or all";
+    const std::string& path = document_.path();
+    const KvsHandle own = document_.file().tree(path);
     const KvsHandle taken =
-        withTaken(*ownFile_, *otherFile_, [&](const std::string& path) { return paths.contains(path); });
-    return bring(*ownFile_, *taken, page, name);
+        withTaken(*own, *other_->tree(path), [&](const std::string& each) { return paths.contains(each); });
+    return bring({*own, *taken, document_.file().source(), path}, page, name);
   }
+
+  // What a step makes of the document.
+  struct Change {
+    const KvsFile& before;  // as a save writes it
+    const KvsFile& after;
+    const KvsFile& source;    // whose options are exchanged
+    const std::string& path;  // that file names in `after` start from
+  };
 
   // Gives the document what differs between two files. Parts of the model that are the same in both keep what
   // stands on no file.
-  std::string bring(const KvsFile& before, const KvsFile& after, std::int32_t page, const std::string& name) {
+  std::string bring(const Change& change, std::int32_t page, const std::string& name) {
     CGlobalKvs from;
-    from.Load(&before.tree().root(), document_.path());
+    from.Load(&change.before.tree().root(), document_.path());
     CGlobalKvs to;
-    to.Load(&after.tree().root(), document_.path());
-    if (from.SameState(to))
+    to.Load(&change.after.tree().root(), change.path);
+    const bool hasSameOptions = sameOptions(change.before, change.after);
+    if (hasSameOptions && from.SameState(to))
       return "It follows from other values, or is none of the model, and can't be taken over alone";
+    KvsHandle source = hasSameOptions ? nullptr : withOptions(change.source, change.after);
     const bool isDone = document_.Attempt([&] {
       const std::vector<CKvsBase*> parts = document_.root().children();
       const std::vector<CKvsBase*> olds = from.children();
@@ -178,6 +217,7 @@ class DocumentComparison final : public SetupComparison {
       }
     });
     if (!isDone) return "The edit could not be made";
+    if (source != nullptr) document_.ReplaceSource(std::move(source));
     const auto id = static_cast<PageId>(page);
     if (page != 0) document_.Touch(id);
     document_.SetModifiedFlag();
@@ -186,22 +226,29 @@ class DocumentComparison final : public SetupComparison {
     return {};
   }
 
+  // Three setups on their way to one.
+  struct Merge {
+    KvsHandle base = {};
+    KvsHandle own = {};
+    KvsHandle other = {};
+    KvsHandle source = {};  // of the first of the two
+    std::string path = {};
+    bool isOfFiles = false;  // and not of the document
+    std::vector<MergeConflict> conflicts = {};
+    std::vector<MergeQuestion> questions = {};
+  };
+
   CV27SetupDoc& document_;
   std::unique_ptr<SetupFile> other_;
   std::string otherPath_;
-  std::unique_ptr<SetupFile> own_;  // as it is on disk
+  std::uint64_t begun_ = 0;  // one more for each other setup, and for other units
   SetupDifference found_;
-  std::optional<Look> state_;
-  KvsHandle ownFile_;  // as of the last look
-  KvsHandle otherFile_;
+  std::optional<Look> foundAt_;
+  std::string shownPath_;
   KvsHandle shownFile_;
   std::unique_ptr<ComparedModel> shown_;
   CV27SetupFormView* page_ = nullptr;
-  KvsHandle mergeBase_;
-  KvsHandle mergeOwn_;
-  KvsHandle mergeOther_;
-  std::vector<MergeConflict> conflicts_;
-  std::vector<MergeQuestion> questions_;
+  Merge merge_;
 };
 
 }  // namespace

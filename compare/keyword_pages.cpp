@@ -1,170 +1,68 @@
 #include "compare/keyword_pages.h"
 
-#include <fmt/format.h>
-
 #include <algorithm>
+#include <bit>
 #include <map>
-#include <set>
+#include <tuple>
 #include <unordered_map>
+#include <unordered_set>
 
+#include "compare/page_difference.h"
 #include "setup/member_keyword.h"
+#include "setup/page_places.h"
 #include "setup/setup_path.h"
 
 namespace gridbay {
 namespace {
 
-constexpr std::size_t kMostKeywords = 500;
+constexpr std::size_t kMostKeywords = 500;    // that are tried one by one
 constexpr std::size_t kMostRead = 1'000'000;  // fields and cells
-constexpr std::size_t kMostRows = 50;         // of one setup alone, that are told one by one
-constexpr std::size_t kMostColumns = 4;       // that tell what a row is
+constexpr std::size_t kFewEntries = 60;       // keywords of entries, below which each is tried by itself
+constexpr std::size_t kMuch = 4000;           // pages to read
 
-const ShownCell* cellAt(const ShownTable& table, int row, int column) {
-  if (row < 1 || row > static_cast<int>(table.rows.size())) return nullptr;
-  const ShownTable::Row& found = table.rows[static_cast<std::size_t>(row) - 1];
-  if (column < 1 || column > static_cast<int>(found.cells.size())) return nullptr;
-  return &found.cells[static_cast<std::size_t>(column) - 1];
+using Keywords = std::vector<const KeywordDifference*>;
+
+bool isShownAlike(const Difference& a, const Difference& b) {
+  Difference same = b;
+  same.keywords = a.keywords;
+  return a == same;
 }
 
-std::string shownText(const ShownTable::Row& row) {
-  std::string text;
-  std::size_t columns = 0;
-  for (const ShownCell& cell : row.cells) {
-    if (!cell.isValue || cell.value.empty()) continue;
-    if (++columns > kMostColumns) return text + ", ...";
-    text += (text.empty() ? "" : ", ") + cell.value;
+// Whether a keyword stands in an entry of a list: "BOUNDARY_2/Value", "weir_data[2]/Name".
+bool isOfEntry(std::string_view path) {
+  const std::string_view section = path.substr(0, path.rfind('/'));
+  for (std::size_t end = section.size(); end != 0;) {
+    const std::size_t slash = section.rfind('/', end - 1);
+    const std::size_t begin = slash == section.npos ? 0 : slash + 1;
+    const std::string_view step = section.substr(begin, end - begin);
+    const std::size_t last = step.find_last_not_of("0123456789");
+    if (step.ends_with(']') || (last != step.npos && last + 1 < step.size() && step[last] == '_'))
+      return true;
+    end = begin == 0 ? 0 : slash;
   }
-  return text;
+  return false;
 }
 
-// The differences of one page.
-class PageComparer {
- public:
-  PageComparer(Difference page, std::vector<Difference>& differences)
-      : page_(std::move(page)), differences_(differences) {}
-
-  void compare(const PageContents& own, const PageContents& other) {
-    const std::size_t fields = std::min(own.fields.size(), other.fields.size());
-    for (std::size_t i = 0; i < fields; ++i) compareFields(own.fields[i], other.fields[i]);
-    const std::size_t tables = std::min(own.tables.size(), other.tables.size());
-    for (std::size_t i = 0; i < tables; ++i)
-      compareTables(own.tables[i], other.tables[i], static_cast<int>(i) + 1);
-    const std::size_t details = std::min(own.details.size(), other.details.size());
-    for (std::size_t i = 0; i < details; ++i) {
-      page_.currentRow = static_cast<int>(i) + 1;
-      compare(own.details[i], other.details[i]);
-    }
-    page_.currentRow = 0;
-  }
-
- private:
-  Difference& add(std::string thing, std::optional<std::string> own, std::optional<std::string> other) {
-    Difference difference = page_;
-    if (page_.currentRow > 0) thing += " of row " + std::to_string(page_.currentRow);
-    difference.thing = std::move(thing);
-    difference.own = std::move(own);
-    difference.other = std::move(other);
-    differences_.push_back(std::move(difference));
-    return differences_.back();
-  }
-
-  // What neither shows, or nobody can set, is left out.
-  void compareFields(const ShownField& own, const ShownField& other) {
-    const bool isLeftOut = (!own.isShown && !other.isShown) || (!own.isValue && !other.isValue);
-    if (isLeftOut || own.value == other.value) return;
-    Difference& difference = add(own.name.empty() ? "Value" : own.name, own.value, other.value);
-    difference.label = own.label;
-    difference.labelNumber = own.number;
-  }
-
-  void compareTables(const ShownTable& own, const ShownTable& other, int table) {
-    const std::string of = own.name.empty() ? "" : own.name + ": ";
-    const std::size_t rows = std::min(own.rows.size(), other.rows.size());
-    for (std::size_t row = 0; row < rows; ++row) {
-      const auto& [ownCells, otherCells] = std::tie(own.rows[row].cells, other.rows[row].cells);
-      for (std::size_t i = 0; i < std::min(ownCells.size(), otherCells.size()); ++i) {
-        const bool isLeftOut = !ownCells[i].isValue && !otherCells[i].isValue;
-        if (isLeftOut || ownCells[i].value == otherCells[i].value) continue;
-        at(add(of + ownCells[i].name, ownCells[i].value, otherCells[i].value), table, own.rows[row].number,
-           static_cast<int>(i) + 1);
-      }
-    }
-    addRows(own, rows, of, table, &Difference::own);
-    addRows(other, rows, of, table, &Difference::other);
-  }
-
-  // Rows that only one has, from a place on; very many are told as one.
-  void addRows(const ShownTable& shown, std::size_t first, const std::string& of, int table,
-               std::optional<std::string> Difference::*side) {
-    if (shown.rows.size() > first + kMostRows) {
-      std::string name = shown.rows[first].name;
-      if (name.starts_with("Row ")) name.insert(3, "s");
-      const std::string& last = shown.rows.back().name;
-      name += " to " + last.substr(last.rfind(' ') + 1);
-      Difference& difference = add(of + name, std::nullopt, std::nullopt);
-      difference.*side = fmt::format("{} rows", shown.rows.size() - first);
-      return at(difference, table, shown.rows[first].number, 0);
-    }
-    for (std::size_t row = first; row < shown.rows.size(); ++row) {
-      if (!shown.rows[row].isEntry) continue;
-      Difference& difference = add(of + shown.rows[row].name, std::nullopt, std::nullopt);
-      difference.*side = shownText(shown.rows[row]);
-      at(difference, table, shown.rows[row].number, 0);
-    }
-  }
-
-  static void at(Difference& difference, int table, int row, int column) {
-    difference.table = table;
-    difference.row = row;
-    difference.column = column;
-  }
-
-  Difference page_;
-  std::vector<Difference>& differences_;
-};
-
-// What a page that shows `contents` has where a difference is; nothing where it has no such thing.
-std::optional<std::string> valueAt(const Difference& difference, const PageContents& whole) {
-  const auto detail = static_cast<std::size_t>(std::max(difference.currentRow, 1)) - 1;
-  if (difference.currentRow > 0 && detail >= whole.details.size()) return std::nullopt;
-  const PageContents& contents = difference.currentRow > 0 ? whole.details[detail] : whole;
-  if (difference.table == 0) {
-    const auto field = std::ranges::find_if(contents.fields, [&](const ShownField& each) {
-      return each.label == difference.label && each.number == difference.labelNumber;
-    });
-    return field == contents.fields.end() ? std::nullopt : std::optional(field->value);
-  }
-  if (difference.table > static_cast<int>(contents.tables.size())) return std::nullopt;
-  const ShownTable& table = contents.tables[static_cast<std::size_t>(difference.table) - 1];
-  if (difference.column == 0)
-    return difference.row <= static_cast<int>(table.rows.size()) ? std::optional<std::string>("")
-                                                                 : std::nullopt;
-  const ShownCell* cell = cellAt(table, difference.row, difference.column);
-  return cell == nullptr ? std::nullopt : std::optional(cell->value);
-}
-
-// Whether it is a row or a page, and not a value.
-bool isThing(const Difference& difference) {
-  return difference.thing.empty() || (difference.table > 0 && difference.column == 0);
+std::string sectionOf(const std::string& path) {
+  return path.substr(0, path.rfind('/') + 1);
 }
 
 class KeywordJoiner {
  public:
-  KeywordJoiner(const std::vector<KeywordDifference>& keywords, const KvsFile& own, const KvsFile& other,
-                const std::string& path, const UnitChoices& units, std::vector<Difference>& differences)
-      : keywords_(keywords), own_(own), other_(other), path_(path), units_(units), probe_(own, path, units) {
-    for (Difference& difference : differences) byPage_[difference.page].push_back(&difference);
+  KeywordJoiner(const KvsFile& own, const KvsFile& other, const std::string& path, const UnitChoices& units,
+                SetupDifference& found)
+      : keywords_(found.keywords),
+        differences_(found.differences),
+        own_(own),
+        other_(other),
+        path_(path),
+        units_(units) {
+    for (Difference& difference : found.differences) byPage_[difference.page].push_back(&difference);
   }
 
-  std::vector<std::string> join() {
-    probeAll(own_, other_, [this](const std::string& path) { joinMade(path); });
-    // What one keyword alone does not make follows from several, as a value with the choice that shows it:
-    // those that unmake it where it stands.
-    for (auto page = byPage_.begin(); page != byPage_.end();) {
-      std::erase_if(page->second,
-                    [](const Difference* each) { return !each->keywords.empty() || isThing(*each); });
-      page = page->second.empty() ? byPage_.erase(page) : std::next(page);
-    }
-    if (!byPage_.empty()) probeAll(other_, own_, [this](const std::string& path) { joinUnmade(path); });
+  std::vector<std::string> join(const SetupDifference* before) {
+    if (before != nullptr) keepFormer(*before);
+    if (!byPage_.empty()) joinNew();
     std::vector<std::string> left;
     for (const KeywordDifference& keyword : keywords_) {
       if (!joined_.contains(keyword.path)) left.push_back(keyword.path);
@@ -173,29 +71,170 @@ class KeywordJoiner {
   }
 
  private:
-  // Brings the probe from one file's model to the same with one keyword of the other, for each keyword.
-  template <class Look>
-  void probeAll(const KvsFile& from, const KvsFile& to, Look look) {
-    ComparedModel start(from, path_, units_);
-    std::size_t tried = 0;
-    read_ = 0;
+  using Row = std::tuple<std::int32_t, int, int, int>;
+  static Row rowOf(const Difference& difference) {
+    return {difference.page, difference.currentRow, difference.table, difference.row};
+  }
+
+  // What the pages that are as they were have been found to be made of; they are passed over then. Only
+  // keywords that were made otherwise since, or were found on no such page, are tried for the others.
+  void keepFormer(const SetupDifference& before) {
+    std::unordered_map<std::string_view, const KeywordDifference*> then;
+    for (const KeywordDifference& keyword : before.keywords) then[keyword.path] = &keyword;
+    std::unordered_set<std::string> changed;
+    for (const KeywordDifference& keyword : keywords_) {
+      const auto former = then.find(keyword.path);
+      if (former == then.end() || *former->second != keyword) changed.insert(keyword.path);
+      if (former != then.end()) then.erase(former);
+    }
+    for (const auto& [path, unused] : then) changed.emplace(path);
+    std::map<std::int32_t, std::vector<const Difference*>> pages;
+    for (const Difference& difference : before.differences) pages[difference.page].push_back(&difference);
+    std::unordered_set<std::string> ofOthers = std::move(changed);
+    const auto isAsItWas = [&](const std::vector<Difference*>& now,
+                               const std::vector<const Difference*>& former) {
+      return std::ranges::equal(now, former, [&](const Difference* a, const Difference* b) {
+        return isShownAlike(*a, *b) && !b->keywords.empty() &&
+               std::ranges::none_of(b->keywords, [&](const std::string& k) { return ofOthers.contains(k); });
+      });
+    };
+    std::vector<std::int32_t> kept;
+    for (const auto& [page, differences] : byPage_) {
+      if (isAsItWas(differences, pages[page])) kept.push_back(page);
+    }
+    for (const std::int32_t page : kept) {
+      for (std::size_t i = 0; i < byPage_[page].size(); ++i) {
+        byPage_[page][i]->keywords = pages[page][i]->keywords;
+        joined_.insert(byPage_[page][i]->keywords.begin(), byPage_[page][i]->keywords.end());
+      }
+      byPage_.erase(page);
+    }
+    for (const auto& [page, unused] : byPage_) {
+      for (const Difference* difference : pages[page])
+        ofOthers.insert(difference->keywords.begin(), difference->keywords.end());
+    }
+    for (const KeywordDifference& keyword : keywords_) {
+      if (joined_.contains(keyword.path) && !ofOthers.contains(keyword.path))
+        passedOver_.insert(keyword.path);
+    }
+  }
+
+  void joinNew() {
+    Keywords single;
+    Keywords ofEntries;
     for (const KeywordDifference& keyword : keywords_) {
       const bool isChange = !keyword.isSection && keyword.own && keyword.other;
-      if (!isChange || isOption(keyword.path) || read_ > kMostRead || ++tried > kMostKeywords) continue;
-      probe_.assign(start.root());
-      const Node* wanted = nodeAt(to, keyword.path);
-      Result<MemberKeyword> held = findKeyword(probe_.root(), keyword.path, path_);
+      if (!isChange || isOption(keyword.path) || passedOver_.contains(keyword.path)) continue;
+      (isOfEntry(keyword.path) ? ofEntries : single).push_back(&keyword);
+    }
+    const auto made = [this](const std::string& path) { joinMade(path); };
+    tryEach(single, own_, other_, made);
+    const bool areMany = ofEntries.size() > kFewEntries;
+    if (areMany) joinByNumbers(ofEntries);
+    std::erase_if(ofEntries, [this](const auto* each) { return joined_.contains(each->path); });
+    tryEach(ofEntries, own_, other_, made);
+    if (areMany) joinRows();
+    dropJoined();
+    // What one keyword alone does not make follows from several, as a value with the choice that shows it:
+    // those that unmake it where it stands.
+    if (!byPage_.empty()) {
+      Keywords all;
+      for (const KeywordDifference& keyword : keywords_) {
+        if (!keyword.isSection && keyword.own && keyword.other && !isOption(keyword.path))
+          all.push_back(&keyword);
+      }
+      tried_ = 0;
+      read_ = 0;
+      tryEach(all, other_, own_, [this](const std::string& path) { joinUnmade(path); });
+    }
+    joinTheRest();
+  }
+
+  // Pages with values that no keyword is known to make.
+  void dropJoined() {
+    for (auto page = byPage_.begin(); page != byPage_.end();) {
+      for (Difference* each : page->second) {
+        if (each->keywords.empty()) open_.push_back(each);
+      }
+      std::erase_if(page->second,
+                    [](const Difference* each) { return !each->keywords.empty() || isThing(*each); });
+      page = page->second.empty() ? byPage_.erase(page) : std::next(page);
+    }
+  }
+
+  // Brings the probe from one file's model to the same with one keyword of the other, for each keyword.
+  template <class Look>
+  void tryEach(const Keywords& keywords, const KvsFile& from, const KvsFile& to, Look look) {
+    if (keywords.empty()) return;
+    ComparedModel start(from, path_, units_);
+    if (probe_ == nullptr) probe_ = std::make_unique<ComparedModel>(own_, path_, units_);
+    isMuch_ = byPage_.size() * std::min(keywords.size(), kMostKeywords) > kMuch;
+    for (const KeywordDifference* keyword : keywords) {
+      if (read_ > kMostRead || ++tried_ > kMostKeywords) {
+        isCut_ = true;
+        return;
+      }
+      probe_->assign(start.root());
+      const Node* wanted = nodeAt(to, keyword->path);
+      Result<MemberKeyword> held = findKeyword(probe_->root(), keyword->path, path_);
       if (wanted == nullptr || !held) continue;
       const std::span<const Value> values = wanted->values();
       if (!held->set({values.begin(), values.end()})) continue;
-      probe_.showTree();
-      look(keyword.path);
+      probe_->showTree();
+      look(keyword->path);
+    }
+  }
+
+  // All at once: each keyword has a number, and for each binary digit there are two models, one with the
+  // keywords whose number has the digit, one with the others. What a single keyword makes is seen in just
+  // one of the two, each time, and these spell its number.
+  void joinByNumbers(const Keywords& keywords) {
+    std::unordered_map<std::string_view, std::size_t> numbers;
+    for (const KeywordDifference* keyword : keywords) numbers.emplace(keyword->path, numbers.size());
+    struct Spelled {
+      std::size_t number = 0;
+      bool isOne = true;
+    };
+    std::unordered_map<const Difference*, Spelled> spelled;
+    const auto digits = static_cast<std::size_t>(std::bit_width(keywords.size() - 1));
+    for (std::size_t digit = 0; digit < digits; ++digit) {
+      std::unordered_map<const Difference*, std::size_t> seen;
+      for (const std::size_t half : {1U, 0U}) {
+        const KvsHandle file = withTaken(own_, other_, [&](const std::string& path) {
+          const auto number = numbers.find(path);
+          return number != numbers.end() && (number->second >> digit & 1U) == half;
+        });
+        ComparedModel model(*file, path_, units_);
+        for (const auto& [page, differences] : byPage_) {
+          if (!model.isVisible(page)) continue;
+          const PageContents contents = model.contents(page);
+          for (const Difference* difference : differences) {
+            if (isThing(*difference) || valueAt(*difference, contents) != difference->other) continue;
+            ++seen[difference];
+            spelled[difference].number |= half << digit;
+          }
+        }
+      }
+      for (const auto& [page, differences] : byPage_) {
+        for (const Difference* difference : differences)
+          spelled[difference].isOne = spelled[difference].isOne && seen[difference] == 1;
+      }
+    }
+    for (const auto& [page, differences] : byPage_) {
+      for (Difference* difference : differences) {
+        const auto [number, isOne] = spelled[difference];
+        if (!isOne || isThing(*difference) || number >= keywords.size()) continue;
+        const std::string& path = keywords[number]->path;
+        if (std::ranges::find(difference->keywords, path) == difference->keywords.end())
+          difference->keywords.push_back(path);
+        joined_.insert(path);
+      }
     }
   }
 
   PageContents read(std::int32_t page) {
-    if (!probe_.isVisible(page)) return {};
-    PageContents contents = probe_.contents(page);
+    if (!probe_->isVisible(page)) return {};
+    PageContents contents = probe_->contents(page);
     read_ += contents.size();
     return contents;
   }
@@ -208,14 +247,13 @@ class KeywordJoiner {
     for (const auto& [page, unused] : byPage_) {
       if (page != lastPage_) order.push_back(page);
     }
-    const bool isMuch = byPage_.size() * keywords_.size() > kMuch;
     bool isFound = false;
     for (const std::int32_t page : order) {
-      if (!byPage_.contains(page) || (isFound && isMuch)) continue;
+      if (!byPage_.contains(page) || (isFound && isMuch_)) continue;
       const PageContents contents = read(page);
       for (Difference* difference : byPage_[page]) {
         const bool isPage = difference->thing.empty();
-        const bool isSeen = probe_.isVisible(page);
+        const bool isSeen = probe_->isVisible(page);
         const std::optional<std::string> value = valueAt(*difference, contents);
         const bool isMade = isPage ? isSeen == difference->other.has_value()
                             : isThing(*difference)
@@ -250,7 +288,7 @@ class KeywordJoiner {
   // The sections that come or go with the keyword that the probe has been given.
   std::vector<std::string> followersOfProbe() {
     std::vector<std::string> followers;
-    const KvsHandle file = probe_.file();
+    const KvsHandle file = probe_->file();
     for (const KeywordDifference& each : keywords_) {
       if (each.own && each.other) continue;
       if ((nodeAt(*file, each.path) != nullptr) == each.other.has_value()) followers.push_back(each.path);
@@ -258,44 +296,78 @@ class KeywordJoiner {
     return followers;
   }
 
-  static constexpr std::size_t kMuch = 4000;  // pages to read
+  // A cell that no keyword is known to make is made by those of the entry that other cells of its row are of.
+  void joinRows() {
+    std::map<Row, std::string> sections;
+    for (const Difference& each : differences_) {
+      if (each.table > 0 && !each.keywords.empty()) sections[rowOf(each)] = sectionOf(each.keywords.front());
+    }
+    std::unordered_map<std::string, std::vector<std::string>> ofSection;
+    for (const KeywordDifference& keyword : keywords_)
+      ofSection[sectionOf(keyword.path)].push_back(keyword.path);
+    for (const auto& [page, differences] : byPage_) {
+      for (Difference* each : differences) {
+        const auto section = sections.find(rowOf(*each));
+        if (!each->keywords.empty() || isThing(*each) || section == sections.end()) continue;
+        each->keywords = ofSection[section->second];
+        joined_.insert(each->keywords.begin(), each->keywords.end());
+      }
+    }
+  }
+
+  // What is still made by none is made by those of its page. Where not all was tried these are not told by
+  // themselves any more.
+  void joinTheRest() {
+    std::erase_if(open_, [](const Difference* each) { return !each->keywords.empty(); });
+    if (open_.empty()) return;
+    const std::map<std::int32_t, std::vector<std::string>> ofPages = keywordsOfPages();
+    for (Difference* difference : open_) {
+      const auto page = ofPages.find(difference->page);
+      if (page == ofPages.end()) continue;
+      difference->keywords = page->second;
+      if (isCut_) joined_.insert(page->second.begin(), page->second.end());
+    }
+  }
+
+  std::map<std::int32_t, std::vector<std::string>> keywordsOfPages() const {
+    std::unordered_map<std::string, std::int32_t> pages;
+    for (const KvsFile* file : {&own_, &other_}) {
+      eachKeyword(*file, [&](const PagePlace& place, const Node&) {
+        pages.emplace(place.keyword, static_cast<std::int32_t>(place.page));
+      });
+    }
+    std::map<std::int32_t, std::vector<std::string>> keywords;
+    for (const KeywordDifference& keyword : keywords_) {
+      if (const auto page = pages.find(keyword.path); page != pages.end())
+        keywords[page->second].push_back(keyword.path);
+    }
+    return keywords;
+  }
 
   const std::vector<KeywordDifference>& keywords_;
+  const std::vector<Difference>& differences_;
   const KvsFile& own_;
   const KvsFile& other_;
   const std::string& path_;
   const UnitChoices& units_;
-  ComparedModel probe_;
+  std::unique_ptr<ComparedModel> probe_;
   std::map<std::int32_t, std::vector<Difference*>> byPage_;
-  std::set<std::string> joined_;
+  std::vector<Difference*> open_;
+  std::unordered_set<std::string> joined_;
+  std::unordered_set<std::string> passedOver_;
   std::int32_t lastPage_ = 0;
+  std::size_t tried_ = 0;
   std::size_t read_ = 0;
+  bool isMuch_ = false;
+  bool isCut_ = false;
 };
 
 }  // namespace
 
-std::vector<Difference> pageDifferences(ComparedModel& own, ComparedModel& other) {
-  std::vector<Difference> differences;
-  for (const ComparedPage& page : own.pages()) {
-    const bool isOwn = own.isVisible(page.id) && own.page(page.id) != nullptr;
-    const bool isOther = other.isVisible(page.id) && other.page(page.id) != nullptr;
-    if (!isOwn && !isOther) continue;
-    Difference difference{.page = page.id, .pageName = page.caption};
-    if (isOwn && isOther) {
-      PageComparer(std::move(difference), differences)
-          .compare(own.contents(page.id), other.contents(page.id));
-      continue;
-    }
-    (isOwn ? difference.own : difference.other) = "";
-    differences.push_back(std::move(difference));
-  }
-  return differences;
-}
-
-std::vector<std::string> joinKeywords(const std::vector<KeywordDifference>& keywords, const KvsFile& own,
-                                      const KvsFile& other, const std::string& path, const UnitChoices& units,
-                                      std::vector<Difference>& differences) {
-  return KeywordJoiner(keywords, own, other, path, units, differences).join();
+std::vector<std::string> joinKeywords(const KvsFile& own, const KvsFile& other, const std::string& path,
+                                      const UnitChoices& units, const SetupDifference* before,
+                                      SetupDifference& found) {
+  return KeywordJoiner(own, other, path, units, found).join(before);
 }
 
 }  // namespace gridbay

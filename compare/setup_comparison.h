@@ -35,43 +35,57 @@ struct Difference {
   bool operator==(const Difference&) const = default;
 };
 
-// What two setups have each made into something else, in words, with the one or the other to be chosen.
+// What two setups have each made into something else, with the one or the other to be chosen.
 struct MergeQuestion {
-  std::string thing;  // "Basic Parameters, Flood and Dry: Drying depth", or a path
-  std::optional<std::string> base;
-  std::optional<std::string> own;
-  std::optional<std::string> other;
+  std::string path;
+  std::int32_t page = 0;      // 0 where none shows it
+  std::string pageName = {};  // with the root of the tree that it stands under
+  std::string thing = {};     // "Drying depth", or the path
+  // What each holds, in the words of the page where one shows it; nothing where it has no such thing.
+  std::optional<std::string> base = {};
+  std::optional<std::string> own = {};
+  std::optional<std::string> other = {};
   bool takesOther = false;
 };
 
 // An open setup beside another one, which is never changed. All of it is virtual, as a host links nothing of
-// it.
+// it. What takes long changes nothing here and hands back bytes, so that a copy of the process can do it.
 class SetupComparison {
  public:
   virtual ~SetupComparison() = default;
 
-  // Reads the setup to compare with; what is wrong, or empty.
+  // Reads the setup to compare with; what is wrong, or empty, when nothing has been compared yet.
   virtual std::string open(const std::string& path) = 0;
   virtual void close() = 0;
   virtual bool isOpen() const = 0;
   virtual std::string otherPath() const = 0;
 
-  // All that differs as the setup is now, in the order of the tree; until the next call.
-  virtual const std::vector<Difference>& differences() = 0;
+  // Compares the setup as it is now: what is found, for `take`. That is false, and changes nothing, where it
+  // is of a setup that has been edited since, or is nothing.
+  virtual std::string compare() const = 0;
+  virtual bool take(const std::string& found) = 0;
+  // Whether what was taken last is of the setup as it is now.
+  virtual bool isCurrent() const = 0;
+  // All that differed when it was taken, in the order of the tree.
+  virtual const std::vector<Difference>& differences() const = 0;
   // The other setup's page; null where it has none. Nothing on it can be used. It lives until the next call.
   virtual Form* openPage(std::int32_t id) = 0;
   // What the user sees is in other units.
   virtual void unitsChanged() = 0;
 
-  // Makes a difference of the last look as the other setup has it; or all of a page; or all. One step each.
-  // What is wrong, or empty.
+  // Makes a difference as the other setup has it; or all of a page; or all. One step each. To be called while
+  // the differences are current. What is wrong, or empty.
   virtual std::string takeOver(std::size_t place) = 0;
   virtual std::string takeOverPage(std::int32_t id) = 0;
   virtual std::string takeOverAll() = 0;
 
-  // Reads two setups: the one that both have come from, and the one to merge. What is wrong, or empty. Then
-  // what is to be chosen; and the result in place of the setup, as one step.
-  virtual std::string startMerge(const std::string& base, const std::string& other) = 0;
+  // Reads the setups to merge: the one that two have come from, and these; for an empty `own` this setup as
+  // it is now. What is wrong, or empty. Then what is to be chosen, by its paths, or in the words of the pages
+  // once these are worked out and taken; and the result in place of the setup, as one step.
+  virtual std::string startMerge(const std::string& base, const std::string& own,
+                                 const std::string& other) = 0;
+  virtual std::string wordQuestions() const = 0;
+  virtual bool takeQuestions(const std::string& words) = 0;
   virtual std::vector<MergeQuestion>& questions() = 0;
   virtual std::string finishMerge() = 0;
 };

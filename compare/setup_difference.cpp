@@ -7,6 +7,7 @@
 #include <set>
 
 #include "compare/keyword_pages.h"
+#include "compare/page_difference.h"
 #include "core/nearest.h"
 #include "platform/files/paths.h"
 #include "setup/setup_path.h"
@@ -87,7 +88,7 @@ void compareUnknown(SetupFile* own, SetupFile& other, SetupDifference& found) {
 }  // namespace
 
 SetupDifference compareFiles(const KvsFile& ownFile, const KvsFile& otherFile, const std::string& path,
-                             const UnitChoices& units) {
+                             const UnitChoices& units, const SetupDifference* before) {
   const KvsHandle plainOwn = plain(ownFile, path);
   const KvsHandle plainOther = plain(otherFile, path);
   const KvsFile& own = *plainOwn;
@@ -100,8 +101,7 @@ SetupDifference compareFiles(const KvsFile& ownFile, const KvsFile& otherFile, c
     ComparedModel otherModel(other, path, units);
     found.differences = pageDifferences(ownModel, otherModel);
   }
-  const std::vector<std::string> left =
-      joinKeywords(found.keywords, own, other, path, units, found.differences);
+  const std::vector<std::string> left = joinKeywords(own, other, path, units, before, found);
   const std::set<std::string> paths(left.begin(), left.end());
   for (const KeywordDifference& keyword : found.keywords) {
     if (paths.contains(keyword.path)) found.differences.push_back(byPath(keyword));
@@ -121,6 +121,18 @@ SetupDifference compareSetups(SetupOnDisk& own, SetupOnDisk& other) {
   SetupDifference found = compareFiles(*ownFile, *otherFile, own.path);
   compareRest(&own.setup, other.setup, own.path, other.path, found);
   return found;
+}
+
+std::string shortened(std::string text) {
+  constexpr std::size_t kMost = 120;
+  if (text.size() <= kMost) return text;
+  std::size_t end = kMost;
+  while (end > 0 && (static_cast<unsigned char>(text[end]) & 0xC0U) == 0x80U) --end;
+  return text.substr(0, end) + "...";
+}
+
+std::optional<std::string> shortened(const std::optional<std::string>& text) {
+  return text ? std::optional(shortened(*text)) : std::nullopt;
 }
 
 std::string wordsOf(const std::optional<std::string>& own, const std::optional<std::string>& other,

@@ -20,8 +20,9 @@ struct SetupDifference {
 };
 
 // Compares two files as a save to the same path would write them, so that file names are as seen from there.
+// What was found before an edit of the first, in the same units, spares looking at all again.
 SetupDifference compareFiles(const KvsFile& ownFile, const KvsFile& otherFile, const std::string& path,
-                             const UnitChoices& units = {});
+                             const UnitChoices& units = {}, const SetupDifference* before = nullptr);
 
 // A setup on disk with the path that its file names start from.
 struct SetupOnDisk {
@@ -38,6 +39,9 @@ void compareRest(SetupFile* own, SetupFile& other, const std::string& ownPath, c
 // edition, are compared too.
 SetupDifference compareSetups(SetupOnDisk& own, SetupOnDisk& other);
 
+// Values of very many numbers in part.
+std::string shortened(std::string text);
+std::optional<std::string> shortened(const std::optional<std::string>& text);
 // "0.02 m in A, 0.05 m in B"
 std::string wordsOf(const std::optional<std::string>& own, const std::optional<std::string>& other,
                     std::string_view ownName, std::string_view otherName);

@@ -1,6 +1,6 @@
 #include "compare/setup_merge.h"
 
-#include <algorithm>
+#include <map>
 
 namespace gridbay {
 namespace {
@@ -11,6 +11,29 @@ std::optional<std::string> sectionText(const std::optional<std::string>& value, 
   return hadBase ? "changed" : "added";
 }
 
+// The differences that pages show, by the keywords that make them.
+class PageWords {
+ public:
+  explicit PageWords(const SetupDifference& found) {
+    for (const Difference& each : found.differences) {
+      if (each.page == 0 || each.thing.empty()) continue;
+      for (const std::string& path : each.keywords) byPath_.emplace(path, &each);
+    }
+  }
+  const Difference* of(const std::string& path) const {
+    const auto found = byPath_.find(path);
+    return found == byPath_.end() ? nullptr : found->second;
+  }
+  // The first of what a section holds.
+  const Difference* within(const std::string& section) const {
+    const auto found = byPath_.lower_bound(section + '/');
+    return found != byPath_.end() && found->first.starts_with(section + '/') ? found->second : nullptr;
+  }
+
+ private:
+  std::map<std::string, const Difference*> byPath_;
+};
+
 }  // namespace
 
 MergedTree mergeSetups(MergeSources& sources, const std::string& path, const MergeChoice& choose) {
@@ -20,31 +43,44 @@ MergedTree mergeSetups(MergeSources& sources, const std::string& path, const Mer
   return mergeTrees(*base, *own, *other, choose);
 }
 
-std::vector<MergeQuestion> questionsOf(const std::vector<MergeConflict>& conflicts, const KvsFile& own,
-                                       const KvsFile& other, const std::string& path,
+MergeQuestion questionOf(const MergeConflict& conflict) {
+  MergeQuestion question{.path = conflict.path, .thing = conflict.path};
+  if (!conflict.isSection) {
+    question.base = conflict.base;
+    question.own = conflict.own;
+    question.other = conflict.other;
+    return question;
+  }
+  const bool hadBase = conflict.base.has_value();
+  question.own = sectionText(conflict.own, hadBase);
+  question.other = sectionText(conflict.other, hadBase);
+  if (hadBase) question.base = "there";
+  return question;
+}
+
+std::vector<MergeQuestion> questionsOf(const std::vector<MergeConflict>& conflicts, const KvsFile& base,
+                                       const KvsFile& own, const KvsFile& other, const std::string& path,
                                        const UnitChoices& units) {
   std::vector<MergeQuestion> questions;
   if (conflicts.empty()) return questions;
   const SetupDifference found = compareFiles(own, other, path, units);
+  const PageWords words(found);
+  const SetupDifference fromBase = compareFiles(base, own, path, units);
+  const PageWords baseWords(fromBase);
   for (const MergeConflict& conflict : conflicts) {
-    MergeQuestion question{conflict.path, conflict.base, conflict.own, conflict.other};
-    // The base has no pages of its own here: its value is told where it is the only one that the page adds
-    // to.
-    const auto shown = std::ranges::find_if(found.differences, [&](const Difference& difference) {
-      return difference.page != 0 && !difference.thing.empty() &&
-             std::ranges::find(difference.keywords, conflict.path) != difference.keywords.end();
-    });
-    if (conflict.isSection) {
-      const bool hadBase = conflict.base.has_value();
-      question.own = sectionText(conflict.own, hadBase);
-      question.other = sectionText(conflict.other, hadBase);
-      question.base = hadBase ? std::optional<std::string>("there") : std::nullopt;
-    } else if (shown != found.differences.end()) {
-      question.thing = shown->pageName + ": " + shown->thing;
-      question.own = shown->own;
-      question.other = shown->other;
-    }
-    questions.push_back(std::move(question));
+    MergeQuestion& question = questions.emplace_back(questionOf(conflict));
+    const Difference* shown = words.of(conflict.path);
+    const Difference* place = shown == nullptr ? words.within(conflict.path) : shown;
+    if (place == nullptr) continue;
+    question.page = place->page;
+    question.pageName = place->pageName;
+    if (shown == nullptr) continue;
+    question.thing = shown->thing;
+    if (conflict.isSection) continue;
+    question.own = shown->own;
+    question.other = shown->other;
+    const Difference* before = baseWords.of(conflict.path);
+    if (before != nullptr && before->thing == shown->thing) question.base = before->own;
   }
   return questions;
 }

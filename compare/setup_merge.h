@@ -20,10 +20,13 @@ struct MergeSources {
 // where they led before. Sections that this version does not know are left out.
 MergedTree mergeSetups(MergeSources& sources, const std::string& path, const MergeChoice& choose);
 
-// What was chosen, or is to be, in the words of the pages where one shows it. `own` and `other` are the files
-// that the conflicts come from, as a save to the path would write them.
-std::vector<MergeQuestion> questionsOf(const std::vector<MergeConflict>& conflicts, const KvsFile& own,
-                                       const KvsFile& other, const std::string& path,
+// A conflict by its path, with what has become of it.
+MergeQuestion questionOf(const MergeConflict& conflict);
+
+// What was chosen, or is to be, in the words of the pages where one shows it. The files are those that the
+// conflicts come from, as a save to the path would write them.
+std::vector<MergeQuestion> questionsOf(const std::vector<MergeConflict>& conflicts, const KvsFile& base,
+                                       const KvsFile& own, const KvsFile& other, const std::string& path,
                                        const UnitChoices& units = {});
 
 }  // namespace gridbay

@@ -1,5 +1,7 @@
 #include "compare/tree_difference.h"
 
+#include <algorithm>
+
 #include "setup/global_kvs.h"
 #include "setup/setup_path.h"
 
@@ -43,6 +45,39 @@ void writeTaken(const NodeGroup<2>& sections, const std::string& prefix, const I
   }
 }
 
+const Node* targetOf(const KvsFile& file) {
+  return kvsTargetByNameNum(file, CGlobalKvs::kTarget, 1);
+}
+
+bool isOptions(const Node& section) {
+  return isOption(std::string(section.name()) + '/');
+}
+
+bool hasOptions(const Node& section) {
+  if (isOptions(section)) return true;
+  for (const Node* node = section.first(); node != nullptr; node = node->next()) {
+    if (node->isSection() && hasOptions(*node)) return true;
+  }
+  return false;
+}
+
+void writeWithOptions(const NodeGroup<2>& sections, KvsFile& file) {
+  for (const NodeGroup<2>& nodes : groupsOf<2>(sections)) {
+    const auto [mine, other] = nodes;
+    const Node& held = mine != nullptr ? *mine : *other;
+    const bool isSearched = held.isSection() && hasOptions(held);
+    if (isSearched && !isOptions(held)) {
+      kvsAddSection(file, held.name());
+      writeWithOptions(nodes, file);
+      kvsEndSection(file);
+    } else if (isSearched && sections[1] != nullptr) {
+      if (other != nullptr) writeNode(*other, file);
+    } else if (mine != nullptr) {
+      writeNode(*mine, file);
+    }
+  }
+}
+
 }  // namespace
 
 std::vector<KeywordDifference> differencesOf(const Node& own, const Node& other) {
@@ -54,11 +89,22 @@ std::vector<KeywordDifference> differencesOf(const Node& own, const Node& other)
 KvsHandle withTaken(const KvsFile& own, const KvsFile& other, const IsTaken& isTaken) {
   KvsHandle file = kvsCreate();
   kvsAddTarget(*file, CGlobalKvs::kTarget);
-  writeTaken(
-      {kvsTargetByNameNum(own, CGlobalKvs::kTarget, 1), kvsTargetByNameNum(other, CGlobalKvs::kTarget, 1)},
-      {}, isTaken, *file);
+  writeTaken({targetOf(own), targetOf(other)}, {}, isTaken, *file);
   kvsEndSection(*file);
   return file;
+}
+
+bool sameOptions(const KvsFile& a, const KvsFile& b) {
+  return std::ranges::none_of(differencesOf(*targetOf(a), *targetOf(b)),
+                              [](const KeywordDifference& each) { return isOption(each.path + '/'); });
+}
+
+KvsHandle withOptions(const KvsFile& file, const KvsFile& other) {
+  KvsHandle made = kvsCreate();
+  kvsAddTarget(*made, CGlobalKvs::kTarget);
+  writeWithOptions({targetOf(file), targetOf(other)}, *made);
+  kvsEndSection(*made);
+  return made;
 }
 
 }  // namespace gridbay

@@ -27,4 +27,9 @@ std::vector<KeywordDifference> differencesOf(const Node& own, const Node& other)
 KvsHandle withTaken(const KvsFile& own, const KvsFile& other,
                     const std::function<bool(const std::string& path)>& isTaken);
 
+// Whether two files of setups have the same options of the engine.
+bool sameOptions(const KvsFile& a, const KvsFile& b);
+// A file of a setup with the options of another one, as far as that has sections for them.
+KvsHandle withOptions(const KvsFile& file, const KvsFile& other);
+
 }  // namespace gridbay

@@ -37,11 +37,11 @@ std::vector<EditHistory::PartChange> EditHistory::takeChanges(CGlobalKvs& model)
 }
 
 bool EditHistory::record(CGlobalKvs& model, PageId page, std::string name, bool continues,
-                         const Touched& touched) {
+                         const Touched& touched, bool hasMore) {
   std::vector<PartChange> changes = takeChanges(model);
   Step step{page, std::move(name), continues, std::move(changes), touched_, touched, lastState_ + 1};
   touched_ = touched;
-  if (step.changes.empty()) return false;
+  if (step.changes.empty() && !hasMore) return false;
   ++lastState_;
   if (saved_ != kNeverSaved && saved_ > done_) saved_ = kNeverSaved;
   steps_.erase(steps_.begin() + static_cast<std::ptrdiff_t>(done_), steps_.end());

@@ -35,8 +35,10 @@ class EditHistory {
 
   // Forgets all steps; the model as it is now is what the first one starts from.
   void start(CGlobalKvs& model, const Touched& touched);
-  // Notes what has changed since the last step; false when nothing has. A new step ends what could be redone.
-  bool record(CGlobalKvs& model, PageId page, std::string name, bool continues, const Touched& touched);
+  // Notes what has changed since the last step; false when nothing has, which is a step all the same where
+  // something beside the model has changed. A new step ends what could be redone.
+  bool record(CGlobalKvs& model, PageId page, std::string name, bool continues, const Touched& touched,
+              bool hasMore = false);
 
   // What has changed without a step, as what a page works out when it is shown, goes with the last one.
   void settle(CGlobalKvs& model);

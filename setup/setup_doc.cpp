@@ -1,6 +1,9 @@
 #include "setup/setup_doc.h"
 
 #include <algorithm>
+#include <utility>
+
+#include "setup/setup_path.h"
 
 namespace gridbay {
 
@@ -14,6 +17,7 @@ void CV27SetupDoc::start(SetupFile setup, const std::string& path, bool modified
   touched().clear();
   SetModifiedFlag(modified);
   leavesOut_ = false;
+  sources_.clear();
   history_.start(root(), touched());
   if (modified) history_.markUnsaved();
   UpdateAllViews(nullptr);
@@ -97,19 +101,37 @@ bool CV27SetupDoc::OnRecoverDocument(const std::string& copy, const std::string&
   return true;
 }
 
+void CV27SetupDoc::ReplaceSource(KvsHandle source) {
+  replaced_ = withValues(setup_.source(), nullptr, {});
+  setup_.replaceSource(std::move(source));
+}
+
 void CV27SetupDoc::RecordEdit(PageId page, std::string name, bool continues) {
-  history_.record(root(), page, std::move(name), continues, touched());
+  const bool isRecorded =
+      history_.record(root(), page, std::move(name), continues, touched(), replaced_ != nullptr);
+  if (isRecorded && replaced_ != nullptr) sources_.push_back({history_.state(), std::move(replaced_)});
   if (!history_.isSaved()) SetModifiedFlag();
 }
 
+void CV27SetupDoc::exchangeSource(std::uint64_t state) {
+  const auto change = std::ranges::find(sources_, state, &SourceChange::state);
+  if (change == sources_.end()) return;
+  KvsHandle now = withValues(setup_.source(), nullptr, {});
+  setup_.replaceSource(std::exchange(change->other, std::move(now)));
+}
+
 void CV27SetupDoc::Undo() {
+  const std::uint64_t before = history_.state();
   history_.undo(root(), touched());
+  if (history_.state() != before) exchangeSource(before);
   SetModifiedFlag(!history_.isSaved());
   UpdateAllViews(nullptr);
 }
 
 void CV27SetupDoc::Redo() {
+  const std::uint64_t before = history_.state();
   history_.redo(root(), touched());
+  if (history_.state() != before) exchangeSource(history_.state());
   SetModifiedFlag(!history_.isSaved());
   UpdateAllViews(nullptr);
 }

@@ -1,6 +1,8 @@
 #pragma once
 
+#include <cstdint>
 #include <string>
+#include <vector>
 
 #include "pages/vd_doc.h"
 #include "setup/edit_history.h"
@@ -37,6 +39,10 @@ class CV27SetupDoc : public CVdDoc {
   Outcome WriteRecoveryCopy(const std::string& copy);
   bool OnRecoverDocument(const std::string& copy, const std::string& path);
 
+  // The model with its file, to be read.
+  SetupFile& file() { return setup_; }
+  // An edit makes it pass other options of the engine on; to be called before that is recorded.
+  void ReplaceSource(KvsHandle source);
   void RecordEdit(PageId page, std::string name, bool continues = false) override;
   // The step that comes next; null when there is none.
   const EditHistory::Step* UndoStep() const { return history_.undoStep(); }
@@ -50,12 +56,21 @@ class CV27SetupDoc : public CVdDoc {
   void TakeBackUnrecorded() override { history_.takeBackUnrecorded(root()); }
 
  private:
+  // Sources of the file that a step has exchanged, by the state that it leads to.
+  struct SourceChange {
+    std::uint64_t state;
+    KvsHandle other;
+  };
+
   bool mayLeaveOut();
+  void exchangeSource(std::uint64_t state);
   void start(SetupFile setup, const std::string& path, bool modified);
 
   SetupFile setup_;
   std::string engine_;
   EditHistory history_;
+  std::vector<SourceChange> sources_;
+  KvsHandle replaced_;      // by an edit that is not recorded yet
   bool leavesOut_ = false;  // the user has agreed
   std::function<void()> saved_;
 };

@@ -43,7 +43,11 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
   auto* main = new QWidget(this);
   auto* mainLayout = new QVBoxLayout(main);
   mainLayout->setContentsMargins(0, 0, 0, 0);
-  notice_ = makeNotice(main);
+  notice_ = new FileNotice(
+      {tr("%1 was changed by another program. Reload it and lose the edits made here, or keep what is open "
+          "here."),
+       tr("%1 is no longer on disk. What is open here can be saved again."), tr("Reload"), tr("Keep mine")},
+      main);
   pages_ = new QSplitter(main);
   pages_->setChildrenCollapsible(false);
   pane_ = new PagePane(pages_);
@@ -93,36 +97,13 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
   connect(pane_, &PagePane::cellChosen, this, &DocumentTab::cellChosen);
   connect(filter_, &QLineEdit::textChanged, this, [this] { applyVisibility(); });
   connect(tree_, &QTreeWidget::currentItemChanged, this, [this] { showCurrentPage(); });
-  connect(&watcher_, &QFileSystemWatcher::fileChanged, this, [this] {
-    // A program that replaces the file is given the moment that this takes.
-    constexpr int kMoment = 200;
-    QTimer::singleShot(kMoment, this, [this] { fileChanged(); });
-  });
+  connect(notice_, &FileNotice::readAgain, this, [this] { open(QString::fromStdString(editor_->path())); });
 }
 
 // The page's widgets go before the editor whose form they show.
 DocumentTab::~DocumentTab() {
   emit closing();
   pane_->clear();
-}
-
-QFrame* DocumentTab::makeNotice(QWidget* parent) {
-  auto* notice = new QFrame(parent);
-  notice->setFrameShape(QFrame::StyledPanel);
-  notice->setVisible(false);
-  auto* layout = new QHBoxLayout(notice);
-  noticeText_ = new QLabel(notice);
-  noticeText_->setWordWrap(true);
-  auto* reload = new QPushButton(tr("Reload"), notice);
-  auto* keep = new QPushButton(tr("Keep mine"), notice);
-  reload->setObjectName("reload");
-  keep->setObjectName("keep");
-  layout->addWidget(noticeText_, 1);
-  layout->addWidget(reload);
-  layout->addWidget(keep);
-  connect(reload, &QPushButton::clicked, this, [this] { open(QString::fromStdString(editor_->path())); });
-  connect(keep, &QPushButton::clicked, this, [this] { notice_->hide(); });
-  return notice;
 }
 
 void DocumentTab::fillTree() {
@@ -273,6 +254,9 @@ void DocumentTab::markPages(const QHash<std::int32_t, QString>& tips) {
   tree_->setColumnCount(hasMarks ? kMarkColumn + 1 : kMarkColumn);
   tree_->header()->setStretchLastSection(!hasMarks);
   if (!hasMarks) return;
+  // Rows with a mark are as high as the others.
+  const int height = tree_->fontMetrics().height();
+  tree_->setIconSize({height, height});
   tree_->header()->setSectionResizeMode(0, QHeaderView::Stretch);
   tree_->header()->setSectionResizeMode(kMarkColumn, QHeaderView::ResizeToContents);
   for (auto item = itemsById_.cbegin(); item != itemsById_.cend(); ++item) {
@@ -357,29 +341,7 @@ QString DocumentTab::title() const {
 }
 
 void DocumentTab::watch() {
-  const QString path = QString::fromStdString(editor_->path());
-  stamp_ = fileStamp(editor_->path());
-  notice_->hide();
-  if (!watcher_.files().isEmpty()) watcher_.removePaths(watcher_.files());
-  if (!path.isEmpty() && QFileInfo::exists(path)) watcher_.addPath(path);
-}
-
-bool DocumentTab::isChangedOnDisk() const {
-  const std::optional<FileStamp> now = fileStamp(editor_->path());
-  return stamp_ && now && !now->isOfSameContent(*stamp_);
-}
-
-void DocumentTab::fileChanged() {
-  const QString path = QString::fromStdString(editor_->path());
-  if (QFileInfo::exists(path)) watcher_.addPath(path);
-  const bool isGone = !path.isEmpty() && !QFileInfo::exists(path);
-  if (!isGone && !isChangedOnDisk()) return;
-  notice_->findChild<QPushButton*>("reload")->setEnabled(!isGone);
-  noticeText_->setText(isGone ? tr("%1 is no longer on disk. What is open here can be saved again.").arg(path)
-                              : tr("%1 was changed by another program. Reload it and lose the edits made "
-                                   "here, or keep what is open here.")
-                                    .arg(path));
-  notice_->show();
+  notice_->watch(QString::fromStdString(editor_->path()));
 }
 
 // The page that was open is opened again.

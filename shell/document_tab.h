@@ -1,6 +1,5 @@
 #pragma once
 
-#include <QFileSystemWatcher>
 #include <QHash>
 #include <QLineEdit>
 #include <QSplitter>
@@ -10,10 +9,10 @@
 #include <memory>
 #include <optional>
 
-#include "platform/files/file_stamp.h"
 #include "plugin/setup_editor.h"
 #include "shell/advice_strip.h"
 #include "shell/cover_view.h"
+#include "shell/file_notice.h"
 #include "shell/page_pane.h"
 #include "shell/summary_view.h"
 
@@ -95,7 +94,7 @@ class DocumentTab final : public QSplitter, public SetupHost {
   bool recover(const QString& copy, const QString& path);
   bool save(const QString& path);
   // Whether another program has changed the file since it was read or written here.
-  bool isChangedOnDisk() const;
+  bool isChangedOnDisk() const { return notice_->isChanged(); }
 
   // Takes the last edit back, or does it again, and goes to its page.
   void undo();
@@ -148,8 +147,6 @@ class DocumentTab final : public QSplitter, public SetupHost {
   void leaveHiddenPage();
   bool replaceSetup(const std::function<bool()>& load);
   void watch();
-  void fileChanged();
-  QFrame* makeNotice(QWidget* parent);
 
   WindowServices services_;
   QLineEdit* filter_;
@@ -158,11 +155,8 @@ class DocumentTab final : public QSplitter, public SetupHost {
   PagePane* pane_;
   CoverView* cover_;
   SummaryView* summary_;
-  QFrame* notice_;
-  QLabel* noticeText_ = nullptr;
+  FileNotice* notice_;
   QHash<std::int32_t, QTreeWidgetItem*> itemsById_;
-  QFileSystemWatcher watcher_;
-  std::optional<FileStamp> stamp_;  // of the file when it was read or written here
   std::optional<Check> check_;
   AdviceStrip* adviceStrip_;
   QTimer adviceTimer_;   // runs from an edit to the look at what it has made

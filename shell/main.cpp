@@ -57,7 +57,7 @@ void takeMaps(MainWindow& window, const std::function<void(const QString&)>& tak
 // A picture of the first difference from the setup beside the document.
 void takeComparison(MainWindow& window, const std::function<void(const QString&)>& take) {
   TabComparison* comparison = TabComparison::of(window.currentDocument());
-  if (comparison == nullptr) return;
+  if (comparison == nullptr || !comparison->finish()) return;
   const QSize before = window.size();
   window.resize(1500, 860);
   QApplication::processEvents();

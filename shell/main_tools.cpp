@@ -115,8 +115,7 @@ void MainWindow::refreshActions() {
   };
   show(undo_, tr("&Undo"), tab == nullptr ? std::nullopt : tab->editor().undoable());
   show(redo_, tr("&Redo"), tab == nullptr ? std::nullopt : tab->editor().redoable());
-  for (QAction* action : {save_, saveAs_, close_, summary_, compareWith_, merge_})
-    action->setEnabled(tab != nullptr);
+  for (QAction* action : {save_, saveAs_, close_, summary_, compareWith_}) action->setEnabled(tab != nullptr);
   for (const auto& [id, action] : commands_) {
     action->setEnabled(tab != nullptr);
     action->setToolTip(tipOf(*action));

@@ -49,9 +49,10 @@ class MainWindow final : public QMainWindow {
   TerrainImport* terrainImport() { return terrainImport_; }
   // Puts another setup beside the one that is shown; false where it can't be read, which is then said.
   bool compareWith(const QString& path);
-  // Merges another setup, which has come from the same one, into the one that is shown. False where that is
-  // not done, with what is wrong said.
-  bool mergeWith(const QString& base, const QString& other);
+  // Merges two setups that have come from a third: the one that is shown, as it is now, and another, as one
+  // step; or, where `own` names one, two files, into a new document. False where that is not done, with what
+  // is wrong said.
+  bool merge(const QString& base, const QString& own, const QString& other);
   // Offers the edits that a run which ended suddenly has left behind.
   void offerRecovery();
 
@@ -100,6 +101,7 @@ class MainWindow final : public QMainWindow {
   bool askSave();
   void askCompare();
   void askMerge();
+  bool mergeInto(DocumentTab& tab, const QString& base, const QString& own, const QString& other);
   QString askSaveName(const DocumentTab& tab);
   // The list of setups opened last, newest first, and the menu that offers them.
   void remember(const QString& path);

@@ -101,9 +101,14 @@ int MessagesDock::messageCount() const {
 
 void MessagesDock::showAdvice() {
   const int current = adviceAt(list_->currentItem());
-  for (int count = list_->topLevelItemCount(); count > messageCount(); --count)
+  const int messages = messageCount();
+  for (int count = list_->topLevelItemCount(); count > messages; --count)
     delete list_->takeTopLevelItem(count - 1);
   if (tab_ == nullptr) return;
+  // All at once: with buttons in it the list lays all of itself out for each item that comes.
+  QList<QTreeWidgetItem*> items;
+  for (std::size_t i = 0; i < tab_->advice().size(); ++i) items << new QTreeWidgetItem(kAdviceType);
+  list_->addTopLevelItems(items);
   for (std::size_t i = 0; i < tab_->advice().size(); ++i) addAdvice(tab_->advice()[i], static_cast<int>(i));
   if (current >= 0 && messageCount() + current < list_->topLevelItemCount())
     list_->setCurrentItem(list_->topLevelItem(messageCount() + current));
@@ -115,7 +120,8 @@ void MessagesDock::showPlace(QTreeWidgetItem& item, const PagePlace& place) {
 }
 
 void MessagesDock::addAdvice(const Advice& advice, int place) {
-  auto* item = new QTreeWidgetItem(list_, kAdviceType);
+  const int count = static_cast<int>(tab_->advice().size());
+  QTreeWidgetItem* item = list_->topLevelItem(list_->topLevelItemCount() - count + place);
   item->setText(0, QString::fromStdString(advice.doubt));
   item->setData(0, kNumberRole, place);
   showPlace(*item, advice.place);

@@ -20,6 +20,7 @@ QString textOf(const std::optional<std::string>& value) {
 CompareDock::CompareDock(QWidget* parent)
     : QDockWidget(tr("Differences"), parent),
       note_(new QLabel(this)),
+      busy_(new QProgressBar(this)),
       tools_(new QToolBar(this)),
       list_(new QTreeWidget(this)),
       next_(new QAction(tr("&Next Difference"), this)),
@@ -60,12 +61,22 @@ CompareDock::CompareDock(QWidget* parent)
   note_->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
   note_->setTextFormat(Qt::PlainText);
   top->addWidget(note_, 1);
+  busy_->setRange(0, 0);
+  busy_->setTextVisible(false);
+  busy_->setMaximumWidth(80);
+  busy_->setAccessibleName(tr("Comparing"));
+  busy_->hide();
+  top->addWidget(busy_);
   top->addWidget(tools_);
   auto* layout = new QVBoxLayout(content);
   layout->setContentsMargins(4, 4, 4, 0);
   layout->addLayout(top);
   layout->addWidget(list_);
   setWidget(content);
+  constexpr int kMoment = 400;  // milliseconds
+  busyTimer_.setSingleShot(true);
+  busyTimer_.setInterval(kMoment);
+  connect(&busyTimer_, &QTimer::timeout, busy_, &QWidget::show);
   QWidget::setTabOrder(list_, tools_->widgetForAction(previous_));
   connect(list_, &QTreeWidget::currentItemChanged, this, [this](const QTreeWidgetItem* item) {
     if (isFilling_ || item == nullptr) return;
@@ -94,10 +105,33 @@ void CompareDock::showDocument(DocumentTab* tab) {
   tab_ = tab;
   if (TabComparison* on = comparison()) {
     connect(on, &TabComparison::changed, this, &CompareDock::fill);
+    connect(on, &TabComparison::atWork, this, &CompareDock::showWork);
     connect(on, &TabComparison::currentChanged, this, &CompareDock::select);
     connect(on, &TabComparison::failed, this, &CompareDock::failed);
   }
   fill();
+}
+
+QString CompareDock::noteText() const {
+  const TabComparison* on = comparison();
+  if (on == nullptr) return tr("No setup is beside this one: File, Compare With.");
+  const auto count = static_cast<int>(on->differences().size());
+  if (count == 1) return tr("%1 and %2: 1 difference").arg(tab_->name(), on->otherName());
+  if (count > 0) return tr("%1 and %2: %3 differences").arg(tab_->name(), on->otherName()).arg(count);
+  if (on->isAtWork()) return tr("%1 and %2 are being compared.").arg(tab_->name(), on->otherName());
+  return (on->isCurrent() ? tr("%1 and %2 are the same.") : tr("%1 and %2 have not been compared."))
+      .arg(tab_->name(), on->otherName());
+}
+
+void CompareDock::showWork() {
+  note_->setText(noteText());
+  const TabComparison* on = comparison();
+  if (on != nullptr && on->isAtWork()) {
+    if (!busy_->isVisible()) busyTimer_.start();
+  } else {
+    busyTimer_.stop();
+    busy_->hide();
+  }
 }
 
 // A page with its differences below it.
@@ -105,17 +139,10 @@ void CompareDock::fill() {
   isFilling_ = true;
   list_->clear();
   const TabComparison* on = comparison();
-  if (on == nullptr) {
-    note_->setText(tr("No setup is beside this one: File, Compare With."));
-  } else {
-    const auto count = static_cast<int>(on->differences().size());
-    note_->setText(count == 0 ? tr("%1 and %2 are the same.").arg(tab_->name(), on->otherName())
-                   : count == 1
-                       ? tr("%1 and %2: 1 difference").arg(tab_->name(), on->otherName())
-                       : tr("%1 and %2: %3 differences").arg(tab_->name(), on->otherName()).arg(count));
+  showWork();
+  if (on != nullptr)
     list_->setHeaderLabels(
         {tr("Difference"), tr("In %1").arg(tab_->name()), tr("In %1").arg(on->otherName())});
-  }
   QTreeWidgetItem* page = nullptr;
   for (int i = 0; on != nullptr && i < static_cast<int>(on->differences().size()); ++i) {
     const Difference& difference = on->differences()[static_cast<std::size_t>(i)];

@@ -4,6 +4,8 @@
 #include <QDockWidget>
 #include <QLabel>
 #include <QPointer>
+#include <QProgressBar>
+#include <QTimer>
 #include <QToolBar>
 #include <QTreeWidget>
 
@@ -23,6 +25,8 @@ class CompareDock final : public QDockWidget {
 
   QTreeWidget& list() { return *list_; }
   QLabel& note() { return *note_; }
+  // Seen while comparing takes longer than a moment.
+  QProgressBar& busy() { return *busy_; }
   QToolBar& tools() { return *tools_; }
   // For menus: they have keys, and can be used while there is something to do.
   QAction* nextAction() { return next_; }
@@ -39,11 +43,15 @@ class CompareDock final : public QDockWidget {
   QAction* makeAction(const QString& text, const QKeySequence& key, void (TabComparison::*act)());
   TabComparison* comparison() const { return TabComparison::of(tab_); }
   void fill();
+  void showWork();
+  QString noteText() const;
   void select(int place);
   void enableActions();
 
   QPointer<DocumentTab> tab_;
   QLabel* note_;
+  QProgressBar* busy_;
+  QTimer busyTimer_;
   QToolBar* tools_;
   QTreeWidget* list_;
   QAction* next_;

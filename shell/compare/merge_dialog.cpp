@@ -31,21 +31,8 @@ MergeDialog::MergeDialog(const QString& own, const QString& other, std::vector<M
       this);
   list_->setHeaderLabels(
       {tr("Difference"), tr("Before"), tr("In %1").arg(own), tr("In %1").arg(other), tr("Take")});
-  list_->setRootIsDecorated(false);
   list_->setAccessibleName(tr("Conflicts"));
-  for (std::size_t i = 0; i < questions.size(); ++i) {
-    MergeQuestion& question = questions[i];
-    auto* item = new QTreeWidgetItem(list_, {QString::fromStdString(question.thing), textOf(question.base),
-                                             textOf(question.own), textOf(question.other)});
-    for (int column = 0; column < kChoiceColumn; ++column) item->setToolTip(column, item->text(column));
-    auto* choice = new QComboBox(list_);
-    choice->addItems({own, other});
-    choice->setCurrentIndex(question.takesOther ? 1 : 0);
-    choice->setAccessibleName(tr("Take for %1").arg(item->text(0)));
-    list_->setItemWidget(item, kChoiceColumn, choice);
-    connect(choice, &QComboBox::currentIndexChanged, this,
-            [this, i](int index) { questions_[i].takesOther = index == 1; });
-  }
+  fill(own, other);
   constexpr int kWidest = 360;
   for (int column = 0; column < kChoiceColumn; ++column) {
     list_->resizeColumnToContents(column);
@@ -66,12 +53,66 @@ MergeDialog::MergeDialog(const QString& own, const QString& other, std::vector<M
   layout->addWidget(buttons);
 }
 
-QComboBox& MergeDialog::choice(int place) {
+QComboBox* MergeDialog::makeChoice(QTreeWidgetItem& item, const QString& own, const QString& other) {
+  auto* choice = new QComboBox(list_);
+  choice->addItems({own, other});
+  choice->setAccessibleName(tr("Take for %1").arg(item.text(0)));
+  list_->setItemWidget(&item, kChoiceColumn, choice);
+  return choice;
+}
+
+// Questions of a page stand below it.
+void MergeDialog::fill(const QString& own, const QString& other) {
+  QHash<QString, QTreeWidgetItem*> pages;
+  for (std::size_t i = 0; i < questions_.size(); ++i) {
+    const MergeQuestion& question = questions_[i];
+    const QString name = question.page == 0 ? tr("On no page") : QString::fromStdString(question.pageName);
+    QTreeWidgetItem*& page = pages[name];
+    if (page == nullptr) {
+      page = new QTreeWidgetItem(list_, {name});
+      QFont bold = page->font(0);
+      bold.setBold(true);
+      page->setFont(0, bold);
+      page->setExpanded(true);
+      QComboBox* all = makeChoice(*page, own, other);
+      all->setPlaceholderText(tr("Both"));
+      connect(all, &QComboBox::activated, this, [this, page](int side) {
+        for (int row = 0; row < page->childCount(); ++row)
+          static_cast<QComboBox*>(list_->itemWidget(page->child(row), kChoiceColumn))->setCurrentIndex(side);
+      });
+    }
+    auto* item = new QTreeWidgetItem(page, {QString::fromStdString(question.thing), textOf(question.base),
+                                            textOf(question.own), textOf(question.other)});
+    for (int column = 0; column < kChoiceColumn; ++column) item->setToolTip(column, item->text(column));
+    choices_.push_back(makeChoice(*item, own, other));
+    choices_.back()->setCurrentIndex(question.takesOther ? 1 : 0);
+    connect(choices_.back(), &QComboBox::currentIndexChanged, this, [this, i, page](int index) {
+      questions_[i].takesOther = index == 1;
+      showPageChoice(*page);
+    });
+  }
+}
+
+// What is chosen for all of its questions, or neither.
+void MergeDialog::showPageChoice(QTreeWidgetItem& page) {
+  int side = -1;
+  for (int row = 0; row < page.childCount(); ++row) {
+    const auto* choice = static_cast<QComboBox*>(list_->itemWidget(page.child(row), kChoiceColumn));
+    if (row > 0 && choice->currentIndex() != side) {
+      side = -1;
+      break;
+    }
+    side = choice->currentIndex();
+  }
+  static_cast<QComboBox*>(list_->itemWidget(&page, kChoiceColumn))->setCurrentIndex(side);
+}
+
+QComboBox& MergeDialog::pageChoice(int place) {
   return *static_cast<QComboBox*>(list_->itemWidget(list_->topLevelItem(place), kChoiceColumn));
 }
 
 void MergeDialog::chooseAll(int side) {
-  for (int i = 0; i < list_->topLevelItemCount(); ++i) choice(i).setCurrentIndex(side);
+  for (QComboBox* choice : choices_) choice->setCurrentIndex(side);
 }
 
 }  // namespace gridbay::shell

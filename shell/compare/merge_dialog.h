@@ -9,7 +9,8 @@
 
 namespace gridbay::shell {
 
-// What two setups have each made into something else, with a choice for each.
+// What two setups have each made into something else, page by page, with a choice for each and for all of a
+// page.
 class MergeDialog final : public QDialog {
   Q_OBJECT
  public:
@@ -17,14 +18,19 @@ class MergeDialog final : public QDialog {
               QWidget* parent);
 
   QTreeWidget& list() { return *list_; }
-  // The choice for a question: 0 for the document's own, 1 for the other's.
-  QComboBox& choice(int place);
+  // The choice for a question: 0 for the first setup, 1 for the other; and for a page, by its place.
+  QComboBox& choice(int question) { return *choices_.at(static_cast<std::size_t>(question)); }
+  QComboBox& pageChoice(int place);
 
  private:
+  QComboBox* makeChoice(QTreeWidgetItem& item, const QString& own, const QString& other);
+  void fill(const QString& own, const QString& other);
+  void showPageChoice(QTreeWidgetItem& page);
   void chooseAll(int side);
 
   std::vector<MergeQuestion>& questions_;
   QTreeWidget* list_;
+  std::vector<QComboBox*> choices_;
 };
 
 }  // namespace gridbay::shell

@@ -1,10 +1,11 @@
 #include "shell/compare/tab_comparison.h"
 
-#include <QElapsedTimer>
 #include <QFileInfo>
 #include <QScrollBar>
+#include <QVBoxLayout>
 #include <algorithm>
 
+#include "shell/compare/work_beside.h"
 #include "shell/grid_view.h"
 
 namespace gridbay::shell {
@@ -20,24 +21,41 @@ TabComparison* TabComparison::of(DocumentTab* tab) {
 
 QString TabComparison::begin(DocumentTab& tab, const QString& path) {
   tab.commit();
-  if (TabComparison* before = of(&tab)) before->pane_->clear();
-  const std::string fault = tab.editor().comparison().open(path.toStdString());
   TabComparison* comparison = of(&tab);
-  if (fault.empty() && comparison == nullptr) comparison = new TabComparison(tab);
-  if (comparison == nullptr) return QString::fromStdString(fault);
-  comparison->current_ = -1;
-  comparison->refresh();
-  comparison->showPage();
+  if (comparison != nullptr) comparison->pane_->clear();
+  const std::string fault = tab.editor().comparison().open(path.toStdString());
+  if (fault.empty()) {
+    if (comparison == nullptr) comparison = new TabComparison(tab);
+    comparison->notice_->watch(path);
+    comparison->differences_.clear();
+    comparison->current_ = -1;
+    comparison->showFound();
+    comparison->compare();
+  }
+  if (comparison != nullptr) comparison->showPage();
   return QString::fromStdString(fault);
 }
 
-TabComparison::TabComparison(DocumentTab& tab) : QObject(&tab), tab_(tab), pane_(new PagePane(&tab.pages())) {
+TabComparison::TabComparison(DocumentTab& tab)
+    : QObject(&tab),
+      tab_(tab),
+      side_(new QWidget(&tab.pages())),
+      notice_(new FileNotice({tr("%1 was changed by another program since it was read for comparing."),
+                              tr("%1 is no longer on disk. What was read of it is still compared."),
+                              tr("Read Again"), tr("Leave It")},
+                             side_)),
+      pane_(new PagePane(side_)) {
   pane_->setReadOnly(true);
-  tab.pages().addWidget(pane_);
+  auto* layout = new QVBoxLayout(side_);
+  layout->setContentsMargins(0, 0, 0, 0);
+  layout->addWidget(notice_);
+  layout->addWidget(pane_, 1);
+  tab.pages().addWidget(side_);
   tab.pages().setSizes({1000, 1000});
   timer_.setSingleShot(true);
   timer_.setInterval(kDelay);
-  connect(&timer_, &QTimer::timeout, this, &TabComparison::refresh);
+  connect(&timer_, &QTimer::timeout, this, &TabComparison::compare);
+  connect(&work_, &BackgroundWork::ended, this, &TabComparison::takeFound);
   connect(&tab, &DocumentTab::documentChanged, &timer_, qOverload<>(&QTimer::start));
   connect(&tab, &DocumentTab::pageShown, this, &TabComparison::showPage);
   connect(&tab, &DocumentTab::cellChosen, this, [this] {
@@ -45,8 +63,13 @@ TabComparison::TabComparison(DocumentTab& tab) : QObject(&tab), tab_(tab), pane_
     if (row > 0) pane_->goTo({.entries = {{row, 0}}});
     markPage();
   });
+  connect(notice_, &FileNotice::readAgain, this, [this] {
+    const QString path = QString::fromStdString(comparison().otherPath());
+    if (const QString fault = begin(tab_, path); !fault.isEmpty()) emit failed(fault);
+  });
   // The widgets go before the form that they show.
   connect(&tab, &DocumentTab::closing, this, [this] {
+    work_.stop();
     pane_->clear();
     disconnect(&tab_, nullptr, this, nullptr);
   });
@@ -71,11 +94,12 @@ void TabComparison::end() {
   pane_->clear();
   disconnect(&tab_, nullptr, this, nullptr);
   timer_.stop();
+  work_.stop();
   delete marks_;
   comparison().close();
   tab_.markPages({});
-  pane_->hide();
-  pane_->deleteLater();
+  side_->hide();
+  side_->deleteLater();
   setParent(nullptr);
   differences_.clear();
   emit changed();
@@ -83,23 +107,34 @@ void TabComparison::end() {
 }
 
 QString TabComparison::otherName() const {
-  const QString path = QString::fromStdString(const_cast<TabComparison*>(this)->comparison().otherPath());
+  const QString path = QString::fromStdString(comparison().otherPath());
   const QString name = QFileInfo(path).fileName();
   return name == tab_.name() ? path : name;
 }
 
-void TabComparison::refresh() {
+void TabComparison::compare() {
   timer_.stop();
-  QElapsedTimer took;
-  took.start();
-  std::vector<Difference> found = comparison().differences();
-  // Of large setups it takes a while: then it waits until nothing has been edited for longer.
-  timer_.setInterval(std::max(kDelay, 10 * static_cast<int>(took.elapsed())));
-  if (current_ >= 0 && (current_ >= static_cast<int>(found.size()) ||
-                        found[static_cast<std::size_t>(current_)].thing !=
-                            differences_[static_cast<std::size_t>(current_)].thing))
-    current_ = -1;
-  differences_ = std::move(found);
+  work_.stop();
+  if (comparison().isCurrent()) return showFound();
+  work_.begin([&setups = comparison()](const WorkApart::Progress&) { return setups.compare(); }, false);
+  emit atWork();
+}
+
+// What is of a setup that has been edited since is dropped: it is compared again in a moment.
+void TabComparison::takeFound(const std::optional<std::string>& found) {
+  if (found && comparison().take(*found)) {
+    showFound();
+  } else if (!timer_.isActive()) {
+    emit failed(tr("%1 and %2 could not be compared.").arg(tab_.name(), otherName()));
+  }
+  emit atWork();
+}
+
+void TabComparison::showFound() {
+  const std::optional<Difference> shown =
+      current_ < 0 ? std::nullopt : std::optional(differences_[static_cast<std::size_t>(current_)]);
+  differences_ = comparison().differences();
+  current_ = shown ? placeOf(*shown) : -1;
   // In other units it shows the same.
   pane_->refresh();
   markTree();
@@ -107,10 +142,26 @@ void TabComparison::refresh() {
   emit changed();
 }
 
+bool TabComparison::finish() {
+  if (comparison().isCurrent()) return true;
+  if (!work_.isRunning() || timer_.isActive()) compare();
+  waitFor(work_, tr("Comparing %1 and %2...").arg(tab_.name(), otherName()), &tab_);
+  return comparison().isCurrent();
+}
+
+// By what it is of: what the setups hold there may have become something else.
+int TabComparison::placeOf(const Difference& wanted) const {
+  const auto found = std::ranges::find_if(differences_, [&](const Difference& each) {
+    return each.page == wanted.page && each.thing == wanted.thing && each.table == wanted.table &&
+           each.row == wanted.row && each.column == wanted.column && each.currentRow == wanted.currentRow;
+  });
+  return found == differences_.end() ? -1 : static_cast<int>(found - differences_.begin());
+}
+
 void TabComparison::showPage() {
   pane_->clear();
   const std::int32_t page = tab_.currentPage();
-  pane_->setVisible(page != 0);
+  side_->setVisible(page != 0);
   if (page == 0) return;
   if (Form* form = comparison().openPage(page)) {
     // The two headings tell the sides apart.
@@ -192,33 +243,33 @@ void TabComparison::step(int by) {
   goTo((from + by + count) % count, true);
 }
 
-void TabComparison::take(const std::function<std::string(SetupComparison&)>& act) {
+void TabComparison::take(const std::function<std::string(SetupComparison&, int current)>& act) {
   tab_.commit();
   // What was just entered may have changed what there is to take.
-  const std::vector<Difference> before = differences_;
-  if (comparison().differences() != before) return refresh();
-  const std::string fault = act(comparison());
+  if (!finish()) return;
+  showFound();
+  const std::string fault = act(comparison(), current_);
   tab_.editor().refreshPage();
   tab_.pane().refresh();
   if (!fault.empty()) emit failed(QString::fromStdString(fault));
-  refresh();
+  compare();
 }
 
 void TabComparison::takeOver() {
   if (current_ < 0) return;
-  take([this](SetupComparison& comparison) {
-    return comparison.takeOver(static_cast<std::size_t>(current_));
+  take([](SetupComparison& comparison, int current) {
+    return current < 0 ? std::string() : comparison.takeOver(static_cast<std::size_t>(current));
   });
 }
 
 void TabComparison::takeOverPage() {
   const std::int32_t page =
       current_ < 0 ? tab_.currentPage() : differences_[static_cast<std::size_t>(current_)].page;
-  take([page](SetupComparison& comparison) { return comparison.takeOverPage(page); });
+  take([page](SetupComparison& comparison, int) { return comparison.takeOverPage(page); });
 }
 
 void TabComparison::takeOverAll() {
-  take([](SetupComparison& comparison) { return comparison.takeOverAll(); });
+  take([](SetupComparison& comparison, int) { return comparison.takeOverAll(); });
 }
 
 }  // namespace gridbay::shell

@@ -10,7 +10,7 @@
 #include <optional>
 #include <vector>
 
-#include "shell/import/background_work.h"
+#include "shell/background_work.h"
 #include "shell/import/height_histogram.h"
 #include "shell/import/terrain_form.h"
 #include "shell/import/terrain_preview.h"

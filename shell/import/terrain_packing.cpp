@@ -1,52 +1,9 @@
 #include "shell/import/terrain_packing.h"
 
-#include <cstring>
-#include <type_traits>
+#include "platform/packing.h"
 
 namespace gridbay::shell {
 namespace {
-
-// Puts members into bytes, or fills them from there: both by one list of them.
-class Packing {
- public:
-  Packing() = default;
-  explicit Packing(const std::string& bytes) : bytes_(bytes), reads_(true) {}
-
-  template <class... Members>
-  void operator()(Members&... members) {
-    (member(members), ...);
-  }
-  std::string& bytes() { return bytes_; }
-
- private:
-  void raw(void* at, std::size_t size) {
-    if (!reads_) {
-      bytes_.append(static_cast<const char*>(at), size);
-    } else if (bytes_.size() - at_ >= size) {
-      std::memcpy(at, bytes_.data() + at_, size);
-      at_ += size;
-    }
-  }
-  template <class Member>
-  void member(Member& member) {
-    if constexpr (std::is_trivially_copyable_v<Member>) {
-      raw(&member, sizeof member);
-    } else {
-      std::size_t count = member.size();
-      raw(&count, sizeof count);
-      member.resize(count);
-      if constexpr (std::is_trivially_copyable_v<typename Member::value_type>) {
-        raw(member.data(), count * sizeof(typename Member::value_type));
-      } else {
-        for (auto& element : member) this->member(element);
-      }
-    }
-  }
-
-  std::string bytes_;
-  std::size_t at_ = 0;
-  bool reads_ = false;
-};
 
 void pass(Packing& pack, RasterPreview& each) {
   pack(each.columns, each.rows, each.values, each.points, each.first, each.spacing, each.rotation,

@@ -5,6 +5,8 @@
 #include <gmock/gmock.h>
 
 #include <filesystem>
+#include <functional>
+#include <map>
 #include <nlohmann/json.hpp>
 #include <set>
 
@@ -176,6 +178,72 @@ TEST_F(CompareSetups, VeryManyEntriesAreOneDifference) {
               Contains("Basic Parameters, Source and Sink|Rows 2 to 60|none <59 rows>"));
 }
 
+// The text of a setup with other values of a keyword: the n-th becomes `value(n)`.
+std::string withEach(std::string text, const std::string& keyword,
+                     const std::function<std::string(int)>& value) {
+  int n = 0;
+  for (std::size_t at = text.find(keyword + ' '); at != text.npos; at = text.find(keyword + ' ', at + 1)) {
+    const std::size_t from = at + keyword.size() + 1;
+    text.replace(from, text.find('\n', from) - from, value(++n));
+  }
+  return text;
+}
+
+// Values in long lists, some with the format that shows them: each is told once, and made by its own
+// keywords.
+TEST_F(CompareSetups, EachOfVeryManyDifferencesIsToldOnce) {
+  constexpr int kMany = 700;
+  const std::string own = make("a.v27", "flood.v27", {kSources + "=" + std::to_string(kMany)});
+  std::string text =
+      withEach(test::textOf(own), "Constant_Magnitude", [](int n) { return fmt::format("{}.25", n); });
+  text = withEach(text, "Sink_Point", [](int n) { return fmt::format("{} {}", n, n + 1); });
+  text = withEach(text, "Drying_Depth", [](int) { return "0.05"; });
+  const SetupDifference found = compare(own, folder.write("b.v27", text));
+  EXPECT_EQ(found.keywords.size(), 2U * kMany + 1);
+  std::map<std::string, int> told;
+  for (const Difference& difference : found.differences) {
+    EXPECT_NE(difference.page, 0) << difference.thing;
+    ASSERT_FALSE(difference.keywords.empty()) << difference.thing;
+    for (const std::string& path : difference.keywords) ++told[path];
+    if (difference.page == 41 && difference.thing.starts_with("Magnitude"))
+      EXPECT_THAT(difference.keywords,
+                  ElementsAre(fmt::format("HYDRODYNAMIC_MODULE/SOURCE_AND_SINK/SOURCE_SINK_{}/"
+                                          "Constant_Magnitude",
+                                          difference.row)));
+  }
+  EXPECT_EQ(told.size(), found.keywords.size());
+  EXPECT_EQ(told[kDrying], 1);
+}
+
+// What was found before an edit spares work, and changes nothing of what is found.
+TEST_F(CompareSetups, AFormerLookChangesNothing) {
+  const std::string other =
+      make("b.v27", "flood.v27",
+           {kDrying + "=0.05", kSources + "=2", "HYDRODYNAMIC_MODULE/OPEN_BOUNDARY/BOUNDARY_3/Value=150",
+            "HYDRODYNAMIC_MODULE/OPEN_BOUNDARY/BOUNDARY_3/Data_Format=1"});
+  const SetupDifference before = compare(make("a.v27", "flood.v27"), other);
+  const KvsHandle otherFile = open(other).setup.tree(other);
+  for (const std::vector<std::string>& edits : std::vector<std::vector<std::string>>{
+           {},
+           {kFlooding + "=0.4"},
+           {kDrying + "=0.05"},
+           {kSources + "=2"},
+           {kSources + "=3"},
+           {"HYDRODYNAMIC_MODULE/OPEN_BOUNDARY/BOUNDARY_3/Value=150"},
+           {"HYDRODYNAMIC_MODULE/OPEN_BOUNDARY/BOUNDARY_3/Data_Format=1"}}) {
+    SCOPED_TRACE(::testing::PrintToString(edits));
+    const std::string edited = make("c.v27", "flood.v27", edits);
+    const KvsHandle own = open(edited).setup.tree(other);
+    const SetupDifference whole = compareFiles(*own, *otherFile, other);
+    const SetupDifference spared = compareFiles(*own, *otherFile, other, {}, &before);
+    EXPECT_EQ(spared.keywords, whole.keywords);
+    EXPECT_EQ(linesOf(spared.differences), linesOf(whole.differences));
+    for (std::size_t i = 0; i < whole.differences.size(); ++i)
+      EXPECT_EQ(spared.differences.at(i).keywords, whole.differences[i].keywords)
+          << whole.differences[i].thing;
+  }
+}
+
 TEST_F(CompareSetups, AFileIsWhereItLeads) {
   const std::string own = make("a.v27", "flood.v27");
   const std::string elsewhere = make("deep/b.v27", "flood.v27");
@@ -251,9 +319,14 @@ TEST_F(CompareSetups, ConflictsAreAskedInWords) {
   const std::string out = folder.file("out.v27");
   const MergedTree merged = mergeSetups(sources, out, [](const MergeConflict&) { return MergeSide::own; });
   const std::vector<MergeQuestion> questions =
-      questionsOf(merged.conflicts, *sources.own.setup.tree(out), *sources.other.setup.tree(out), out);
+      questionsOf(merged.conflicts, *sources.base.setup.tree(out), *sources.own.setup.tree(out),
+                  *sources.other.setup.tree(out), out);
   ASSERT_EQ(questions.size(), 1U);
-  EXPECT_EQ(questions[0].thing, "Basic Parameters, Flood and Dry: Drying depth");
+  EXPECT_EQ(questions[0].path, kDrying);
+  EXPECT_EQ(questions[0].page, 26);
+  EXPECT_EQ(questions[0].pageName, "Basic Parameters, Flood and Dry");
+  EXPECT_EQ(questions[0].thing, "Drying depth");
+  EXPECT_EQ(questions[0].base, "0.1 m");
   EXPECT_EQ(questions[0].own, "0.05 m");
   EXPECT_EQ(questions[0].other, "0.02 m");
 }
@@ -309,6 +382,61 @@ TEST_F(CompareCommands, DiffTellsBadInput) {
   }
 }
 
+// The same, whatever its names of files are written like: by a link, a folder, or in full.
+TEST_F(CompareCommands, DiffKnowsTheSame) {
+  const std::string own = make("a.v27", "flood.v27");
+  fs::create_directories(folder.file("deep/down"));
+  SetupOnDisk moved = open(own);
+  ASSERT_TRUE(moved.setup.save(folder.file("deep/down/b.v27")));
+  std::string text = test::textOf(own);
+  const auto put = [&](const std::string& before, const std::string& what) {
+    text.replace(text.find(before), before.size(), what);
+  };
+  put("\"estuary.tsb2\"", '"' + folder.file("estuary.tsb2") + '"');
+  fs::create_symlink(own, folder.file("link.v27"));
+  for (const std::string& other : {own, folder.file("link.v27"), folder.file("deep/../a.v27"),
+                                   folder.file("deep/down/b.v27"), folder.write("full.v27", text)}) {
+    SCOPED_TRACE(other);
+    for (const char* form : {"--json", "--keywords"}) {
+      const ProgramRun run = runTool({"diff", own, other, form});
+      EXPECT_EQ(run.status, 0) << run.out << run.err;
+      if (std::string_view(form) == "--keywords") {
+        EXPECT_EQ(run.out, "");
+      } else {
+        EXPECT_THAT(nlohmann::json::parse(run.out)["differences"], IsEmpty());
+      }
+    }
+  }
+}
+
+TEST_F(CompareCommands, DiffTellsAnotherModule) {
+  if (theEdition.wetlandSweepKit) GTEST_SKIP() << "one module";
+  const ProgramRun run = runTool({"diff", make("a.v27", "flood.v27"), make("b.v27", "oxygen.v27"), "--json"});
+  EXPECT_EQ(run.status, 1) << run.err;
+  const nlohmann::json report = nlohmann::json::parse(run.out);
+  const ProgramRun plain = runTool({"diff", folder.file("a.v27"), folder.file("b.v27")});
+  EXPECT_EQ(plain.status, 1);
+  // What the text has stands in the report.
+  for (const nlohmann::json& difference : report["differences"]) {
+    const std::string thing = difference["thing"];
+    EXPECT_THAT(plain.out, HasSubstr(thing.empty() ? "the page is only in" : thing));
+    EXPECT_THAT(plain.out, HasSubstr(difference["page"] == 0 ? "On no page" : difference["pageName"]));
+  }
+  EXPECT_EQ(
+      static_cast<std::size_t>(
+          std::ranges::count_if(std::string_view(plain.out), [](char c) { return c == '\n'; })),
+      report["differences"].size() + 2 + [&] {
+        std::size_t pages = 0;
+        std::string last = "none";
+        for (const nlohmann::json& difference : report["differences"]) {
+          const std::string name = difference["page"] == 0 ? "On no page" : difference["pageName"];
+          pages += name == last ? 0 : 1;
+          last = name;
+        }
+        return pages;
+      }());
+}
+
 TEST_F(CompareCommands, DiffTellsAnotherEdition) {
   const std::string own = make("a.v27", "flood.v27");
   fs::copy_file(own, folder.file("a.v27wsk"));
@@ -343,14 +471,23 @@ TEST_F(CompareCommands, MergeWritesConflictsOnlyWhenToldHow) {
   ProgramRun run = runTool({"merge", base, own, other, "-o", out});
   EXPECT_EQ(run.status, 1);
   EXPECT_EQ(run.out,
-            "Basic Parameters, Flood and Dry: Drying depth: 0.05 m in A, 0.02 m in B, 0.1 in the base\n");
+            "Basic Parameters, Flood and Dry: Drying depth: 0.05 m in A, 0.02 m in B, 0.1 m in the base\n");
   EXPECT_THAT(run.err, HasSubstr("1 conflict; nothing is written"));
   EXPECT_FALSE(fs::exists(out));
   run = runTool({"merge", base, own, other, "-o", out, "--json"});
   EXPECT_EQ(run.status, 1);
   const nlohmann::json report = nlohmann::json::parse(run.out);
-  EXPECT_EQ(report["conflicts"][0]["path"], kDrying);
+  EXPECT_EQ(report["conflicts"], nlohmann::json({{{"path", kDrying},
+                                                  {"page", 26},
+                                                  {"pageName", "Basic Parameters, Flood and Dry"},
+                                                  {"thing", "Drying depth"},
+                                                  {"base", "0.1 m"},
+                                                  {"a", "0.05 m"},
+                                                  {"b", "0.02 m"}}}));
   EXPECT_EQ(report["written"], false);
+  EXPECT_EQ(report["out"], out);
+  for (const fs::directory_entry& file : fs::directory_iterator(folder.path()))
+    EXPECT_THAT(file.path().filename().string(), Not(HasSubstr("out")));
   EXPECT_EQ(runTool({"merge", base, own, other, "-o", out, "--theirs"}).status, 1);
   EXPECT_EQ(test::textOf(out), test::textOf(other));
   EXPECT_EQ(runTool({"merge", base, own, other, "-o", out, "--ours", "--force"}).status, 1);
@@ -377,9 +514,13 @@ class BesideDocument : public CompareSetups {
     ASSERT_TRUE(document.OnOpenDocument(own));
     comparison = makeSetupComparison(document);
   }
-  std::vector<std::string> lines() { return linesOf(comparison->differences()); }
+  const std::vector<Difference>& differences() {
+    EXPECT_EQ(comparison->take(comparison->compare()), comparison->isOpen());
+    return comparison->differences();
+  }
+  std::vector<std::string> lines() { return linesOf(differences()); }
   std::size_t placeOf(std::string_view thing) {
-    const std::vector<Difference>& all = comparison->differences();
+    const std::vector<Difference>& all = differences();
     const auto found = std::ranges::find(all, thing, &Difference::thing);
     EXPECT_NE(found, all.end()) << thing;
     return static_cast<std::size_t>(found - all.begin());
@@ -393,7 +534,7 @@ class BesideDocument : public CompareSetups {
 };
 
 TEST_F(BesideDocument, ItLooksAgainAfterAnEdit) {
-  EXPECT_THAT(comparison->differences(), IsEmpty());
+  EXPECT_THAT(differences(), IsEmpty());
   EXPECT_EQ(comparison->open(make("b.v27", "flood.v27", {kDrying + "=0.05"})), "");
   EXPECT_THAT(lines(), ElementsAre("Basic Parameters, Flood and Dry|Drying depth|<0.1 m> <0.05 m>"));
   document.root().areaDescription->floodingDepth = 0.4F;
@@ -415,6 +556,7 @@ TEST_F(BesideDocument, ADifferenceIsTakenOverAsOneStep) {
   EXPECT_TRUE(document.IsModified());
   EXPECT_THAT(lines(), ::testing::SizeIs(1));
   EXPECT_EQ(comparison->takeOverPage(26), "");
+  EXPECT_THAT(comparison->takeOverPage(26), HasSubstr("edited since"));
   EXPECT_THAT(lines(), IsEmpty());
   document.Undo();
   document.Undo();
@@ -439,7 +581,7 @@ TEST_F(BesideDocument, AllIsTakenOver) {
     const std::string before = textNow();
     const std::string other = make("b.v27", name);
     ASSERT_EQ(comparison->open(other), "");
-    if (comparison->differences().empty()) continue;
+    if (differences().empty()) continue;
     EXPECT_EQ(comparison->takeOverAll(), "");
     EXPECT_THAT(lines(), IsEmpty());
     EXPECT_EQ(textNow(), *open(other).setup.tree(own)->text());
@@ -462,7 +604,7 @@ TEST_F(BesideDocument, TheOtherPageCanBeReadOnly) {
   EXPECT_EQ(comparison->openPage(1), nullptr);
   comparison->close();
   EXPECT_FALSE(comparison->isOpen());
-  EXPECT_THAT(comparison->differences(), IsEmpty());
+  EXPECT_THAT(differences(), IsEmpty());
 }
 
 TEST_F(BesideDocument, WhatCannotBeReadIsTold) {
@@ -472,8 +614,8 @@ TEST_F(BesideDocument, WhatCannotBeReadIsTold) {
   EXPECT_TRUE(comparison->isOpen());
   EXPECT_THAT(lines(), ::testing::SizeIs(1));
   EXPECT_THAT(comparison->takeOver(9), HasSubstr("no such difference"));
-  EXPECT_THAT(comparison->startMerge(folder.file("none.v27"), own), HasSubstr("none.v27"));
-  EXPECT_THAT(comparison->startMerge(own, folder.write("no.v27", "A {}\n")), HasSubstr("is not a setup"));
+  EXPECT_THAT(comparison->startMerge(folder.file("none.v27"), {}, own), HasSubstr("none.v27"));
+  EXPECT_THAT(comparison->startMerge(own, {}, folder.write("no.v27", "A {}\n")), HasSubstr("is not a setup"));
 }
 
 TEST_F(BesideDocument, AMergeIsOneStep) {
@@ -482,9 +624,13 @@ TEST_F(BesideDocument, AMergeIsOneStep) {
   document.root().areaDescription->dryingDepth = 0.05F;
   document.RecordEdit(PageId::floodAndDry, "Drying depth");
   const std::string before = textNow();
-  ASSERT_EQ(comparison->startMerge(base, other), "");
+  ASSERT_EQ(comparison->startMerge(base, {}, other), "");
   ASSERT_EQ(comparison->questions().size(), 1U);
-  EXPECT_EQ(comparison->questions()[0].thing, "Basic Parameters, Flood and Dry: Drying depth");
+  EXPECT_EQ(comparison->questions()[0].thing, kDrying);
+  EXPECT_FALSE(comparison->takeQuestions(""));
+  EXPECT_TRUE(comparison->takeQuestions(comparison->wordQuestions()));
+  EXPECT_EQ(comparison->questions()[0].pageName, "Basic Parameters, Flood and Dry");
+  EXPECT_EQ(comparison->questions()[0].thing, "Drying depth");
   EXPECT_EQ(comparison->questions()[0].own, "0.05 m");
   EXPECT_EQ(comparison->finishMerge(), "");
   EXPECT_FLOAT_EQ(document.root().areaDescription->dryingDepth, 0.05F);
@@ -492,10 +638,114 @@ TEST_F(BesideDocument, AMergeIsOneStep) {
   EXPECT_EQ(document.UndoStep()->name, "Merge");
   document.Undo();
   EXPECT_EQ(textNow(), before);
-  ASSERT_EQ(comparison->startMerge(base, other), "");
+  ASSERT_EQ(comparison->startMerge(base, {}, other), "");
   comparison->questions()[0].takesOther = true;
   EXPECT_EQ(comparison->finishMerge(), "");
   EXPECT_FLOAT_EQ(document.root().areaDescription->dryingDepth, 0.02F);
+}
+
+// What was found of a setup that has been edited since, or beside another one, changes nothing.
+TEST_F(BesideDocument, AnOlderLookIsNotTaken) {
+  const std::string other = make("b.v27", "flood.v27", {kDrying + "=0.05"});
+  ASSERT_EQ(comparison->open(other), "");
+  EXPECT_FALSE(comparison->isCurrent());
+  const std::string early = comparison->compare();
+  document.root().areaDescription->floodingDepth = 0.4F;
+  document.RecordEdit(PageId::floodAndDry, "Flooding depth");
+  EXPECT_FALSE(comparison->take(early));
+  EXPECT_THAT(lines(), ::testing::SizeIs(2));
+  EXPECT_TRUE(comparison->isCurrent());
+  EXPECT_FALSE(comparison->take(early));
+  EXPECT_THAT(comparison->differences(), ::testing::SizeIs(2));
+  // The same state again: it holds again.
+  document.Undo();
+  EXPECT_FALSE(comparison->isCurrent());
+  EXPECT_TRUE(comparison->take(early));
+  EXPECT_THAT(comparison->differences(), ::testing::SizeIs(1));
+  ASSERT_EQ(comparison->open(other), "");
+  EXPECT_FALSE(comparison->take(early));
+  const std::string found = comparison->compare();
+  for (const std::string& bytes :
+       {std::string(), std::string("x"), found.substr(0, found.size() / 2), found + "x"})
+    EXPECT_FALSE(comparison->take(bytes));
+  EXPECT_TRUE(comparison->take(found));
+  document.units().setSystem(UnitSystem::us);
+  comparison->unitsChanged();
+  EXPECT_FALSE(comparison->take(found));
+  EXPECT_THAT(lines(), ElementsAre(HasSubstr("ft>")));
+}
+
+TEST_F(BesideDocument, OneOfVeryManyIsTakenOver) {
+  constexpr int kMany = 700;
+  own = make("a.v27", "flood.v27", {kSources + "=" + std::to_string(kMany)});
+  ASSERT_TRUE(document.OnOpenDocument(own));
+  const std::string other = folder.write("b.v27", withEach(test::textOf(own), "Constant_Magnitude",
+                                                           [](int n) { return fmt::format("{}.25", n); }));
+  ASSERT_EQ(comparison->open(other), "");
+  ASSERT_THAT(differences(), ::testing::SizeIs(kMany));
+  const std::string thing = comparison->differences()[600].thing;
+  EXPECT_EQ(comparison->takeOver(600), "");
+  EXPECT_THAT(differences(), ::testing::SizeIs(kMany - 1));
+  EXPECT_EQ(std::ranges::find(comparison->differences(), thing, &Difference::thing),
+            comparison->differences().end());
+}
+
+// The engine's options stand in no model: they are taken over and merged with an undo all the same.
+TEST_F(BesideDocument, OptionsAreBroughtIn) {
+  const std::string base = make("base.v27", "flood.v27");
+  std::string text = test::textOf(base);
+  text.replace(text.find("OPTION_PARAMETERS {}"), 20, "OPTION_PARAMETERS {\nmode 2\n}");
+  const std::string other = folder.write("b.v27", text);
+  const auto savedMode = [&] {
+    const KvsHandle file = document.file().tree(own);
+    const Node* mode = nodeAt(*file, "NESTED_MODEL_GLOBALS/OPTION_PARAMETERS/mode");
+    return mode == nullptr ? std::string() : shownValues(*mode);
+  };
+  ASSERT_EQ(comparison->open(other), "");
+  const auto undoAndRedo = [&](const char* name) {
+    EXPECT_EQ(savedMode(), "2");
+    EXPECT_EQ(document.UndoStep()->name, name);
+    EXPECT_TRUE(document.IsModified());
+    document.Redo();
+    EXPECT_EQ(savedMode(), "2");
+    document.Undo();
+    EXPECT_EQ(savedMode(), "");
+    document.Undo();
+    EXPECT_FALSE(document.IsModified());
+    EXPECT_EQ(savedMode(), "");
+    document.Redo();
+    EXPECT_EQ(savedMode(), "2");
+    document.Undo();
+  };
+  EXPECT_EQ(comparison->takeOver(placeOf("NESTED_MODEL_GLOBALS/OPTION_PARAMETERS/mode")), "");
+  EXPECT_THAT(lines(), IsEmpty());
+  undoAndRedo("Take over NESTED_MODEL_GLOBALS/OPTION_PARAMETERS/mode");
+  ASSERT_EQ(comparison->startMerge(base, {}, other), "");
+  EXPECT_EQ(comparison->finishMerge(), "");
+  undoAndRedo("Merge");
+  // It reaches the file, and what stands there beside the options stays.
+  document.Redo();
+  ASSERT_TRUE(document.OnSaveDocument(own));
+  EXPECT_TRUE(compare(own, other).isSame());
+}
+
+// Three files become a new document, with file names that lead where they led.
+TEST_F(BesideDocument, ThreeFilesAreMergedIntoANewOne) {
+  const std::string base = make("base.v27", "flood.v27");
+  const std::string first = make("first.v27", "flood.v27", {kDrying + "=0.05"});
+  const std::string second = make("second.v27", "flood.v27", {kDrying + "=0.02", kFlooding + "=0.3"});
+  ASSERT_TRUE(document.OnNewDocument());
+  ASSERT_EQ(comparison->startMerge(base, first, second), "");
+  ASSERT_EQ(comparison->questions().size(), 1U);
+  comparison->questions()[0].takesOther = true;
+  EXPECT_EQ(comparison->finishMerge(), "");
+  EXPECT_EQ(document.path(), "");
+  EXPECT_TRUE(document.IsModified());
+  fs::create_directories(folder.file("elsewhere"));
+  ASSERT_TRUE(document.OnSaveDocument(folder.file("elsewhere/merged.v27")));
+  EXPECT_THAT(linesOf(compare(folder.file("elsewhere/merged.v27"), second).differences), IsEmpty());
+  EXPECT_THAT(comparison->startMerge(base, folder.file("none.v27"), second), HasSubstr("none.v27"));
+  EXPECT_THAT(comparison->finishMerge(), HasSubstr("nothing to merge"));
 }
 
 }  // namespace compare_setups_test

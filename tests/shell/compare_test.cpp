@@ -4,11 +4,13 @@
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QLabel>
+#include <QPushButton>
 #include <QScrollBar>
 #include <QStatusBar>
 #include <QToolButton>
 
 #include "shell/compare/merge_dialog.h"
+#include "shell/compare/merge_files_dialog.h"
 #include "shell/grid_view.h"
 #include "tests/shell/desktop_fixture.h"
 
@@ -55,11 +57,34 @@ class CompareTest final : public DesktopFixture {
     QWidget* widget = comparison().otherPane().widgetOf(label);
     return *qobject_cast<QLineEdit*>(widget->focusProxy() != nullptr ? widget->focusProxy() : widget);
   }
+  // Puts a setup beside the one that is open, and waits until the two have been compared.
+  bool compareWith(const QString& name) { return window_->compareWith(file(name)) && comparison().finish(); }
   // A copy of the setup with other values.
   void makeOther(const QString& name, const QStringList& settings) {
     QFile::remove(file(name));
     QVERIFY(QFile::copy(file("s.v27"), file(name)));
     if (!settings.isEmpty()) run("v27setup", QStringList{"set", name} + settings);
+  }
+
+  static QStringList rowOf(MergeDialog& dialog) {
+    const QTreeWidgetItem& row = *dialog.list().topLevelItem(0)->child(0);
+    return {row.text(0), row.text(1), row.text(2), row.text(3)};
+  }
+  // Does something with the dialog of a type that comes up while the window is at something.
+  template <class Dialog>
+  static bool with(const std::function<void(Dialog&)>& act, const std::function<void()>& begin) {
+    QTimer poll;
+    bool isShown = false;
+    connect(&poll, &QTimer::timeout, qApp, [&] {
+      auto* dialog = qobject_cast<Dialog*>(QApplication::activeModalWidget());
+      if (dialog == nullptr) return;
+      poll.stop();
+      isShown = true;
+      act(*dialog);
+    });
+    poll.start(10);
+    begin();
+    return isShown;
   }
 
  private slots:
@@ -87,11 +112,11 @@ class CompareTest final : public DesktopFixture {
     QTest::keyClick(window_.get(), Qt::Key_D, Qt::ControlModifier | Qt::ShiftModifier);
     QTRY_VERIFY(TabComparison::of(&tab()) != nullptr);
     QVERIFY(dock().isVisible());
-    QCOMPARE(dock().note().text(), QString("s.v27 and o.v27: 3 differences"));
+    QTRY_COMPARE(dock().note().text(), QString("s.v27 and o.v27: 3 differences"));
   }
 
   void differingPagesAreListedAndMarked() {
-    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
     QVERIFY(dock().isVisible());
     const QStringList things = listed();
     QCOMPARE(things.size(), 3);
@@ -103,7 +128,7 @@ class CompareTest final : public DesktopFixture {
   }
 
   void thePagesStandSideBySide() {
-    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
     QVERIFY(!comparison().otherPane().isVisible());
     QVERIFY(tab().goToPage(kFloodAndDry));
     QCoreApplication::processEvents();
@@ -134,7 +159,7 @@ class CompareTest final : public DesktopFixture {
   }
 
   void cellsAreMarkedAndReadOnly() {
-    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
     QVERIFY(tab().goToPage(kAreas));
     QCoreApplication::processEvents();
     GridView& table = *tab().pane().tableAt(1);
@@ -154,7 +179,7 @@ class CompareTest final : public DesktopFixture {
   }
 
   void keysGoFromDifferenceToDifference() {
-    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
     std::vector<int> pages;
     for (int i = 0; i < 4; ++i) {
       QTest::keyClick(window_.get(), Qt::Key_F8);
@@ -170,7 +195,7 @@ class CompareTest final : public DesktopFixture {
   }
 
   void theListLeadsToThePage() {
-    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
     QTreeWidget& list = dock().list();
     QTreeWidgetItem* item = list.findItems("Drying depth", Qt::MatchExactly | Qt::MatchRecursive).at(0);
     list.scrollToItem(item);
@@ -180,14 +205,14 @@ class CompareTest final : public DesktopFixture {
   }
 
   void aDifferenceIsTakenOverAndBack() {
-    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
     QTest::keyClick(window_.get(), Qt::Key_F8, Qt::ShiftModifier);
     QCOMPARE(edit(kDepth).text(), QString("0.02"));
     click(dock().takeAction());
     QCOMPARE(edit(kDepth).text(), QString("0.05"));
     QCOMPARE(undoName(), QString("Take over Drying depth"));
     QCOMPARE(window_->undoAction()->text(), QString("&Undo Take over Drying depth"));
-    QCOMPARE(listed().size(), 2);
+    QTRY_COMPARE(listed().size(), 2);
     QVERIFY(!isMarked("Flood and Dry"));
     QVERIFY(comparison().marks()->rects().empty());
     window_->undoAction()->trigger();
@@ -201,22 +226,22 @@ class CompareTest final : public DesktopFixture {
   }
 
   void aPageAndAllAreTakenOver() {
-    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
     QVERIFY(tab().goToPage(kAreas));
     click(dock().takePageAction());
     QCOMPARE(undoName(), QString("Take over Basic Parameters, Bathymetry"));
-    QCOMPARE(listed().size(), 2);
+    QTRY_COMPARE(listed().size(), 2);
     click(dock().takeAllAction());
     QCOMPARE(undoName(), QString("Take over all"));
+    QTRY_COMPARE(dock().note().text(), QString("s.v27 and o.v27 are the same."));
     QVERIFY(listed().isEmpty());
-    QCOMPARE(dock().note().text(), QString("s.v27 and o.v27 are the same."));
     QVERIFY(!dock().takeAllAction()->isEnabled());
     QVERIFY(window_->saveDocument());
     QCOMPARE(textOf(file("s.v27")), textOf(file("o.v27")));
   }
 
   void itFollowsEachEdit() {
-    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
     QVERIFY(tab().goToPage(kFloodAndDry));
     enter(kDepth, "0.05");
     QTRY_COMPARE(listed().size(), 2);
@@ -227,7 +252,7 @@ class CompareTest final : public DesktopFixture {
   }
 
   void bothPagesScrollTogether() {
-    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
     QVERIFY(tab().goToPage(29));
     window_->resize(900, 420);
     QCoreApplication::processEvents();
@@ -250,7 +275,7 @@ class CompareTest final : public DesktopFixture {
   }
 
   void unitsAreThoseOfTheDocument() {
-    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
     QVERIFY(tab().goToPage(kFloodAndDry));
     UnitChoices us;
     us.setSystem(UnitSystem::us);
@@ -260,7 +285,7 @@ class CompareTest final : public DesktopFixture {
   }
 
   void itEnds() {
-    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
     QVERIFY(tab().goToPage(kFloodAndDry));
     click(dock().endAction());
     QVERIFY(TabComparison::of(&tab()) == nullptr);
@@ -269,7 +294,7 @@ class CompareTest final : public DesktopFixture {
     QVERIFY(listed().isEmpty());
     QVERIFY(!dock().nextAction()->isEnabled());
     // And begins again; the document goes with it.
-    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
     QVERIFY(tab().goToPage(kFloodAndDry));
     QTest::keySequence(window_.get(), QKeySequence(QKeySequence::Close));
     QVERIFY(window_->currentDocument() == nullptr);
@@ -277,7 +302,7 @@ class CompareTest final : public DesktopFixture {
   }
 
   void eachDocumentHasItsOwn() {
-    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
     makeOther("p.v27", {});
     QVERIFY(window_->openDocument(file("p.v27")) != nullptr);
     QVERIFY(listed().isEmpty());
@@ -302,7 +327,7 @@ class CompareTest final : public DesktopFixture {
     makeOther("base.v27", {});
     QVERIFY(tab().goToPage(kFloodAndDry));
     enter("Flooding depth:", "0.9");
-    QVERIFY(window_->mergeWith(file("base.v27"), file("o.v27")));
+    QVERIFY(window_->merge(file("base.v27"), {}, file("o.v27")));
     QCOMPARE(edit(kDepth).text(), QString("0.05"));
     QCOMPARE(edit("Flooding depth:").text(), QString("0.9"));
     QCOMPARE(undoName(), QString("Merge"));
@@ -321,17 +346,15 @@ class CompareTest final : public DesktopFixture {
         auto* dialog = qobject_cast<MergeDialog*>(QApplication::activeModalWidget());
         if (dialog == nullptr) return;
         poll.stop();
-        isShown =
-            dialog->list().topLevelItemCount() == 1 &&
-            dialog->list().topLevelItem(0)->text(0) == "Basic Parameters, Flood and Dry: Drying depth" &&
-            dialog->list().topLevelItem(0)->text(2) == "0.01 m" &&
-            dialog->list().topLevelItem(0)->text(3) == "0.05 m";
+        isShown = dialog->list().topLevelItemCount() == 1 &&
+                  dialog->list().topLevelItem(0)->text(0) == "Basic Parameters, Flood and Dry" &&
+                  rowOf(*dialog) == QStringList{"Drying depth", "0.02 m", "0.01 m", "0.05 m"};
         dialog->choice(0).setFocus();
         if (takesOther) QTest::keyClick(&dialog->choice(0), Qt::Key_Down);
         accepts ? dialog->accept() : dialog->reject();
       });
       poll.start(10);
-      const bool isDone = window_->mergeWith(file("base.v27"), file("o.v27"));
+      const bool isDone = window_->merge(file("base.v27"), {}, file("o.v27"));
       return isShown && isDone == accepts;
     };
     QVERIFY(merge(true, false));
@@ -343,6 +366,107 @@ class CompareTest final : public DesktopFixture {
     QVERIFY(merge(true, true));
     QVERIFY(tab().goToPage(kFloodAndDry));
     QCOMPARE(edit(kDepth).text(), QString("0.05"));
+  }
+
+  // The window goes on while a long comparison is at work, whose result is not that of the setup as it is by
+  // then: what is seen in the end is.
+  void theWindowGoesOnMeanwhile() {
+    run("v27setup", {"set", "o.v27", "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/Number_Of_Sources=1500"});
+    QVERIFY(window_->compareWith(file("o.v27")));
+    QVERIFY(comparison().isAtWork());
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    int beats = 0;
+    QTimer beat;
+    connect(&beat, &QTimer::timeout, this, [&] { ++beats; });
+    beat.start(5);
+    enter("Flooding depth:", "0.9");
+    QTRY_VERIFY_WITH_TIMEOUT(!comparison().isAtWork(), 30000);
+    QVERIFY2(beats > 10, qPrintable(QString::number(beats)));
+    QVERIFY(comparison().isCurrent());
+    QVERIFY2(listed().filter("Flooding depth").value(0).contains("0.9 m"), qPrintable(listed().join("\n")));
+    // What is typed is compared before something is taken over.
+    enter("Flooding depth:", "0.8");
+    click(dock().takeAllAction());
+    QCOMPARE(undoName(), QString("Take over all"));
+    QTRY_VERIFY_WITH_TIMEOUT(!comparison().isAtWork(), 30000);
+    QVERIFY(listed().isEmpty());
+  }
+
+  void theOtherFileIsReadAgain() {
+    QVERIFY(compareWith("o.v27"));
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    QVERIFY(!comparison().notice().isVisible());
+    run("v27setup", {"set", "o.v27", "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.07"});
+    QTRY_VERIFY(comparison().notice().isVisible());
+    QCOMPARE(otherEdit(kDepth).text(), QString("0.05"));
+    auto* again = comparison().notice().findChild<QPushButton*>("reload");
+    QTest::mouseClick(again, Qt::LeftButton);
+    QVERIFY(!comparison().notice().isVisible());
+    QTRY_VERIFY(listed().contains("Drying depth: 0.02 m | 0.07 m"));
+    QCOMPARE(otherEdit(kDepth).text(), QString("0.07"));
+    // What is gone is still compared, and can be read when it is there again.
+    QVERIFY(QFile::rename(file("o.v27"), file("away.v27")));
+    QTRY_VERIFY(comparison().notice().isVisible());
+    QVERIFY(comparison().notice().findChild<QLabel*>()->text().contains("no longer on disk"));
+    QVERIFY(!again->isEnabled());
+    QCOMPARE(listed().size(), 3);
+    run("v27setup", {"set", "away.v27", "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.06"});
+    QVERIFY(QFile::rename(file("away.v27"), file("o.v27")));
+    QTRY_VERIFY(again->isEnabled());
+    QTest::mouseClick(again, Qt::LeftButton);
+    QTRY_VERIFY(listed().contains("Drying depth: 0.02 m | 0.06 m"));
+    // One that is none any more is told, and what was read stays.
+    write(file("o.v27"), "OTHER {}\n");
+    QTRY_VERIFY(comparison().notice().isVisible());
+    again->click();
+    QVERIFY2(window_->statusBar()->currentMessage().contains("is not a setup"),
+             qPrintable(window_->statusBar()->currentMessage()));
+    QCOMPARE(otherEdit(kDepth).text(), QString("0.06"));
+    QVERIFY(comparison().notice().isVisible());
+  }
+
+  void threeFilesAreMergedIntoANewDocument() {
+    makeOther("base.v27", {});
+    makeOther("a.v27", {"NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.01",
+                        "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD/Warm_Up_Period=5"});
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    const auto fill = [this](MergeFilesDialog& dialog) {
+      dialog.baseEdit().setText(file("base.v27"));
+      QTest::keyClicks(&dialog.ownEdit(), file("a.v27"));
+      dialog.otherEdit().setText(file("o.v27"));
+      QTimer::singleShot(0, &dialog, &QDialog::accept);
+    };
+    const auto settle = [](MergeDialog& dialog) {
+      QCOMPARE(dialog.list().topLevelItemCount(), 2);
+      // All of a page, and one of another.
+      const bool isFirst = dialog.list().topLevelItem(0)->text(0).contains("Flood");
+      QTest::keyClick(&dialog.pageChoice(isFirst ? 0 : 1), Qt::Key_Down);
+      QTimer::singleShot(0, &dialog, &QDialog::accept);
+    };
+    QAction* action = nullptr;
+    for (QAction* each : window_->findChildren<QAction*>()) {
+      if (each->text() == "&Merge...") action = each;
+    }
+    QVERIFY(action != nullptr);
+    bool isSettled = false;
+    QVERIFY(with<MergeFilesDialog>(
+        fill, [&] { isSettled = with<MergeDialog>(settle, [&] { action->trigger(); }); }));
+    QVERIFY(isSettled);
+    QVERIFY(tab().editor().path().empty());
+    QVERIFY(tab().editor().isModified());
+    QCOMPARE(undoName(), QString("Merge"));
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    QCOMPARE(edit(kDepth).text(), QString("0.05"));
+    QVERIFY(window_->saveDocument(file("merged.v27")));
+    makeOther("wanted.v27", {"NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.05",
+                             "NESTED_MODEL_GLOBALS/BATHYMETRY_SELECTION/AREA_2/Origin=37,33",
+                             "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD/Warm_Up_Period=5"});
+    QCOMPARE(textOf(file("merged.v27")), textOf(file("wanted.v27")));
+    // What can't be read leaves nothing behind.
+    const QStringList told = answers(
+        {QMessageBox::Ok}, [&] { QVERIFY(!window_->merge(file("none.v27"), file("a.v27"), file("o.v27"))); });
+    QCOMPARE(told.size(), 1);
+    QCOMPARE(tab().name(), QString("merged.v27"));
   }
 };
 

@@ -1,4 +1,4 @@
-#include "shell/import/background_work.h"
+#include "shell/background_work.h"
 
 #include <utility>
 
