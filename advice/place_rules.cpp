@@ -9,6 +9,7 @@
 #include "advice/rules.h"
 #include "basic/bathymetry.h"
 #include "basic/boundary.h"
+#include "basic/boundary_overlap.h"
 #include "basic/nesting.h"
 #include "basic/source_sink.h"
 #include "structures/culvert.h"
@@ -119,33 +120,11 @@ bool adviseBoundary(AdviceContext& context, const GridFacts& grid, int number) {
              isLine ? std::optional(movedBoundary(boundary, number, *wet, *lastWet)) : std::nullopt);
 }
 
-// The points that two boundaries along one line have in common, by their place on that line; a corner of the
-// grid is a part of both its edges.
-struct Span {
-  int low, high;
-};
-std::optional<Span> commonOf(const CBoundaryObjectKvs& a, const CBoundaryObjectKvs& b) {
-  const auto along = [](const CBoundaryObjectKvs& it, bool alongJ) {
-    return alongJ ? Span{std::min(it.first.j, it.last.j), std::max(it.first.j, it.last.j)}
-                  : Span{std::min(it.first.k, it.last.k), std::max(it.first.k, it.last.k)};
-  };
-  for (const bool alongJ : {false, true}) {
-    const Span acrossA = along(a, !alongJ);
-    const Span acrossB = along(b, !alongJ);
-    if (acrossA.low != acrossA.high || acrossB.low != acrossB.high || acrossA.low != acrossB.low) continue;
-    const Span one = along(a, alongJ);
-    const Span two = along(b, alongJ);
-    const Span common{std::max(one.low, two.low), std::min(one.high, two.high)};
-    if (common.low <= common.high) return common;
-  }
-  return std::nullopt;
-}
-
 void adviseOverlap(AdviceContext& context, int number, int other) {
   const CBoundaryObjectKvs& a = *context.model.boundary->GetItem(other);
   const CBoundaryObjectKvs& b = *context.model.boundary->GetItem(number);
   if (a.first == a.last || b.first == b.last) return;
-  const std::optional<Span> common = commonOf(a, b);
+  const std::optional<BoundarySpan> common = commonOf(a, b);
   if (!common) return;
   Advice advice = ofBoundary(context, number,
                              fmt::format("Boundaries {} and {} have {} points in common.", other, number,

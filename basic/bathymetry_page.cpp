@@ -33,7 +33,11 @@ void CBathymetryGrid::LayOut() {
   FileName("Bathymetry", 210, file);
   Browse(texts::browse.format, 30, file);
   // Blank for Area 1, which lies in none.
-  Point("Origin", 60, inner, &Area::origin).Right().ReadOnlyIf(isFixed).EnabledIf({});
+  Point("Origin", 60, inner, &Area::origin)
+      .Right()
+      .ReadOnlyIf(isFixed)
+      .EnabledIf({})
+      .OfArea([area](GridRow row) { return area(row)->enclosingArea; });
   PlainInteger("Enclosing Area", 100, inner, &Area::enclosingArea).Right().ReadOnlyIf(isFixed).EnabledIf({});
   View(texts::view.format, 45, file);
 }

@@ -8,8 +8,11 @@ void CBoundaryGrid::LayOut() {
   constexpr int kWidth = 90;
   const auto boundary = RowsOf(&BasicParts::boundary);
   const auto isDetected = [this](GridRow) { return !parts<BasicParts>().boundary->isUserSpecified(); };
-  Point("First point", kWidth, boundary, &CBoundaryObjectKvs::first).Right().ReadOnlyIf(isDetected);
-  Point("Last point", kWidth, boundary, &CBoundaryObjectKvs::last).Right().ReadOnlyIf(isDetected);
+  Point("First point", kWidth, boundary, &CBoundaryObjectKvs::first)
+      .Right()
+      .ReadOnlyIf(isDetected)
+      .OnBorder();
+  Point("Last point", kWidth, boundary, &CBoundaryObjectKvs::last).Right().ReadOnlyIf(isDetected).OnBorder();
 }
 
 void CBoundaryDlg::DoDataExchange(Form& form) {

@@ -51,7 +51,8 @@ void CMassBudgetGrid::LayOut() {
   Integer("", 0, polygon, &CMassBudgetItemKvs::associatedArea);
   Add({.get = [polygon](GridRow at) { return std::to_string(polygon(at)->corners.size()); },
        .set = setCount});
-  Column& corners = Point("", 0, corner);
+  Column& corners =
+      Point("", 0, corner).OfArea([polygon](GridRow at) { return polygon(at)->associatedArea; });
   corners.get = [corner](GridRow at) {
     const GridPoint* point = corner(at);
     return point == nullptr ? std::string() : fmt::format("{},{}", point->j, point->k);

@@ -13,7 +13,23 @@ void CSourceSinkGrid::LayOut() {
   const auto end = [&](const char* header, GridPoint Entry::*point, std::int32_t Entry::*area,
                        std::int32_t offType) {
     const auto isOn = [entry, offType](GridRow row) { return entry(row)->type != offType; };
-    Point(header, kWidth, entry, point).EnabledIf(isOn).SubHeader("Point").HeaderSpan(2);
+    // A place on a map has an area too, the finest there.
+    const auto wanted = [=](GridRow row) {
+      const Entry& held = *entry(row);
+      return std::optional(CellPick{.of = CellPick::Of::finest,
+                                    .area = held.*area,
+                                    .held = {{.area = held.*area, .point = held.*point}}});
+    };
+    const auto take = [=](GridRow row, std::span<const PickedPlace> places) {
+      entry(row)->*point = places.front().point;
+      entry(row)->*area = places.front().area;
+      return Stored::taken;
+    };
+    Point(header, kWidth, entry, point)
+        .EnabledIf(isOn)
+        .SubHeader("Point")
+        .HeaderSpan(2)
+        .Picks({wanted, take});
     PlainInteger("", kWidth, entry, area).Static().EnabledIf(isOn).SubHeader("Area");
   };
   List("Type", kTypeWidth, entry, &Entry::type,

@@ -38,8 +38,9 @@ void LineOrBoxGrid::LayOut() {
   Button("...", 20, [this, item](GridRow row) {
     if (choosePlace_(document(), *item(row))) UpdateDoc();
   });
-  Point("First", 70, item, &LineOrBox::first);
-  Point("Last", 70, item, &LineOrBox::last);
+  const auto area = [item](GridRow row) { return item(row)->areaNumber; };
+  Point("First", 70, item, &LineOrBox::first).OfArea(area);
+  Point("Last", 70, item, &LineOrBox::last).OfArea(area);
   Range(
       "Period", 70, [item](GridRow row) { return &item(row)->steps; }, false);
   FileName("File name", 160, file);

@@ -12,8 +12,10 @@ void TransportOutputColumns::ListOutput(const Output& output) {
   const auto kind = [output](GridRow row) { return resultFileKind(extentOf(output(row)->part)); };
   const FileChoice file = resultFileOf(output, &TransportOutput::file, kind);
   Integer("Area", 45, output, &TransportOutput::areaNumber);
-  Range("J", 70, [output](GridRow row) { return &output(row)->part.x; });
-  Range("K", 70, [output](GridRow row) { return &output(row)->part.y; });
+  const Column::Pick pick = partPick([output](GridRow row) { return &output(row)->part; },
+                                     [output](GridRow row) { return output(row)->areaNumber; });
+  Range("J", 70, [output](GridRow row) { return &output(row)->part.x; }).Picks(pick);
+  Range("K", 70, [output](GridRow row) { return &output(row)->part.y; }).Picks(pick);
   Range("Time", 70, [output](GridRow row) { return &output(row)->steps; });
   Button("...", 20, [this, output](GridRow row) {
     TransportOutput& it = *output(row);

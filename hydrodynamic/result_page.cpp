@@ -3,6 +3,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <limits>
 
 #include "families/points_dialog.h"
 #include "hydrodynamic/infiltration.h"
@@ -93,8 +94,9 @@ void CResultGrid::LayOut() {
     return std::to_string(output(row)->type);
   };
   Shown("Area", 45, [](GridRow) { return std::to_string(Output::kAreaNumber); }).Static();
-  pointsOrRange("J", &Output::pointsJ, &Output::pointsK, &USubArea::x);
-  pointsOrRange("K", &Output::pointsK, &Output::pointsJ, &USubArea::y);
+  const Column::Pick pick = pointsOrPart(output);
+  pointsOrRange("J", &Output::pointsJ, &Output::pointsK, &USubArea::x).Picks(pick);
+  pointsOrRange("K", &Output::pointsK, &Output::pointsJ, &USubArea::y).Picks(pick);
   Range("Time", 60, [output](GridRow row) { return &output(row)->steps; });
   Button("...", 20, [this, output](GridRow row) { choosePart(*output(row)); });
   ResultFile("Data File", 160, file);
@@ -126,6 +128,36 @@ Column& CResultGrid::pointsOrRange(std::string_view header, std::vector<double> 
     return Stored::taken;
   };
   return column;
+}
+
+Column::Pick CResultGrid::pointsOrPart(const std::function<Output*(GridRow)>& output) {
+  const Column::Pick part = partPick([output](GridRow row) { return &output(row)->part; },
+                                     [](GridRow) { return Output::kAreaNumber; },
+                                     [output](GridRow row) { return output(row)->type == Output::kLine; });
+  const auto wanted = [output, part](GridRow row) {
+    const Output& it = *output(row);
+    std::optional<CellPick> pick = part.wanted(row);
+    if (it.type != Output::kPoints) return pick;
+    pick->shape = CellPick::Shape::points;
+    pick->most = std::numeric_limits<std::size_t>::max();
+    pick->held.clear();
+    for (std::size_t i = 0; i < static_cast<std::size_t>(it.PointCount()); ++i)
+      pick->held.push_back(
+          {.point = {static_cast<std::int32_t>(it.pointsJ[i]), static_cast<std::int32_t>(it.pointsK[i])}});
+    return pick;
+  };
+  const auto take = [output, part](GridRow row, std::span<const PickedPlace> places) {
+    Output& it = *output(row);
+    if (it.type != Output::kPoints) return part.take(row, places);
+    it.pointsJ.clear();
+    it.pointsK.clear();
+    for (const PickedPlace& place : places) {
+      it.pointsJ.push_back(place.point.j);
+      it.pointsK.push_back(place.point.k);
+    }
+    return Stored::taken;
+  };
+  return {wanted, take};
 }
 
 void CResultGrid::choosePart(Output& output) {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstdint>
+#include <functional>
 #include <vector>
 
 #include "families/result_pages.h"
@@ -15,6 +16,8 @@ class CResultGrid final : public ResultFileGrid {
 
   Column& pointsOrRange(std::string_view header, std::vector<double> CNhdResultObjectKvs::*points,
                         std::vector<double> CNhdResultObjectKvs::*others, USubLine USubArea::*range);
+  // The pick of both.
+  static Column::Pick pointsOrPart(const std::function<CNhdResultObjectKvs*(GridRow)>& output);
   void choosePart(CNhdResultObjectKvs& output);
   void chooseItems();
 };

@@ -14,6 +14,12 @@ class DocumentMap final : public MapEditor {
 
   const MapScene& scene() override { return map_.scene(root()); }
   std::optional<MapPick> pick(MapPoint place, std::int32_t area) override { return map_.pick(place, area); }
+  std::optional<PickedPlace> placeFor(const CellPick& cell, MapPoint place) override {
+    return map_.placeFor(cell, place);
+  }
+  std::optional<MapPoint> placeOf(const CellPick& cell, const PickedPlace& held) override {
+    return map_.placeOf(cell, held);
+  }
   std::optional<std::array<double, 2>> geographic(MapPoint place) override { return map_.geographic(place); }
 
   AreaPlace previewMoveArea(std::int32_t number, MapPoint first) override {
@@ -56,6 +62,9 @@ class DocumentMap final : public MapEditor {
   }
   std::string removeVertex(MapFeatureId feature, std::size_t vertex) override {
     return record([&] { return map_.removeVertex(root(), feature, vertex); });
+  }
+  FeaturePlace previewFeature(MapKind kind, const std::vector<MapPoint>& points, std::int32_t page) override {
+    return map_.previewFeature(root(), kind, points, page);
   }
   std::string addFeature(MapKind kind, const std::vector<MapPoint>& points, std::int32_t page) override {
     return record([&] { return map_.addFeature(root(), kind, points, page); });

@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "map/map_scene.h"
+#include "pages/map_pick.h"
 
 namespace gridbay {
 
@@ -28,6 +29,13 @@ struct VertexPlace {
   std::string fault;
 };
 
+// A new feature as an edit would place it.
+struct FeaturePlace {
+  std::vector<MapPoint> points;    // snapped to the grid where the feature stands on one
+  std::optional<GridPoint> point;  // of that grid: the last one
+  std::string fault;
+};
+
 // The setup on a map, and what can be grasped there. Each edit is one undo step by its name; the text that it
 // returns says why it can't be done, and is empty when it has been. All of it is virtual, as a host links
 // nothing of it.
@@ -42,6 +50,10 @@ class MapEditor {
   // The point of a grid at a place on the map: of the finest area there, or of one by its number. Nothing
   // where there is none. In the last scene, as `geographic` is.
   virtual std::optional<MapPick> pick(MapPoint place, std::int32_t area = 0) = 0;
+  // A place on the map as a cell of a page takes it, and where on the map a place lies that it holds. Nothing
+  // where there is no such point, or no way between the projections.
+  virtual std::optional<PickedPlace> placeFor(const CellPick& cell, MapPoint place) = 0;
+  virtual std::optional<MapPoint> placeOf(const CellPick& cell, const PickedPlace& held) = 0;
   // Longitude and latitude (degrees) of a place on the map; nothing in local coordinates.
   virtual std::optional<std::array<double, 2>> geographic(MapPoint place) = 0;
 
@@ -66,9 +78,13 @@ class MapEditor {
   // The new point stands before `vertex`; at the end of the line where that is the number of points.
   virtual std::string insertVertex(MapFeatureId feature, std::size_t vertex, MapPoint place) = 0;
   virtual std::string removeVertex(MapFeatureId feature, std::size_t vertex) = 0;
+  // With the points that there are so far, in the last scene: that more are needed is no fault.
+  virtual FeaturePlace previewFeature(MapKind kind, const std::vector<MapPoint>& points,
+                                      std::int32_t page = 0) = 0;
   // A new feature of its list with these points: a source (one point, or two for a pair), a sink is made of a
-  // source on its page; a user-specified boundary, an output, a polygon, a structure, a line or box of the
-  // module that is chosen. Outputs are those of the flow calculation unless the page is that of the module's.
+  // source on its page; an open boundary, an output, a polygon, a structure, a line or box of the module that
+  // is chosen. Outputs are those of the flow calculation unless the page is that of the module's. With a
+  // boundary, all boundaries become user-specified; one that is drawn over another takes its place.
   virtual std::string addFeature(MapKind kind, const std::vector<MapPoint>& points,
                                  std::int32_t page = 0) = 0;
   virtual std::string removeFeature(MapFeatureId feature) = 0;

@@ -5,8 +5,10 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <span>
 
 #include "basic/boundary.h"
+#include "basic/boundary_overlap.h"
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
 #include "basic/source_sink.h"
@@ -30,18 +32,42 @@ bool isOutput(MapKind kind) {
   return std::ranges::find(kOutputs, kind) != kOutputs.end();
 }
 
-// Two points as the ends of what an output of a kind covers: a line follows the axis along which it is
+bool isFlowPage(std::int32_t page) {
+  return page == 0 || page == static_cast<std::int32_t>(PageId::hdResult);
+}
+
+bool isRectangle(MapKind kind) {
+  return kind == MapKind::outputMap || kind == MapKind::box;
+}
+
+// Two points as the ends of what a feature covers: an output along a line follows the axis along which it is
 // longer. What is wrong, or empty.
 std::string makeExtent(MapKind kind, GridPoint first, GridPoint& last) {
-  if ((kind == MapKind::outputMap || kind == MapKind::box) && (first.j == last.j || first.k == last.k))
+  if (isRectangle(kind) && (first.j == last.j || first.k == last.k))
     return "The rectangle is narrower than the grid's cells";
-  if (kind == MapKind::outputLine) {
-    const bool alongJ = std::abs(first.j - last.j) >= std::abs(first.k - last.k);
-    (alongJ ? last.k : last.j) = alongJ ? first.k : first.j;
-  }
+  if (kind == MapKind::outputLine) last = alongAxis(first, last);
   if ((kind == MapKind::outputLine || kind == MapKind::discharge) && first == last)
     return "The line is shorter than the grid's cells";
   return {};
+}
+
+// The boundaries over which one would lie; a point in common is not yet that.
+std::vector<int> boundariesBelow(const CBoundaryKvs& list, GridPoint first, GridPoint last) {
+  CBoundaryObjectKvs drawn(nullptr);
+  drawn.first = first;
+  drawn.last = last;
+  std::vector<int> below;
+  for (int number = 1; number <= list.GetCount(); ++number) {
+    const auto common = commonOf(*list.GetItem(number), drawn);
+    if (common && common->low < common->high) below.push_back(number);
+  }
+  return below;
+}
+
+std::string faultBelow(const std::vector<int>& below) {
+  return below.size() < 2 ? std::string()
+                          : fmt::format("It lies over boundaries {}: draw it over one of them at most",
+                                        fmt::join(below, " and "));
 }
 
 }  // namespace
@@ -50,8 +76,8 @@ MapEdit SetupMap::addFeature(CGlobalKvs& root, MapKind kind, const std::vector<M
                              std::int32_t page) {
   scene(root);
   if (kind == MapKind::discharge || kind == MapKind::box) return addLineOrBox(root, kind, points);
-  const bool isOfFlow = page == 0 || page == static_cast<std::int32_t>(PageId::hdResult);
-  if (isOutput(kind) && !isOfFlow) return addModuleOutput(root, kind, points);
+  if (kind == MapKind::boundary) return addBoundary(root, points);
+  if (isOutput(kind) && !isFlowPage(page)) return addModuleOutput(root, kind, points);
   return isStructure(kind) ? addStructure(root, kind, points) : addOnGrid(root, kind, points);
 }
 
@@ -73,51 +99,116 @@ MapEdit SetupMap::addStructure(CGlobalKvs& root, MapKind kind, std::vector<MapPo
   return {.page = pageOfStructure(kind), .name = fmt::format("New {}", kindName(kind))};
 }
 
-MapEdit SetupMap::addOnGrid(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points) {
-  if (points.empty()) return refusedEdit("There are no points");
-  const auto outer = pick(points.front(), 1);
-  // What the outermost area alone has.
-  const auto onOuter = [&](std::size_t least) {
-    if (points.size() < least) return fmt::format("{} points are needed", least);
-    const bool isInside =
-        std::ranges::all_of(points, [this](MapPoint point) { return pick(point, 1).has_value(); });
-    return isInside ? std::string() : std::string("Area 1 does not reach there");
+SetupMap::NewShape SetupMap::newShape(MapKind kind, const std::vector<MapPoint>& points,
+                                      bool isOfFlow) const {
+  NewShape made;
+  auto& [on, areas, closed, joined] = made.shape;
+  const auto failed = [&made](std::string fault) {
+    made.fault = std::move(fault);
+    return made;
   };
+  if (points.empty()) return failed("There are no points");
   if (kind == MapKind::boundary) {
-    CBoundaryKvs& list = *root.boundary;
     const MapArea* area = scene_.area(1);
-    if (!list.isUserSpecified())
-      return refusedEdit(
-          "The boundaries are found by the program; choose \"User specified\" on their page first");
-    if (area == nullptr || !area->isPlaced) return refusedEdit("Area 1 has no place on the map");
-    if (points.size() < 2) return refusedEdit("2 points are needed");
-    if (list.GetCount() >= CBoundaryKvs::kMostOnPage)
-      return refusedEdit(fmt::format("There are no more than {} boundaries", CBoundaryKvs::kMostOnPage));
-    const auto [j, k] = area->grid.pointOf(points[0]);
-    const auto [lastJ, lastK] = area->grid.pointOf(points[1]);
-    const GridPoint first = slideAlongBorder(j, k, area->nx, area->ny, {});
-    const GridPoint last = slideAlongBorder(lastJ, lastK, area->nx, area->ny, first);
-    if (last == first) return refusedEdit("The boundary is shorter than the spacing of Area 1");
-    list.SetNoBoundaries(list.GetCount() + 1);
-    CBoundaryObjectKvs& boundary = list.at(list.GetCount());
-    boundary.first = first;
-    boundary.last = last;
-    return {.page = PageId::boundary, .name = "New boundary"};
+    if (area == nullptr || !area->isPlaced) return failed("Area 1 has no place on the map");
+    for (const MapPoint& point : std::span(points).first(std::min<std::size_t>(points.size(), 2))) {
+      const auto [j, k] = area->grid.pointOf(point);
+      on.push_back(
+          slideAlongBorder(j, k, area->nx, area->ny, on.empty() ? std::nullopt : std::optional(on.front())));
+    }
+    areas.assign(on.size(), 1);
+    if (on.size() == 2 && on[0] == on[1]) made.fault = "The boundary is shorter than the spacing of Area 1";
+    return made;
   }
   if (kind == MapKind::source) {
+    for (const MapPoint& point : points) {
+      const auto there = pick(point, 0);
+      if (!there) return failed("There is no area");
+      on.push_back(there->point);
+      areas.push_back(there->area);
+    }
+    return made;
+  }
+  const auto isInArea1 = [this](MapPoint point) { return pick(point, 1).has_value(); };
+  if (isOfFlow && !std::ranges::all_of(points, isInArea1)) return failed("Area 1 does not reach there");
+  const std::int32_t number = isOfFlow ? 1 : finestHolding(points);
+  if (number == 0) {
+    const char* what = kind == MapKind::massBudget  ? "polygon"
+                       : kind == MapKind::discharge ? "line"
+                       : kind == MapKind::box       ? "box"
+                                                    : "output";
+    return failed(fmt::format("No area holds the whole {}", what));
+  }
+  for (const MapPoint& point : points) on.push_back(pick(point, number)->point);
+  const bool hasExtent = isRectangle(kind) || kind == MapKind::outputLine || kind == MapKind::discharge;
+  if (hasExtent && on.size() > 1) {
+    const GridPoint first = on.front();
+    GridPoint last = on.back();
+    made.fault = makeExtent(kind, first, last);
+    on = isRectangle(kind) ? rectangleOf(first, last) : std::vector<GridPoint>{first, last};
+  }
+  areas.assign(on.size(), number);
+  closed = isRectangle(kind) || kind == MapKind::massBudget;
+  return made;
+}
+
+FeaturePlace SetupMap::previewFeature(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points,
+                                      std::int32_t page) const {
+  if (isStructure(kind)) return {points, {}, {}};
+  const NewShape made = newShape(kind, points, isOutput(kind) && isFlowPage(page));
+  FeaturePlace place{{}, {}, made.fault};
+  const std::vector<GridPoint>& on = made.shape.points;
+  if (made.fault.empty() && kind == MapKind::boundary && on.size() == 2)
+    place.fault = faultBelow(boundariesBelow(*root.boundary, on[0], on[1]));
+  for (std::size_t i = 0; i < on.size() && i < made.shape.areas.size(); ++i)
+    place.points.push_back(scene_.area(made.shape.areas[i])->grid.at(on[i].j, on[i].k));
+  if (place.points.empty()) {
+    place.points = points;
+  } else {
+    place.point = isRectangle(kind) && on.size() > 2 ? on[2] : on.back();
+  }
+  return place;
+}
+
+// What the program has found stays, and is the user's from now on. What is said of a boundary on other pages
+// stands under its number, so that one which is drawn over another has the number of that.
+MapEdit SetupMap::addBoundary(CGlobalKvs& root, const std::vector<MapPoint>& points) {
+  CBoundaryKvs& list = *root.boundary;
+  const NewShape made = newShape(MapKind::boundary, points, false);
+  if (!made.fault.empty()) return refusedEdit(made.fault);
+  if (points.size() < 2) return refusedEdit("2 points are needed");
+  const GridPoint first = made.shape.points[0];
+  const GridPoint last = made.shape.points[1];
+  const std::vector<int> below = boundariesBelow(list, first, last);
+  if (std::string fault = faultBelow(below); !fault.empty()) return refusedEdit(std::move(fault));
+  if (below.empty() && list.GetCount() >= CBoundaryKvs::kMostOnPage)
+    return refusedEdit(fmt::format("There are no more than {} boundaries", CBoundaryKvs::kMostOnPage));
+  list.defaultPosition = 0;
+  if (below.empty()) list.SetNoBoundaries(list.GetCount() + 1);
+  CBoundaryObjectKvs& boundary = list.at(below.empty() ? list.GetCount() : below.front());
+  boundary.first = first;
+  boundary.last = last;
+  return {.page = PageId::boundary,
+          .name = below.empty() ? "New boundary" : fmt::format("Boundary {}, both ends", below.front())};
+}
+
+MapEdit SetupMap::addOnGrid(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points) {
+  if (points.empty()) return refusedEdit("There are no points");
+  const NewShape made = newShape(kind, points, isOutput(kind));
+  const GridShape& shape = made.shape;
+  if (kind == MapKind::source) {
     CSourceSinkKvs& list = *root.sourceSink;
-    const auto first = pick(points.front(), 0);
-    const auto second = points.size() > 1 ? pick(points[1], 0) : first;
-    if (!first || !second) return refusedEdit("There is no area");
+    if (!made.fault.empty()) return refusedEdit(made.fault);
     if (list.GetCount() >= CSourceSinkKvs::kMostSources)
       return refusedEdit(fmt::format("There are no more than {} sources", CSourceSinkKvs::kMostSources));
     list.SetNoSources(list.GetCount() + 1);
     CSourceSinkObjectKvs& source = list.at(list.GetCount());
-    source.type = points.size() > 1 ? CSourceSinkObjectKvs::kPair : CSourceSinkObjectKvs::kIsolatedSource;
-    source.source = first->point;
-    source.sourceArea = first->area;
-    source.sink = second->point;
-    source.sinkArea = second->area;
+    const std::size_t second = points.size() > 1 ? 1 : 0;
+    source.type = second == 1 ? CSourceSinkObjectKvs::kPair : CSourceSinkObjectKvs::kIsolatedSource;
+    source.source = shape.points[0];
+    source.sourceArea = shape.areas[0];
+    source.sink = shape.points[second];
+    source.sinkArea = shape.areas[second];
     return {.page = PageId::sourceAndSink, .name = "New source"};
   }
   if (kind == MapKind::massBudget) {
@@ -127,24 +218,21 @@ MapEdit SetupMap::addOnGrid(CGlobalKvs& root, MapKind kind, const std::vector<Ma
     if (points.size() < shapeRule(kind).least) return refusedEdit("A polygon has three corners at least");
     if (list.GetCount() >= CMassBudgetKvs::kMostOnPage)
       return refusedEdit(fmt::format("There are no more than {} polygons", CMassBudgetKvs::kMostOnPage));
-    const std::int32_t number = finestHolding(points);
-    if (number == 0) return refusedEdit("No area holds the whole polygon");
+    if (!made.fault.empty()) return refusedEdit(made.fault);
     list.SetNoPolygons(list.GetCount() + 1);
     CMassBudgetItemKvs& polygon = list.at(list.GetCount());
-    polygon.associatedArea = number;
-    polygon.corners.clear();
-    for (const MapPoint point : points) polygon.corners.push_back(*pointAt(*scene_.area(number), point));
+    polygon.associatedArea = shape.area();
+    polygon.corners = shape.points;
     return {.page = PageId::massBudget, .name = "New polygon"};
   }
   if (isOutput(kind)) {
     CNhdResultKvs& results = *root.nhdResult;
     const std::size_t least = kind == MapKind::outputPoints ? 1 : 2;
-    if (const std::string fault = onOuter(least); !fault.empty()) return refusedEdit(fault);
+    if (points.size() < least) return refusedEdit(fmt::format("{} points are needed", least));
+    if (shape.points.empty()) return refusedEdit(made.fault);
     if (results.outputs.GetCount() >= CNhdResultKvs::kMostOutputs)
       return refusedEdit(fmt::format("There are no more than {} outputs", CNhdResultKvs::kMostOutputs));
-    const GridPoint first = outer->point;
-    GridPoint last = pick(points.back(), 1)->point;
-    if (std::string fault = makeExtent(kind, first, last); !fault.empty()) return refusedEdit(fault);
+    if (!made.fault.empty()) return refusedEdit(made.fault);
     results.outputs.SetCount(results.outputs.GetCount() + 1);
     const int number = results.outputs.GetCount();
     CNhdResultObjectKvs& output = results.outputs.at(number);
@@ -154,13 +242,6 @@ MapEdit SetupMap::addOnGrid(CGlobalKvs& root, MapKind kind, const std::vector<Ma
     } else {
       output.type = kind == MapKind::outputMap ? CNhdResultObjectKvs::kMap : CNhdResultObjectKvs::kLine;
     }
-    GridShape shape;
-    if (kind == MapKind::outputPoints) {
-      for (const MapPoint point : points) shape.points.push_back(pick(point, 1)->point);
-    } else {
-      shape.points = {first, last};
-    }
-    shape.areas.assign(shape.points.size(), 1);
     giveShape(root, idOf(kind, number, PageId::hdResult), shape);
     return {.page = PageId::hdResult, .name = "New output"};
   }
@@ -183,14 +264,11 @@ MapEdit SetupMap::addModuleOutput(CGlobalKvs& root, MapKind kind, const std::vec
   if (points.size() < (kind == MapKind::outputPoints ? 1U : 2U)) return refusedEdit("2 points are needed");
   if (outputs.count >= outputs.most)
     return refusedEdit(fmt::format("There are no more than {} outputs", outputs.most));
-  const std::int32_t number = finestHolding(points);
-  if (number == 0) return refusedEdit("No area holds the whole output");
-  const GridPoint first = pick(points.front(), number)->point;
-  GridPoint last = kind == MapKind::outputPoints ? first : pick(points.back(), number)->point;
-  if (std::string fault = makeExtent(kind, first, last); !fault.empty()) return refusedEdit(fault);
+  const NewShape made = newShape(kind, points, false);
+  if (!made.fault.empty()) return refusedEdit(made.fault);
   outputs.setCount(outputs.count + 1);
-  outputs.item(outputs.count + 1)->areaNumber = number;
-  giveShape(root, idOf(kind, outputs.count + 1, outputs.page), {{first, last}, {number, number}});
+  outputs.item(outputs.count + 1)->areaNumber = made.shape.area();
+  giveShape(root, idOf(kind, outputs.count + 1, outputs.page), made.shape);
   return {.page = outputs.page, .name = "New output"};
 }
 
@@ -203,16 +281,11 @@ MapEdit SetupMap::addLineOrBox(CGlobalKvs& root, MapKind kind, const std::vector
   if (points.size() < 2) return refusedEdit("2 points are needed");
   if (list->GetCount() >= LineOrBoxList::kMost)
     return refusedEdit(fmt::format("There are no more than {} of them", LineOrBoxList::kMost));
-  const std::int32_t number = finestHolding(points);
-  if (number == 0) return refusedEdit(fmt::format("No area holds the whole {}", isLine ? "line" : "box"));
-  const GridPoint first = pick(points.front(), number)->point;
-  GridPoint last = pick(points.back(), number)->point;
-  if (std::string fault = makeExtent(kind, first, last); !fault.empty()) return refusedEdit(fault);
+  const NewShape made = newShape(kind, points, false);
+  if (!made.fault.empty()) return refusedEdit(made.fault);
   list->SetCount(list->GetCount() + 1);
-  list->GetLineOrBox(list->GetCount())->areaNumber = number;
-  const std::vector<GridPoint> corners =
-      isLine ? std::vector<GridPoint>{first, last} : rectangleOf(first, last);
-  giveShape(root, idOf(kind, list->GetCount(), list->kind().page), {corners, {number, number}});
+  list->GetLineOrBox(list->GetCount())->areaNumber = made.shape.area();
+  giveShape(root, idOf(kind, list->GetCount(), list->kind().page), made.shape);
   return {.page = list->kind().page, .name = isLine ? "New discharge line" : "New box"};
 }
 

@@ -21,6 +21,9 @@
 namespace gridbay {
 namespace {
 
+constexpr const char* kNoLength = "A boundary has two ends that differ";
+constexpr const char* kFoundByProgram =
+    "The boundaries are found by the program; choose \"User specified\" on their page first";
 constexpr const char* kPlacedByHotStart = "A hot start file says itself where its area lies";
 
 GridFrame frameOf(const GridHeader& header) {
@@ -147,6 +150,33 @@ std::optional<MapPick> SetupMap::pick(MapPoint place, std::int32_t area) const {
   return point ? std::optional(MapPick{number, *point}) : std::nullopt;
 }
 
+std::optional<PickedPlace> SetupMap::placeFor(const CellPick& cell, MapPoint place) {
+  if (cell.of == CellPick::Of::coordinates) {
+    std::array own{place};
+    if (!coordinates_.fromMap(cell.projection, own).empty() || !isFinite(own[0])) return std::nullopt;
+    return PickedPlace{.x = own[0].east, .y = own[0].north};
+  }
+  if (cell.of == CellPick::Of::border) {
+    const MapArea* area = scene_.area(cell.area);
+    if (area == nullptr || !area->isPlaced) return std::nullopt;
+    const auto [j, k] = area->grid.pointOf(place);
+    return PickedPlace{.area = cell.area, .point = slideAlongBorder(j, k, area->nx, area->ny, {})};
+  }
+  const auto there = pick(place, cell.of == CellPick::Of::finest ? 0 : cell.area);
+  return there ? std::optional(PickedPlace{.area = there->area, .point = there->point}) : std::nullopt;
+}
+
+std::optional<MapPoint> SetupMap::placeOf(const CellPick& cell, const PickedPlace& held) {
+  if (cell.of == CellPick::Of::coordinates) {
+    std::array there{MapPoint{held.x, held.y}};
+    if (!coordinates_.toMap(cell.projection, there).empty() || !isFinite(there[0])) return std::nullopt;
+    return there[0];
+  }
+  const MapArea* area = scene_.area(cell.of == CellPick::Of::finest ? held.area : cell.area);
+  if (area == nullptr || !area->isPlaced) return std::nullopt;
+  return area->grid.at(held.point.j, held.point.k);
+}
+
 std::optional<std::array<double, 2>> SetupMap::geographic(MapPoint place) const {
   double longitude = 0;
   double latitude = 0;
@@ -251,7 +281,12 @@ SetupMap::Shaped SetupMap::shaped(CGlobalKvs& root, MapFeatureId feature, std::s
     }
     const auto [j, k] = area->grid.pointOf(place);
     if (feature.kind == MapKind::boundary) {
-      points[vertex] = slideAlongBorder(j, k, area->nx, area->ny, points[1 - vertex]);
+      const GridPoint end = slideAlongBorder(j, k, area->nx, area->ny, points[1 - vertex]);
+      if (end == points[1 - vertex]) {
+        result.fault = kNoLength;
+        return result;
+      }
+      points[vertex] = end;
     } else {
       const auto point = pointAt(*area, place);
       if (!point) {
@@ -261,9 +296,7 @@ SetupMap::Shaped SetupMap::shaped(CGlobalKvs& root, MapFeatureId feature, std::s
       points[vertex] = *point;
       // An output along a line follows the axis along which it is longer.
       if (feature.kind == MapKind::outputLine) {
-        const GridPoint other = points[1 - vertex];
-        const bool alongJ = std::abs(point->j - other.j) >= std::abs(point->k - other.k);
-        (alongJ ? points[vertex].k : points[vertex].j) = alongJ ? other.k : other.j;
+        points[vertex] = alongAxis(points[1 - vertex], *point);
       }
     }
   }
@@ -279,8 +312,9 @@ VertexPlace SetupMap::previewVertex(CGlobalKvs& root, MapFeatureId feature, std:
                                     MapPoint place) {
   scene(root);
   if (isStructure(feature.kind)) return {place, std::nullopt, {}};
-  const Shaped result = shaped(root, feature, vertex, place);
+  Shaped result = shaped(root, feature, vertex, place);
   if (result.shape.points.empty()) return {place, std::nullopt, result.fault};
+  if (feature.kind == MapKind::boundary && !root.boundary->isUserSpecified()) result.fault = kFoundByProgram;
   const std::int32_t number =
       feature.kind == MapKind::source ? result.shape.areas[vertex] : result.shape.area();
   return {scene_.area(number)->grid.at(result.point.j, result.point.k), result.point, result.fault};
@@ -303,8 +337,7 @@ MapEdit SetupMap::moveVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t
     return made(feature, pointName(feature, vertex));
   }
   if (feature.kind == MapKind::boundary && !root.boundary->isUserSpecified())
-    return refusedEdit(
-        "The boundaries are found by the program; choose \"User specified\" on their page first");
+    return refusedEdit(kFoundByProgram);
   const Shaped result = shaped(root, feature, vertex, place);
   if (result.shape.points.empty()) return refusedEdit(result.fault);
   giveShape(root, feature, result.shape);

@@ -30,6 +30,8 @@ class SetupMap {
  public:
   const MapScene& scene(CGlobalKvs& root);
   std::optional<MapPick> pick(MapPoint place, std::int32_t area) const;
+  std::optional<PickedPlace> placeFor(const CellPick& cell, MapPoint place);
+  std::optional<MapPoint> placeOf(const CellPick& cell, const PickedPlace& held);
   std::optional<std::array<double, 2>> geographic(MapPoint place) const;
 
   AreaPlace previewMoveArea(CGlobalKvs& root, std::int32_t number, MapPoint first);
@@ -46,6 +48,8 @@ class SetupMap {
   MapEdit moveVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place);
   MapEdit insertVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place);
   MapEdit removeVertex(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex);
+  FeaturePlace previewFeature(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points,
+                              std::int32_t page = 0) const;
   MapEdit addFeature(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points,
                      std::int32_t page = 0);
   MapEdit removeFeature(CGlobalKvs& root, MapFeatureId feature);
@@ -62,7 +66,14 @@ class SetupMap {
   };
   Shaped shaped(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place);
   MapEdit insertPoint(CGlobalKvs& root, MapFeatureId feature, std::size_t vertex, MapPoint place);
+  // A new feature on the points of grids: an output of the flow calculation stands on Area 1.
+  struct NewShape {
+    GridShape shape;
+    std::string fault;
+  };
+  NewShape newShape(MapKind kind, const std::vector<MapPoint>& points, bool isOfFlow) const;
   MapEdit addOnGrid(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points);
+  MapEdit addBoundary(CGlobalKvs& root, const std::vector<MapPoint>& points);
   MapEdit addModuleOutput(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points);
   MapEdit addLineOrBox(CGlobalKvs& root, MapKind kind, const std::vector<MapPoint>& points);
   // The number of the finest area that holds all points; 0 where none does.

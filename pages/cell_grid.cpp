@@ -2,7 +2,9 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <charconv>
+#include <tuple>
 #include <utility>
 
 #include "pages/scan.h"
@@ -21,6 +23,24 @@ auto blankWithout(const FileChoice& file) {
 }
 
 }  // namespace
+
+Column& Column::OfArea(std::function<std::int32_t(GridRow)> area) {
+  pick.wanted = [area = std::move(area), before = std::move(pick.wanted)](GridRow row) {
+    std::optional<CellPick> wanted = before(row);
+    if (wanted) wanted->area = area(row);
+    return wanted;
+  };
+  return *this;
+}
+
+Column& Column::OnBorder() {
+  pick.wanted = [before = std::move(pick.wanted)](GridRow row) {
+    std::optional<CellPick> wanted = before(row);
+    if (wanted) wanted->of = CellPick::Of::border;
+    return wanted;
+  };
+  return *this;
+}
 
 const std::vector<std::deque<Column>>& CellGrid::lines() {
   const int key = LayoutKey();
@@ -184,7 +204,43 @@ Column& CellGrid::addPoint(std::string_view header, int width, std::function<Gri
                     return held == nullptr ? std::string() : pointText(*held);
                   },
               .set = store,
-              .enabled = [point](GridRow row) { return point(row) != nullptr; }});
+              .enabled = [point](GridRow row) { return point(row) != nullptr; }})
+      .Picks({.wanted =
+                  [point](GridRow row) {
+                    const GridPoint* held = point(row);
+                    return held == nullptr ? std::nullopt
+                                           : std::optional(CellPick{.held = {{.point = *held}}});
+                  },
+              .take =
+                  [point](GridRow row, std::span<const PickedPlace> places) {
+                    *point(row) = places.front().point;
+                    return Stored::taken;
+                  }});
+}
+
+// An interval stays as it is.
+Column::Pick CellGrid::partPick(std::function<USubArea*(GridRow)> part,
+                                std::function<std::int32_t(GridRow)> area,
+                                std::function<bool(GridRow)> isLine) {
+  const auto wanted = [part, area](GridRow row) {
+    const USubArea& held = *part(row);
+    return std::optional(
+        CellPick{.name = "J and K",
+                 .area = area(row),
+                 .shape = CellPick::Shape::part,
+                 .most = 2,
+                 .held = {{.point = {held.x.first, held.y.first}}, {.point = {held.x.last, held.y.last}}}});
+  };
+  const auto take = [part, isLine](GridRow row, std::span<const PickedPlace> places) {
+    const GridPoint first = places.front().point;
+    const GridPoint last =
+        isLine && isLine(row) ? alongAxis(first, places.back().point) : places.back().point;
+    USubArea& held = *part(row);
+    std::tie(held.x.first, held.x.last) = std::minmax({first.j, last.j});
+    std::tie(held.y.first, held.y.last) = std::minmax({first.k, last.k});
+    return Stored::taken;
+  };
+  return {wanted, take};
 }
 
 Column& CellGrid::Range(std::string_view header, int width, RangeGetter get,
@@ -286,6 +342,17 @@ void CellGrid::buttonPressed(int row, int col) {
   press(at);
 }
 
+std::optional<CellPick> CellGrid::pickOf(int row, int col) {
+  const auto [cell, at] = placeOf(row, col);
+  return cell == nullptr || !cell->pick.wanted ? std::nullopt : cell->pick.wanted(at);
+}
+
+Stored CellGrid::storePick(int row, int col, std::span<const PickedPlace> places) {
+  const auto [cell, at] = placeOf(row, col);
+  const auto take = cell->pick.take;
+  return take(at, places);
+}
+
 void CellGrid::setUpResultFile(int row, int col, CVdGridResultFileEditCtrl& control) {
   const auto [cell, at] = placeOf(row, col);
   const FileKind kind = cell->fileKind(at);
@@ -323,6 +390,10 @@ bool ColumnGrid::styleOf(int row, int col, CellStyle& style) {
   style.readOnly = true;
   style.value = column(col).subHeader;
   return true;
+}
+
+std::optional<CellPick> ColumnGrid::pickOf(int row, int col) {
+  return row > headerRows() ? CellGrid::pickOf(row, col) : std::nullopt;
 }
 
 Stored ColumnGrid::storeCell(int row, int col, std::string_view text) {

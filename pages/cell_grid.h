@@ -43,6 +43,13 @@ struct Column {
   std::string subHeader = {};                          // in the second row of headers
   int headerSpan = 1;                                  // columns that the header covers
 
+  // How the points of the cell, and of those that hold the rest of them, are pointed at on a map.
+  struct Pick {
+    std::function<std::optional<CellPick>(GridRow)> wanted = {};
+    std::function<Stored(GridRow, std::span<const PickedPlace>)> take = {};
+  };
+  Pick pick = {};
+
   Column& Right() {
     align = CellAlign::right;
     return *this;
@@ -76,6 +83,13 @@ struct Column {
     widthNow = std::move(pixels);
     return *this;
   }
+  Column& Picks(Pick how) {
+    pick = std::move(how);
+    return *this;
+  }
+  // Whose points a cell of a point takes, where it is not Area 1; and whether these are of its border alone.
+  Column& OfArea(std::function<std::int32_t(GridRow)> area);
+  Column& OnBorder();
   Column& SubHeader(std::string_view text) {
     subHeader = text;
     return *this;
@@ -258,6 +272,11 @@ class CellGrid : public CV27SetupGridWnd {
         [value](GridRow row, const USubLine& typed) { *pointerTo(value(row)) = typed; }, hasInterval);
   }
 
+  // The pick of the columns that hold the ranges of a part of a grid along J and K; a line has no width.
+  static Column::Pick partPick(std::function<USubArea*(GridRow)> part,
+                               std::function<std::int32_t(GridRow)> area,
+                               std::function<bool(GridRow)> isLine = {});
+
   // The columns of a file, together or one by one. The first gives that of the name.
   Column& File(const FileColumns& columns);
   Column& FileName(std::string_view header, int width, const FileChoice& file);
@@ -269,6 +288,8 @@ class CellGrid : public CV27SetupGridWnd {
   bool styleOf(int row, int col, CellStyle& style) override;
   Stored storeCell(int row, int col, std::string_view text) override;
   void buttonPressed(int row, int col) override;
+  std::optional<CellPick> pickOf(int row, int col) override;
+  Stored storePick(int row, int col, std::span<const PickedPlace> places) override;
   void setUpResultFile(int row, int col, CVdGridResultFileEditCtrl& control) override;
 
  private:
@@ -330,6 +351,7 @@ class ColumnGrid : public CellGrid {
   bool styleOf(int row, int col, CellStyle& style) override;
   Stored storeCell(int row, int col, std::string_view text) override;
   Place placeOf(int row, int col) override { return {&column(col), rowAt(row - headerRows())}; }
+  std::optional<CellPick> pickOf(int row, int col) override;
 
   const std::deque<Column>& columns() { return lines().front(); }
   const Column& column(int col) { return columns()[static_cast<std::size_t>(col) - 1]; }

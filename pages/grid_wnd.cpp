@@ -25,14 +25,37 @@ int CV27SetupGridWnd::StoreStyleRowCol(int row, int col, std::string_view text) 
   if (row == 0 || col == 0) return 1;
   CellStyle style;
   if (GetStyleRowCol(row, col, style) == 0 || !style.takesValue()) return 0;
-  host_->SetEditName(editName(row, col));
+  return store(editName(row, col), [&] { return storeCell(row, col, std::string(trimmed(text))); });
+}
+
+int CV27SetupGridWnd::store(const std::string& name, const std::function<Stored()>& edit) {
+  host_->SetEditName(name);
   Stored stored = Stored::refused;
   const bool done = document().Attempt([&] {
-    stored = storeCell(row, col, std::string(trimmed(text)));
+    stored = edit();
     if (stored == Stored::taken || stored == Stored::partly) UpdateDoc();
   });
   host_->SetEditName({});
   return done && (stored == Stored::taken || stored == Stored::same) ? 1 : 0;
+}
+
+std::optional<CellPick> CV27SetupGridWnd::PickRowCol(int row, int col) {
+  CellStyle style;
+  if (row < 1 || col < 1 || GetStyleRowCol(row, col, style) == 0) return std::nullopt;
+  if (!style.enabled || style.readOnly || style.kind == CellKind::label) return std::nullopt;
+  std::optional<CellPick> pick = pickOf(row, col);
+  if (!pick) return std::nullopt;
+  const std::string item = GetRowHeader(row);
+  pick->name = pick->name.empty() ? editName(row, col)
+               : item.empty()     ? pick->name
+                                  : pick->name + ", row " + item;
+  return pick;
+}
+
+int CV27SetupGridWnd::StorePickRowCol(int row, int col, std::span<const PickedPlace> places) {
+  const std::optional<CellPick> pick = PickRowCol(row, col);
+  if (!pick || places.size() < pick->least || places.size() > pick->most) return 0;
+  return store(pick->name, [&] { return storePick(row, col, places); });
 }
 
 void CV27SetupGridWnd::OnClickedButtonRowCol(int row, int col) {

@@ -1,7 +1,9 @@
 #pragma once
 
+#include <functional>
 #include <optional>
 #include <set>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -9,6 +11,7 @@
 #include "pages/cell_controls.h"
 #include "pages/form_view.h"
 #include "pages/grid_host.h"
+#include "pages/map_pick.h"
 
 namespace gridbay {
 
@@ -87,6 +90,12 @@ class CV27SetupGridWnd {
   // A press of the button in a cell.
   virtual void OnClickedButtonRowCol(int row, int col);
 
+  // What can be pointed at on a map for the cell; nothing where that takes no points at present.
+  virtual std::optional<CellPick> PickRowCol(int row, int col);
+  // Stores the places in the cell and in those that hold the rest of the same points, as one edit; 1 when
+  // they were taken.
+  virtual int StorePickRowCol(int row, int col, std::span<const PickedPlace> places);
+
   // A click on a cell that is no button.
   virtual void OnLButtonHitRowCol(int, int) {}
   // Ctrl+D lets the user browse for the file of a result file cell; false for any other key or cell.
@@ -124,6 +133,9 @@ class CV27SetupGridWnd {
   virtual bool styleOf(int row, int col, CellStyle& style) = 0;
   virtual Stored storeCell(int row, int col, std::string_view text) = 0;
   virtual void buttonPressed(int, int) {}
+  // The name is left empty where it is that of the cell alone.
+  virtual std::optional<CellPick> pickOf(int, int) { return std::nullopt; }
+  virtual Stored storePick(int, int, std::span<const PickedPlace>) { return Stored::refused; }
   // What the browsing of a result file cell is for.
   virtual void setUpResultFile(int, int, CVdGridResultFileEditCtrl&) {}
   // What an edit of the cell is called: its column and row, or the name of the grid where it shows no
@@ -131,6 +143,8 @@ class CV27SetupGridWnd {
   virtual std::string editName(int row, int col);
 
  private:
+  int store(const std::string& name, const std::function<Stored()>& edit);
+
   GridHost* host_ = nullptr;
   bool enabled_ = true;
   bool rebuilding_ = false;

@@ -123,6 +123,8 @@ class DocumentTab final : public QSplitter, public SetupHost {
   void documentChanged();
   // Another page, or another cell of it.
   void cellChosen();
+  // Points of the page's current cell are to be pointed at on the map.
+  void pickWanted();
   // The setup was checked, or there is another one whose check is not known.
   void checked();
   void saved();

@@ -120,6 +120,20 @@ bool GridModel::browse(const QModelIndex& index) {
   return browsed;
 }
 
+std::optional<CellPick> GridModel::pick(const QModelIndex& index) const {
+  if (readOnly_ || !index.isValid()) return std::nullopt;
+  return grid_.PickRowCol(index.row() + 1, index.column() + 1);
+}
+
+bool GridModel::storePick(const QModelIndex& index, std::span<const PickedPlace> places) {
+  if (readOnly_ || !index.isValid()) return false;
+  const QPointer<GridModel> self(this);
+  const bool stored = grid_.StorePickRowCol(index.row() + 1, index.column() + 1, places) != 0;
+  if (self != nullptr) refresh();
+  if (self != nullptr && stored) emit edited();
+  return stored;
+}
+
 // Rows that go may move the current cell, and who hears of that may refresh in turn.
 void GridModel::refresh() {
   if (isRefreshing_) return;

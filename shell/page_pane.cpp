@@ -2,6 +2,8 @@
 
 #include <QApplication>
 #include <QLabel>
+#include <QMenu>
+#include <QMetaMethod>
 #include <QScreen>
 #include <QStyle>
 #include <QVBoxLayout>
@@ -9,7 +11,6 @@
 #include <unordered_map>
 #include <unordered_set>
 
-#include "core/grid_point.h"
 #include "shell/fields/frame.h"
 #include "shell/grid_view.h"
 
@@ -143,6 +144,9 @@ PagePane::Part PagePane::makePart(Control& control, QWidget* parent, bool hasBod
       lastGrid_ = grid;
       emit cellChosen();
     });
+    grid->setContextMenuPolicy(Qt::CustomContextMenu);
+    connect(grid, &QWidget::customContextMenuRequested, this,
+            [this, grid](QPoint at) { offerPick(*grid, at); });
     return {&control, grid, nullptr, grid};
   }
   Part part{&control, nullptr, makeField(control, keys_, parent)};
@@ -291,9 +295,16 @@ PagePane::Cell PagePane::currentCell() const {
 std::optional<QModelIndex> PagePane::pointCell() const {
   if (lastGrid_ == nullptr || !lastGrid_->currentIndex().isValid()) return std::nullopt;
   const QModelIndex index = lastGrid_->currentIndex();
-  const CellStyle cell = lastGrid_->cells().style(index);
-  const bool isPoint = cell.kind == CellKind::plain && pointOfText(cell.value).has_value();
-  return isPoint && cell.editable() ? std::optional(index) : std::nullopt;
+  return lastGrid_->cells().pick(index) ? std::optional(index) : std::nullopt;
+}
+
+void PagePane::offerPick(GridView& grid, QPoint at) {
+  const QModelIndex index = grid.indexAt(at);
+  if (!isSignalConnected(QMetaMethod::fromSignal(&PagePane::pickWanted)) || !grid.cells().pick(index)) return;
+  grid.goToCell(index.row(), index.column());
+  QMenu menu(this);
+  menu.addAction(tr("Pick on the map"), this, &PagePane::pickWanted);
+  menu.exec(grid.viewport()->mapToGlobal(at));
 }
 
 QSize PagePane::sizeHint() const {

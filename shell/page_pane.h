@@ -53,7 +53,7 @@ class PagePane final : public QScrollArea {
     int rows = 0;
   };
   Cell currentCell() const;
-  // The cell that is at work, where it holds a point of a grid and takes another one.
+  // The cell that is at work, where its points can be pointed at on a map.
   std::optional<QModelIndex> pointCell() const;
 
   // The whole page, as far as the screen has the room.
@@ -62,6 +62,8 @@ class PagePane final : public QScrollArea {
  signals:
   // Another cell of a table is at work.
   void cellChosen();
+  // The points of the cell that is at work are to be pointed at on a map. Who never hears of it has no map.
+  void pickWanted();
 
  private:
   // A control with what shows it: a field, a table, a frame, or a heading.
@@ -79,6 +81,7 @@ class PagePane final : public QScrollArea {
   void refreshGroup(const Part& part, bool isShown);
   QWidget* startPage(const QString& caption);
   void changed(Control& control);
+  void offerPick(GridView& grid, QPoint at);
 
   Form* form_ = nullptr;
   std::vector<Part> parts_;

@@ -55,8 +55,23 @@ void CPointGrid::LayOut() {
   });
   constexpr int kCoordinateWidth = 120;
   constexpr int kLevelWidth = 90;
-  coordinate("Easting", kCoordinateWidth, &DikePoint::x, item::kGeographicalCoordinate);
-  coordinate("Northing", kCoordinateWidth, &DikePoint::y, item::kGeographicalCoordinate);
+  const auto wanted = [this](GridRow row) {
+    const Dike& dike = *dikes_.selected();
+    const DikePoint& point = dike.points[static_cast<std::size_t>(row.item) - 1];
+    return std::optional(CellPick{.name = "Point",
+                                  .of = CellPick::Of::coordinates,
+                                  .projection = dike.coordinateType,
+                                  .held = {{.x = point.x, .y = point.y}}});
+  };
+  const auto take = [this](GridRow row, std::span<const PickedPlace> places) {
+    DikePoint& point = dikes_.selected()->points.edit(static_cast<std::size_t>(row.item) - 1);
+    point.x = places.front().x;
+    point.y = places.front().y;
+    return Stored::taken;
+  };
+  coordinate("Easting", kCoordinateWidth, &DikePoint::x, item::kGeographicalCoordinate).Picks({wanted, take});
+  coordinate("Northing", kCoordinateWidth, &DikePoint::y, item::kGeographicalCoordinate)
+      .Picks({wanted, take});
   coordinate("Z", kLevelWidth, &DikePoint::z, item::kElevation).WidthBy([this] {
     const Dike* dike = dikes_.selected();
     return dike != nullptr && dike->crest() == Dike::kInSpace ? kLevelWidth : 0;

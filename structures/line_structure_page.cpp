@@ -13,7 +13,30 @@ std::string LineStructureGrid::editName(int row, int col) {
 
 void LineStructureGrid::PlaceColumns(const Structure& structure) {
   Text("Name", 90, structure, &LineStructure::name);
-  Button("...", 60, [this, structure](GridRow row) { editPoints(*structure(row)); }).header = "Location";
+  const auto wanted = [structure](GridRow row) {
+    const LineStructure& line = *structure(row);
+    CellPick pick{.name = "Location",
+                  .of = CellPick::Of::coordinates,
+                  .projection = line.coordinateType,
+                  .shape = CellPick::Shape::line,
+                  .least = 2,
+                  .most = LineStructure::kMostPoints};
+    for (std::size_t i = 0; i < std::min(line.x.size(), line.y.size()); ++i)
+      pick.held.push_back({.x = line.x[i], .y = line.y[i]});
+    return std::optional(pick);
+  };
+  const auto take = [structure](GridRow row, std::span<const PickedPlace> places) {
+    LineStructure& line = *structure(row);
+    line.x.clear();
+    line.y.clear();
+    for (const PickedPlace& place : places) {
+      line.x.push_back(place.x);
+      line.y.push_back(place.y);
+    }
+    return Stored::taken;
+  };
+  Column& location = Button("...", 60, [this, structure](GridRow row) { editPoints(*structure(row)); });
+  location.Picks({wanted, take}).header = "Location";
   // A full text is long, and there is room for its beginning only.
   Projection("Projection", 90, structure, &LineStructure::coordinateType).Tip([structure](GridRow row) {
     return CVdDoc::GetToolTipsString(structure(row)->coordinateType);

@@ -90,7 +90,8 @@ void MapCanvas::paintPlaced(QPainter& painter) {
 }
 
 void MapCanvas::showMap(MapEditor* editor, const std::optional<MapFrame>& frame) {
-  drop();
+  // The editor that was shown may be gone.
+  setTool(MapTool::select);
   editor_ = editor;
   drawing_.selection = {};
   drawing_.setScene({});
@@ -105,7 +106,6 @@ void MapCanvas::showMap(MapEditor* editor, const std::optional<MapFrame>& frame)
     frame_ = *frame;
     frame_.size = size();
   }
-  setTool(MapTool::select);
   refresh();
   update();
 }

@@ -10,32 +10,11 @@
 #include "shell/map/map_backgrounds.h"
 #include "shell/map/map_drawing.h"
 #include "shell/map/map_grasps.h"
+#include "shell/map/map_tools.h"
 #include "shell/map/terrain_store.h"
 #include "shell/map/terrain_worker.h"
 
 namespace gridbay::shell {
-
-// What a click or a drag on the map does.
-enum class MapTool {
-  select,
-  nestedArea,
-  source,
-  pair,
-  boundary,
-  massBudget,
-  dike,
-  weir,
-  culvert,
-  outputPoint,
-  outputLine,
-  outputArea,
-  moduleOutputPoint,  // of the module that is chosen
-  moduleOutputLine,
-  moduleOutputArea,
-  discharge,
-  box,
-  pick
-};
 
 // The map: terrain below what the setup places. A click selects, a drag moves what is held or else the map,
 // the wheel zooms. The last picture of the terrain is shown in its place at once while a finer one is made.
@@ -61,6 +40,10 @@ class MapCanvas final : public QWidget {
   void setMarks(std::vector<AdviceMark> marks);
   void setTool(MapTool tool);
   MapTool tool() const { return tool_; }
+  // Has the user point at what a cell is to hold: `picked` tells it.
+  void startPick(const CellPick& cell);
+  // What the next click does with the tool in hand.
+  QString hint() const;
   void setLayer(MapLayer layer, bool on);
   void setStyle(const TerrainStyle& style);
   const TerrainStyle& terrainStyle() const { return style_; }
@@ -94,12 +77,15 @@ class MapCanvas final : public QWidget {
   // The advice of a mark, by their places in the document's list; none for a click elsewhere.
   void adviceChosen(const std::vector<int>& advice);
   void pointed(const QString& text);
-  void picked(gridbay::MapPoint place);
+  void picked(const std::vector<gridbay::PickedPlace>& places);
+  // A new feature, or one whose place a new one took.
+  void featureMade(const gridbay::MapFeature& feature);
   void nestedAreaWanted(gridbay::MapPoint corner, gridbay::MapPoint opposite);
   // An edit is about to be made: what is typed and not entered comes before it.
   void editing();
   void edited();
   void failed(const QString& text);
+  // Another tool is in hand, or another click is next.
   void toolChanged();
   void scaleChanged();
   void sceneChanged();
@@ -132,11 +118,12 @@ class MapCanvas final : public QWidget {
   void takePicture(const TerrainPicture& picture);
   void showCursor(QPointF at);
   void startDrag(QPointF at);
-  bool placesByClicks() const;
+  bool placesByClicks() const { return clicks().most > 0; }
+  MapClicks clicks() const;
   void click(QPointF at);
   void chooseAt(QPointF at);
   void complete();
-  void chooseLast(MapKind kind, std::int32_t page);
+  void chooseMade(MapKind kind, const std::vector<MapFeature>& before);
   std::int32_t pageOfTool() const;
   void drop();
   // Whether it was made.
@@ -151,6 +138,7 @@ class MapCanvas final : public QWidget {
   MapFrame frame_;
   bool isFitted_ = true;
   MapTool tool_ = MapTool::select;
+  CellPick pick_;  // of that tool
   std::unique_ptr<MapGrasp> grasp_;
   QPointF pressed_;
   QPointF last_;

@@ -4,6 +4,7 @@
 #include <QKeyEvent>
 #include <QMenu>
 #include <QMouseEvent>
+#include <algorithm>
 #include <cmath>
 #include <utility>
 
@@ -18,48 +19,6 @@ constexpr double kWheelStep = 1.2;
 constexpr double kKeyZoom = 1.5;
 constexpr double kKeyPan = 60;     // pixels
 constexpr double kKeyFinePan = 2;  // with Shift
-
-// What a tool makes by clicks.
-struct Clicks {
-  MapKind kind;
-  std::size_t least;
-  std::size_t most;
-};
-std::optional<Clicks> clicksOf(MapTool tool) {
-  constexpr std::size_t kAny = 1'000'000;
-  switch (tool) {
-    case MapTool::source:
-      return Clicks{MapKind::source, 1, 1};
-    case MapTool::pair:
-      return Clicks{MapKind::source, 2, 2};
-    case MapTool::boundary:
-      return Clicks{MapKind::boundary, 2, 2};
-    case MapTool::massBudget:
-      return Clicks{MapKind::massBudget, 3, kAny};
-    case MapTool::dike:
-      return Clicks{MapKind::dike, 2, kAny};
-    case MapTool::weir:
-      return Clicks{MapKind::weir, 2, kAny};
-    case MapTool::culvert:
-      return Clicks{MapKind::culvert, 2, kAny};
-    case MapTool::outputPoint:
-    case MapTool::moduleOutputPoint:
-      return Clicks{MapKind::outputPoints, 1, 1};
-    case MapTool::outputLine:
-    case MapTool::moduleOutputLine:
-      return Clicks{MapKind::outputLine, 2, 2};
-    case MapTool::discharge:
-      return Clicks{MapKind::discharge, 2, 2};
-    default:
-      return std::nullopt;
-  }
-}
-
-// What a tool makes of a rectangle.
-std::optional<MapKind> rectangleOf(MapTool tool) {
-  if (tool == MapTool::outputArea || tool == MapTool::moduleOutputArea) return MapKind::outputMap;
-  return tool == MapTool::box ? std::optional(MapKind::box) : std::nullopt;
-}
 
 }  // namespace
 
@@ -79,16 +38,43 @@ std::int32_t MapCanvas::pageOfTool() const {
   }
 }
 
+MapClicks MapCanvas::clicks() const {
+  if (tool_ == MapTool::pick) return {pick_.least, pick_.most};
+  const PlacingTool* tool = placingTool(tool_);
+  return tool == nullptr ? MapClicks{} : tool->clicks;
+}
+
 void MapCanvas::setTool(MapTool tool) {
-  drop();
-  if (tool_ == tool) return;
   tool_ = tool;
+  drop();
   setCursor(tool == MapTool::select ? Qt::ArrowCursor : Qt::CrossCursor);
   emit toolChanged();
 }
 
+void MapCanvas::startPick(const CellPick& cell) {
+  pick_ = cell;
+  setTool(MapTool::pick);
+}
+
+QString MapCanvas::hint() const {
+  const std::size_t made = grasp_ ? grasp_->clicks() : 0;
+  if (const PlacingTool* tool = placingTool(tool_)) return hintOf(*tool, made);
+  if (tool_ != MapTool::pick) return tr("Click to choose; drag points, borders of areas, or the map.");
+  using Shape = CellPick::Shape;
+  const QString action = pick_.most == 1 ? tr("click on the point")
+                         : pick_.shape == Shape::part
+                             ? (made == 0 ? tr("click on one corner") : tr("click on the opposite corner"))
+                         : made == 0 ? tr("click on the first point")
+                                     : tr("click on the next point");
+  return hintOf(QString::fromStdString(pick_.name), action, clicks(), made);
+}
+
+// What a pick is for is shown from its beginning.
 void MapCanvas::drop() {
   grasp_.reset();
+  if (tool_ == MapTool::pick && editor_ != nullptr)
+    grasp_ =
+        graspPick(*editor_, pick_, [this](const std::vector<PickedPlace>& places) { emit picked(places); });
   isPressed_ = false;
   isPanning_ = false;
   isDragged_ = false;
@@ -109,20 +95,17 @@ void MapCanvas::mousePressEvent(QMouseEvent* event) {
   if (!isPanning_) startDrag(event->position());
 }
 
-bool MapCanvas::placesByClicks() const {
-  return clicksOf(tool_).has_value();
-}
-
 // What is under the pointer is held from now on, where it can be dragged.
 void MapCanvas::startDrag(QPointF at) {
   const MapPoint place = frame_.toMap(at);
-  if (!clicksOf(tool_)) grasp_.reset();
+  if (!placesByClicks()) grasp_.reset();
+  const PlacingTool* placing = placingTool(tool_);
   if (tool_ == MapTool::nestedArea) {
     grasp_ = graspNestedArea(*editor_, place, [this](MapPoint corner, MapPoint opposite) {
       emit nestedAreaWanted(corner, opposite);
     });
-  } else if (const std::optional<MapKind> kind = rectangleOf(tool_)) {
-    grasp_ = graspRectangle(*editor_, *kind, place, pageOfTool());
+  } else if (placing != nullptr && !placesByClicks()) {
+    grasp_ = graspRectangle(*editor_, *placing->kind, place, pageOfTool());
   } else if (tool_ == MapTool::select) {
     const MapHit hit = drawing_.hit(frame_, at);
     if (hit.feature && hit.vertex && hit.feature == drawing_.selection.feature) {
@@ -144,7 +127,7 @@ void MapCanvas::mouseMoveEvent(QMouseEvent* event) {
   last_ = at;
   emit pointed(textAt(frame_.toMap(at)));
   if (isPressed_ && !isDragged_) isDragged_ = (at - pressed_).manhattanLength() > kDragged;
-  const bool isByClicks = clicksOf(tool_).has_value();
+  const bool isByClicks = placesByClicks();
   if (grasp_ && !isPanning_ && (isDragged_ || isByClicks)) {
     if (!isPressed_ || !isByClicks) {
       grasp_->moveTo(frame_.toMap(at));
@@ -180,7 +163,7 @@ void MapCanvas::mouseReleaseEvent(QMouseEvent* event) {
   isDragged_ = false;
   setCursor(tool_ == MapTool::select ? Qt::ArrowCursor : Qt::CrossCursor);
   if (wasPanning) return update();
-  if (grasp_ && !clicksOf(tool_)) {
+  if (grasp_ && !placesByClicks()) {
     if (wasDragged) {
       grasp_->moveTo(frame_.toMap(event->position()));
       return complete();
@@ -193,15 +176,17 @@ void MapCanvas::mouseReleaseEvent(QMouseEvent* event) {
 void MapCanvas::click(QPointF at) {
   const MapPoint place = frame_.toMap(at);
   if (tool_ == MapTool::select) return chooseAt(at);
-  if (tool_ == MapTool::pick) {
-    setTool(MapTool::select);
-    emit picked(place);
-    return;
+  if (!placesByClicks()) return;
+  if (const PlacingTool* tool = placingTool(tool_); tool != nullptr && !grasp_)
+    grasp_ = graspNewFeature(*editor_, *tool->kind, tool->clicks.least, tool->clicks.most, pageOfTool());
+  if (!grasp_) return;
+  const bool isDone = grasp_->click(place);
+  if (isDone) {
+    complete();
+  } else if (const QString fault = grasp_->fault(); !fault.isEmpty()) {
+    emit failed(fault);
   }
-  const std::optional<Clicks> clicks = clicksOf(tool_);
-  if (!clicks) return;
-  if (!grasp_) grasp_ = graspNewFeature(*editor_, clicks->kind, clicks->least, clicks->most, pageOfTool());
-  if (grasp_->click(place)) complete();
+  emit toolChanged();
   update();
 }
 
@@ -225,24 +210,28 @@ void MapCanvas::chooseAt(QPointF at) {
 
 void MapCanvas::complete() {
   const std::unique_ptr<MapGrasp> grasp = std::move(grasp_);
-  const std::optional<Clicks> clicks = clicksOf(tool_);
-  const std::optional<MapKind> kind = clicks ? std::optional(clicks->kind) : rectangleOf(tool_);
-  const std::int32_t page = pageOfTool();
+  const PlacingTool* tool = placingTool(tool_);
+  if (tool_ == MapTool::pick) setTool(MapTool::select);
+  const std::vector<MapFeature> before = scene().features;
   const bool isMade = edit([&grasp] { return grasp->commit(); });
-  if (kind && isMade) chooseLast(*kind, page);
+  if (tool != nullptr && tool->kind && isMade) chooseMade(*tool->kind, before);
 }
 
-// The new one is the last of its kind.
-void MapCanvas::chooseLast(MapKind kind, std::int32_t page) {
-  const MapFeature* last = nullptr;
-  for (const MapFeature& feature : scene().features) {
-    const bool isOf = feature.id.kind == kind && (page == 0 || feature.id.page == page);
-    if (isOf && (last == nullptr || feature.id.number >= last->id.number)) last = &feature;
-  }
-  if (last == nullptr) return;
-  const MapFeature chosen = *last;
-  selectFeature(chosen.id);
-  emit featureChosen(chosen);
+// The one that is not as any was before.
+void MapCanvas::chooseMade(MapKind kind, const std::vector<MapFeature>& before) {
+  const auto wasThere = [&before](const MapFeature& feature) {
+    return std::ranges::any_of(before, [&feature](const MapFeature& each) {
+      return each.id == feature.id && *each.points == *feature.points;
+    });
+  };
+  const auto isMade = [&](const MapFeature& feature) {
+    return feature.id.kind == kind && !wasThere(feature);
+  };
+  const auto found = std::ranges::find_if(scene().features, isMade);
+  if (found == scene().features.end()) return;
+  const MapFeature made = *found;
+  selectFeature(made.id);
+  emit featureMade(made);
 }
 
 bool MapCanvas::edit(const std::function<std::string()>& change) {
@@ -274,8 +263,9 @@ bool MapCanvas::isPolyline(const MapFeature& feature) const {
 
 void MapCanvas::mouseDoubleClickEvent(QMouseEvent* event) {
   if (editor_ == nullptr || event->button() != Qt::LeftButton) return;
-  if (clicksOf(tool_)) {
+  if (placesByClicks()) {
     if (grasp_ && grasp_->finish()) complete();
+    emit toolChanged();
     return;
   }
   const MapHit hit = drawing_.hit(frame_, event->position());
@@ -329,19 +319,22 @@ void MapCanvas::keyPressEvent(QKeyEvent* event) {
   const double pan = event->modifiers().testFlag(Qt::ShiftModifier) ? kKeyFinePan : kKeyPan;
   switch (event->key()) {
     case Qt::Key_Escape:
-      if (grasp_) {
+      if (grasp_ && (isPressed_ || grasp_->clicks() > 0)) {
         drop();
+        emit toolChanged();
       } else {
         setTool(MapTool::select);
       }
       return;
     case Qt::Key_Return:
     case Qt::Key_Enter:
-      if (grasp_ && clicksOf(tool_) && grasp_->finish()) complete();
+      if (grasp_ && placesByClicks() && grasp_->finish()) complete();
+      emit toolChanged();
       return;
     case Qt::Key_Backspace:
-      if (grasp_ && clicksOf(tool_)) {
+      if (grasp_ && placesByClicks()) {
         if (!grasp_->stepBack()) grasp_.reset();
+        emit toolChanged();
         return update();
       }
       [[fallthrough]];

@@ -1,6 +1,7 @@
 #include "shell/map/map_dock.h"
 
 #include <QActionGroup>
+#include <QCoreApplication>
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QHBoxLayout>
@@ -18,8 +19,10 @@ namespace gridbay::shell {
 namespace {
 
 constexpr auto kAreasPage = static_cast<std::int32_t>(PageId::bathymetry);
-constexpr auto kSourcesPage = static_cast<std::int32_t>(PageId::sourceAndSink);
-constexpr int kSinkColumn = 4;  // of that page, from 1
+// The cell of the flow's boundary page that says what drives a boundary: in its block of rows below the
+// title.
+constexpr ListEntry kBoundaryDataRow{2, 5};
+constexpr int kBoundaryDataColumn = 2;
 const QString kPanelKey = "panel";
 const QString kFrameKey = "frame";
 
@@ -46,6 +49,7 @@ MapDock::MapDock(QWidget* parent)
     : QDockWidget(tr("Map"), parent),
       tools_(new QToolBar(this)),
       canvas_(new MapCanvas(this)),
+      hint_(new QLabel(this)),
       readout_(new QLabel(this)),
       panel_(new LayerPanel(*canvas_, this)),
       adviceStrip_(new AdviceStrip(canvas_)),
@@ -69,6 +73,12 @@ MapDock::MapDock(QWidget* parent)
   readout_->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
   readout_->setAccessibleName(tr("Under the pointer"));
   readout_->setText(" ");
+  QFont bold = hint_->font();
+  bold.setWeight(QFont::DemiBold);
+  hint_->setFont(bold);
+  hint_->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
+  hint_->setAccessibleName(tr("What the next click does"));
+  hint_->setText(canvas_->hint());
   // On the map, which stays as it is when the strip comes and goes.
   auto* over = new QVBoxLayout(canvas_);
   over->addStretch();
@@ -79,6 +89,7 @@ MapDock::MapDock(QWidget* parent)
   layout->addWidget(split, 1);
   layout->addWidget(readingStrip_);
   layout->addWidget(exportStrip_);
+  layout->addWidget(hint_);
   layout->addWidget(readout_);
   setWidget(content);
 
@@ -120,10 +131,8 @@ MapDock::MapDock(QWidget* parent)
   });
   connect(canvas_, &MapCanvas::picked, this, &MapDock::takePick);
   connect(canvas_, &MapCanvas::nestedAreaWanted, this, &MapDock::askNestedArea);
-  connect(canvas_, &MapCanvas::toolChanged, this, [this] {
-    if (const auto found = toolActions_.find(canvas_->tool()); found != toolActions_.end())
-      found->second->setChecked(true);
-  });
+  connect(canvas_, &MapCanvas::featureMade, this, &MapDock::showMade);
+  connect(canvas_, &MapCanvas::toolChanged, this, &MapDock::showTool);
 }
 
 void MapDock::buildTools() {
@@ -153,41 +162,25 @@ void MapDock::buildTools() {
 
   auto* place = new QMenu(tr("Place"), this);
   place->setToolTipsVisible(true);
-  place->addAction(addTool(MapTool::nestedArea, Qt::Key_N, tr("Nested area"), tr("Draw a rectangle")));
-  place->addSeparator();
-  place->addAction(addTool(MapTool::source, Qt::Key_Q, tr("Source"), tr("Click")));
-  place->addAction(addTool(MapTool::pair, Qt::Key_P, tr("Source and sink"), tr("Click both")));
-  place->addAction(addTool(MapTool::boundary, Qt::Key_B, tr("Open boundary"), tr("Click both ends")));
-  place->addAction(addTool(MapTool::massBudget, Qt::Key_M, tr("Mass budget polygon"),
-                           tr("Click the corners, Return ends")));
-  place->addSeparator();
-  place->addAction(addTool(MapTool::dike, Qt::Key_D, tr("Dike"), tr("Click the points, Return ends")));
-  place->addAction(addTool(MapTool::weir, Qt::Key_W, tr("Weir"), tr("Click the points, Return ends")));
-  place->addAction(addTool(MapTool::culvert, Qt::Key_C, tr("Culvert"), tr("Click the points, Return ends")));
-  place->addSeparator();
-  place->addAction(addTool(MapTool::outputPoint, Qt::Key_O, tr("Output point"), tr("Click")));
-  place->addAction(addTool(MapTool::outputLine, Qt::Key_L, tr("Output line"), tr("Click both ends")));
-  place->addAction(addTool(MapTool::outputArea, Qt::Key_A, tr("Output area"), tr("Draw a rectangle")));
-  place->addSeparator();
-  place->addAction(
-      addTool(MapTool::moduleOutputPoint, Qt::SHIFT | Qt::Key_O, tr("Module output point"), tr("Click")));
-  place->addAction(addTool(MapTool::moduleOutputLine, Qt::SHIFT | Qt::Key_L, tr("Module output line"),
-                           tr("Click both ends")));
-  place->addAction(addTool(MapTool::moduleOutputArea, Qt::SHIFT | Qt::Key_A, tr("Module output area"),
-                           tr("Draw a rectangle")));
-  place->addAction(addTool(MapTool::discharge, Qt::Key_F, tr("Discharge line"), tr("Click both ends")));
-  place->addAction(addTool(MapTool::box, Qt::Key_X, tr("Box"), tr("Draw a rectangle")));
+  for (const PlacingTool& tool : placingTools()) {
+    place->addAction(addTool(tool.tool, QString(tool.key), QCoreApplication::translate("Map", tool.name),
+                             hintOf(tool, 0)));
+    if (tool.endsGroup) place->addSeparator();
+  }
   connect(canvas_, &MapCanvas::sceneChanged, this, &MapDock::showTools);
-  auto* button = new QToolButton(tools_);
-  button->setText(tr("Place"));
-  button->setMenu(place);
-  button->setPopupMode(QToolButton::InstantPopup);
-  button->setFocusPolicy(Qt::StrongFocus);
-  tools_->addWidget(button);
+  place_ = new QToolButton(tools_);
+  place_->setText(tr("Place"));
+  place_->setMenu(place);
+  place_->setPopupMode(QToolButton::InstantPopup);
+  place_->setFocusPolicy(Qt::StrongFocus);
+  place_->setCheckable(true);
+  connect(place_, &QToolButton::clicked, this, &MapDock::showTool);  // the keyboard's has changed it
+  tools_->addWidget(place_);
 
   pick_ = tools_->addAction(tr("Pick"), this, &MapDock::startPick);
   pick_->setToolTip(tr("Pick on the map what the page's current cell is to hold (Ctrl+Shift+M)"));
   pick_->setShortcut(Qt::CTRL | Qt::SHIFT | Qt::Key_M);
+  pick_->setCheckable(true);
   tools_->addSeparator();
   QAction* whole = tools_->addAction(tr("Whole map"), canvas_, &MapCanvas::fit);
   whole->setToolTip(tr("Whole map (Home)"));
@@ -204,6 +197,24 @@ void MapDock::buildTools() {
   for (auto* each : tools_->findChildren<QToolButton*>()) each->setFocusPolicy(Qt::StrongFocus);
 }
 
+// The tool in hand is named on the button that it came from.
+void MapDock::showTool() {
+  const PlacingTool* placing = placingTool(canvas_->tool());
+  if (const auto found = toolActions_.find(canvas_->tool()); found != toolActions_.end()) {
+    found->second->setChecked(true);
+  } else if (QAction* checked = toolActions_[MapTool::select]->actionGroup()->checkedAction()) {
+    checked->setChecked(false);
+  }
+  place_->setChecked(placing != nullptr);
+  place_->setText(placing == nullptr
+                      ? tr("Place")
+                      : tr("Place: %1").arg(QCoreApplication::translate("Map", placing->name)));
+  pick_->setChecked(canvas_->tool() == MapTool::pick);
+  const QString hint = canvas_->hint();
+  hint_->setText(hint);
+  hint_->setToolTip(hint);
+}
+
 // What the module that is chosen has none of can't be drawn.
 void MapDock::showTools() {
   const MapScene& scene = canvas_->scene();
@@ -215,6 +226,10 @@ void MapDock::showTools() {
 }
 
 void MapDock::showDocument(DocumentTab* tab) {
+  if (tab != wanted_) {
+    disconnect(pickLink_);
+    if (tab != nullptr) pickLink_ = connect(tab, &DocumentTab::pickWanted, this, &MapDock::startPick);
+  }
   wanted_ = tab;
   follow();
 }
@@ -277,6 +292,7 @@ void MapDock::showAdvice() {
 // another one too, or the page has just been opened.
 void MapDock::followCell() {
   if (tab_ == nullptr) return;
+  followPick();
   const std::int32_t page = tab_->currentPage();
   const PagePane::Cell cell = tab_->pane().currentCell();
   if (page == kAreasPage && cell.row > 0) return canvas_->selectFeature({}, cell.row);
@@ -311,43 +327,53 @@ void MapDock::goToRow(std::int32_t page, int row, int column) {
 }
 
 void MapDock::startPick() {
+  showTool();  // the press of the button has not changed it
   if (wanted_ == nullptr) return;
   const std::optional<QModelIndex> cell = wanted_->pane().pointCell();
   if (!cell) return emit failed(tr("Choose a cell of the page that holds a point first."));
   show();
   raise();
   if (tab_ == nullptr) return;
-  pickCell_ = *cell;
-  const std::int32_t page = tab_->currentPage();
-  const int row = tab_->currentRow();
-  const int column = cell->column() + 1;
-  // A point counts in the area that its row's feature stands on.
-  pickArea_ = 1;
-  for (const MapFeature& feature : canvas_->scene().features) {
-    const bool isOf = feature.row > 0 ? feature.row == row : feature.column == column;
-    if (feature.id.page != page || !isOf || feature.area < 1) continue;
-    const bool isSink = page == kSourcesPage && column == kSinkColumn;
-    pickArea_ = isSink ? feature.lastArea : feature.area;
-  }
-  if (const MapArea* area = canvas_->scene().area(row); page == kAreasPage && area != nullptr && row > 1)
-    pickArea_ = area->enclosing;
-  canvas_->setTool(MapTool::pick);
+  // What is typed in the cell is entered first, and may be what it is about.
+  const QPersistentModelIndex kept(*cell);
+  tab_->commit();
+  if (!kept.isValid()) return;
+  aim(kept);
   canvas_->setFocus();
-  readout_->setText(tr("Click on the point of area %1.").arg(pickArea_));
 }
 
-void MapDock::takePick(MapPoint place) {
-  if (tab_ == nullptr || canvas_->editor() == nullptr || !pickCell_.isValid()) return;
-  const std::optional<MapPick> pick = canvas_->editor()->pick(place, pickArea_);
-  if (!pick) return emit failed(tr("There is no point of area %1.").arg(pickArea_));
-  tab_->commit();
-  const QModelIndex cell = pickCell_;
-  pickCell_ = QPersistentModelIndex();
-  if (!cell.isValid()) return;
-  const_cast<QAbstractItemModel*>(cell.model())
-      ->setData(cell, QString::fromStdString(pointText(pick->point)), Qt::EditRole);
-  tab_->pane().refresh();
-  canvas_->refresh();
+void MapDock::aim(const QModelIndex& cell) {
+  pickCell_ = cell;
+  if (const auto pick = static_cast<const GridModel*>(cell.model())->pick(cell)) canvas_->startPick(*pick);
+}
+
+// A pick goes on with another cell that is chosen, and ends with the page.
+void MapDock::followPick() {
+  if (canvas_->tool() != MapTool::pick) return;
+  const std::optional<QModelIndex> cell = tab_->pane().pointCell();
+  if (!cell) {
+    canvas_->setTool(MapTool::select);
+  } else if (pickCell_ != *cell) {
+    aim(*cell);
+  }
+}
+
+void MapDock::takePick(const std::vector<PickedPlace>& places) {
+  const QModelIndex cell = std::exchange(pickCell_, {});
+  if (tab_ == nullptr || !cell.isValid()) return;
+  auto* model = const_cast<GridModel*>(static_cast<const GridModel*>(cell.model()));
+  if (!model->storePick(cell, places)) emit failed(tr("The cell does not take this."));
+}
+
+// What drives a new boundary is a level of 0 until its page says otherwise.
+void MapDock::showMade(const MapFeature& feature) {
+  if (tab_ == nullptr || feature.id.kind != MapKind::boundary) return showFeature(feature);
+  canvas_->setTool(MapTool::select);
+  const int count = countOf(canvas_->scene(), MapKind::boundary);
+  tab_->goToPlace({.page = PageId::hdBoundary,
+                   .entries = {{feature.id.number, count}, kBoundaryDataRow},
+                   .column = kBoundaryDataColumn});
+  readout_->setText(tr("Say on the page what drives boundary %1.").arg(feature.id.number));
 }
 
 void MapDock::askNestedArea(MapPoint corner, MapPoint opposite) {

@@ -8,6 +8,7 @@
 #include <QPointer>
 #include <QTimer>
 #include <QToolBar>
+#include <QToolButton>
 #include <map>
 
 #include "shell/document_tab.h"
@@ -33,6 +34,9 @@ class MapDock final : public QDockWidget {
   MapCanvas& canvas() { return *canvas_; }
   LayerPanel& panel() { return *panel_; }
   QLabel& readout() { return *readout_; }
+  // What the next click does.
+  QLabel& hint() { return *hint_; }
+  QToolButton& placeButton() { return *place_; }
   // The advice of the mark that was clicked on last.
   AdviceStrip& adviceStrip() { return *adviceStrip_; }
   QToolBar& tools() { return *tools_; }
@@ -60,7 +64,11 @@ class MapDock final : public QDockWidget {
   void showAdvice();
   void goToRow(std::int32_t page, int row, int column);
   void refreshSoon();
-  void takePick(MapPoint place);
+  void showTool();
+  void aim(const QModelIndex& cell);
+  void followPick();
+  void takePick(const std::vector<PickedPlace>& places);
+  void showMade(const MapFeature& feature);
   void askNestedArea(MapPoint corner, MapPoint opposite);
   void askExport();
 
@@ -70,6 +78,7 @@ class MapDock final : public QDockWidget {
   QList<QMetaObject::Connection> links_;             // to the one that is shown
   QToolBar* tools_;
   MapCanvas* canvas_;
+  QLabel* hint_;
   QLabel* readout_;
   LayerPanel* panel_;
   AdviceStrip* adviceStrip_;
@@ -78,9 +87,10 @@ class MapDock final : public QDockWidget {
   MapExport* export_;
   std::map<MapTool, QAction*> toolActions_;
   QAction* pick_ = nullptr;
+  QToolButton* place_ = nullptr;
+  QMetaObject::Connection pickLink_;  // to the one that is wanted
   QTimer refreshTimer_;
   QPersistentModelIndex pickCell_;
-  std::int32_t pickArea_ = 0;
   bool isShown_ = false;  // to the user: neither hidden nor behind another dock
 };
 

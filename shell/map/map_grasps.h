@@ -27,6 +27,8 @@ class MapGrasp {
   virtual bool finish() { return true; }
   // Takes the last click back; false when there is none left.
   virtual bool stepBack() { return false; }
+  // The clicks that have been made and count.
+  virtual std::size_t clicks() const { return 0; }
   virtual void paint(QPainter& painter, const MapFrame& frame) const = 0;
   // What is said beside the pointer, and why it can't be.
   virtual QString text() const { return {}; }
@@ -45,6 +47,9 @@ std::unique_ptr<MapGrasp> graspNewFeature(MapEditor& editor, MapKind kind, std::
                                           std::size_t most, std::int32_t page);
 // A rectangle from a corner to the opposite one, that becomes a feature.
 std::unique_ptr<MapGrasp> graspRectangle(MapEditor& editor, MapKind kind, MapPoint corner, std::int32_t page);
+// Points for a cell of a page; who stores them there is told.
+std::unique_ptr<MapGrasp> graspPick(MapEditor& editor, const CellPick& cell,
+                                    std::function<void(const std::vector<PickedPlace>&)> picked);
 // A rectangle that becomes a nested area; who asks for its files is told both corners.
 std::unique_ptr<MapGrasp> graspNestedArea(MapEditor& editor, MapPoint corner,
                                           std::function<void(MapPoint, MapPoint)> wanted);

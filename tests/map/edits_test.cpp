@@ -6,6 +6,7 @@
 #include "basic/module_selection.h"
 #include "basic/source_sink.h"
 #include "core/edition.h"
+#include "hydrodynamic/boundary.h"
 #include "hydrodynamic/result.h"
 #include "map/document_map.h"
 #include "platform/tsb/tsb_file.h"
@@ -166,6 +167,21 @@ TEST_F(MapEdits, ANestedAreaIsCutFromARasterOfAnotherKind) {
   EXPECT_THAT(all, testing::Contains(-5.0F));
 }
 
+TEST_F(MapEdits, LandOfALowerValueStaysLand) {
+  if (theEdition.wetlandSweepKit) GTEST_SKIP() << "one area";
+  makeTwoAreas();
+  const auto surface = [](int j, int) { return j > 12 ? 4.0F : j == 12 ? 3.5F : -2.0F; };
+  const std::string low = folder.file("low.tsb2");
+  test::writeGrid(low, {.noJ = 20, .noK = 16, .land = 4.0F, .geography = placeAt(500000, 6000000)}, surface);
+  ASSERT_THAT(map->addNestedArea(at(11, 9), at(14, 10), low, folder.file("new.tsb2")), IsEmpty());
+  const std::vector<float> got = values(folder.file("new.tsb2"), 10 * 4);
+  EXPECT_EQ(map->scene().areas.back().landValue, 10.0F);
+  EXPECT_FLOAT_EQ(got[0], -2);
+  EXPECT_FLOAT_EQ(got[3], 3.5F);  // wet, though it is higher than all that is beside it
+  EXPECT_FLOAT_EQ(got[4], 3.5F);
+  EXPECT_THAT(std::vector(got.begin() + 5, got.begin() + 10), Each(10.0F));
+}
+
 TEST_F(MapEdits, NestedAreasThatCanNotBe) {
   if (theEdition.wetlandSweepKit) GTEST_SKIP() << "one area";
   makeTwoAreas();
@@ -197,6 +213,7 @@ TEST_F(MapEdits, EndsOfBoundariesSlideAlongTheBorder) {
   root().boundary->SetNoBoundaries(1);
   root().boundary->at(1).Set(0, 2, 0, 9);
   EXPECT_THAT(map->moveVertex(id(MapKind::boundary, 1), 1, at(0, 5)), HasSubstr("User specified"));
+  EXPECT_THAT(map->previewVertex(id(MapKind::boundary, 1), 1, at(0, 5)).fault, HasSubstr("User specified"));
   root().boundary->defaultPosition = 0;
   const VertexPlace shown = map->previewVertex(id(MapKind::boundary, 1), 1, at(3, 12.4));
   EXPECT_EQ(shown.point, (GridPoint{0, 12}));
@@ -217,6 +234,87 @@ TEST_F(MapEdits, EndsOfBoundariesSlideAlongTheBorder) {
   EXPECT_EQ(root().boundary->GetCount(), 1);
   EXPECT_THAT(map->moveVertex(id(MapKind::boundary, 5), 1, at(0, 5)), HasSubstr("has no point"));
   EXPECT_THAT(map->insertVertex(id(MapKind::boundary, 1), 1, at(0, 5)), HasSubstr("no further points"));
+}
+
+TEST_F(MapEdits, ABoundaryHasTwoEndsThatDiffer) {
+  makeTwoAreas();
+  root().boundary->defaultPosition = 0;
+  root().boundary->SetNoBoundaries(1);
+  root().boundary->at(1).Set(0, 2, 0, 9);
+  const std::uint64_t before = document.ModelState();
+  EXPECT_THAT(map->addFeature(MapKind::boundary, {at(10, 0), at(10.2, 0.3)}), HasSubstr("shorter than"));
+  EXPECT_THAT(map->previewVertex(id(MapKind::boundary, 1), 1, at(0, 2.3)).fault,
+              HasSubstr("ends that differ"));
+  EXPECT_THAT(map->moveVertex(id(MapKind::boundary, 1, 28), 1, at(0, 2.3)), HasSubstr("ends that differ"));
+  EXPECT_EQ(document.ModelState(), before);
+  EXPECT_EQ(lastStep(), "made");
+}
+
+TEST_F(MapEdits, ABoundaryTakesThePlaceOfTheOneThatItIsDrawnOver) {
+  makeTwoAreas();
+  root().boundary->SetNoBoundaries(2);
+  root().boundary->at(1).Set(0, 0, 0, 15);
+  root().boundary->at(2).Set(1, 0, 8, 0);
+  root().nhdBoundary->GetItem(1)->value = 1.5F;
+  document.RecordEdit(PageId::boundary, "found");
+  // What the program found becomes the user's, in the same step.
+  ASSERT_THAT(map->addFeature(MapKind::boundary, {at(0, 4), at(0, 9)}), IsEmpty());
+  EXPECT_EQ(lastStep(), "Boundary 1, both ends");
+  EXPECT_TRUE(root().boundary->isUserSpecified());
+  EXPECT_EQ(root().boundary->GetCount(), 2);
+  EXPECT_EQ(root().boundary->at(1).Text(), "(0,4) - (0,9)");
+  EXPECT_EQ(root().nhdBoundary->GetItem(1)->value, 1.5F);
+  document.Undo();
+  EXPECT_FALSE(root().boundary->isUserSpecified());
+  EXPECT_EQ(root().boundary->at(1).Text(), "(0,0) - (0,15)");
+  EXPECT_EQ(lastStep(), "found");
+  document.Redo();
+  // Beside it, or from where it ends, another one is made.
+  ASSERT_THAT(map->addFeature(MapKind::boundary, {at(0, 9), at(0, 13)}), IsEmpty());
+  EXPECT_EQ(lastStep(), "New boundary");
+  EXPECT_EQ(root().boundary->at(3).Text(), "(0,9) - (0,13)");
+  const std::vector<MapPoint> over{at(0.3, 6), at(-1, 12)};
+  EXPECT_EQ(map->previewFeature(MapKind::boundary, over).fault, map->addFeature(MapKind::boundary, over));
+  EXPECT_EQ(map->addFeature(MapKind::boundary, over),
+            "It lies over boundaries 1 and 3: draw it over one of them at most");
+  EXPECT_EQ(root().boundary->GetCount(), 3);
+}
+
+TEST_F(MapEdits, WhatIsDrawnIsShownWhereItWouldLie) {
+  makeTwoAreas();
+  map->scene();
+  const std::uint64_t before = document.ModelState();
+  struct Case {
+    MapKind kind;
+    std::vector<MapPoint> drawn;
+    std::string shown;
+    std::string fault;
+    std::int32_t page = 0;
+  };
+  const std::vector<Case> cases{
+      {MapKind::boundary, {at(1, 7.2)}, text(at(0, 7)), ""},
+      {MapKind::boundary, {at(1, 7.2), at(3, 11)}, text(std::vector{at(0, 7), at(0, 11)}), ""},
+      {MapKind::boundary, {at(1, 7.2), at(1, 7)}, text(std::vector{at(0, 7), at(0, 7)}), "shorter than"},
+      {MapKind::source, {at(6.1, 5)}, text(at(6, 5)), ""},
+      {MapKind::source, {at(60, 5)}, text(at(60, 5)), "There is no area"},
+      {MapKind::dike, {at(60, 5.3)}, text(at(60, 5.3)), ""},
+      {MapKind::outputLine, {at(2, 2.2), at(9, 3)}, text(std::vector{at(2, 2), at(9, 2)}), ""},
+      {MapKind::outputLine, {at(2, 2), at(90, 3)}, text(std::vector{at(2, 2), at(90, 3)}), "does not reach"},
+      {MapKind::outputMap, {at(2, 2), at(2.2, 9)}, "", "narrower"},
+      {MapKind::box,
+       {at(6.3, 5), at(8, 6)},
+       text(std::vector{at(19.0 / 3, 5), at(8, 5), at(8, 6), at(19.0 / 3, 6)}),
+       ""},
+      {MapKind::massBudget, {at(2, 2), at(90, 3)}, text(std::vector{at(2, 2), at(90, 3)}), "whole polygon"},
+  };
+  for (const Case& each : cases) {
+    SCOPED_TRACE(each.shown);
+    const FeaturePlace place = map->previewFeature(each.kind, each.drawn, each.page);
+    if (!each.shown.empty()) EXPECT_EQ(text(place.points), each.shown);
+    EXPECT_THAT(place.fault, HasSubstr(each.fault));
+    EXPECT_EQ(place.fault.empty(), each.fault.empty());
+  }
+  EXPECT_EQ(document.ModelState(), before);
 }
 
 struct Slide {

@@ -20,6 +20,7 @@ class MapTest : public DesktopFixture {
   Q_OBJECT
 
  private:
+  static constexpr int kFloodAndDry = 26;
   static constexpr int kAreas = 27;
   static constexpr int kBoundaries = 28;
   static constexpr int kDikes = 31;
@@ -429,13 +430,12 @@ class MapTest : public DesktopFixture {
       if (button->text().remove('&') == "User specified") button->click();
     }
     QCoreApplication::processEvents();
-    int number = 1;  // of the new one, after those that were found
-    while (feature(MapKind::boundary, number) != nullptr) ++number;
+    constexpr int number = 1;
     window_->map().toolAction(MapTool::boundary)->trigger();
     click(screenOf(1, 0, 10));
     click(screenOf(1, 0, 40));
     QVERIFY(feature(MapKind::boundary, number) != nullptr);
-    QCOMPARE(undoName(), QString("New boundary"));
+    QCOMPARE(undoName(), QString("Boundary 1, both ends"));  // of the one that was found there
     window_->map().toolAction(MapTool::select)->trigger();
     // Off the border, and it slides along it all the same.
     drag(screenOf(1, 0, 40), screenOf(1, 6, 55));
@@ -535,6 +535,234 @@ class MapTest : public DesktopFixture {
     QCOMPARE(canvas().tool(), MapTool::select);
     tab().undo();
     QVERIFY(undoName().isEmpty());
+  }
+
+  void theCellsOfAPartArePickedTogether() {
+    window_->map().toolAction(MapTool::outputArea)->trigger();
+    drag(screenOf(1, 5, 5), screenOf(1, 25, 15));
+    tab().goToPlace({.page = PageId::hdResult, .entries = {{1}}, .column = 4});
+    const QString before = cell(1, 3) + " " + cell(1, 4);
+    QTest::keyClick(window_.get(), Qt::Key_M, Qt::ControlModifier | Qt::ShiftModifier);
+    QVERIFY(window_->map().pickAction()->isChecked());
+    QVERIFY2(window_->map().hint().text().startsWith("J and K, row 1: click on one corner."),
+             qPrintable(window_->map().hint().text()));
+    // What is held is ringed.
+    const QPoint ring = screenOf(1, 5, 5).toPoint() - QPoint(8, 0);
+    const QImage picked = canvas().grab().toImage();
+    click(screenOf(1, 30, 25));
+    QVERIFY(window_->map().hint().text().contains("opposite corner"));
+    QCOMPARE(cell(1, 3) + " " + cell(1, 4), before);
+    click(screenOf(1, 12, 40));
+    QCOMPARE(cell(1, 3), QString("12-30,1"));
+    QCOMPARE(cell(1, 4), QString("25-40,1"));
+    QCOMPARE(undoName(), QString("J and K, row 1"));
+    QCOMPARE(canvas().tool(), MapTool::select);
+    QVERIFY(!window_->map().pickAction()->isChecked());
+    QVERIFY(canvas().grab().toImage().pixelColor(ring) != picked.pixelColor(ring));
+    tab().undo();
+    QCOMPARE(undoName(), QString("New output"));
+    QCOMPARE(cell(1, 3) + " " + cell(1, 4), before);
+  }
+
+  void aPickFollowsTheCellAndEndsWithItsPage() {
+    QSignalSpy failed(&window_->map(), &MapDock::failed);
+    window_->map().toolAction(MapTool::pair)->trigger();
+    click(screenOf(1, 8, 10));
+    click(screenOf(1, 12, 10));
+    tab().goToPlace({.page = PageId::sourceAndSink, .entries = {{1}}, .column = 2});
+    window_->map().startPick();
+    QVERIFY(window_->map().hint().text().startsWith("Source, row 1"));
+    // Esc puts it down, off the grid there is no point, and another cell is picked for from then on.
+    QTest::keyClick(&canvas(), Qt::Key_Escape);
+    QCOMPARE(canvas().tool(), MapTool::select);
+    window_->map().startPick();
+    click(QPointF(3, canvas().height() / 2.0));
+    QCOMPARE(failed.count(), 1);
+    QCOMPARE(canvas().tool(), MapTool::pick);
+    tab().pane().goTo({.entries = {{1}}, .column = 4});
+    QVERIFY(window_->map().hint().text().startsWith("Sink, row 1"));
+    click(screenOf(2, 30, 30));  // its area follows
+    QCOMPARE(cell(2, 4), QString("(30,30)"));
+    QCOMPARE(cell(2, 5), QString("2"));
+    window_->map().startPick();
+    tab().goToPage(kAreas);
+    QCOMPARE(canvas().tool(), MapTool::select);
+    // From the menu of a cell.
+    tab().goToPage(kSources);
+    auto* table = tab().pane().findChild<GridView*>();
+    const QPoint at = table->visualRect(table->model()->index(1, 1)).center();
+    QTimer::singleShot(100, qApp, [] {
+      auto* menu = qobject_cast<QMenu*>(QApplication::activePopupWidget());
+      if (menu != nullptr) {
+        QTest::keyClick(menu, Qt::Key_Down);
+        QTest::keyClick(menu, Qt::Key_Return);
+      }
+    });
+    QContextMenuEvent wanted(QContextMenuEvent::Mouse, at, table->viewport()->mapToGlobal(at));
+    QCoreApplication::sendEvent(table->viewport(), &wanted);
+    QCOMPARE(canvas().tool(), MapTool::pick);
+    QVERIFY(window_->map().hint().text().startsWith("Source, row 1"));
+  }
+
+  void theToolInHandIsShown() {
+    MapDock& map = window_->map();
+    const QString select = map.hint().text();
+    const QSize size = canvas().size();
+    QVERIFY(select.startsWith("Click to choose"));
+    QVERIFY(!map.placeButton().isChecked());
+    map.toolAction(MapTool::dike)->trigger();
+    QVERIFY(map.placeButton().isChecked());
+    QCOMPARE(map.placeButton().text(), QString("Place: Dike"));
+    QCOMPARE(canvas().cursor().shape(), Qt::CrossCursor);
+    QCOMPARE(map.hint().text(), QString("Dike: click on the first point. Esc puts it down."));
+    QCOMPARE(canvas().size(), size);
+    click(screenOf(1, 20, 60));
+    QCOMPARE(map.hint().text(),
+             QString("Dike: click on the next point. Backspace takes the last click back, Esc all."));
+    click(screenOf(1, 30, 60));
+    QVERIFY(map.hint().text().contains("Return ends."));
+    QTest::keyClick(&canvas(), Qt::Key_Backspace);
+    QVERIFY(!map.hint().text().contains("Return ends."));
+    QTest::keyClick(&canvas(), Qt::Key_Escape);
+    QVERIFY(map.hint().text().contains("first point"));
+    QTest::keyClick(&canvas(), Qt::Key_Escape);
+    QCOMPARE(map.hint().text(), select);
+    QVERIFY(!map.placeButton().isChecked());
+    QCOMPARE(map.placeButton().text(), QString("Place"));
+    QVERIFY(map.toolAction(MapTool::select)->isChecked());
+    QCOMPARE(canvas().cursor().shape(), Qt::ArrowCursor);
+    QVERIFY(undoName().isEmpty());
+  }
+
+  void aPressEntersWhatIsTypedBeforeItGrasps() {
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    const GridPoint before = area(2).origin;
+    type("Drying depth:", "0.25");
+    QVERIFY(undoName().isEmpty());
+    const QPointF border = screenOf(2, -0.5, 20);
+    const double spacing = screenOf(1, 1, 0).x() - screenOf(1, 0, 0).x();
+    drag(border, border + QPointF(3.2 * spacing, 0));
+    QCOMPARE(area(2).origin.j, before.j + 3);
+    QCOMPARE(undoName(), QString("Area 2, Origin"));
+    QVERIFY(edit("Drying depth:").text().startsWith("0.25"));
+    tab().undo();
+    QCOMPARE(undoName(), QString("Drying depth"));
+    tab().undo();
+    QVERIFY(undoName().isEmpty());
+    // What was typed may take away what is under the pointer: then nothing is grasped.
+    tab().goToPlace({.page = PageId::bathymetry, .entries = {{2}}, .column = 3});
+    auto* table = tab().pane().findChild<GridView*>();
+    QTest::keyClick(table, Qt::Key_F2);
+    QTest::keyClicks(QApplication::focusWidget(), "50,60");
+    drag(screenOf(2, -0.5, 20), screenOf(2, -0.5, 20) + QPointF(3.2 * spacing, 0));
+    QCOMPARE(area(2).origin.j, 50);
+    QCOMPARE(area(2).origin.k, 60);
+    QCOMPARE(undoName(), QString("Origin, row 2"));
+  }
+
+  void aBoundaryThatIsDrawnLeadsToWhatDrivesIt() {
+    QVERIFY(feature(MapKind::boundary) != nullptr);
+    int next = 1;  // after those that were found
+    while (feature(MapKind::boundary, next) != nullptr) ++next;
+    const std::vector<MapPoint> found = *feature(MapKind::boundary)->points;
+    window_->map().toolAction(MapTool::boundary)->trigger();
+    click(screenOf(1, 0, 30));
+    click(screenOf(1, 0, 50));  // over what was found, whose place it takes
+    QCOMPARE(undoName(), QString("Boundary 1, both ends"));
+    QVERIFY(feature(MapKind::boundary, next) == nullptr);
+    QCOMPARE(canvas().tool(), MapTool::select);
+    window_->map().toolAction(MapTool::boundary)->trigger();
+    click(screenOf(1, 0, 60));
+    click(screenOf(1, 0, 70));
+    QCOMPARE(undoName(), QString("New boundary"));
+    QVERIFY(feature(MapKind::boundary, next) != nullptr);
+    QCOMPARE(tab().currentPage(), static_cast<int>(PageId::hdBoundary));
+    // The keyboard is on the cell of the level.
+    auto* table = tab().pane().findChild<GridView*>();
+    QVERIFY(table->hasFocus() || table->isAncestorOf(QApplication::focusWidget()));
+    QCOMPARE(tab().pane().currentCell().row, 6 * (next - 1) + 3);
+    QCOMPARE(tab().pane().currentCell().column, 2);
+    for (int i = 0; i < 2; ++i) tab().undo();
+    QCoreApplication::processEvents();
+    QVERIFY(undoName().isEmpty());
+    QCOMPARE(*feature(MapKind::boundary)->points, found);
+  }
+
+  void aBoundaryOfNoLengthIsRefused() {
+    QSignalSpy failed(&window_->map(), &MapDock::failed);
+    window_->map().toolAction(MapTool::boundary)->trigger();
+    click(screenOf(1, 0, 30));
+    click(screenOf(1, 0, 30.3));
+    QCOMPARE(failed.count(), 1);
+    QVERIFY(window_->map().readout().text().contains("shorter than the spacing"));
+    QVERIFY(undoName().isEmpty());
+    // The first click stands.
+    QVERIFY(canvas().isHolding());
+    click(screenOf(1, 0, 50));
+    drag(screenOf(1, 0, 50), screenOf(1, 0, 30.2));
+    QCOMPARE(failed.count(), 2);
+    QVERIFY(window_->map().readout().text().contains("two ends that differ"));
+    QCOMPARE(undoName(), QString("Boundary 1, both ends"));
+  }
+
+  void anAreaStaysInTheOneAroundIt() {
+    const QPointF border = screenOf(2, -0.5, 20);
+    drag(border, border - QPointF(3000, -3000));
+    QCOMPARE(area(2).origin.j, 1);
+    QCOMPARE(area(2).origin.k, 1);
+    QVERIFY2(area(2).fault.empty(), area(2).fault.c_str());
+    QCOMPARE(undoName(), QString("Area 2, Origin"));
+    tab().undo();
+    QVERIFY(undoName().isEmpty());
+  }
+
+  void nothingComesOfWhatIsGivenUp() {
+    window_->map().toolAction(MapTool::source)->trigger();
+    click(screenOf(1, 8, 10));
+    QTest::keyClick(&canvas(), Qt::Key_Escape);
+    const MapPoint there = feature(MapKind::source)->points->front();
+    // Esc while a point is dragged, and Delete, which waits until it is let go.
+    moveTo(screenOf(1, 8, 10));
+    press(screenOf(1, 8, 10));
+    moveTo(screenOf(1, 12, 20));
+    moveTo(screenOf(1, 14, 20));
+    QVERIFY(canvas().isHolding());
+    QTest::keyClick(&canvas(), Qt::Key_Delete);
+    QVERIFY(canvas().isHolding());
+    QVERIFY(feature(MapKind::source) != nullptr);
+    QTest::keyClick(&canvas(), Qt::Key_Escape);
+    moveTo(screenOf(1, 16, 20));
+    release(screenOf(1, 16, 20));
+    QCoreApplication::processEvents();
+    QCOMPARE(feature(MapKind::source)->points->front(), there);
+    QCOMPARE(undoName(), QString("New source"));
+    // Off all areas: a press, a double click, the wheel, and a press that pans.
+    const QPointF off(4, 4);
+    const double scale = canvas().frame().metresPerPixel;
+    click(off);
+    doubleClick(off);
+    QWheelEvent wheel(off, canvas().mapToGlobal(off), {}, {0, -120}, Qt::NoButton, {}, Qt::NoScrollPhase,
+                      false);
+    QCoreApplication::sendEvent(&canvas(), &wheel);
+    QVERIFY(canvas().frame().metresPerPixel > scale);
+    drag(off, off + QPointF(30, 20));
+    QVERIFY(!canvas().isHolding());
+    QCOMPARE(undoName(), QString("New source"));
+    // The wheel while a point is held: it goes where it is let go.
+    canvas().fit();
+    const QPointF from = screenOf(1, 8, 10);
+    click(from);
+    moveTo(from);
+    press(from);
+    moveTo(from + QPointF(20, 0));
+    QWheelEvent closer(from, canvas().mapToGlobal(from), {}, {0, 120}, Qt::LeftButton, {}, Qt::NoScrollPhase,
+                       false);
+    QCoreApplication::sendEvent(&canvas(), &closer);
+    const QPointF to = screenOf(1, 12, 14);
+    moveTo(to);
+    release(to);
+    QCoreApplication::processEvents();
+    QVERIFY(std::abs(feature(MapKind::source)->points->front().east - area(1).grid.at(12, 14).east) < 0.01);
   }
 
   void aCellWithNoPointIsNotPicked() {

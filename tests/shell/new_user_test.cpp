@@ -96,7 +96,7 @@ class NewUserTest final : public DesktopFixture {
           QTest::mouseClick(menu, Qt::LeftButton, {}, menu->actionGeometry(action).center());
       }
     });
-    QTest::mouseClick(&buttonOf(window_->map().tools(), "Place"), Qt::LeftButton);
+    QTest::mouseClick(&window_->map().placeButton(), Qt::LeftButton);
     QCoreApplication::processEvents();
     activate();
   }
@@ -230,7 +230,7 @@ class NewUserTest final : public DesktopFixture {
     click(canvas(), within(1, 1, 0.6));
     click(canvas(), within(1, 1, 0.95));
     QCOMPARE(countOf(MapKind::boundary), 1);
-    QCOMPARE(tab().currentPage(), kBoundaries);
+    QCOMPARE(tab().currentPage(), static_cast<int>(PageId::hdBoundary));
   }
 
   void placeASource() {

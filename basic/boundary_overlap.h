@@ -1,0 +1,32 @@
+#pragma once
+
+#include <algorithm>
+#include <optional>
+
+#include "basic/boundary.h"
+
+namespace gridbay {
+
+// The points that two boundaries along one line have in common, by their place on that line (J or K); a
+// corner of the grid is a part of both its edges.
+struct BoundarySpan {
+  int low, high;
+};
+inline std::optional<BoundarySpan> commonOf(const CBoundaryObjectKvs& a, const CBoundaryObjectKvs& b) {
+  const auto along = [](const CBoundaryObjectKvs& it, bool alongJ) {
+    return alongJ ? BoundarySpan{std::min(it.first.j, it.last.j), std::max(it.first.j, it.last.j)}
+                  : BoundarySpan{std::min(it.first.k, it.last.k), std::max(it.first.k, it.last.k)};
+  };
+  for (const bool alongJ : {false, true}) {
+    const BoundarySpan acrossA = along(a, !alongJ);
+    const BoundarySpan acrossB = along(b, !alongJ);
+    if (acrossA.low != acrossA.high || acrossB.low != acrossB.high || acrossA.low != acrossB.low) continue;
+    const BoundarySpan one = along(a, alongJ);
+    const BoundarySpan two = along(b, alongJ);
+    const BoundarySpan common{std::max(one.low, two.low), std::min(one.high, two.high)};
+    if (common.low <= common.high) return common;
+  }
+  return std::nullopt;
+}
+
+}  // namespace gridbay
