@@ -11,10 +11,32 @@
 
 namespace gridbay {
 
-// What mends a thing: keywords with other values, all to be set in their order or none.
+// A data file that is made of another one; both by their absolute names.
+struct AdviceFile {
+  std::string from;
+  std::string to;          // which is not there yet
+  bool fillsGaps = false;  // missing values of a series lie on the line between their neighbours; else a copy
+
+  bool operator==(const AdviceFile&) const = default;
+};
+
+// An entry of a list that goes, with what all modules say of it. Numbers from 1.
+struct AdviceRemoval {
+  enum class List { boundary, source, weir, culvert };
+
+  List list;
+  int number;
+
+  bool operator==(const AdviceRemoval&) const = default;
+};
+
+// What mends a thing, whole or not at all: files that are made, then keywords with other values in their
+// order, then an entry that goes.
 struct AdviceFix {
   std::string name;  // of the step, as in "Undo Move area 2"
   std::vector<Setting> settings = {};
+  std::vector<AdviceFile> files = {};
+  std::optional<AdviceRemoval> removal = {};
 
   bool operator==(const AdviceFix&) const = default;
 };
@@ -44,6 +66,7 @@ struct Advice {
   PagePlace place;
   AdviceSite site = {};
   std::optional<AdviceFix> fix = {};
+  std::string todo = {};  // what to do at the place, where no fix by the program can be right
 
   bool operator==(const Advice&) const = default;
 };

@@ -5,10 +5,16 @@
 #include <exception>
 #include <filesystem>
 
+#include "advice/fix_files.h"
 #include "advice/rules.h"
 #include "basic/bathymetry.h"
+#include "platform/files/paths.h"
+#include "setup/entry_removal.h"
+#include "setup/page_places.h"
 #include "setup/setting.h"
+#include "structures/culvert.h"
 #include "structures/dike.h"
+#include "structures/weir.h"
 
 namespace gridbay {
 namespace {
@@ -35,6 +41,19 @@ std::optional<double> freeOnDisk(const std::string& folder) {
   if (error) return std::nullopt;
   constexpr double kMegabyte = 1024.0 * 1024.0;
   return static_cast<double>(space.available) / kMegabyte;
+}
+
+void remove(CGlobalKvs& model, const AdviceRemoval& removal) {
+  switch (removal.list) {
+    case AdviceRemoval::List::boundary:
+      return removeBoundary(model, removal.number);
+    case AdviceRemoval::List::source:
+      return removeSource(model, removal.number);
+    case AdviceRemoval::List::weir:
+      return removeEntry(*model.nhdWeir, removal.number);
+    case AdviceRemoval::List::culvert:
+      return removeEntry(*model.nhdCulvert, removal.number);
+  }
 }
 
 }  // namespace
@@ -108,6 +127,29 @@ std::optional<std::vector<GridSpot>> AdviceContext::spotsOn(int number, const st
   return spots;
 }
 
+std::string AdviceContext::freeName(const std::string& name) {
+  const std::string folder = folderOfFile(documentPath);
+  if (names_.empty()) {
+    names_.insert({});
+    if (const KvsFile* file = written()) {
+      eachKeyword(*file, [&](const PagePlace&, const Node& keyword) {
+        for (const Value& value : keyword.values()) {
+          if (value.kind() == ValueKind::fileName || value.kind() == ValueKind::resultFileName)
+            names_.insert(absolutePath(value.text(), folder));
+        }
+      });
+    }
+  }
+  const std::filesystem::path path(name);
+  std::string free = name;
+  std::error_code error;
+  for (int number = 2;; ++number) {
+    const std::string absolute = absolutePath(free, folder);
+    if (!std::filesystem::exists(absolute, error) && names_.insert(absolute).second) return free;
+    free = fmt::format("{}_{}{}", path.stem().string(), number, path.extension().string());
+  }
+}
+
 const KvsFile* AdviceContext::written() {
   if (!isWritten_) {
     isWritten_ = true;
@@ -165,15 +207,19 @@ void Advisor::setFreeMegabytes(std::function<std::optional<double>(const std::st
   freeMegabytes_ = std::move(free);
 }
 
-Outcome makeFix(CGlobalKvs& model, const AdviceFix& fix, const std::string& documentPath) {
+Outcome makeFix(CGlobalKvs& model, const AdviceFix& fix, const std::string& documentPath,
+                const std::function<bool(double)>& progress) {
+  if (Outcome made = makeFiles(fix.files, progress); !made) return made;
   CGlobalKvs before;
   before.AssignState(model);
   for (const Setting& setting : fix.settings) {
-    if (const Outcome done = applySetting(model, setting, documentPath); !done) {
+    if (Outcome done = applySetting(model, setting, documentPath); !done) {
       model.AssignState(before);
+      removeFiles(fix.files);
       return done;
     }
   }
+  if (fix.removal) remove(model, *fix.removal);
   return {};
 }
 

@@ -45,7 +45,10 @@ class Advisor {
   std::function<std::optional<double>(const std::string& folder)> freeMegabytes_;
 };
 
-// Sets what a fix sets, all or none; an error says which keyword would not take it.
-Outcome makeFix(CGlobalKvs& model, const AdviceFix& fix, const std::string& documentPath);
+// Makes all of a fix or nothing; an error says which file can't be made, or which keyword would not take its
+// value. Files stay when the step is taken back. `progress` is told how much of the files is done, 0 to 1,
+// and stops the work by false.
+Outcome makeFix(CGlobalKvs& model, const AdviceFix& fix, const std::string& documentPath,
+                const std::function<bool(double)>& progress = {});
 
 }  // namespace gridbay

@@ -7,6 +7,7 @@
 #include <filesystem>
 #include <map>
 
+#include "advice/fix_files.h"
 #include "advice/rules.h"
 #include "basic/bathymetry.h"
 #include "basic/module_selection.h"
@@ -33,18 +34,56 @@ struct NamedFile {
   bool isResult = false;
 };
 
+// A name that is to take the place of another one, with the file that is made for it.
+struct BetterName {
+  std::string fix;
+  std::string name;
+  std::vector<AdviceFile> files = {};
+};
+
 void adviseName(AdviceContext& context, const std::string& name, const NamedFile& named, std::string doubt,
-                std::string reason, const std::string& better) {
+                std::string reason, std::optional<BetterName> better) {
   Advice advice{{}, fmt::format("{} {}", name, doubt), std::move(reason), named.place};
   advice.place.value = name;
   if (!named.further.empty())
     advice.doubt += fmt::format(" It is named {} more time{}.", named.further.size(),
                                 named.further.size() == 1 ? "" : "s");
-  if (!better.empty()) {
-    advice.fix = AdviceFix{"Take " + better, {{named.place.keyword, better}}};
-    for (const std::string& path : named.further) advice.fix->settings.push_back({path, better});
+  if (better) {
+    advice.fix = AdviceFix{std::move(better->fix), {{named.place.keyword, better->name}}};
+    for (const std::string& path : named.further) advice.fix->settings.push_back({path, better->name});
+    advice.fix->files = std::move(better->files);
   }
+  advice.todo = "Bring the file into the setup's folder, and choose it there.";
   context.add(std::move(advice));
+}
+
+// What a file outside of the setup's folder can be called in it. A result is written there from now on; a
+// file that is read is copied, unless it is there already or can't be read where it is.
+std::optional<BetterName> inFolder(AdviceContext& context, const std::string& folder, const std::string& name,
+                                   bool isResult) {
+  const std::string plain = std::filesystem::path(name).filename().string();
+  if (plain.empty()) return std::nullopt;
+  const std::string from = absolutePath(name, folder);
+  if (isResult) {
+    const std::string free = context.freeName(plain);
+    return BetterName{fmt::format("Write {} in the setup's folder", free), free};
+  }
+  const std::string beside = absolutePath(plain, folder);
+  const bool isThere = isReadableFile(from);
+  if (isReadableFile(beside) && (!isThere || isSmallAndSame(from, beside)))
+    return BetterName{"Take " + plain, plain};
+  std::error_code error;
+  const auto size = std::filesystem::file_size(from, error);
+  if (!isThere || error) return std::nullopt;
+  constexpr double kMegabyte = 1024.0 * 1024.0;
+  const std::optional<double> room =
+      context.freeMegabytes ? context.freeMegabytes(folder) : std::optional<double>();
+  if (room && static_cast<double>(size) > *room * kMegabyte) return std::nullopt;
+  const std::string free = context.freeName(plain);
+  return BetterName{
+      fmt::format("Copy {} into the setup's folder{}", plain, free == plain ? std::string() : " as " + free),
+      free,
+      {{from, absolutePath(free, folder)}}};
 }
 
 // What is written to one disk, by the folder that was asked for first.
@@ -192,17 +231,16 @@ void adviseFileNames(AdviceContext& context) {
     });
   }
   for (const auto& [name, named] : outside) {
-    // One of that name beside the setup is likely the one that is meant. A result would be written over it.
-    const std::string plain = std::filesystem::path(name).filename().string();
-    const bool isBeside = !named.isResult && !plain.empty() && isReadableFile(absolutePath(plain, folder));
     adviseName(context, name, named,
                name.starts_with('/') ? "is named absolutely, and lies outside of the setup's folder."
                                      : "lies outside of the setup's folder.",
-               "When the folder is moved or sent, the file stays behind.", isBeside ? plain : std::string());
+               "When the folder is moved or sent, the file stays behind.",
+               inFolder(context, folder, name, named.isResult));
   }
   for (const auto& [name, named] : absolute) {
     adviseName(context, name, named, "is named absolutely.",
-               "When the folder is moved or sent, the name leads nowhere.", pathOnFile(name, folder));
+               "When the folder is moved or sent, the name leads nowhere.",
+               BetterName{"Take " + pathOnFile(name, folder), pathOnFile(name, folder)});
   }
 }
 
@@ -225,7 +263,8 @@ void adviseOutputSize(AdviceContext& context) {
                  "The run ends when the disk is full, and may spoil what it has written.",
                  std::move(place),
                  {},
-                 lessOften(context, disk, *room)});
+                 lessOften(context, disk, *room),
+                 "Write fewer outputs or hot start files, or let them go to a disk with more room."});
   }
 }
 

@@ -3,6 +3,7 @@
 #include <functional>
 #include <map>
 #include <optional>
+#include <set>
 #include <span>
 #include <string>
 #include <string_view>
@@ -47,12 +48,16 @@ class AdviceContext {
   // on the earth, or the area's grid is not known.
   std::optional<std::vector<GridSpot>> spotsOn(int number, const std::string& projection,
                                                std::span<const AdviceSite::MapPoint> points);
+  // A name in the setup's folder, as near to the given one as there is neither a file of nor another fix
+  // with; of a setup that was never saved it is a name in the folder that the program runs in.
+  std::string freeName(const std::string& name);
   // The setup as a save would write it, but for the points of dikes, of which there may be very many; null
   // where it can't be written.
   const KvsFile* written();
 
   void add(Advice advice) {
     advice.kind = kind;
+    if (advice.fix) advice.todo.clear();
     found.push_back(std::move(advice));
   }
 
@@ -61,6 +66,7 @@ class AdviceContext {
 
  private:
   std::map<int, const GridFacts*> grids_;
+  std::set<std::string> names_;  // that the setup has, or a fix gives
   KvsHandle written_;
   bool isWritten_ = false;
 };

@@ -219,22 +219,27 @@ void adviseNumbersOfSteps(AdviceContext& context) {
 }
 
 void adviseCounts(AdviceContext& context) {
-  const auto most = [&](PageId page, std::string_view keyword, std::string_view what, int count, int limit) {
+  const auto most = [&](PageId page, std::string_view keyword, std::string_view field, std::string_view what,
+                        int count, int limit) {
     if (count <= limit) return;
-    context.add({{},
-                 fmt::format("There are {} {}.", count, what),
-                 fmt::format("Engines take at most {}.", limit),
-                 {page, {}, std::string(keyword), {}}});
+    context.add(
+        {{},
+         fmt::format("There are {} {}.", count, what),
+         fmt::format("Engines take at most {}.", limit),
+         {page, {}, std::string(keyword), std::string(field)},
+         {},
+         {},
+         fmt::format("Only you know which {} can go: lower the number once the last ones are those.", what)});
   };
   CGlobalKvs& model = context.model;
-  most(PageId::hdResult, "HYDRODYNAMIC_MODULE/OUTPUT_SPECIFICATION/Number_Of_Output_areas", "outputs",
-       model.nhdResult->outputs.GetCount(), CNhdResultKvs::kMostOutputs);
-  most(PageId::massBudget, "NESTED_MODEL_GLOBALS/MASS_BUDGET/NoOfPolygons", "polygons",
-       model.massBudget->GetCount(), CMassBudgetKvs::kMostOnPage);
-  most(PageId::weirs, "HYDRODYNAMIC_MODULE/STRUCTURE_MODULE/WEIR/number_of_weirs", "weirs",
+  most(PageId::hdResult, "HYDRODYNAMIC_MODULE/OUTPUT_SPECIFICATION/Number_Of_Output_areas",
+       "Number of Output Areas", "outputs", model.nhdResult->outputs.GetCount(), CNhdResultKvs::kMostOutputs);
+  most(PageId::massBudget, "NESTED_MODEL_GLOBALS/MASS_BUDGET/NoOfPolygons",
+       "&Number of polygons:", "polygons", model.massBudget->GetCount(), CMassBudgetKvs::kMostOnPage);
+  most(PageId::weirs, "HYDRODYNAMIC_MODULE/STRUCTURE_MODULE/WEIR/number_of_weirs", "Number of weirs", "weirs",
        model.nhdWeir->GetCount(), LineStructure::kMost);
-  most(PageId::culverts, "HYDRODYNAMIC_MODULE/STRUCTURE_MODULE/CULVERTS/number_of_Culverts", "culverts",
-       model.nhdCulvert->GetCount(), LineStructure::kMost);
+  most(PageId::culverts, "HYDRODYNAMIC_MODULE/STRUCTURE_MODULE/CULVERTS/number_of_Culverts",
+       "Number of culverts", "culverts", model.nhdCulvert->GetCount(), LineStructure::kMost);
 }
 
 }  // namespace
@@ -245,14 +250,16 @@ void adviseCourant(AdviceContext& context) {
   const Courant worst = worstCourant(context, step);
   if (!(worst.number > kStableCourant)) return;
   const int divisor = stableDivisor(step, worst);
-  context.add({{},
-               fmt::format("The Courant number is {:.3g} in area {}, {:.4g} m deep; beyond {} a run is often "
-                           "unstable. A time step of {:.6g} s would do.",
-                           worst.number, worst.area, worst.where.depth, kStableCourant, step / divisor),
-               "The fastest waves cross more grid spacings in a time step than the scheme follows.",
-               onPeriod("Time_Step_Interval", "Time step interval:"),
-               {.area = worst.area, .points = {worst.where.point}},
-               withShorterSteps(context, divisor)});
+  context.add(
+      {{},
+       fmt::format("The Courant number is {:.3g} in area {}, {:.4g} m deep; beyond {} a run is often "
+                   "unstable. A time step of {:.6g} s would do.",
+                   worst.number, worst.area, worst.where.depth, kStableCourant, step / divisor),
+       "The fastest waves cross more grid spacings in a time step than the scheme follows.",
+       onPeriod("Time_Step_Interval", "Time step interval:"),
+       {.area = worst.area, .points = {worst.where.point}},
+       withShorterSteps(context, divisor),
+       "Choose a shorter time step, or a shorter period: what counts time steps is too large for both."});
 }
 
 void adviseThresholds(AdviceContext& context) {

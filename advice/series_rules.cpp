@@ -4,6 +4,8 @@
 
 #include <algorithm>
 #include <cmath>
+#include <filesystem>
+#include <limits>
 
 #include "advice/rules.h"
 #include "basic/bathymetry.h"
@@ -22,7 +24,8 @@ namespace {
 struct UsedSeries {
   PagePlace place;
   const CheckedFile& file;
-  bool isSmooth = false;  // its values go on without jumps in nature
+  bool isSmooth = false;                   // its values go on without jumps in nature
+  std::vector<std::string> keywords = {};  // all that name it
 };
 
 constexpr double kHalfSecond = 0.5 / 86400;  // days
@@ -32,23 +35,55 @@ std::string momentOf(const DateTime& origin, const CVdUnitConverter& toDays, con
   return dateTimeText(origin.plusDays(toDays.Convert(time.at(step))));
 }
 
-// A run of fewer time steps, with what is written until then.
-AdviceFix shorterRun(AdviceContext& context, const std::string& steps) {
-  constexpr std::string_view kLast[] = {"Last_Time_Step", "End_Time_Step", "Warm_Up_Period"};
-  AdviceFix fix{"End with the series",
-                {{"NESTED_MODEL_GLOBALS/SIMULATION_PERIOD/Number_Of_Timesteps", steps}}};
+constexpr std::string_view kPeriodPath = "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD";
+constexpr double kDay = 86400;  // seconds
+
+// Gives what counts the run's time steps other numbers: those of keywords that the model holds.
+void addSteps(AdviceContext& context, AdviceFix& fix, const std::function<long long(long long)>& moved) {
+  constexpr std::string_view kSteps[] = {"First_Time_Step",
+                                         "Last_Time_Step",
+                                         "Start_Time_Step",
+                                         "End_Time_Step",
+                                         "Start_AD_at_HD_Time_Step",
+                                         "End_AD_at_HD_Time_Step",
+                                         "Start_MT_at_HD_Time_Step",
+                                         "End_MT_at_HD_Time_Step",
+                                         "Warm_Up_Period"};
   const KvsFile* file = context.written();
-  if (file == nullptr) return fix;
+  if (file == nullptr) return;
   eachKeyword(*file, [&](const PagePlace& place, const Node& keyword) {
     const auto isNamed = [&](std::string_view name) { return sameName(name, keyword.name()); };
     if (keyword.values().size() != 1 || keyword.values()[0].kind() != ValueKind::integer ||
-        std::ranges::none_of(kLast, isNamed))
+        std::ranges::none_of(kSteps, isNamed))
       return;
-    const bool isBeyond =
-        std::atoll(std::string(keyword.values()[0].text()).c_str()) > std::atoll(steps.c_str());
-    if (isBeyond && findKeyword(context.model, place.keyword, context.documentPath))
-      fix.settings.push_back({place.keyword, steps});
+    const long long step = std::atoll(std::string(keyword.values()[0].text()).c_str());
+    const bool isOfWarmUp = sameName("Warm_Up_Period", keyword.name());
+    const long long now = isOfWarmUp ? std::min(step, moved(std::numeric_limits<int>::max())) : moved(step);
+    if (now != step && findKeyword(context.model, place.keyword, context.documentPath))
+      fix.settings.push_back({place.keyword, std::to_string(now)});
   });
+}
+
+// A run of fewer time steps, with what is written until then.
+AdviceFix shorterRun(AdviceContext& context, long long steps) {
+  AdviceFix fix{"End with the series",
+                {{fmt::format("{}/Number_Of_Timesteps", kPeriodPath), std::to_string(steps)}}};
+  addSteps(context, fix, [steps](long long step) { return std::min(step, steps); });
+  return fix;
+}
+
+// A run that begins so many time steps later, and ends when it did.
+AdviceFix laterRun(AdviceContext& context, long long later) {
+  const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
+  const long long steps = period.LastTimeStep() - later;
+  const DateTime start =
+      period.start.plusDays(static_cast<double>(later) * double{period.timeStepInterval} / kDay);
+  const auto [year, month, day, hour, minute, second] = *start.parts();
+  AdviceFix fix{"Begin with the series",
+                {{fmt::format("{}/Start_Time", kPeriodPath),
+                  fmt::format("{},{},{},{},{},{}", year, month, day, hour, minute, second)},
+                 {fmt::format("{}/Number_Of_Timesteps", kPeriodPath), std::to_string(steps)}}};
+  addSteps(context, fix, [=](long long step) { return std::clamp(step - later, 0LL, steps); });
   return fix;
 }
 
@@ -61,24 +96,50 @@ void advisePeriod(AdviceContext& context, const UsedSeries& used, const TsbTimeA
   const DateTime end = period.End();
   if (!first.valid() || !last.valid() || !end.valid() || !period.start.valid()) return;
   constexpr const char* kReason = "Beyond it the engine has no values, and stops.";
+  constexpr const char* kTodo = "Choose a series that covers the run, or move the run to where there is one.";
+  const double stepsInDay = kDay / double{period.timeStepInterval};
   if (first.linear() > period.start.linear() + kHalfSecond) {
-    context.add({{},
-                 fmt::format("{} begins at {}, after the run does at {}.", used.file.name,
-                             dateTimeText(first), dateTimeText(period.start)),
-                 kReason,
-                 used.place});
+    Advice advice{{},
+                  fmt::format("{} begins at {}, after the run does at {}.", used.file.name,
+                              dateTimeText(first), dateTimeText(period.start)),
+                  kReason,
+                  used.place,
+                  {},
+                  {},
+                  kTodo};
+    const double later = std::ceil((first.linear() - period.start.linear() - kHalfSecond) * stepsInDay);
+    if (later >= 1 && later < period.LastTimeStep())
+      advice.fix = laterRun(context, static_cast<long long>(later));
+    context.add(std::move(advice));
   }
   if (last.linear() >= end.linear() - kHalfSecond) return;
   Advice advice{{},
                 fmt::format("{} ends at {}, in the run, which ends at {}.", used.file.name,
                             dateTimeText(last), dateTimeText(end)),
                 kReason,
-                used.place};
-  const double steps =
-      std::floor((last.linear() - period.start.linear() + kHalfSecond) * 86400 / period.timeStepInterval);
+                used.place,
+                {},
+                {},
+                kTodo};
+  const double steps = std::floor((last.linear() - period.start.linear() + kHalfSecond) * stepsInDay);
   if (steps >= 1 && steps < period.LastTimeStep())
-    advice.fix = shorterRun(context, fmt::format("{:.0f}", steps));
+    advice.fix = shorterRun(context, static_cast<long long>(steps));
   context.add(std::move(advice));
+}
+
+// A series without gaps beside the setup, for all that take the one with gaps.
+std::optional<AdviceFix> withoutGaps(AdviceContext& context, const UsedSeries& used,
+                                     const SeriesFacts& facts) {
+  const auto hasValues = [&](const SeriesFacts::Item& item) { return item.missing < facts.file.time.count; };
+  if (!facts.file.axes.empty() || used.keywords.empty() || context.documentPath.empty() ||
+      !std::ranges::all_of(facts.items, hasValues))
+    return std::nullopt;
+  const std::filesystem::path path(used.file.path);
+  const std::string name = context.freeName(path.stem().string() + "_filled" + path.extension().string());
+  AdviceFix fix{fmt::format("Fill the gaps, in {}", name)};
+  for (const std::string& keyword : used.keywords) fix.settings.push_back({keyword, name});
+  fix.files.push_back({used.file.path, absolutePath(name, folderOfFile(context.documentPath)), true});
+  return fix;
 }
 
 void adviseValues(AdviceContext& context, const UsedSeries& used, const SeriesFacts& facts,
@@ -91,7 +152,10 @@ void adviseValues(AdviceContext& context, const UsedSeries& used, const SeriesFa
          fmt::format("\"{}\" of {} has {} missing value{}, the first at {}.", named.name, used.file.name,
                      item.missing, item.missing == 1 ? "" : "s", moment(item.firstMissing)),
          "What the engine takes in their place is not known.",
-         used.place});
+         used.place,
+         {},
+         withoutGaps(context, used, facts),
+         "Fill them from another source, and choose the file that has them all."});
   }
   // A smooth curve that is sampled well goes no such way in one step.
   constexpr std::size_t kLeastSteps = 10;
@@ -105,7 +169,10 @@ void adviseValues(AdviceContext& context, const UsedSeries& used, const SeriesFa
                            used.file.name, item.before, item.after, named.unit, moment(item.jumpStep - 1),
                            moment(item.jumpStep)),
                "A wave that is none in nature runs through the model; often a value is mistyped.",
-               used.place});
+               used.place,
+               {},
+               {},
+               "Look at the series there, and mend its source where a value is wrong."});
 }
 
 void adviseOne(AdviceContext& context, const UsedSeries& used) {
@@ -192,7 +259,11 @@ void adviseSeries(AdviceContext& context) {
     if (!file.coversRun) continue;
     PagePlace place = placeOf(file, names);
     const bool smooth = isSmooth(place);
-    adviseOne(context, {std::move(place), file, smooth});
+    std::vector<std::string> keywords;
+    for (const NameOnFile& each : names) {
+      if (each.path == file.path) keywords.push_back(each.place.keyword);
+    }
+    adviseOne(context, {std::move(place), file, smooth, std::move(keywords)});
   }
 }
 

@@ -3,17 +3,17 @@
 #include <algorithm>
 #include <optional>
 
-#include "basic/boundary.h"
+#include "core/grid_point.h"
 
 namespace gridbay {
 
-// The points that two boundaries along one line have in common, by their place on that line (J or K); a
-// corner of the grid is a part of both its edges.
+// The points that two boundaries, or two runs of points (each from `first` to `last`), along one line have in
+// common, by their place on that line (J or K); a corner of the grid is a part of both its edges.
 struct BoundarySpan {
   int low, high;
 };
-inline std::optional<BoundarySpan> commonOf(const CBoundaryObjectKvs& a, const CBoundaryObjectKvs& b) {
-  const auto along = [](const CBoundaryObjectKvs& it, bool alongJ) {
+std::optional<BoundarySpan> commonOf(const auto& a, const auto& b) {
+  const auto along = [](const auto& it, bool alongJ) {
     return alongJ ? BoundarySpan{std::min(it.first.j, it.last.j), std::max(it.first.j, it.last.j)}
                   : BoundarySpan{std::min(it.first.k, it.last.k), std::max(it.first.k, it.last.k)};
   };

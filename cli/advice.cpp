@@ -38,7 +38,7 @@ int fix(const Options& options, const Console& console) {
   const Advice& advice = found[options.number - 1];
   if (!advice.fix)
     return console.fail(
-        fmt::format("Advice {} has no fix: {} {}", options.number, advice.doubt, advice.reason));
+        fmt::format("Advice {} has no fix: {} {}", options.number, advice.doubt, advice.todo));
   std::vector<std::string> before;
   for (const Setting& setting : advice.fix->settings)
     before.push_back(valueAt(*setup, setting.path, options.file));
@@ -46,6 +46,8 @@ int fix(const Options& options, const Console& console) {
     return console.fail(done.error());
   if (const int status = saveSetup(*setup, options.file, console); status != kClean) return status;
   console.out << advice.fix->name << '\n';
+  for (const AdviceFile& file : advice.fix->files)
+    console.out << fmt::format("  made {} of {}\n", file.to, file.from);
   for (std::size_t i = 0; i < before.size(); ++i) {
     const std::string& path = advice.fix->settings[i].path;
     console.out << fmt::format("  {}: {} -> {}\n", path, before[i], valueAt(*setup, path, options.file));
@@ -95,8 +97,11 @@ std::string placeText(const PagePlace& place) {
 std::string adviceText(const Advice& advice, std::size_t number, const std::string& path) {
   std::string text =
       fmt::format("advice {}, {}: {} {}\n", number, placeText(advice.place), advice.doubt, advice.reason);
-  if (advice.fix)
+  if (advice.fix) {
     text += fmt::format("  fix: {} ({} fix {} {})\n", advice.fix->name, toolName(), shellText(path), number);
+  } else {
+    text += fmt::format("  to do: {}\n", advice.todo);
+  }
   return text;
 }
 
@@ -116,8 +121,12 @@ nlohmann::ordered_json adviceJson(const Advice& advice, std::size_t number) {
     nlohmann::ordered_json settings = nlohmann::ordered_json::array();
     for (const Setting& setting : advice.fix->settings)
       settings.push_back({{"path", setting.path}, {"value", setting.value}});
-    json["fix"] = {{"name", advice.fix->name}, {"settings", std::move(settings)}};
+    nlohmann::ordered_json files = nlohmann::ordered_json::array();
+    for (const AdviceFile& file : advice.fix->files) files.push_back({{"from", file.from}, {"to", file.to}});
+    json["fix"] = {
+        {"name", advice.fix->name}, {"settings", std::move(settings)}, {"files", std::move(files)}};
   }
+  json["todo"] = advice.todo;
   return json;
 }
 

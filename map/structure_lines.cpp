@@ -8,6 +8,7 @@
 #include <utility>
 
 #include "map/map_areas.h"
+#include "setup/entry_removal.h"
 #include "structures/culvert.h"
 #include "structures/weir.h"
 
@@ -40,12 +41,6 @@ std::vector<MapPoint> pointsOf(const SharedArray<DikePoint>& dike) {
     for (const DikePoint& point : dike.block(block)) points.push_back({point.x, point.y});
   }
   return points;
-}
-
-template <class List>
-void removeFrom(List& list, int number) {
-  for (int next = number; next < list.GetCount(); ++next) list.at(next).AssignState(list.at(next + 1));
-  list.SetCount(list.GetCount() - 1);
 }
 
 std::ptrdiff_t at(std::size_t vertex) {
@@ -169,9 +164,9 @@ void removeStructurePoint(CGlobalKvs& root, MapKind kind, int number, std::size_
 }
 
 void removeStructure(CGlobalKvs& root, MapKind kind, int number) {
-  if (kind == MapKind::dike) removeFrom(*root.nhdDike, number);
-  if (kind == MapKind::weir) removeFrom(*root.nhdWeir, number);
-  if (kind == MapKind::culvert) removeFrom(*root.nhdCulvert, number);
+  if (kind == MapKind::dike) removeEntry(*root.nhdDike, number);
+  if (kind == MapKind::weir) removeEntry(*root.nhdWeir, number);
+  if (kind == MapKind::culvert) removeEntry(*root.nhdCulvert, number);
 }
 
 void StructureLines::place(Known& known, const std::vector<MapPoint>& own, MapCoordinates& coordinates) {

@@ -98,8 +98,16 @@ class Editor final : public SetupEditor {
   bool makeFix(const Advice& advice) override {
     if (!advice.fix) return false;
     const bool isMade = document_.Attempt([this, &fix = *advice.fix] {
-      if (const Outcome made = gridbay::makeFix(document_.root(), fix, document_.path()); !made)
-        throw std::runtime_error(made.error());
+      Outcome made;
+      const auto make = [&](const Progress& progress) {
+        made = gridbay::makeFix(document_.root(), fix, document_.path(), progress);
+      };
+      if (fix.files.empty()) {
+        make({});
+      } else {
+        document_.host().doLongWork(fix.name, make);
+      }
+      if (!made) throw std::runtime_error(made.error());
     });
     if (!isMade) return false;
     document_.Touch(advice.place.page);

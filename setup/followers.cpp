@@ -76,6 +76,7 @@
 #include "mud_transport_expanded/task_selection.h"
 #include "mud_transport_expanded/transition.h"
 #include "mud_transport_expanded/var_friction_coef.h"
+#include "setup/entry_removal.h"
 #include "setup/global_kvs.h"
 
 namespace gridbay {
@@ -278,6 +279,24 @@ constexpr LeaderRow kLeaders[] = {
 };
 
 }  // namespace
+
+void removeBoundary(CGlobalKvs& root, int number) {
+  moveUp(*root.nhdBoundary, number);
+  moveUp(*root.nadBoundary, number);
+  moveUp(*root.nmtBoundary, number);
+  moveUp(*root.nmtExpBoundary, number);
+  moveUp(*root.wqsAdBoundary, number);
+  removeEntry(*root.boundary, number);
+}
+
+void removeSource(CGlobalKvs& root, int number) {
+  moveUp(*root.nhdSourceSink, number);
+  moveUp(*root.nadSourceSink, number);
+  moveUp(*root.nmtSourceSink, number);
+  moveUp(*root.nmtExpSources, number);
+  moveUp(*root.wqsAdSourceSink, number);
+  removeEntry(*root.sourceSink, number);
+}
 
 void CGlobalKvs::TellFollowers(const CKvsBase& leader, std::span<const int> counts) {
   for (const LeaderRow& row : kLeaders) {

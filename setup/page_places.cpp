@@ -6,7 +6,9 @@
 #include <array>
 #include <cstdlib>
 #include <map>
+#include <span>
 
+#include "advection_dispersion/texts.h"
 #include "basic/texts.h"
 #include "ecology/texts.h"
 #include "families/result_texts.h"
@@ -186,11 +188,19 @@ constexpr PageRow kPages[] = {
     {PageId::ecoResults, "BIO_RIG_MODULE"},
 };
 
-// The field that a text speaks of: the label of a control, or the header of a column where an entry is known.
+// Pages on which a text means another field than on others.
+constexpr PageId kResultPages[] = {PageId::hdResult, PageId::adResult, PageId::mtResult, PageId::mtExpResult,
+                                   PageId::ecoResults};
+constexpr PageId kLinePages[] = {PageId::adLineDischarge, PageId::adBoxSummation, PageId::mtLineDischarge,
+                                 PageId::mtBoxSummation, PageId::mtExpLineDischarge};
+
+// The field that a text speaks of: the label of a control, or the header of a column where an entry is known;
+// on some pages, or on all. Of several rows that fit the first one holds.
 struct FieldRow {
   const Text& text;
   std::string_view field;
   int number = 1;
+  std::span<const PageId> pages = {};
 };
 
 constexpr FieldRow kFields[] = {
@@ -200,10 +210,14 @@ constexpr FieldRow kFields[] = {
     {texts::negativeTimeSteps, "Last:"},
     {texts::negativeWarmUp, "Last:", 2},
     {texts::warmUpTooLong, "Last:", 2},
+    {texts::bathymetryCount, "Number of areas"},
+    {texts::landBelowZero, "Bathymetry"},
     {texts::outerNotValid, "Enclosing Area"},
+    {texts::nestRatio, "Bathymetry"},
+    {texts::nestJextr, "Bathymetry"},
+    {texts::nestKextr, "Bathymetry"},
     {texts::nestPosition, "Origin"},
-    {texts::firstPointNegative, "First point"},
-    {texts::lastPointNegative, "Last point"},
+    {texts::overlap, "Origin"},
     {texts::lineNotParallel, "Last point"},
     {texts::sourceNoArea, "Source"},
     {texts::sourceOutside, "Source"},
@@ -213,12 +227,59 @@ constexpr FieldRow kFields[] = {
     {texts::sinkOutside, "Sink"},
     {texts::sinkCovered, "Sink"},
     {texts::sinkOnLand, "Sink"},
+
+    {texts::infiltrationFileNotValid, "Data file:"},
+    {texts::surfaceElevationType, "Given as:"},
+    {texts::negativeEddyViscosity, "Viscosity"},
+    {texts::negativeResistance, "Constant"},
+    {texts::waveHeightLimitNotPositive, "Wave height/depth limit:"},
+    {texts::updateFrequencyNotPositive, "Update frequency:"},
+    {texts::updateFrequencyTooHigh, "Update frequency:"},
     {texts::negativeWindSpeed, "Speed:"},
+
+    {texts::resultFileNotValid, "Data File"},
+    {texts::associatedAreaMissing, "Area"},
+    {texts::gridPointOutOfRange, "J", 1, kResultPages},
+    {texts::gridPointOutOfRange, "Last", 1, kLinePages},
+    {texts::firstPointNegative, "J", 1, kResultPages},
+    {texts::firstPointNegative, "First", 1, kLinePages},
+    {texts::firstPointNegative, "First point"},
+    {texts::lastPointNegative, "Last point"},
+    {texts::firstPointBehindLast, "J", 1, kResultPages},
+    {texts::firstPointBehindLast, "Last", 1, kLinePages},
+    {texts::intervalTooSmall, "J"},
+    {texts::firstTimeStepNegative, "Time", 1, kResultPages},
+    {texts::firstTimeStepNegative, "Period", 1, kLinePages},
     {texts::firstTimeStepNegative, "First:"},
+    {texts::firstTimeStepAfterLast, "Time", 1, kResultPages},
+    {texts::firstTimeStepAfterLast, "Period", 1, kLinePages},
     {texts::firstTimeStepAfterLast, "First:"},
+    {texts::lastTimeStepOutOfRange, "Time", 1, kResultPages},
+    {texts::lastTimeStepOutOfRange, "Period", 1, kLinePages},
     {texts::lastTimeStepOutOfRange, "Last:"},
+    {texts::timeStepIntervalTooSmall, "Time"},
+    {texts::wrongDimensionOfFile, "Data File"},
+    {texts::outputCount, "Number of Output Areas"},
+    {texts::lineWithoutArea, "Area"},
+    {texts::boxWithoutArea, "Area"},
+    {texts::lineCount, "Number of Lines"},
+    {texts::boxCount, "Number of Boxes"},
+    {texts::invalidPolygon, "Associated polygon"},
+    {texts::timeRangeOutOfRange, "TRange"},
+    {texts::noItemSelected, "Items..."},
+    {texts::noOutputFile, "Filename"},
+
     {texts::tooMuchDispersion, "Proportionality factor in x- direction:"},
     {texts::maximumBelowMinimum, "Max. value:"},
+    {texts::wrongComponentType, "Type"},
+    {texts::componentCount, "Number of Components"},
+    {texts::oneHeatExchange, "Components"},
+    {texts::hotStartTypeNotValid, "Hot Start File"},
+    {texts::nothingVaries, "Given as"},
+    {texts::sameFeedbackItem, "Varying"},
+    {texts::invalidSalinity, "Varying"},
+    {texts::invalidTemperature, "Varying", 2},
+
     {texts::noModelDefinition, "File"},
     {texts::invalidUpdateFrequency, "Update Frequency"},
 };
@@ -261,11 +322,19 @@ std::string inWords(const std::array<std::string_view, 2>& words, const std::vec
   return thing;
 }
 
-// Of a page whose entries are columns the number leads to one.
-void layAcross(PagePlace& place) {
+// Of a page whose entries are columns the number leads to one; in it to a row, from 1, where that is known.
+void layAcross(PagePlace& place, int row = 0) {
   if (place.page != PageId::massBudget || place.entries.empty()) return;
   place.column = place.entries.front().number;
   place.entries.clear();
+  if (row > 0) place.entries = {{row, 0}};
+}
+
+// The rows of a mass budget's polygon: its area, the number of corners, the corners.
+int rowOfPolygon(std::string_view text) {
+  if (text == texts::invalidAssociatedArea.format) return 1;
+  if (text == texts::tooFewCorners.format) return 2;
+  return text == texts::pointOutsideGrid.format ? 3 : 0;
 }
 
 PagePlace placeOfKeyword(std::string path, const std::vector<ListEntry>& entries) {
@@ -332,8 +401,11 @@ std::string thingOf(PageId page, const std::vector<ListEntry>& entries) {
 PagePlace placeOfMessage(const CMessage& message) {
   PagePlace place{
       .page = message.page, .thing = thingOf(message.page, message.entries), .entries = message.entries};
-  const auto* field = std::ranges::find_if(
-      kFields, [&](const FieldRow& each) { return firstOf(message.text, each.text.format).has_value(); });
+  const auto* field = std::ranges::find_if(kFields, [&](const FieldRow& each) {
+    const bool isOnPage =
+        each.pages.empty() || std::ranges::find(each.pages, message.page) != each.pages.end();
+    return isOnPage && firstOf(message.text, each.text.format).has_value();
+  });
   if (field != std::end(kFields)) {
     place.field = field->field;
     place.fieldNumber = field->number;
@@ -342,7 +414,7 @@ PagePlace placeOfMessage(const CMessage& message) {
        {texts::dataFileNotValid, texts::waveOrGrainFileNotValid, texts::resultFileNotValid}) {
     if (const std::optional<std::string> name = firstOf(message.text, text.format)) place.value = *name;
   }
-  layAcross(place);
+  layAcross(place, rowOfPolygon(message.text));
   return place;
 }
 

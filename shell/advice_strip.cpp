@@ -9,7 +9,8 @@
 namespace gridbay::shell {
 
 QString adviceTip(const Advice& advice) {
-  return QString::fromStdString(advice.doubt + "\n" + advice.reason);
+  return QString::fromStdString(advice.doubt + "\n" + advice.reason +
+                                (advice.todo.empty() ? "" : "\n" + advice.todo));
 }
 
 AdviceStrip::AdviceStrip(QWidget* parent) : QFrame(parent), lines_(new QVBoxLayout(this)) {
@@ -45,7 +46,8 @@ void AdviceStrip::addLine(const Advice& advice, int place) {
   show->setAutoRaise(true);
   show->setToolTip(tr("Go to what it speaks of"));
   show->setAccessibleName(show->toolTip());
-  auto* text = new QLabel(QString::fromStdString(advice.doubt), line);
+  const std::string whole = advice.doubt + (advice.todo.empty() ? "" : " " + advice.todo);
+  auto* text = new QLabel(QString::fromStdString(whole), line);
   text->setTextFormat(Qt::PlainText);
   text->setWordWrap(true);
   text->setToolTip(adviceTip(advice));

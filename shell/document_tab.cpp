@@ -313,17 +313,19 @@ void DocumentTab::showAdvice() {
   emit advised();
 }
 
+// The setup and its files may be others since the advice was given: it is worked out anew, and made where it
+// still does what was offered.
 void DocumentTab::fixAdvice(std::size_t place) {
-  if (place >= advice_.size()) return;
+  if (place >= advice_.size() || !advice_[place].fix) return;
   Advice wanted = advice_[place];
   commit();
-  if (adviceTimer_.isActive()) {  // the setup is another one since
-    lookForAdvice();
-    const auto now = std::ranges::find_if(
-        advice_, [&](const Advice& each) { return each.kind == wanted.kind && each.place == wanted.place; });
-    if (now == advice_.end()) return;
-    wanted = *now;
-  }
+  lookForAdvice();
+  const auto now = std::ranges::find_if(advice_, [&](const Advice& each) {
+    return each.kind == wanted.kind && each.place == wanted.place && each.fix &&
+           each.fix->name == wanted.fix->name;
+  });
+  if (now == advice_.end()) return;
+  wanted = *now;
   if (!editor_->makeFix(wanted)) return;
   editor_->refreshPage();
   pane_->refresh();

@@ -420,11 +420,16 @@ void GridView::currentChanged(const QModelIndex& current, const QModelIndex& pre
   emit cellChosen();
 }
 
-bool GridView::goTo(const PagePlace& place) {
-  const int row = rowOf(place.entries);
-  const int column = row < 0 ? -1 : columnOf(place, row);
-  if (column < 0) return false;
-  goToCell(row, column);
+bool GridView::goTo(const PagePlace& place, bool exactly) {
+  const auto [first, count] = rowsOf(place.entries);
+  for (int row = first; row < first + count; ++row) {
+    if (const int column = columnOf(place, row); column >= 0) {
+      goToCell(row, column);
+      return true;
+    }
+  }
+  if (exactly || count == 0 || model_->columnCount() == 0) return false;
+  goToCell(first, std::max(currentIndex().column(), 0));
   return true;
 }
 
@@ -436,13 +441,13 @@ void GridView::goToCell(int row, int column) {
 }
 
 // An entry may have several rows, and a title above them.
-int GridView::rowOf(const std::vector<ListEntry>& entries) const {
+GridView::Rows GridView::rowsOf(const std::vector<ListEntry>& entries) const {
   int first = model_->headerRows();
-  int rows = model_->rowCount() - first;
+  int rows = std::max(model_->rowCount() - first, 0);
   const auto isTitle = [this](int row) { return model_->style(model_->index(row, 0)).isHeading; };
   for (const auto& [number, count] : entries) {
     const int each = std::max(count > 0 ? rows / count : 1, 1);
-    if (number < 1 || (number - 1) * each >= rows) return -1;
+    if (number < 1 || (number - 1) * each >= rows) return {};
     first += (number - 1) * each;
     rows = each;
     while (rows > 1 && isTitle(first)) {
@@ -450,11 +455,14 @@ int GridView::rowOf(const std::vector<ListEntry>& entries) const {
       --rows;
     }
   }
-  return rows > 0 ? first : -1;
+  return {first, rows};
 }
 
+// The column that a place names, by its header or what stands in it; -1 where the row has none.
 int GridView::columnOf(const PagePlace& place, int row) const {
   if (place.column > 0) return place.column <= model_->columnCount() ? place.column - 1 : -1;
+  if (place.field.empty() && place.value.empty())
+    return model_->columnCount() == 0 ? -1 : std::max(currentIndex().column(), 0);
   int number = place.fieldNumber;
   for (int column = 0; column < model_->columnCount(); ++column) {
     if (isColumnHidden(column)) continue;
@@ -462,7 +470,7 @@ int GridView::columnOf(const PagePlace& place, int row) const {
     if (!place.field.empty() && header == QString::fromStdString(place.field) && --number == 0) return column;
     if (!place.value.empty() && model_->style(model_->index(row, column)).value == place.value) return column;
   }
-  return model_->columnCount() == 0 ? -1 : std::max(currentIndex().column(), 0);
+  return -1;
 }
 
 // To come here by Tab makes a cell the current one, and opens none. The focus that a closed editor gives back

@@ -23,7 +23,8 @@ class GridView final : public QTableView {
   void setStretches(bool stretches);
   GridModel& cells() { return *model_; }
   // Makes the cell at a place of the page the current one, and opens no editor; false where there is none.
-  bool goTo(const PagePlace& place);
+  // Where it is not there and need not be found exactly, one of its row will do.
+  bool goTo(const PagePlace& place, bool exactly);
   // Makes a cell of the table itself (from 0, headers counted) the current one, and opens none.
   void goToCell(int row, int column);
   // Hands over what is typed in a cell and not yet entered.
@@ -66,8 +67,12 @@ class GridView final : public QTableView {
     bool isUserSized = false;
   };
 
-  // From 0; below 0 for none.
-  int rowOf(const std::vector<ListEntry>& entries) const;
+  // From 0; none where there are no such entries.
+  struct Rows {
+    int first = 0;
+    int count = 0;
+  };
+  Rows rowsOf(const std::vector<ListEntry>& entries) const;
   int columnOf(const PagePlace& place, int row) const;
   void layOutGrid();
   void followCurrentRow();

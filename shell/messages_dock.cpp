@@ -127,15 +127,20 @@ void MessagesDock::addAdvice(const Advice& advice, int place) {
   showPlace(*item, advice.place);
   item->setIcon(0, toolIcon(Tool::advice));
   item->setToolTip(0, adviceTip(advice));
-  if (!advice.fix) return;
   auto* button = new QToolButton(list_);
-  button->setText(tr("Fix"));
-  button->setToolTip(QString::fromStdString(advice.fix->name));
+  button->setText(advice.fix ? tr("Fix") : tr("Show"));
+  button->setToolTip(QString::fromStdString(advice.fix ? advice.fix->name : advice.todo));
   button->setAutoRaise(true);
   list_->setItemWidget(item, kFixColumn, button);
   // Not at once: the button goes with the list that the fix changes.
-  connect(
-      button, &QToolButton::clicked, this, [this, place] { emit fixWanted(place); }, Qt::QueuedConnection);
+  const auto pressed = [this, place, isFix = advice.fix.has_value()] {
+    if (isFix) {
+      emit fixWanted(place);
+    } else if (tab_ != nullptr && place < static_cast<int>(tab_->advice().size())) {
+      emit placeChosen(PagePlace(tab_->advice()[static_cast<std::size_t>(place)].place));
+    }
+  };
+  connect(button, &QToolButton::clicked, this, pressed, Qt::QueuedConnection);
 }
 
 void MessagesDock::mark() {

@@ -263,13 +263,17 @@ QWidget* PagePane::goTo(const PagePlace& place) {
   return found;
 }
 
-// A control of the label, or else one that holds the value; of a place in a table that table.
+// Of a place in a table the table that has its cell, or else its row; a control of the label, or else one
+// that holds the value.
 QWidget* PagePane::widgetAt(const PagePlace& place) const {
-  for (const Part& part : parts_) {
-    if (place.isInTable() && part.grid != nullptr && part.control->visible && part.grid->goTo(place))
-      return part.grid;
+  for (const bool exactly : {true, false}) {
+    for (const Part& part : parts_) {
+      if (place.isInTable() && part.grid != nullptr && part.control->visible &&
+          part.grid->goTo(place, exactly))
+        return part.grid;
+    }
   }
-  if (place.isInTable()) return nullptr;
+  if (place.isInTable() && place.field.empty()) return nullptr;
   if (!place.field.empty()) return widgetOf(QString::fromStdString(place.field), place.fieldNumber);
   const auto holds = [&](const Part& part) {
     return part.field != nullptr && part.control->visible && part.control->text == place.value;

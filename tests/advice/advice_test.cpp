@@ -9,6 +9,7 @@
 #include <set>
 
 #include "advection_dispersion/boundary.h"
+#include "advection_dispersion/source_sink.h"
 #include "advice/advisor.h"
 #include "advice/rules.h"
 #include "basic/area_description.h"
@@ -18,20 +19,27 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "core/edition.h"
+#include "ecology/boundary.h"
 #include "ecology/precipitation.h"
+#include "ecology/source_sink.h"
 #include "hydrodynamic/boundary.h"
 #include "hydrodynamic/infiltration.h"
 #include "hydrodynamic/resistance.h"
 #include "hydrodynamic/result.h"
 #include "hydrodynamic/source_sink.h"
+#include "mud_transport/boundary.h"
+#include "mud_transport/source_sink.h"
 #include "mud_transport/task_selection.h"
 #include "mud_transport/wave_data.h"
+#include "mud_transport_expanded/boundary.h"
 #include "mud_transport_expanded/forcings.h"
 #include "mud_transport_expanded/sources.h"
 #include "mud_transport_expanded/waves.h"
 #include "platform/cartography/cartography.h"
+#include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_writer.h"
 #include "setup/dlg_enumerator.h"
+#include "setup/edit_history.h"
 #include "structures/culvert.h"
 #include "structures/dike.h"
 #include "structures/weir.h"
@@ -44,6 +52,7 @@ namespace gridbay {
 namespace advice_advice_test {
 
 using ::testing::HasSubstr;
+using ::testing::StartsWith;
 
 // A sea in the west and land in the east, with a finer area of sea at point (6,6).
 class AdviceTest : public ::testing::Test {
@@ -153,7 +162,40 @@ class AdviceTest : public ::testing::Test {
     std::string fix;  // its name; empty where there is none
     std::function<void()> edit;
   };
-  // Each case has one advice, whose fix mends it.
+  std::string saved() {
+    const KvsHandle file = kvsCreate();
+    model->Save(*file, path);
+    return *file->text();
+  }
+
+  // The fix leaves no advice, is one step whose undo brings the exact state back, and is the same on the
+  // file.
+  void mends(const Advice& advice) {
+    const std::string before = saved();
+    CGlobalKvs state;
+    state.AssignState(*model);
+    EditHistory history;
+    history.start(*model, {});
+    const Outcome made = makeFix(*model, *advice.fix, path);
+    ASSERT_TRUE(made) << made.error();
+    for (const Advice& left : look()) ADD_FAILURE() << left.kind << ": " << left.doubt;
+    EXPECT_TRUE(history.record(*model, advice.place.page, advice.fix->name, false, {}));
+    const std::string mended = saved();
+    EditHistory::Touched touched;
+    history.undo(*model, touched);
+    EXPECT_TRUE(model->SameState(state));
+    EXPECT_EQ(history.undoStep(), nullptr);
+    for (const AdviceFile& file : advice.fix->files) EXPECT_TRUE(std::filesystem::remove(file.to));
+    if (!fixesByTool) return;
+    folder.write("setup.v27", before);
+    const test::ProgramRun run = test::runTool({"fix", path, "1"});
+    EXPECT_EQ(run.status, 0) << run.err;
+    EXPECT_THAT(run.out, StartsWith(advice.fix->name + "\n"));
+    EXPECT_EQ(test::textOf(folder.file("setup.v27")), mended);
+    for (const AdviceFile& file : advice.fix->files) EXPECT_TRUE(std::filesystem::remove(file.to));
+  }
+
+  // Each case has one advice, whose fix mends it, or which says what is to be done.
   void speaks(const std::vector<Speaks>& cases) {
     for (const Speaks& each : cases) {
       SCOPED_TRACE(each.doubt);
@@ -169,10 +211,8 @@ class AdviceTest : public ::testing::Test {
       EXPECT_FALSE(advice.reason.empty());
       EXPECT_NE(CDlgEnumerator().GetCaption(static_cast<std::int32_t>(advice.place.page)), "");
       EXPECT_EQ(advice.fix ? advice.fix->name : "", each.fix);
-      if (!advice.fix || theEdition.wetlandSweepKit) continue;
-      const Outcome made = makeFix(*model, *advice.fix, path);
-      ASSERT_TRUE(made) << made.error();
-      for (const Advice& left : look()) ADD_FAILURE() << left.kind << ": " << left.doubt;
+      EXPECT_EQ(advice.todo.empty(), advice.fix.has_value());
+      if (advice.fix && !theEdition.wetlandSweepKit) mends(advice);
     }
   }
   void isSilent(const std::vector<std::function<void()>>& edits) {
@@ -189,6 +229,7 @@ class AdviceTest : public ::testing::Test {
   std::unique_ptr<CGlobalKvs> model;
   Advisor advisor;
   mutable bool areFilesClean = false;
+  bool fixesByTool = true;
 };
 
 TEST_F(AdviceTest, OnANewOrCleanSetupThereIsNone) {
@@ -231,6 +272,12 @@ TEST_F(AdviceTest, AreasAndTheirFiles) {
        [=] { moved(15); }},
       {"area-position", "it belongs at (-45,6), 4590 m away. There it does not lie inside area 1.", "",
        [=] { moved(-51 * 90); }},
+      {"area-position", "There it does not lie inside area 2.", "Move area 3 into area 1",
+       [this] {
+         write({"third.tsb2", 10, 30, kInner + 6 * 90, kInnerNorth}, sea);
+         model->bathymetry->SetNoAreas(3);
+         model->bathymetry->GetArea(3)->fileName = folder.file("third.tsb2");
+       }},
       {"projection", "There is no projection \"UTM-99\".", "Projection of area 1", [=] { own("UTM-99"); }},
       {"projection", "The setup is in WGS 84 / UTM zone 33N, the file of area 1 in WGS 84 / UTM zone 32N.",
        "Projection of area 1", [=] { own("UTM-33"); }},
@@ -337,10 +384,11 @@ TEST_F(AdviceTest, WhatIsPlaced) {
   speaks({
       {"boundary", "Boundary 1 from (0,0) to (0,40) goes beyond area 1, whose last point is (30,30).",
        "Boundary 1 from (0,0) to (0,30)", [=] { boundary(1, 0, 0, 0, 40); }},
-      {"boundary", "Boundary 1 is a single point, (0,4).", "", [=] { boundary(1, 0, 4, 0, 4); }},
-      {"boundary", "Boundary 1 from (5,0) to (5,30) does not lie on the border of area 1.", "",
-       [=] { boundary(1, 5, 0, 5, 30); }},
-      {"boundary", "Boundary 1 from (30,0) to (30,30) lies wholly on land.", "",
+      {"boundary", "Boundary 1 is a single point, (0,4).", "Boundary 1 from (0,0) to (0,30)",
+       [=] { boundary(1, 0, 4, 0, 4); }},
+      {"boundary", "Boundary 1 from (5,0) to (5,30) does not lie on the border of area 1.",
+       "Boundary 1 from (0,0) to (0,30)", [=] { boundary(1, 5, 0, 5, 30); }},
+      {"boundary", "Boundary 1 from (30,0) to (30,30) lies wholly on land.", "Boundary 1 out",
        [=] { boundary(1, 30, 0, 30, 30); }},
       {"boundary", "Boundary 1 from (20,0) to (0,0) ends on land: 6 of its 21 points are land.",
        "Boundary 1 from (14,0) to (0,0)", [=] { boundary(1, 20, 0, 0, 0); }},
@@ -348,6 +396,21 @@ TEST_F(AdviceTest, WhatIsPlaced) {
        [=] {
          boundary(1, 0, 0, 0, 20);
          boundary(2, 0, 30, 0, 10);
+       }},
+      {"boundary", "Boundary 1 from (40,40) to (50,40) goes beyond area 1", "Boundary 1 out",
+       [=] { boundary(1, 40, 40, 50, 40); }},
+      {"boundary", "Boundary 1 from (0,0) to (40,30) goes beyond area 1", "",
+       [=] { boundary(1, 0, 0, 40, 30); }},
+      {"boundary", "Boundaries 1 and 2 have 6 points in common.", "Boundary 2 out",
+       [=] { boundary(2, 0, 5, 0, 10); }},
+      {"boundary", "Boundary 1 from (0,0) to (0,40) goes beyond area 1", "Boundary 1 from (0,0) to (0,30)",
+       [=, this] {
+         boundary(1, 0, 0, 0, 40);
+         model->boundary->defaultPosition = 1;  // found by the program in another grid
+       }},
+      {"source", "Source 1 at (30,5) lies on the edge of area 1.", "",
+       [=] {
+         source({30, 5});
        }},
       {"source", "Source 1 at (5,0) lies on the edge of area 1.", "Move source 1 to (5,1)",
        [=] {
@@ -364,7 +427,7 @@ TEST_F(AdviceTest, WhatIsPlaced) {
          pair.sink = {9, 3};
          pair.sinkArea = 2;
        }},
-      {"structure", "Weir 1 lies outside of all areas.", "",
+      {"structure", "Weir 1 lies outside of all areas.", "Weir 1 out",
        [this] {
          weir({400000, 400100}, {6100100, 6100200});
        }},
@@ -372,12 +435,28 @@ TEST_F(AdviceTest, WhatIsPlaced) {
        [this] {
          weir({480100, 480200, 480200, 480300}, {6100100, 6100200, 6100200, 6100200});
        }},
-      {"structure", "Weir 1 has 1 point.", "", [this] { weir({480100}, {6100100}); }},
+      {"structure", "Weir 1 lies outside of all areas.", "Projection of weir 1",
+       [this] {
+         weir({480100, 480200}, {6100100, 6100200}).coordinateType = "UTM-33";
+       }},
+      {"structure", "Points 1 and 2 of weir 1 are equal.", "Weir 1 out",
+       [this] {
+         weir({480100, 480100}, {6100100, 6100100});
+       }},
+      {"structure", "Culvert 1 lies outside of all areas.", "Culvert 1 out",
+       [this] {
+         model->nhdCulvert->SetCount(1);
+         CNhdCulvertObjectKvs& made = *model->nhdCulvert->GetItem(1);
+         made.coordinateType = "UTM-32";
+         made.x = {400000, 400100};
+         made.y = {6100100, 6100200};
+       }},
+      {"structure", "Weir 1 has 1 point.", "Weir 1 out", [this] { weir({480100}, {6100100}); }},
       {"structure", "Points 1 and 2 of dike 1 are equal.", "Point 2 of dike 1 out",
        [this] {
          dike({{480100, 6100100, 1}, {480100, 6100100, 2}, {480300, 6100100, 3}});
        }},
-      {"structure", "Dike 1 lies outside of all areas.", "",
+      {"structure", "Dike 1 lies outside of all areas.", "Dike 1 out of use",
        [this] {
          dike({{480100, 5100100, 1}, {480300, 5100100, 3}});
        }},
@@ -429,6 +508,55 @@ TEST_F(AdviceTest, TheEqualPointOfADikeGoesWithItsLevel) {
   EXPECT_EQ(std::as_const(made.points)[1].z, 3);
 }
 
+// What all modules say of the entries behind it stays with them.
+TEST_F(AdviceTest, AnEntryThatGoesTakesItsOwnAlong) {
+  const auto named = [](auto& list) {
+    for (int number = 1; number <= list.GetCount(); ++number) list.GetItem(number)->format = number;
+  };
+  const auto namesOf = [](auto& list) {
+    std::string names;
+    for (int number = 1; number <= list.GetCount(); ++number)
+      names += std::to_string(list.GetItem(number)->format);
+    return names;
+  };
+  const auto fill = [&](int count) {
+    model->boundary->SetNoBoundaries(count);
+    model->sourceSink->SetNoSources(count);
+    for (int number = 1; number <= count; ++number) {
+      model->boundary->GetItem(number)->Set(number, 0, number, 0);
+      model->sourceSink->GetItem(number)->source = {number, number};
+      model->nhdBoundary->GetItem(number)->value = static_cast<float>(number);
+    }
+    named(*model->nadBoundary);
+    named(*model->nmtBoundary);
+    named(*model->nmtExpBoundary);
+    named(*model->wqsAdBoundary);
+    named(*model->nadSourceSink);
+    named(*model->nmtSourceSink);
+    named(*model->nmtExpSources);
+    named(*model->wqsAdSourceSink);
+  };
+  fill(3);
+  using List = AdviceRemoval::List;
+  ASSERT_TRUE(makeFix(*model, {"Out", {}, {}, AdviceRemoval{List::boundary, 2}}, path));
+  ASSERT_EQ(model->boundary->GetCount(), 2);
+  EXPECT_EQ(model->boundary->GetItem(2)->first.j, 3);
+  EXPECT_FLOAT_EQ(model->nhdBoundary->GetItem(2)->value, 3);
+  EXPECT_EQ(namesOf(*model->nadBoundary) + namesOf(*model->nmtBoundary) + namesOf(*model->nmtExpBoundary) +
+                namesOf(*model->wqsAdBoundary),
+            "13131313");
+  ASSERT_TRUE(makeFix(*model, {"Out", {}, {}, AdviceRemoval{List::source, 1}}, path));
+  ASSERT_EQ(model->sourceSink->GetCount(), 2);
+  EXPECT_EQ(model->sourceSink->GetItem(1)->source, (GridPoint{2, 2}));
+  EXPECT_EQ(namesOf(*model->nadSourceSink) + namesOf(*model->nmtSourceSink) + namesOf(*model->nmtExpSources) +
+                namesOf(*model->wqsAdSourceSink),
+            "23232323");
+  model->nhdWeir->SetCount(3);
+  ASSERT_TRUE(makeFix(*model, {"Out", {}, {}, AdviceRemoval{List::weir, 2}}, path));
+  ASSERT_EQ(model->nhdWeir->GetCount(), 2);
+  EXPECT_EQ(model->nhdWeir->GetItem(2)->name, "Weir 3");
+}
+
 TEST_F(AdviceTest, Series) {
   const auto with = [](std::vector<float> values, std::size_t at, float value) {
     values[at] = value;
@@ -438,9 +566,12 @@ TEST_F(AdviceTest, Series) {
   speaks({
       {"series", "tide.tsb0 ends at 1990-01-01 13:30:00, in the run, which ends at 1990-01-01 14:00:00.",
        "End with the series", [=, this] { writeTide(smooth(10), start()); }},
-      {"series", "tide.tsb0 begins at 1990-01-01 12:10:00, after the run does at 1990-01-01 12:00:00.", "",
-       [=, this] { writeTide(smooth(kWhole), start().plusDays(10.0 / 1440)); }},
-      {"series", "\"Tide\" of", "", [=, this] { writeTide(with(smooth(kWhole), 4, -1e-35F), start()); }},
+      {"series", "tide.tsb0 begins at 1990-01-01 12:10:00, after the run does at 1990-01-01 12:00:00.",
+       "Begin with the series", [=, this] { writeTide(smooth(kWhole), start().plusDays(10.0 / 1440)); }},
+      {"series", "tide.tsb0 begins at 1990-01-03 12:00:00, after the run", "",
+       [=, this] { writeTide(smooth(kWhole), start().plusDays(2)); }},
+      {"series", "\"Tide\" of", "Fill the gaps, in tide_filled.tsb0",
+       [=, this] { writeTide(with(smooth(kWhole), 4, -1e-35F), start()); }},
       {"series", "jumps from", "", [=, this] { writeTide(with(smooth(30), 6, 9.0F), start()); }},
   });
   isSilent({
@@ -456,6 +587,29 @@ TEST_F(AdviceTest, Series) {
   ASSERT_EQ(found.size(), 1U);
   EXPECT_THAT(found[0].doubt, HasSubstr("has 2 missing values, the first at 1990-01-01 12:40:00."));
   EXPECT_EQ(found[0].place.thing, "boundary 1");
+  // A gap lies on the line between its neighbours.
+  ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
+  EXPECT_EQ(model->nhdBoundary->GetItem(1)->dataFile.fileName.text(), "tide_filled.tsb0");
+  const Result<TsbFile> filled = TsbFile::open(folder.file("tide_filled.tsb0"));
+  ASSERT_TRUE(filled) << filled.error();
+  std::vector<float> values(kWhole);
+  ASSERT_TRUE(filled->readSteps(1, 0, std::span(values)));
+  std::vector<float> expected = smooth(kWhole);
+  const float third = (expected[6] - expected[3]) / 3;
+  expected[4] = expected[3] + third;
+  expected[5] = expected[3] + 2 * third;
+  for (std::size_t i = 0; i < kWhole; ++i) EXPECT_NEAR(values[i], expected[i], 1e-6) << i;
+
+  // A later run takes what is written with it, and ends when it did.
+  clean();
+  writeTide(smooth(kWhole), start().plusDays(10.0 / 1440));
+  model->nhdResult->outputs.SetCount(1);
+  model->nhdResult->outputs.GetItem(1)->steps = {0, 360, 10};
+  const DateTime end = model->simulationPeriod->End();
+  ASSERT_TRUE(makeFix(*model, *look().at(0).fix, path));
+  EXPECT_EQ(dateTimeText(start()), "1990-01-01 12:10:00");
+  EXPECT_NEAR(model->simulationPeriod->End().linear(), end.linear(), 1e-9);
+  EXPECT_EQ(model->nhdResult->outputs.GetItem(1)->steps, (USubLine{0, 330, 10}));
 
   // A shorter run takes what is written with it.
   clean();
@@ -572,6 +726,30 @@ TEST_F(AdviceTest, NamesOfFiles) {
       {"file-name", "../fine.tsb2 lies outside of the setup's folder.", "",
        [this] { model->bathymetry->overlandFile = folder.path().parent_path().string() + "/fine.tsb2"; }},
   });
+  isSilent({[this] {
+    std::filesystem::create_directory(folder.file("sub"));
+    model->bathymetry->overlandFile = folder.file("sub/fine.tsb2");
+    model->nhdResult->outputs.SetCount(1);
+    model->nhdResult->outputs.GetItem(1)->file = folder.file("sub/out.tsb2");
+  }});
+  // A file is copied, under another name where there is another one of its own; a result is written there.
+  const test::TemporaryFolder elsewhere;
+  elsewhere.write("fine.tsb2", "fine");
+  const auto fine = [&] { model->bathymetry->overlandFile = elsewhere.file("fine.tsb2"); };
+  const std::string outside = "fine.tsb2 lies outside of the setup's folder.";
+  speaks({{"file-name", outside, "Copy fine.tsb2 into the setup's folder", fine}});
+  folder.write("fine.tsb2", "other");
+  speaks({{"file-name", outside, "Copy fine.tsb2 into the setup's folder as fine_2.tsb2", fine}});
+  folder.write("fine.tsb2", "fine");
+  speaks({{"file-name", outside, "Take fine.tsb2", fine}});
+  ASSERT_TRUE(makeFix(*model, {"Copy", {}, {{elsewhere.file("fine.tsb2"), folder.file("copy.tsb2")}}}, path));
+  EXPECT_EQ(test::textOf(folder.file("copy.tsb2")), "fine");
+  const auto result = [&] {
+    model->nhdResult->outputs.SetCount(1);
+    model->nhdResult->outputs.GetItem(1)->file = elsewhere.file("fine.tsb2");
+  };
+  speaks({{"file-name", outside, "Write fine_2.tsb2 in the setup's folder", result}});
+  std::filesystem::remove(beside);
   clean();
   test::writeGrid(beside);
   model->bathymetry->overlandFile = "/elsewhere/fine.tsb2";
@@ -608,6 +786,7 @@ TEST_F(AdviceTest, OutputsLargerThanTheDisk) {
     output.part = {{0, 999, 1}, {0, 999, 1}};
     output.steps = {0, 360, 1};
   };
+  fixesByTool = false;  // which asks the disk itself
   big();
   const double size = model->nhdResult->TotalSizeMB();
   ASSERT_GT(size, 1000);
@@ -678,6 +857,26 @@ TEST_F(AdviceTest, AFixIsMadeWholeOrNotAtAll) {
   ASSERT_FALSE(made);
   EXPECT_THAT(made.error(), HasSubstr("NESTED_MODEL_GLOBALS/NONE"));
   EXPECT_FLOAT_EQ(model->areaDescription->dryingDepth, 0.02F);
+  // So with its files: one that is there stays as it is, and one that was made goes.
+  const auto file = [this](const char* name) { return folder.file(name); };
+  folder.write("a", "a");
+  folder.write("there", "there");
+  const auto errorOf = [&](std::vector<AdviceFile> files, std::vector<Setting> settings = {}) {
+    const Outcome refused = makeFix(*model, {"Files", std::move(settings), std::move(files)}, path);
+    return refused ? std::string() : refused.error();
+  };
+  EXPECT_EQ(errorOf({{file("a"), file("b")}, {file("a"), file("there")}}),
+            "There is a file " + file("there") + " already");
+  EXPECT_EQ(errorOf({{file("a"), file("b")}, {file("none"), file("c")}}), file("none") + " can't be read");
+  EXPECT_THAT(errorOf({{file("a"), file("b"), true}}), HasSubstr("a"));
+  EXPECT_NE(errorOf({{file("a"), file("b")}}, {{"NESTED_MODEL_GLOBALS/NONE", "1"}}), "");
+  EXPECT_FALSE(std::filesystem::exists(file("b")));
+  EXPECT_EQ(test::textOf(folder.file("there")), "there");
+  const Outcome stopped =
+      makeFix(*model, {"Files", {}, {{file("a"), file("b")}}}, path, [](double) { return false; });
+  ASSERT_FALSE(stopped);
+  EXPECT_EQ(stopped.error(), "The fix was stopped");
+  EXPECT_FALSE(std::filesystem::exists(file("b")));
 }
 
 TEST_F(AdviceTest, OfALargeGridBlocksAreKept) {

@@ -44,8 +44,24 @@ TEST(PagePlaces, AMessageLeadsToItsThingAndField) {
        "",
        1,
        "d"},
-      {{PageId::hdResult, "Filename: a.tsb2 is not valid", {}, {{1, 1}}}, "output 1", "", 1, "a.tsb2"},
+      {{PageId::hdResult, "Filename: a.tsb2 is not valid", {}, {{1, 1}}},
+       "output 1",
+       "Data File",
+       1,
+       "a.tsb2"},
       {{PageId::moduleSelection, "?"}, "", "", 1, ""},
+      // One text speaks of other fields on other pages.
+      {{PageId::boundary, "First point coordinates can not be negative", {}, second},
+       "boundary 2",
+       "First point",
+       1,
+       ""},
+      {{PageId::adResult, "First point coordinates can not be negative", {}, second}, "output 2", "J", 1, ""},
+      {{PageId::adLineDischarge, "First point coordinates can not be negative", {}, second},
+       "line 2",
+       "First",
+       1,
+       ""},
   };
   for (const Case& each : cases) {
     SCOPED_TRACE(each.message.text);
@@ -62,6 +78,10 @@ TEST(PagePlaces, AMessageLeadsToItsThingAndField) {
   EXPECT_EQ(polygon.thing, "polygon 2");
   EXPECT_EQ(polygon.column, 2);
   EXPECT_TRUE(polygon.entries.empty());
+  const PagePlace corner =
+      placeOfMessage({PageId::massBudget, "Point is outside of grid", Severity::fault, second});
+  EXPECT_EQ(corner.column, 2);
+  EXPECT_EQ(corner.entries, (std::vector<ListEntry>{{3, 0}}));
 }
 
 TEST(PagePlaces, EachKeywordHasItsPageAndEntry) {

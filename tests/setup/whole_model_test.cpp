@@ -7,16 +7,25 @@
 #include <algorithm>
 #include <filesystem>
 #include <map>
+#include <regex>
 #include <set>
+#include <sstream>
 #include <tuple>
 
+#include "advection_dispersion/texts.h"
 #include "basic/bathymetry.h"
 #include "basic/module_selection.h"
+#include "basic/texts.h"
 #include "core/edition.h"
 #include "ecology/model_definition.h"
+#include "families/result_texts.h"
+#include "families/texts.h"
+#include "families/transport_texts.h"
+#include "hydrodynamic/texts.h"
 #include "pages/scan.h"
 #include "setup/dlg_enumerator.h"
 #include "setup/navigation_tree.h"
+#include "setup/page_places.h"
 #include "tests/support/grids.h"
 #include "tests/support/model.h"
 #include "tests/support/pages.h"
@@ -147,6 +156,105 @@ class AskedHost : public test::TestHost {
   }
   std::set<std::string> asked;
 };
+
+CellStyle cellOf(CV27SetupGridWnd& grid, int row, int col) {
+  CellStyle style;
+  grid.GetStyleRowCol(row, col, style);
+  return style;
+}
+
+// The rows of an entry, as a table finds them: the first one, and behind the last one.
+std::pair<int, int> rowsOf(CV27SetupGridWnd& grid, const std::vector<ListEntry>& entries) {
+  int first = 1;
+  while (first <= grid.GetRowCount() && cellOf(grid, first, 1).isHeader) ++first;
+  int rows = grid.GetRowCount() - first + 1;
+  for (const auto& [number, count] : entries) {
+    const int each = std::max(count > 0 ? rows / count : 1, 1);
+    if (number < 1 || (number - 1) * each >= rows) return {0, 0};
+    first += (number - 1) * each;
+    rows = each;
+    while (rows > 1 && cellOf(grid, first, 1).isHeading) {
+      ++first;
+      --rows;
+    }
+  }
+  return {first, first + rows};
+}
+
+// Whether a table has the place: its row, and a column with the header or the value that it names.
+bool isIn(CV27SetupGridWnd& grid, const PagePlace& place) {
+  const auto [first, end] = rowsOf(grid, place.entries);
+  if (first == end || place.column > grid.GetColCount()) return false;
+  if (place.column > 0 || (place.field.empty() && place.value.empty())) return true;
+  for (int row = first; row < end; ++row) {
+    for (int col = 1; col <= grid.GetColCount(); ++col) {
+      if (!place.field.empty() && grid.GetColHeader(col) == place.field) return true;
+      if (!place.value.empty() && cellOf(grid, row, col).value == place.value) return true;
+    }
+  }
+  return false;
+}
+
+std::string labelsOf(Form& form) {
+  std::string labels;
+  for (const Control& control : form.controls()) {
+    labels += "\n    " + control.label + (control.visible ? "" : " (hidden)");
+    if (control.grid == nullptr) continue;
+    labels += ", " + std::to_string(control.grid->GetRowCount()) + " rows:";
+    for (int col = 1; col <= control.grid->GetColCount(); ++col)
+      labels += " [" + control.grid->GetColHeader(col) + "]";
+  }
+  return labels;
+}
+
+// What is wrong with a place on its page; empty where it leads to something.
+std::string faultOf(Form& form, const PagePlace& place) {
+  for (const Control& control : form.controls()) {
+    if (place.isInTable() && control.grid != nullptr && control.visible && isIn(*control.grid, place))
+      return {};
+  }
+  if (place.field.empty() && place.value.empty())
+    return place.isInTable() ? "no table has its row" : "leads to the page alone";
+  // A file that the page shows once its layer is chosen: the row of that.
+  const auto hasRow = [&](const Control& control) {
+    return control.grid != nullptr && control.visible && isIn(*control.grid, {.entries = place.entries});
+  };
+  if (place.isInTable() && place.field.empty() && std::ranges::any_of(form.controls(), hasRow)) return {};
+  int number = place.fieldNumber;
+  for (const Control& control : form.controls()) {
+    if (!place.field.empty() ? control.label == place.field && --number == 0
+                             : control.isEdit() && control.visible && control.text == place.value)
+      return {};
+  }
+  return "there is no such field";
+}
+
+// A setup's text with other values in all keywords but those that shape it.
+std::string withValues(const std::string& text, const std::string& number, const std::string& file) {
+  static const std::regex kShape(
+      "No_?Of|Number|Count|Format|Type|Description|Include|Enable|Version|SCHEME|Module|Simulation|Layers|"
+      "Fractions|Dynamic|Hot_?Start|Select|Area|Component",
+      std::regex::icase);
+  static const std::regex kLine("( *)([A-Za-z0-9_]+) (.*)");
+  std::istringstream lines(text);
+  std::string out;
+  for (std::string line; std::getline(lines, line);) {
+    std::smatch parts;
+    if (std::regex_match(line, parts, kLine) && !std::regex_search(parts[2].first, parts[2].second, kShape)) {
+      const std::string values = parts[3];
+      if (values.find("(file)") != values.npos || values.find("(result)") != values.npos) {
+        if (file != "as it is")
+          line =
+              parts[1].str() + parts[2].str() + " " + values.substr(0, values.find('"')) + '"' + file + '"';
+      } else if (!number.empty() && std::regex_match(values, std::regex("-?[0-9][-0-9.eE+ ]*"))) {
+        line =
+            parts[1].str() + parts[2].str() + " " + std::regex_replace(values, std::regex("[^ ]+"), number);
+      }
+    }
+    out += line + "\n";
+  }
+  return out;
+}
 
 class WholeModel : public ::testing::TestWithParam<Setup> {
  protected:
@@ -425,6 +533,100 @@ TEST_P(WholeModel, EveryEditIsTakenBackAndDoneAgain) {
                         {"CWQSModelDefinitionDlg: File", "CWQSModelDefinitionDlg: Model choice 1"}));
   if (walksAllPages()) EXPECT_THAT(host.asked, ::testing::IsSupersetOf(kAsked));
   EXPECT_THAT(host.texts, ::testing::Each(::testing::Not(::testing::HasSubstr("could not be made"))));
+}
+
+// Messages that no value of a keyword brings about alone.
+struct Told {
+  std::int32_t module;
+  PageId page;
+  Text text;
+  ListEntry entry = {};  // none where its number is 0
+};
+constexpr Told kTold[] = {
+    {module::kHydrodynamic, PageId::floodAndDry, texts::dryingAboveFlooding},
+    {module::kHydrodynamic, PageId::simulationPeriod, texts::negativeTimeSteps},
+    {module::kHydrodynamic, PageId::simulationPeriod, texts::warmUpTooLong},
+    {module::kHydrodynamic, PageId::bathymetry, texts::bathymetryCount},
+    {module::kHydrodynamic, PageId::bathymetry, texts::landBelowZero, {2, 2}},
+    {module::kHydrodynamic, PageId::bathymetry, texts::outerNotValid, {2, 2}},
+    {module::kHydrodynamic, PageId::bathymetry, texts::nestRatio, {2, 2}},
+    {module::kHydrodynamic, PageId::bathymetry, texts::nestJextr, {2, 2}},
+    {module::kHydrodynamic, PageId::bathymetry, texts::nestKextr, {2, 2}},
+    {module::kHydrodynamic, PageId::bathymetry, texts::overlap, {2, 2}},
+    {module::kHydrodynamic, PageId::boundary, texts::lineNotParallel, {1, 4}},
+    {module::kHydrodynamic, PageId::sourceAndSink, texts::sourceNoArea, {1, 1}},
+    {module::kHydrodynamic, PageId::sourceAndSink, texts::sourceOnLand, {1, 1}},
+    {module::kHydrodynamic, PageId::sourceAndSink, texts::sinkNoArea, {1, 1}},
+    {module::kHydrodynamic, PageId::sourceAndSink, texts::sinkOutside, {1, 1}},
+    {module::kHydrodynamic, PageId::sourceAndSink, texts::sinkCovered, {1, 1}},
+    {module::kHydrodynamic, PageId::sourceAndSink, texts::sinkOnLand, {1, 1}},
+    {module::kHydrodynamic, PageId::infiltration, texts::infiltrationFileNotValid},
+    {module::kHydrodynamic, PageId::hdBoundary, texts::tiltingPointOutside, {2, 4}},
+    {module::kHydrodynamic, PageId::hdBoundary, texts::noBoundaryDataItem, {2, 4}},
+    {module::kHydrodynamic, PageId::surfaceElevation, texts::surfaceElevationType, {2, 2}},
+    {module::kHydrodynamic, PageId::eddyViscosity, texts::negativeEddyViscosity, {2, 2}},
+    {module::kHydrodynamic, PageId::resistance, texts::negativeResistance, {2, 2}},
+    {module::kHydrodynamic, PageId::hdResult, texts::associatedAreaMissing, {1, 1}},
+    {module::kAdvectionDispersion, PageId::adResult, texts::outputCount},
+    {module::kAdvectionDispersion, PageId::adResult, texts::associatedAreaMissing, {1, 1}},
+    {module::kAdvectionDispersion, PageId::adResult, texts::firstPointBehindLast, {1, 1}},
+    {module::kAdvectionDispersion, PageId::adResult, texts::firstTimeStepAfterLast, {1, 1}},
+    {module::kAdvectionDispersion, PageId::adStartingConditions, texts::firstTimeStepAfterLast},
+    {module::kAdvectionDispersion, PageId::adStartingConditions, texts::firstTimeStepNegative},
+    {module::kAdvectionDispersion, PageId::adStartingConditions, texts::hotStartTypeNotValid, {1, 2}},
+    {module::kAdvectionDispersion, PageId::adLineDischarge, texts::lineCount},
+    {module::kAdvectionDispersion, PageId::adBoxSummation, texts::boxCount},
+    {module::kAdvectionDispersion, PageId::adComponent, texts::wrongComponentType, {1, 1}},
+    {module::kAdvectionDispersion, PageId::adComponent, texts::componentCount},
+    {module::kAdvectionDispersion, PageId::adComponent, texts::oneHeatExchange},
+    {module::kAdvectionDispersion, PageId::adDispersionCoef, texts::tooMuchDispersion},
+    {module::kAdvectionDispersion, PageId::adDispersionCoef, texts::maximumBelowMinimum},
+    {module::kAdvectionDispersion, PageId::massBudget, texts::invalidAssociatedArea, {1, 1}},
+    {module::kAdvectionDispersion, PageId::massBudget, texts::tooFewCorners, {1, 1}},
+    {module::kAdvectionDispersion, PageId::adFeedback, texts::nothingVaries},
+    {module::kAdvectionDispersion, PageId::adFeedback, texts::sameFeedbackItem},
+    {module::kAdvectionDispersion, PageId::adFeedback, texts::invalidSalinity},
+    {module::kAdvectionDispersion, PageId::adFeedback, texts::invalidTemperature},
+};
+
+// What is wrong in them leads to a page, and there to a field, a row or a cell.
+TEST_P(WholeModel, EachMessageLeadsToAFieldOrARow) {
+  std::set<std::string> seen;
+  const auto leads = [&](const CMessage& message) {
+    if (!seen.insert(message.text).second) return;
+    std::string topic;
+    std::string local;
+    const auto id = static_cast<std::int32_t>(message.page);
+    pageClass = enumerator.GetPageClass(id, &topic, &local);
+    SCOPED_TRACE(message.text + " on page " + std::to_string(id) + " " + pageClass);
+    page = makePage(pageClass, document);
+    ASSERT_NE(page, nullptr);
+    const PagePlace place = placeOfMessage(message);
+    EXPECT_EQ(faultOf(form(), place), "") << "  of \"" << place.thing << "\", field \"" << place.field
+                                          << "\", value \"" << place.value << '"' << labelsOf(form());
+  };
+  // The Wetland Sweep Kit has one area, and the flow alone.
+  for (const Told& told : kTold) {
+    if (theEdition.wetlandSweepKit) break;
+    const bool isOfEntry = told.entry.number > 0;
+    const std::vector<ListEntry> entries(isOfEntry ? 1 : 0, told.entry);
+    const bool hasNumber = told.text.format.find("%d") != std::string_view::npos;
+    const std::string worded = hasNumber ? formatted(told.text, 1, "2") : formatted(told.text, "1", "2");
+    if (told.module == GetParam().module) leads({told.page, worded, {}, entries});
+  }
+  const std::string text = test::textOf(std::string(GRIDBAY_TESTS) + "/main_job/setups/" + GetParam().name);
+  for (const auto& [number, file] : {std::pair<std::string, std::string>{"", "none.tsb2"},
+                                     {"-1", ""},
+                                     {"99999", "x/"},
+                                     {"0", "as it is"}}) {
+    folder.write(GetParam().name, withValues(text, number, file));
+    ASSERT_TRUE(document.OnOpenDocument(path));
+    if (!theEdition.wetlandSweepKit) root().moduleSelection->simulationType = GetParam().module;
+    ValidationList messages;
+    root().Validate(messages, 1);
+    for (const CMessage& message : messages) leads(message);
+  }
+  EXPECT_GE(seen.size(), theEdition.wetlandSweepKit ? 15U : 30U);
 }
 
 }  // namespace setup_whole_model_test

@@ -41,6 +41,19 @@ class WindowTest final : public DesktopFixture {
   QTreeWidgetItem* adviceItem(const QString& text) {
     return messages().list().topLevelItem(messages().messageCount() + adviceOf(text));
   }
+  // The setup with faults and doubts of many kinds.
+  void makeDoubtful() {
+    const QString globals = "NESTED_MODEL_GLOBALS/";
+    run("v27setup",
+        {"set", "s.v27", globals + "BATHYMETRY_SELECTION/AREA_2/Origin=35,33",
+         globals + "FLOOD_AND_DRY/Flooding_Depth=0.5", globals + "FLOOD_AND_DRY/Drying_Depth=0.01",
+         globals + "OPEN_BOUNDARY/BOUNDARY_2/First_Point=-1,90",
+         globals + "SIMULATION_PERIOD/Warm_Up_Period=99999999",
+         "HYDRODYNAMIC_MODULE/OPEN_BOUNDARY/BOUNDARY_3/Data_Format=3",
+         "HYDRODYNAMIC_MODULE/OPEN_BOUNDARY/BOUNDARY_3/File_Name=gone.tsb0",
+         "HYDRODYNAMIC_MODULE/WIND_CONDITIONS/Data_Format=2",
+         "HYDRODYNAMIC_MODULE/WIND_CONDITIONS/File_Name=/elsewhere/wind.tsb0"});
+  }
   // By its key, which differs with the desktop.
   void closeTab() { QTest::keySequence(window_.get(), QKeySequence(QKeySequence::Close)); }
   static QString redoKey() { return QKeySequence(QKeySequence::Redo).toString(QKeySequence::NativeText); }
@@ -503,6 +516,158 @@ class WindowTest final : public DesktopFixture {
     messages().list().setCurrentItem(adviceItem("it belongs at"));
     QTest::keyClick(&messages().list(), Qt::Key_Period, Qt::ControlModifier);
     QCOMPARE(origin(), QString("36,33"));
+  }
+
+  void aStaleFixIsMadeAnewOrNotAtAll() {
+    QVERIFY(open());
+    QVERIFY(tab().goToPage(26));
+    const auto fix = [this] { tab().fixAdvice(static_cast<std::size_t>(adviceOf("flooding depth"))); };
+    const auto flooding = [this] { return edit("Flooding depth:").text(); };
+    enter("Flooding depth:", "0.5");
+    QTRY_VERIFY(adviceOf("flooding depth") >= 0);
+    // There is nothing to mend any more.
+    enter("Flooding depth:", "0.03");
+    QVERIFY(adviceOf("flooding depth") >= 0);
+    fix();
+    QCOMPARE(flooding(), QString("0.03"));
+    QVERIFY(adviceOf("flooding depth") < 0);
+    window_->undoAction()->trigger();
+    QCOMPARE(flooding(), QString("0.5"));  // the entry was the last step
+    // What it rests on is another value, entered or only typed.
+    QTRY_VERIFY(adviceOf("flooding depth") >= 0);
+    enter("Drying depth:", "0.03");
+    fix();
+    QCOMPARE(flooding(), QString("0.06"));
+    window_->undoAction()->trigger();
+    QTRY_VERIFY(adviceOf("flooding depth") >= 0);
+    type("Drying depth:", "0.04");
+    QTest::mouseClick(tab().adviceStrip().findChild<QToolButton*>("fix"), Qt::LeftButton);
+    QCOMPARE(flooding(), QString("0.08"));
+    // Another fix than the one that was offered is offered first.
+    QVERIFY(tab().goToPage(39));
+    enter("Time step interval:", "300");
+    QTRY_VERIFY(adviceOf("would do") >= 0);
+    const auto offered = [this] {
+      return QString::fromStdString(tab().advice()[static_cast<std::size_t>(adviceOf("would do"))].fix->name);
+    };
+    const QString before = offered();
+    enter("Time step interval:", "307");
+    tab().fixAdvice(static_cast<std::size_t>(adviceOf("would do")));
+    QCOMPARE(edit("Time step interval:").text(), QString("307"));
+    QVERIFY(offered() != before);
+    tab().fixAdvice(static_cast<std::size_t>(adviceOf("would do")));
+    QVERIFY(adviceOf("would do") < 0);
+    window_->undoAction()->trigger();
+    QCOMPARE(edit("Time step interval:").text(), QString("307"));
+    // A place that there is no more.
+    tab().fixAdvice(1000);
+    QCOMPARE(edit("Time step interval:").text(), QString("307"));
+  }
+
+  void aFixMakesAFileThatStaysWhenItIsTakenBack() {
+    const QTemporaryDir outside;
+    write(outside.filePath("wind.tsb0"), "wind");
+    const QString name = QFileInfo(file("s.v27")).dir().relativeFilePath(outside.filePath("wind.tsb0"));
+    run("v27setup", {"set", "s.v27", "HYDRODYNAMIC_MODULE/WIND_CONDITIONS/File_Name=" + name});
+    QVERIFY(open());
+    const QString lies = "lies outside of the setup's folder";
+    const auto fix = [&] { tab().fixAdvice(static_cast<std::size_t>(adviceOf(lies))); };
+    QTRY_VERIFY(adviceOf(lies) >= 0);
+    fix();
+    QCOMPARE(textOf(file("wind.tsb0")), QString("wind"));
+    QVERIFY(adviceOf(lies) < 0);
+    QCOMPARE(window_->undoAction()->text(), QString("&Undo Copy wind.tsb0 into the setup's folder"));
+    window_->undoAction()->trigger();
+    QCOMPARE(textOf(file("wind.tsb0")), QString("wind"));
+    QTRY_VERIFY(adviceOf(lies) >= 0);
+    fix();
+    QCOMPARE(window_->undoAction()->text(), QString("&Undo Take wind.tsb0"));
+    QVERIFY(QFile::remove(file("wind.tsb0")));
+  }
+
+  void adviceLeavesWhoTypesAlone() {
+    QVERIFY(open());
+    QVERIFY(tab().goToPage(26));
+    enter("Flooding depth:", "0.5");
+    type("Drying depth:", "0.0");
+    edit("Drying depth:").setCursorPosition(1);
+    QTRY_VERIFY(adviceOf("flooding depth") >= 0);
+    QCOMPARE(edit("Drying depth:").text(), QString("0.0"));
+    QVERIFY(edit("Drying depth:").hasFocus());
+    QCOMPARE(edit("Drying depth:").cursorPosition(), 1);
+    QCOMPARE(window_->undoAction()->text(), QString("&Undo Flooding depth"));
+  }
+
+  void eachMessageAndAdviceLeadsByMouseAndKey() {
+    makeDoubtful();
+    QVERIFY(open());
+    QTRY_VERIFY(adviceOf("it belongs at (36,33)") >= 0);
+    QTest::keyClick(window_.get(), Qt::Key_F7);
+    QTreeWidget& list = messages().list();
+    QVERIFY2(messages().messageCount() >= 3, qPrintable(QString::number(messages().messageCount())));
+    QVERIFY(list.topLevelItemCount() - messages().messageCount() >= 5);
+    // The lines are made anew with each other advice.
+    const auto leads = [&](int line, const std::function<void(QTreeWidgetItem*)>& act) {
+      QVERIFY(tab().goToPage(1));
+      list.setFocus();
+      const QString text = list.topLevelItem(line)->text(0);
+      const QString page = list.topLevelItem(line)->text(1);
+      list.scrollToItem(list.topLevelItem(line));
+      act(list.topLevelItem(line));
+      QCOMPARE(tab().caption(tab().currentPage()), page);
+      QWidget* at = QApplication::focusWidget();
+      QVERIFY2(at != nullptr && tab().pane().isAncestorOf(at), qPrintable(text));
+    };
+    for (int line = 0; line < list.topLevelItemCount(); ++line) {
+      leads(line, [&](QTreeWidgetItem* item) {
+        const QRect row = list.visualItemRect(item);
+        const QPoint place(row.left() + 30, row.center().y());
+        QTest::mouseClick(list.viewport(), Qt::LeftButton, {}, place);
+        QTest::mouseDClick(list.viewport(), Qt::LeftButton, {}, place);
+      });
+      leads(line, [&](QTreeWidgetItem* item) {
+        list.setCurrentItem(item);
+        QTest::keyClick(&list, Qt::Key_Return);
+      });
+      // What is left to the modeller has a button that leads there.
+      const bool isAdvice = line >= messages().messageCount();
+      const auto button = [&] {
+        return qobject_cast<QToolButton*>(list.itemWidget(list.topLevelItem(line), 3));
+      };
+      QCOMPARE(button() != nullptr, isAdvice);
+      if (!isAdvice || button()->text() != "Show") continue;
+      QVERIFY(!button()->toolTip().isEmpty());
+      leads(line, [&](QTreeWidgetItem*) {
+        QTest::mouseClick(button(), Qt::LeftButton);
+        QCoreApplication::processEvents();
+      });
+    }
+    // Of a block of rows the one with the file that is spoken of.
+    const QList<QTreeWidgetItem*> found = list.findItems("gone.tsb0", Qt::MatchContains);
+    QVERIFY(!found.isEmpty());
+    emit list.itemActivated(found.front(), 0);
+    auto* grid = tab().pane().findChild<GridView*>();
+    QCOMPARE(grid->currentIndex().data().toString(), QString("gone.tsb0"));
+  }
+
+  // For the eye, where a folder is named: messages and advice, and below the page.
+  void picturesOfMessages() {
+    const QString pictures = qEnvironmentVariable("GRIDBAY_PICTURES");
+    if (pictures.isEmpty()) QSKIP("no folder is named");
+    makeDoubtful();
+    window_->resize(1300, 850);
+    for (const auto& [appearance, name] :
+         {std::pair{Appearance::light, "light"}, std::pair{Appearance::dark, "dark"}}) {
+      setAppearance(appearance);
+      QVERIFY(open());
+      QTRY_VERIFY(adviceOf("it belongs at (36,33)") >= 0);
+      QTest::keyClick(window_.get(), Qt::Key_F7);
+      window_->resizeDocks({&messages()}, {330}, Qt::Vertical);
+      QVERIFY(tab().goToPage(46));
+      QCoreApplication::processEvents();
+      QVERIFY(window_->grab().save(pictures + "/messages-" + name + ".png"));
+    }
+    setAppearance(Appearance::desktop);
   }
 
   void messagesNameWhatTheySpeakOfAndLeadThere() {

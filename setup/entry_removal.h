@@ -1,0 +1,24 @@
+#pragma once
+
+namespace gridbay {
+
+class CGlobalKvs;
+
+// The entries behind a number (from 1) move up by one, so that the last one can go.
+template <class List>
+void moveUp(List& list, int number) {
+  for (int next = number; next < list.GetCount(); ++next) list.at(next).AssignState(list.at(next + 1));
+}
+
+// Takes an entry out of a list that nobody follows; those behind it take its number.
+template <class List>
+void removeEntry(List& list, int number) {
+  moveUp(list, number);
+  list.SetCount(list.GetCount() - 1);
+}
+
+// The same for an open boundary and for a source or sink, with what all modules say of it.
+void removeBoundary(CGlobalKvs& root, int number);
+void removeSource(CGlobalKvs& root, int number);
+
+}  // namespace gridbay
