@@ -32,6 +32,12 @@ void addConvertSeries(CLI::App& convert, Action& action) {
       ->check(CLI::NonNegativeNumber)
       ->capture_default_str();
   command
+      .add_option(
+          "--missing", options->missing,
+          "A number that stands for missing values; may be given several times (default: -9999 and the "
+          "like are recognised; with --start no value may be missing)")
+      ->allow_extra_args(false);
+  command
       .add_option("--dates", options->dateOrder,
                   "The order of dates that do not tell it themselves: ymd, dmy, mdy")
       ->transform(CLI::CheckedTransformer(dateOrderNames(), CLI::ignore_case));

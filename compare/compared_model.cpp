@@ -7,8 +7,9 @@
 
 namespace gridbay {
 
-ComparedModel::ComparedModel(const KvsFile& file, const std::string& path, const UnitChoices& units)
-    : CVdDoc(noHost()), root_(std::make_unique<CGlobalKvs>()) {
+ComparedModel::ComparedModel(const KvsFile& file, const std::string& path, const UnitChoices& units,
+                             NoHost* host)
+    : CVdDoc(host == nullptr ? noHost() : *host), root_(std::make_unique<CGlobalKvs>()) {
   SetPath(path);
   this->units() = units;
   root_->Load(&file.tree().root(), path);

@@ -24,8 +24,9 @@ struct ComparedPage {
 class ComparedModel final : private CVdDoc {
  public:
   // The model of a file of a setup, which must outlive it, with file names that start from the folder of
-  // `path`.
-  ComparedModel(const KvsFile& file, const std::string& path, const UnitChoices& units);
+  // `path`. What its pages ask is declined, or asked of a host, which must outlive it too.
+  ComparedModel(const KvsFile& file, const std::string& path, const UnitChoices& units,
+                NoHost* host = nullptr);
   ~ComparedModel() override;
 
   CGlobalKvs& root() { return *root_; }
@@ -44,15 +45,18 @@ class ComparedModel final : private CVdDoc {
   PageContents contents(std::int32_t page);
   // The page itself; null where there is none. It lives as long as the model.
   CV27SetupFormView* page(std::int32_t id);
+  // What an undo would call the last edit that was made on a page.
+  const std::string& lastEdit() const { return lastEdit_; }
 
  private:
   CKvsBase& GetKvs() override { return *root_; }
-  void RecordEdit(PageId, std::string, bool) override {}
+  void RecordEdit(PageId, std::string name, bool) override { lastEdit_ = std::move(name); }
   void TakeBackUnrecorded() override {}
 
   static NoHost& noHost();
 
   std::unique_ptr<CGlobalKvs> root_;
+  std::string lastEdit_;
   CDlgEnumerator enumerator_;
   CNavigationView tree_{enumerator_};
   std::map<std::int32_t, std::unique_ptr<CV27SetupFormView>> pages_;

@@ -145,6 +145,21 @@ Result<Target> define(const RasterConversion& options, const Raster& raster, con
   return target;
 }
 
+// Before hours of work: what the disk has no room for.
+Outcome checkRoom(const std::string& path, const TsbDefinition& map) {
+  std::error_code unknown;
+  const std::filesystem::path folder = std::filesystem::absolute(path, unknown).parent_path();
+  const std::filesystem::space_info disk = std::filesystem::space(folder, unknown);
+  const double wanted = static_cast<double>(sizeof(float)) * static_cast<double>(map.axes[0].points) *
+                        static_cast<double>(map.axes[1].points);
+  if (unknown || wanted <= static_cast<double>(disk.available)) return {};
+  constexpr double kGigabyte = 1e9;
+  return Failure{
+      fmt::format("cannot write \"{}\": its {} x {} points take {:.3g} GB, and the disk has {:.3g} GB free",
+                  path, map.axes[0].points, map.axes[1].points, wanted / kGigabyte,
+                  static_cast<double>(disk.available) / kGigabyte)};
+}
+
 // Copies the chosen points, some rows at a time; returns how many values were missing.
 Result<std::size_t> copyValues(const RasterConversion& options, Raster& raster, const RasterLayout& layout,
                                const Selection& chosen, TsbWriter& writer, ConversionHost& host) {
@@ -248,6 +263,7 @@ Result<ConvertedRaster> convertRaster(const RasterConversion& options, Conversio
   if (!chosen) return Failure{chosen.error()};
   const Result<Target> target = define(options, raster, *layout, *chosen, host);
   if (!target) return Failure{target.error()};
+  if (const Outcome fits = checkRoom(options.out, target->definition); !fits) return Failure{fits.error()};
   Result<TsbWriter> writer = TsbWriter::create(options.out, target->definition);
   if (!writer) return Failure{writer.error()};
   const Result<std::size_t> missing = copyValues(options, raster, *layout, *chosen, *writer, host);

@@ -3,12 +3,15 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <cmath>
 #include <filesystem>
+#include <iterator>
 #include <string_view>
 #include <vector>
 
 #include "conversion/item_types.h"
 #include "conversion/table_guess.h"
+#include "conversion/table_text.h"
 #include "core/date_time.h"
 #include "platform/files/may_write.h"
 #include "platform/files/read_file.h"
@@ -31,7 +34,8 @@ TableForm plainForm(std::string_view text, const SeriesConversion& options) {
   form.headerLines = options.skipLines;
   form.start = options.start;
   form.timeUnit = options.timeUnit;
-  form.takesMissing = false;
+  form.takesMissing = !options.missing.empty();
+  form.missing = options.missing;
   std::string_view heading;
   for (int number = 1; !text.empty(); ++number) {
     const std::size_t end = std::min(text.find('\n'), text.size());
@@ -64,6 +68,11 @@ Result<TableForm> recognisedForm(std::string_view text, const SeriesConversion& 
                                host.option("start"))};
   }
   if (options.dateOrder) guess.form.dateOrder = *options.dateOrder;
+  if (options.missing.empty()) {
+    std::ranges::move(guess.missingDoubts, std::back_inserter(guess.doubts));
+  } else {
+    guess.form.missing = options.missing;
+  }
   if (!options.dateOrder && !guess.dateOrderDoubt.empty()) guess.doubts.push_back(guess.dateOrderDoubt);
   for (const std::string& doubt : guess.doubts) host.note(doubt);
   return guess.form;
@@ -124,13 +133,18 @@ Result<ConvertedSeries> convertSeries(const SeriesConversion& options, Conversio
     return Failure{
         fmt::format("{} cannot be {}: it is at least 0", host.option("skip-lines"), options.skipLines)};
   }
-  const Result<FileText> text = readFile(options.in);
-  if (!text) return Failure{text.error()};
+  for (const double number : options.missing) {
+    if (!std::isfinite(number))
+      return Failure{fmt::format("{} cannot be {}: it is a finite number", host.option("missing"), number)};
+  }
+  const Result<FileText> file = readFile(options.in);
+  if (!file) return Failure{file.error()};
   const auto unread = [&options](std::string_view why) {
     return Failure{fmt::format("cannot read \"{}\": {}", options.in, why)};
   };
-  Result<TableForm> form =
-      isPlain ? plainForm(text->view(), options) : recognisedForm(text->view(), options, host);
+  const Result<std::string> text = tableText(file->view());
+  if (!text) return unread(text.error());
+  Result<TableForm> form = isPlain ? plainForm(*text, options) : recognisedForm(*text, options, host);
   if (!form) return Failure{form.error()};
   if (form->columns.empty()) return unread("there are no values");
   if (form->columns.size() == 1)
@@ -138,7 +152,7 @@ Result<ConvertedSeries> convertSeries(const SeriesConversion& options, Conversio
   if (const std::string fault = faultOf(*form); !fault.empty()) return Failure{fault};
   if (const Outcome given = giveItemTypes(*form, options, host); !given) return Failure{given.error()};
   if (const std::string fault = faultOfItems(*form); !fault.empty()) return Failure{fault};
-  const Result<SeriesTable> table = readSeriesTable(text->view(), *form);
+  const Result<SeriesTable> table = readSeriesTable(*text, *form);
   if (!table) return unread(table.error());
   if (table->faultCount > 0) {
     const auto& [line, text_, why] = table->faults.front();

@@ -23,6 +23,8 @@ struct SeriesConversion {
   bool force = false;                  // replaces a file that is there
   std::string history;                 // how the series came about, a line of its history without the date
   std::optional<DateOrder> dateOrder = {};  // of dates that do not tell it themselves
+  // Numbers that stand for missing values; where there are some a value may be missing with a start too.
+  std::vector<double> missing = {};
 };
 
 // What a user calls them: "ymd", "dmy", "mdy".

@@ -168,14 +168,19 @@ Result<ConvertedSeries> writeSeriesTable(const SeriesTable& table, const SeriesT
   for (std::size_t i = 0; i < table.items.size(); ++i) {
     const TsbItem& made = definition.items[i];
     const CVdUnitConverter converter(table.items[i].unit, made.unit);
-    for (std::size_t step = 0; step < steps; ++step) {
-      const double given = table.values[i][step];
-      const double value = std::isnan(given)             ? made.deleteValue
-                           : table.items[i].unit.empty() ? given
-                                                         : converter.Convert(given);
-      if (const Outcome written = writer->write(i + 1, step, std::span<const double>(&value, 1)); !written)
+    constexpr std::size_t kAtOnce = 4096;
+    std::vector<double> values;
+    for (std::size_t step = 0; step < steps; step += values.size()) {
+      const auto given = std::span(table.values[i]).subspan(step, std::min(kAtOnce, steps - step));
+      values.clear();
+      for (const double value : given) {
+        values.push_back(std::isnan(value)             ? made.deleteValue
+                         : table.items[i].unit.empty() ? value
+                                                       : converter.Convert(value));
+      }
+      if (const Outcome written = writer->write(i + 1, step, std::span<const double>(values)); !written)
         return Failure{written.error()};
-      if (!host.reached(i * steps + step + 1, table.items.size() * steps))
+      if (!host.reached(i * steps + step + values.size(), table.items.size() * steps))
         return Failure{std::string(kConversionStopped)};
     }
   }

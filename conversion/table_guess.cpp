@@ -63,7 +63,9 @@ class Guesser {
     guessItems();
   }
 
-  TableGuess result() { return {std::move(form_), std::move(doubts_), std::move(dateOrderDoubt_)}; }
+  TableGuess result() {
+    return {std::move(form_), std::move(doubts_), std::move(missingDoubts_), std::move(dateOrderDoubt_)};
+  }
 
  private:
   // The later ones of the first lines, where no heading stands any more.
@@ -329,8 +331,8 @@ class Guesser {
     });
     for (const auto& [number, count] : found) {
       form_.missing.push_back(number);
-      doubts_.push_back(fmt::format("{:g} stands {} for a value: it is taken for a missing one", number,
-                                    count == 1 ? "once" : fmt::format("{} times", count)));
+      missingDoubts_.push_back(fmt::format("{:g} stands {} for a value: it is taken for a missing one",
+                                           number, count == 1 ? "once" : fmt::format("{} times", count)));
     }
   }
 
@@ -347,6 +349,7 @@ class Guesser {
 
   TableForm form_;
   std::vector<std::string> doubts_;
+  std::vector<std::string> missingDoubts_;
   std::string dateOrderDoubt_;
   std::vector<std::string_view> lines_;
   std::vector<std::string_view> sample_;
@@ -362,8 +365,6 @@ TableGuess guessTable(std::string_view text) {
 }
 
 TableGuess guessTable(std::string_view text, char separator, int headerLines) {
-  constexpr std::string_view kMark = "\xef\xbb\xbf";  // of UTF-8
-  if (text.starts_with(kMark)) text.remove_prefix(kMark.size());
   return Guesser(text, separator, headerLines).result();
 }
 

@@ -12,6 +12,7 @@ namespace gridbay {
 struct TableGuess {
   TableForm form;  // with no columns where the text is no table
   std::vector<std::string> doubts;
+  std::vector<std::string> missingDoubts;  // more of them, for who has not told the missing values
   std::string dateOrderDoubt;  // one more, for who has not told the order of dates; empty for none
 };
 

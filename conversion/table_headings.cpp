@@ -169,7 +169,9 @@ std::vector<ColumnHeading> columnHeadings(std::span<const std::string_view> line
   std::vector<ColumnHeading> headings(columns);
   Fields units;
   for (auto line = lines.rbegin(); line != lines.rend(); ++line) {
-    const Fields fields = headingFields(*line, separator, columns);
+    Fields fields = headingFields(*line, separator, columns);
+    // Tabs may stand between values below a heading that was set by blanks.
+    if (fields.size() == 1 && separator == '\t') fields = headingFields(*line, ' ', columns);
     if (fields.size() != columns) continue;
     if (units.empty() && isUnits(fields)) {
       units = fields;

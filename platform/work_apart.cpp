@@ -15,6 +15,7 @@
 #include <utility>
 
 #include "platform/apart.h"
+#include "platform/files/unfinished_file.h"
 
 namespace gridbay {
 namespace {
@@ -67,7 +68,7 @@ bool isWanted(int line) {
 
 }  // namespace
 
-Result<WorkApart> WorkApart::begin(const Work& work, bool writes) {
+Result<WorkApart> WorkApart::begin(const Work& work, std::string file) {
   std::array<int, 2> ends{};
   if (::socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, ends.data()) != 0)
     return Failure{systemError("cannot start", "work beside this")};
@@ -79,13 +80,13 @@ Result<WorkApart> WorkApart::begin(const Work& work, bool writes) {
     ::close(here.release());
     workFor(work, there.get());
   }
-  return WorkApart(std::move(here), process, writes);
+  return WorkApart(std::move(here), process, std::move(file));
 }
 
 WorkApart::WorkApart(WorkApart&& other) noexcept
     : line_(std::move(other.line_)),
       process_(std::exchange(other.process_, -1)),
-      writes_(other.writes_),
+      file_(std::move(other.file_)),
       read_(std::move(other.read_)),
       done_(other.done_),
       text_(std::move(other.text_)) {}
@@ -93,13 +94,14 @@ WorkApart::WorkApart(WorkApart&& other) noexcept
 WorkApart::~WorkApart() {
   if (process_ < 0) return;
   stop();
-  if (!writes_) ::kill(process_, SIGKILL);
+  if (file_.empty()) ::kill(process_, SIGKILL);
   using namespace std::chrono_literals;
   const auto end = std::chrono::steady_clock::now() + 2s;
   while (::waitpid(process_, nullptr, WNOHANG) == 0) {
     if (std::chrono::steady_clock::now() > end) ::kill(process_, SIGKILL);
     std::this_thread::sleep_for(2ms);
   }
+  if (!file_.empty()) removeUnfinished(file_, process_);
 }
 
 void WorkApart::stop() {

@@ -21,8 +21,9 @@ class WorkApart {
   using Work = std::function<std::string(const Progress& progress)>;
 
   // Fails where no copy can be made. To be called by the one thread that uses the libraries, or while others
-  // have a NoCopyNow. Work that writes nothing is ended at once when it is to stop.
-  static Result<WorkApart> begin(const Work& work, bool writes = true);
+  // have a NoCopyNow. `file` is the one that the work makes, of which nothing is left whatever ends it; work
+  // that makes none is ended at once when it is to stop.
+  static Result<WorkApart> begin(const Work& work, std::string file = {});
 
   WorkApart(WorkApart&& other) noexcept;
   WorkApart& operator=(WorkApart&&) = delete;
@@ -40,12 +41,12 @@ class WorkApart {
   void stop();
 
  private:
-  WorkApart(FileDescriptor line, pid_t process, bool writes)
-      : line_(std::move(line)), process_(process), writes_(writes) {}
+  WorkApart(FileDescriptor line, pid_t process, std::string file)
+      : line_(std::move(line)), process_(process), file_(std::move(file)) {}
 
   FileDescriptor line_;
   pid_t process_;
-  bool writes_;
+  std::string file_;  // empty for none
   std::string read_;  // and not understood yet
   double done_ = 0;
   std::optional<std::string> text_;

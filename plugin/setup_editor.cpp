@@ -143,6 +143,10 @@ class Editor final : public SetupEditor {
   void onChange(std::function<void()> changed) override { changed_ = std::move(changed); }
   void onSave(std::function<void()> saved) override { document_.OnSaved(std::move(saved)); }
   SetupComparison& comparison() override { return *comparison_; }
+  SeriesPlaces seriesPlaces(const std::string& file) override { return findSeriesPlaces(document_, file); }
+  std::string useSeries(const std::string& file, const SeriesPlace& place) override {
+    return putSeries(document_, file, place);
+  }
 
  private:
   std::optional<Edit> editOf(const EditHistory::Step* step) const {

@@ -14,6 +14,7 @@
 #include "pages/form.h"
 #include "pages/grid_wnd.h"
 #include "pages/host.h"
+#include "plugin/series_places.h"
 #include "plugin/setup_summary.h"
 
 namespace gridbay {
@@ -114,6 +115,11 @@ class SetupEditor {
   virtual void onChange(std::function<void()> changed) = 0;
   // Called after each save, whoever has asked for it.
   virtual void onSave(std::function<void()> saved) = 0;
+
+  // Where the setup, as it is now, takes the time series in a file (an absolute path). Puts it there as one
+  // step, which the open page shows too; what is wrong, or empty.
+  virtual SeriesPlaces seriesPlaces(const std::string& file) = 0;
+  virtual std::string useSeries(const std::string& file, const SeriesPlace& place) = 0;
 
   // Another setup beside this one. What is taken over is shown by the open page too.
   virtual SetupComparison& comparison() = 0;

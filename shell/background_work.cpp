@@ -4,9 +4,9 @@
 
 namespace gridbay::shell {
 
-void BackgroundWork::begin(const WorkApart::Work& work, bool writes) {
+void BackgroundWork::begin(const WorkApart::Work& work, const QString& file) {
   stop();
-  Result<WorkApart> begun = WorkApart::begin(work, writes);
+  Result<WorkApart> begun = WorkApart::begin(work, file.toStdString());
   if (!begun) {
     QMetaObject::invokeMethod(
         this, [this] { emit ended(std::nullopt); }, Qt::QueuedConnection);

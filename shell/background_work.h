@@ -2,6 +2,7 @@
 
 #include <QObject>
 #include <QSocketNotifier>
+#include <QString>
 #include <memory>
 #include <optional>
 #include <string>
@@ -16,7 +17,8 @@ class BackgroundWork final : public QObject {
  public:
   explicit BackgroundWork(QObject* parent) : QObject(parent) {}
 
-  void begin(const WorkApart::Work& work, bool writes);
+  // `file` is the one that it makes; empty for none.
+  void begin(const WorkApart::Work& work, const QString& file = {});
   bool isRunning() const { return work_ != nullptr; }
   // Stops the work and waits for its end; what it would have told is not told any more.
   void stop();

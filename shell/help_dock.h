@@ -12,6 +12,7 @@ class HelpDock final : public QDockWidget {
  public:
   // The topics of what is no page.
   static constexpr int kImportTerrain = 100;
+  static constexpr int kImportSeries = 101;
 
   explicit HelpDock(QWidget* parent);
 

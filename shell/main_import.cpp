@@ -2,6 +2,7 @@
 
 #include <QFileInfo>
 #include <QStatusBar>
+#include <algorithm>
 
 #include "shell/grid_view.h"
 #include "shell/import/series_import.h"
@@ -35,13 +36,11 @@ void MainWindow::useBathymetry(DocumentTab& tab, int area, const QString& map) {
 
 void MainWindow::importTerrain() {
   if (terrainImport_ == nullptr) {
-    terrainImport_ = new TerrainImport([this] { return bathymetryUses(); }, this);
+    terrainImport_ = new TerrainImport([this](const QString&) { return bathymetryUses(); }, this);
     terrainImport_->setAttribute(Qt::WA_DeleteOnClose);
     connect(terrainImport_, &TerrainImport::viewWanted, this, [this](const QString& map) { openData(map); });
-    connect(terrainImport_, &TerrainImport::helpWanted, this, [this] {
-      QString error;
-      if (!help_->showTopic(HelpDock::kImportTerrain, tr("Import Terrain"), &error)) tell(error);
-    });
+    connect(terrainImport_, &TerrainImport::helpWanted, this,
+            [this] { showTopic(HelpDock::kImportTerrain, tr("Import Terrain")); });
     terrainImport_->show();
   }
   terrainImport_->raise();
@@ -49,8 +48,8 @@ void MainWindow::importTerrain() {
 }
 
 // The areas of the document that is open, and a new setup.
-std::vector<TerrainImport::Use> MainWindow::bathymetryUses() {
-  std::vector<TerrainImport::Use> uses;
+UseStrip::Offer MainWindow::bathymetryUses() {
+  std::vector<UseStrip::Use> uses;
   if (DocumentTab* tab = currentDocument()) {
     const std::size_t count = tab->editor().map().scene().areas.size();
     for (int area = 1; area <= static_cast<int>(count); ++area) {
@@ -64,22 +63,81 @@ std::vector<TerrainImport::Use> MainWindow::bathymetryUses() {
     uses.push_back({tr("a new setup: %1").arg(libraries_[i]->docString(CVdDocTemplate::kNewFileName)),
                     [this, i](const QString& map) { useBathymetry(*newDocument(i), 1, map); }});
   }
-  return uses;
+  return {std::move(uses)};
 }
 
 void MainWindow::importSeries() {
-  std::optional<Period> period;
-  QString folder;
-  if (DocumentTab* tab = currentDocument()) {
-    period = tab->editor().summary().period;
-    const QString path = QString::fromStdString(tab->editor().path());
-    if (!path.isEmpty()) folder = QFileInfo(path).absolutePath();
+  if (seriesImport_ == nullptr) {
+    const auto setup = [this] {
+      SeriesImport::Setup found;
+      DocumentTab* tab = currentDocument();
+      if (tab == nullptr) return found;
+      found.period = tab->editor().summary().period;
+      const QString path = QString::fromStdString(tab->editor().path());
+      if (!path.isEmpty()) found.folder = QFileInfo(path).absolutePath();
+      return found;
+    };
+    seriesImport_ = new SeriesImport(
+        setup, [this](const QString& series) { return seriesUses(series); }, this);
+    seriesImport_->setAttribute(Qt::WA_DeleteOnClose);
+    connect(seriesImport_, &SeriesImport::imported, this,
+            [this](const QString& summary) { statusBar()->showMessage(summary); });
+    connect(seriesImport_, &SeriesImport::viewWanted, this,
+            [this](const QString& series) { openData(series); });
+    connect(seriesImport_, &SeriesImport::helpWanted, this,
+            [this] { showTopic(HelpDock::kImportSeries, tr("Import Series")); });
+    seriesImport_->show();
   }
-  auto* dialog = new SeriesImport(period, folder, this);
-  dialog->setAttribute(Qt::WA_DeleteOnClose);
-  connect(dialog, &SeriesImport::imported, this,
-          [this](const QString&, const QString& summary) { statusBar()->showMessage(summary); });
-  dialog->open();
+  seriesImport_->raise();
+  seriesImport_->activateWindow();
+}
+
+// Where the document that is open asks for such a series at present; else why nothing does.
+UseStrip::Offer MainWindow::seriesUses(const QString& series) {
+  DocumentTab* tab = currentDocument();
+  if (tab == nullptr) return {{}, tr("There is no setup open that could take the series.")};
+  tab->commit();
+  const SeriesPlaces found = tab->editor().seriesPlaces(series.toStdString());
+  UseStrip::Offer offer;
+  for (const SeriesPlace& place : found.places) {
+    QString text = tr("%1 of %2").arg(QString::fromStdString(place.name), tab->name());
+    // Of several items that fit it is told which one.
+    const auto same = std::ranges::count(found.places, place.name, &SeriesPlace::name);
+    if (same > 1) text += " (" + QString::fromStdString(place.item) + ')';
+    offer.uses.push_back({text, [this, place, tab = QPointer(tab)](const QString& file) {
+                            if (tab != nullptr) useSeries(*tab, place, file);
+                          }});
+  }
+  if (!offer.uses.empty()) return offer;
+  offer.why = tr("%1 has no place that asks for such a series now.").arg(tab->name());
+  if (!found.others.empty()) {
+    constexpr qsizetype kMost = 3;
+    QStringList others;
+    for (const std::string& other : found.others) others << QString::fromStdString(other);
+    const QString more = others.size() > kMost ? ", ..." : "";
+    offer.why += ' ' + tr("Asked for is: %1.").arg(others.mid(0, kMost).join(", ") + more);
+  }
+  offer.why += ' ' + tr("Choose a file with a time series as the format there, and come back here.");
+  return offer;
+}
+
+void MainWindow::useSeries(DocumentTab& tab, const SeriesPlace& place, const QString& series) {
+  tabs_->setCurrentWidget(&tab);
+  tab.commit();
+  const std::string doubt = place.doubt.empty() ? "" : place.doubt + "\n\nTake the file all the same?";
+  if (!doubt.empty() && !tab.askYesNo(doubt)) return;
+  const std::string fault = tab.editor().useSeries(series.toStdString(), place);
+  tab.goToPage(place.page);
+  if (!fault.empty()) {
+    tell(QString::fromStdString(fault));
+  } else {
+    statusBar()->showMessage(tr("%1 has the series.").arg(QString::fromStdString(place.name)));
+  }
+}
+
+void MainWindow::showTopic(int topic, const QString& caption) {
+  QString error;
+  if (!help_->showTopic(topic, caption, &error)) tell(error);
 }
 
 }  // namespace gridbay::shell

@@ -16,6 +16,7 @@
 #include "shell/document_tab.h"
 #include "shell/editor_library.h"
 #include "shell/help_dock.h"
+#include "shell/import/series_import.h"
 #include "shell/import/terrain_import.h"
 #include "shell/map/map_dock.h"
 #include "shell/messages_dock.h"
@@ -47,6 +48,9 @@ class MainWindow final : public QMainWindow {
   // Opens the dialog in which a map is made from terrain of any kind.
   void importTerrain();
   TerrainImport* terrainImport() { return terrainImport_; }
+  // The same for a time series from a table of text.
+  void importSeries();
+  SeriesImport* seriesImport() { return seriesImport_; }
   // Puts another setup beside the one that is shown; false where it can't be read, which is then said.
   bool compareWith(const QString& path);
   // Merges two setups that have come from a third: the one that is shown, as it is now, and another, as one
@@ -97,7 +101,6 @@ class MainWindow final : public QMainWindow {
   void showTabsOrStart();
   // Opens, and has the user save under, a name of his choice.
   void askOpen();
-  void importSeries();
   bool askSave();
   void askCompare();
   void askMerge();
@@ -111,8 +114,12 @@ class MainWindow final : public QMainWindow {
   void showMessages(DocumentTab* tab);
   void startEngine(const EngineStart& start);
   void showHelp();
-  std::vector<TerrainImport::Use> bathymetryUses();
+  // Shows the help of a window of its own.
+  void showTopic(int topic, const QString& caption);
+  UseStrip::Offer bathymetryUses();
   void useBathymetry(DocumentTab& tab, int area, const QString& map);
+  UseStrip::Offer seriesUses(const QString& series);
+  void useSeries(DocumentTab& tab, const SeriesPlace& place, const QString& series);
   void tell(const QString& text);
   void documentChanged(DocumentTab* tab);
   void writeRecoveryCopies();
@@ -150,6 +157,7 @@ class MainWindow final : public QMainWindow {
   QMenu* windowMenu_ = nullptr;
   UnitsMenu* units_ = nullptr;
   QPointer<TerrainImport> terrainImport_;
+  QPointer<SeriesImport> seriesImport_;
   MessagesDock* messages_ = nullptr;
   RunDock* run_ = nullptr;
   HelpDock* help_ = nullptr;

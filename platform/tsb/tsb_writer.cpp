@@ -1,16 +1,13 @@
 #include "platform/tsb/tsb_writer.h"
 
-#include <fcntl.h>
 #include <fmt/format.h>
 #include <netcdf.h>
-#include <sys/stat.h>
-#include <unistd.h>
 
 #include <algorithm>
 #include <array>
 #include <cctype>
 #include <cerrno>
-#include <filesystem>
+#include <optional>
 #include <set>
 #include <string_view>
 #include <vector>
@@ -18,7 +15,7 @@
 #include "platform/cartography/cartography.h"
 #include "platform/cartography/grid_mapping.h"
 #include "platform/files/file_descriptor.h"
-#include "platform/files/paths.h"
+#include "platform/files/unfinished_file.h"
 #include "platform/tsb/netcdf_names.h"
 #include "platform/units/units.h"
 
@@ -286,16 +283,18 @@ std::string whyNot(const TsbDefinition& definition) {
 }  // namespace
 
 struct TsbWriter::State {
+  State(const std::string& name, const TsbDefinition& wanted)
+      // A symbolic link stays one, and what it leads to is replaced.
+      : path(name), unfinished(name), definition(wanted) {}
+
   std::string path;
-  std::string target;  // where the path leads
-  std::string temporary;
+  UnfinishedFile unfinished;
   TsbDefinition definition;
   int file = -1;
   std::vector<int> items;
 
   ~State() {
     if (file >= 0) nc_close(file);
-    if (!temporary.empty()) ::unlink(temporary.c_str());
   }
 
   Failure failure(const std::string& why) const { return {"cannot write \"" + path + "\": " + why}; }
@@ -304,10 +303,12 @@ struct TsbWriter::State {
   Outcome write(std::size_t item, std::size_t step, std::size_t firstRow, std::span<const Number> values,
                 Put put) {
     if (item < 1 || item > items.size()) return failure("it has no item " + std::to_string(item));
-    if (step >= definition.time.count) return failure("it has no time step " + std::to_string(step));
+    const std::size_t steps = definition.axes.empty() ? std::max<std::size_t>(values.size(), 1) : 1;
+    if (step >= definition.time.count || steps > definition.time.count - step)
+      return failure("it has no time step " + std::to_string(step + steps - 1));
     std::vector<std::size_t> start{step};
-    std::vector<std::size_t> count{1};
-    std::size_t wanted = 1;
+    std::vector<std::size_t> count{steps};
+    std::size_t wanted = steps;
     for (std::size_t i = definition.axes.size(); i-- > 0;) {
       const bool isRows = i == 1;
       const std::size_t rowLength = definition.axes[0].points;
@@ -334,27 +335,13 @@ TsbWriter::TsbWriter(TsbWriter&&) noexcept = default;
 TsbWriter::~TsbWriter() = default;
 
 Result<TsbWriter> TsbWriter::create(const std::string& path, const TsbDefinition& definition) {
-  auto state = std::make_unique<State>();
-  state->path = path;
-  state->definition = definition;
-  if (const std::string why = whyNot(definition); !why.empty()) return state->failure(why);
-
-  // A symbolic link stays one, and what it leads to is replaced.
-  state->target = endOfLinks(path);
-  const std::filesystem::path target(state->target);
-  const std::string folder = target.parent_path().empty() ? "." : target.parent_path().string();
-  std::string temporary = folder + "/." + target.filename().string() + ".XXXXXX";
-  {
-    const FileDescriptor made(::mkostemp(temporary.data(), O_CLOEXEC));
-    if (!made) return Failure{systemError("cannot write", path)};
-    const mode_t mask = ::umask(0);
-    ::umask(mask);
-    if (::fchmod(made.get(), 0666U & ~mask) != 0) errno = 0;
-  }
-  state->temporary = temporary;
+  if (const std::string why = whyNot(definition); !why.empty())
+    return Failure{"cannot write \"" + path + "\": " + why};
+  auto state = std::make_unique<State>(path, definition);
+  if (state->unfinished.path().empty()) return Failure{systemError("cannot write", path)};
   try {
     errno = 0;
-    check(nc_create(temporary.c_str(), NC_NETCDF4 | NC_CLOBBER, &state->file));
+    check(nc_create(state->unfinished.path().c_str(), NC_NETCDF4 | NC_CLOBBER, &state->file));
     state->items = DefinitionWriter(state->file, definition).write();
   } catch (const LibraryError& error) {
     return state->failure(State::reason(error.status));
@@ -379,12 +366,7 @@ Outcome TsbWriter::commit() {
   errno = 0;
   const int status = nc_close(std::exchange(state_->file, -1));
   if (status != NC_NOERR) return state_->failure(State::reason(status));
-  const FileDescriptor written(::open(state_->temporary.c_str(), O_RDONLY | O_CLOEXEC));
-  if (!written || ::fsync(written.get()) != 0 ||
-      ::rename(state_->temporary.c_str(), state_->target.c_str()) != 0) {
-    return Failure{systemError("cannot write", state_->path)};
-  }
-  state_->temporary.clear();
+  if (!state_->unfinished.finish()) return Failure{systemError("cannot write", state_->path)};
   return {};
 }
 

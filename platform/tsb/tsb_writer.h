@@ -20,7 +20,7 @@ class TsbWriter {
   TsbWriter& operator=(TsbWriter&&) = delete;
   ~TsbWriter();
 
-  // One item (from 1) at one time step (from 0), x fastest.
+  // One item (from 1) at one time step (from 0), x fastest; of a series, at that step and those that follow.
   Outcome write(std::size_t item, std::size_t step, std::span<const float> values);
   Outcome write(std::size_t item, std::size_t step, std::span<const double> values);
   // Rows `firstRow` and on of a two-dimensional item; whole rows only.

@@ -70,6 +70,8 @@ ColumnRows::Row ColumnRows::makeRow(const TableColumn& column, QGridLayout& grid
   const Row row{new QComboBox(body), new QLineEdit(body), makeTypes(body), new QLineEdit(body)};
   const std::size_t place = rows_.size();
   const int line = static_cast<int>(place) + 1;
+  // What is dropped on the window is a file.
+  for (QLineEdit* edit : {row.name, row.type->lineEdit(), row.unit}) edit->setAcceptDrops(false);
   row.role->addItems(
       {tr("Item"), tr("Left out"), tr("Date"), tr("Time of day"), tr("Day number"), tr("Time since start")});
   row.role->setCurrentIndex(static_cast<int>(column.role));

@@ -2,6 +2,7 @@
 
 #include <QDateTime>
 #include <cmath>
+#include <utility>
 
 #include "platform/units/units.h"
 
@@ -27,11 +28,17 @@ std::vector<double> momentsOf(const SeriesTable& table) {
 
 }  // namespace
 
-ImportPlot::ImportPlot(std::optional<Period> period, QWidget* parent) : PlotWidget(parent) {
+ImportPlot::ImportPlot(QWidget* parent) : PlotWidget(parent) {
   auto ticker = QSharedPointer<QCPAxisTickerDateTime>::create();
   ticker->setDateTimeSpec(Qt::UTC);
   ticker->setDateTimeFormat("yyyy-MM-dd\nhh:mm");
   xAxis->setTicker(ticker);
+  setMinimumSize(280, 180);
+  takeColours();
+}
+
+void ImportPlot::setPeriod(const std::optional<Period>& period) {
+  if (shade_ != nullptr) removeItem(std::exchange(shade_, nullptr));
   if (period && (*period)[0].valid() && (*period)[1].valid()) {
     shade_ = new QCPItemRect(this);
     for (QCPItemPosition* corner : {shade_->topLeft, shade_->bottomRight}) {
@@ -40,9 +47,9 @@ ImportPlot::ImportPlot(std::optional<Period> period, QWidget* parent) : PlotWidg
     }
     shade_->topLeft->setCoords(secondsOf((*period)[0]), 0);
     shade_->bottomRight->setCoords(secondsOf((*period)[1]), 1);
+    takeColours();
   }
-  setMinimumSize(280, 180);
-  takeColours();
+  fit();
 }
 
 void ImportPlot::takeColours() {
@@ -64,8 +71,8 @@ void ImportPlot::showTable(const SeriesTable& table) {
     const QunUnit* base = qunBaseUnit(table.items[i].itemType);
     const std::string unit =
         !table.items[i].unit.empty() || base == nullptr ? table.items[i].unit : std::string(base->symbol);
-    curve->setName(
-        QString("%1 [%2]").arg(QString::fromStdString(table.items[i].name), QString::fromStdString(unit)));
+    const QString name = QString::fromStdString(table.items[i].name);
+    curve->setName(unit.empty() ? name : QString("%1 [%2]").arg(name, QString::fromStdString(unit)));
     QVector<QCPGraphData> points;
     points.reserve(static_cast<qsizetype>(moments.size()));
     for (std::size_t step = 0; step < moments.size(); ++step)

@@ -16,12 +16,16 @@ using Period = std::array<DateTime, 2>;
 class ImportPlot final : public PlotWidget {
   Q_OBJECT
  public:
-  ImportPlot(std::optional<Period> period, QWidget* parent);
+  explicit ImportPlot(QWidget* parent);
+
+  // The period that is shaded; none where it has no moments.
+  void setPeriod(const std::optional<Period>& period);
 
   void showTable(const SeriesTable& table);
   // Shows one item alone (from 1), or all of them (0).
   void showValues(std::size_t item, std::size_t step) override;
   void fit() override;
+  // Null where no period is shaded.
   QCPItemRect* shade() { return shade_; }
 
   // Whether the series lasts from the begin of a period to its end.

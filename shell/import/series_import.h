@@ -4,101 +4,113 @@
 #include <QLabel>
 #include <QProgressBar>
 #include <QPushButton>
-#include <QSpinBox>
 #include <QTableView>
 #include <QTimer>
+#include <memory>
+#include <optional>
 
 #include "conversion/table_guess.h"
+#include "shell/background_work.h"
 #include "shell/import/column_rows.h"
 #include "shell/import/import_plot.h"
-#include "shell/import/table_job.h"
+#include "shell/import/series_form.h"
 #include "shell/import/table_preview.h"
+#include "shell/import/use_strip.h"
 
 namespace gridbay::shell {
 
 // Brings a table of text in as a time series: from a file, or what is pasted. How it is read is recognised
 // and shown, can be changed, and is seen at once in the preview and the plot; nothing is written before
-// Import.
+// Import. It is read and written in a copy of the process, so that the window never waits.
 class SeriesImport final : public QDialog {
   Q_OBJECT
  public:
-  // The simulation of the setup that is open, and the folder that its files are in; either may be none.
-  SeriesImport(std::optional<Period> period, QString folder, QWidget* parent);
+  // Of the setup that is open: its simulation, and the folder that its files are in; either may be none.
+  struct Setup {
+    std::optional<Period> period = {};
+    QString folder = {};
+  };
 
+  // `setup` is asked for whenever the window is turned to, as is `uses` for a series that has been written.
+  SeriesImport(std::function<Setup()> setup, std::function<UseStrip::Offer(const QString& series)> uses,
+               QWidget* parent);
   ~SeriesImport() override;
 
   // Shows a table file; false, which is then said, when it can't be read.
   bool openTable(const QString& path);
   // Shows what the clipboard has; false when that is no text.
   bool pasteTable();
-  // Writes the series, once all is read; false when it was not, which is said where there is an error.
-  bool importTable();
 
+  SeriesForm& form() { return *fields_; }
   ColumnRows& columns() { return *columns_; }
   QTableView& preview() { return *previewView_; }
   TablePreview& lines() { return *preview_; }
   ImportPlot& plot() { return *plot_; }
-  QComboBox* separator() { return separator_; }
-  QComboBox* decimals() { return decimals_; }
-  QSpinBox* headings() { return headings_; }
-  QComboBox* dates() { return dates_; }
-  QLineEdit* start() { return start_; }
   QLineEdit* result() { return result_; }
   QLabel* doubts() { return doubts_; }
   QLabel* verdict() { return verdict_; }
   QLabel* coverage() { return coverage_; }
   QPushButton* importButton() { return import_; }
-  bool isReading() const { return job_->isAtWork() || rereading_.isActive(); }
+  bool isReading() const { return rereading_.isActive() || (work_.isRunning() && !isImporting()); }
+  // It is being written, or is going to be once all is read.
+  bool isImporting() const { return stage_ == Stage::importing || isWanted_; }
 
  signals:
-  void imported(const QString& path, const QString& summary);
-
- public slots:
-  void reject() override;
+  void imported(const QString& summary);
+  void viewWanted(const QString& series);
+  void helpWanted();
 
  protected:
   void keyPressEvent(QKeyEvent* event) override;
+  void changeEvent(QEvent* event) override;
+  void done(int result) override;
 
  private:
+  enum class Stage { reading, ready, importing };
+
   QWidget* buildSource();
-  QWidget* buildReading();
+  QWidget* buildMiddle();
   QWidget* buildResult();
+  QWidget* buildButtons();
   void browse();
   void showTable(std::shared_ptr<const std::string> text, const QString& title);
   void guess();
   void takeGuess(TableGuess guess);
   void showForm();
   void orderTabs();
-  void takeForm();
+  void formChanged();
+  void readSoon();
   void reread();
-  void showRead(const std::shared_ptr<const ReadTable>& read);
+  void takeRead(const std::optional<std::string>& bytes);
+  void takeSetup();
+  void showCoverage();
   QString obstacle() const;
   QString firstFault() const;
   void showVerdict();
-  void setAtWork(bool atWork);
+  void tell(const QString& text, bool isFault);
+  void startImport();
+  void write(const QString& path);
+  void takeImport(const std::optional<std::string>& bytes);
+  void cancel();
+  void enter(Stage stage);
   bool mayReplace(const QString& path);
 
-  std::optional<Period> period_;
-  QString folder_;
+  std::function<Setup()> findSetup_;
+  Setup setup_;
   QString source_;  // the path of the table; empty for one that is pasted
   QString title_;
   std::shared_ptr<const std::string> text_;
   TableForm form_;
-  std::shared_ptr<const ReadTable> read_;
+  std::optional<Result<SeriesTable>> read_;
+  Stage stage_ = Stage::ready;
   bool isWanted_ = false;  // the import, once all is read
-  bool isWriting_ = false;
-  bool isStopped_ = false;
-  QTimer rereading_;
+  QString made_;           // the series that is being made, or was
+  QTimer rereading_;       // from a change to a new look
+  BackgroundWork work_;
 
   QWidget* body_;
   QLabel* sourceText_ = nullptr;
-  QComboBox* separator_ = nullptr;
-  QComboBox* decimals_ = nullptr;
-  QSpinBox* headings_ = nullptr;
-  QComboBox* dates_ = nullptr;
-  QLineEdit* missing_ = nullptr;
-  QLineEdit* start_ = nullptr;
-  QComboBox* timeUnit_ = nullptr;
+  SeriesForm* fields_;
   ColumnRows* columns_;
   TablePreview* preview_;
   QTableView* previewView_;
@@ -108,9 +120,12 @@ class SeriesImport final : public QDialog {
   QLabel* verdict_;
   QLineEdit* result_ = nullptr;
   QPushButton* choose_ = nullptr;
-  QProgressBar* progress_;
-  QPushButton* import_;
-  TableJob* job_;
+  UseStrip* uses_;
+  QProgressBar* progress_ = nullptr;
+  QPushButton* cancel_ = nullptr;
+  QPushButton* import_ = nullptr;
+  QPushButton* help_ = nullptr;
+  QPushButton* close_ = nullptr;
 };
 
 }  // namespace gridbay::shell

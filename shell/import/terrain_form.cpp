@@ -9,10 +9,12 @@
 #include <QSignalBlocker>
 #include <QVBoxLayout>
 #include <cmath>
+#include <utility>
 
 #include "conversion/item_types.h"
 #include "platform/units/units.h"
 #include "shell/import/terrain_plan.h"
+#include "shell/shades.h"
 
 namespace gridbay::shell {
 namespace {
@@ -46,6 +48,7 @@ TerrainForm::TerrainForm(QWidget* parent)
       crs_(new ProjectionSearch(this)),
       reproject_(new ProjectionSearch(this)),
       spacing_(makeNumber("spacing", &TerrainForm::sourceChanged)),
+      spacingWanted_(new QLabel(this)),
       resampling_(new QComboBox(this)),
       west_(makeNumber("west", &TerrainForm::planChanged)),
       south_(makeNumber("south", &TerrainForm::planChanged)),
@@ -118,6 +121,11 @@ QWidget* TerrainForm::makePlaceGroup() {
   form->addRow(tr("&Projection of the file:"), crs_);
   form->addRow(tr("Bring &to:"), reproject_);
   form->addRow(tr("&Spacing [m]:"), spacing_);
+  form->addRow(QString(), spacingWanted_);
+  spacingWanted_->setObjectName("spacingWanted");
+  spacingWanted_->setWordWrap(true);
+  spacingWanted_->hide();
+  connect(spacing_, &QLineEdit::textChanged, this, &TerrainForm::showSpacingWanted);
   form->addRow(tr("Resamp&ling:"), resampling_);
   reproject_->edit().setPlaceholderText(tr("as it is"));
   spacing_->setPlaceholderText(tr("as it is"));
@@ -211,6 +219,8 @@ void TerrainForm::setFile(const QString& path) {
     const QString name = info.completeBaseName() + (info.suffix() == "tsb2" ? "_new.tsb2" : ".tsb2");
     target_->setText(path.isEmpty() ? QString() : info.dir().filePath(name));
     whole_ = {};
+    suggestedFor_.clear();
+    natural_ = 0;
     isOfPoints_ = false;
     isFresh_ = true;
   }
@@ -232,10 +242,30 @@ bool TerrainForm::suggestPlace(const RasterPreview& preview) {
     spacing_->clear();
     return true;
   }
-  // What comes of another projection has no round spacing of its own.
+  // What comes of another projection has no round spacing of its own. One that is taken away then stays so.
+  if (std::exchange(suggestedFor_, reproject_->text()) == reproject_->text()) return false;
   if (reproject_->text().isEmpty() || !spacing_->text().isEmpty()) return false;
   spacing_->setNumber(roundNumber(preview.spacing[0]), 6);
   return true;
+}
+
+// Why the empty spacing will not do; empty where it does, or is given.
+QString TerrainForm::spacingWanted() const {
+  const bool isWanted = isOfPoints_ || !reproject_->text().isEmpty();
+  if (!isWanted || !spacing_->text().trimmed().isEmpty()) return {};
+  if (natural_ == 0) return tr("A spacing is wanted.");
+  return isOfPoints_ ? tr("A spacing is wanted: the points lie about %1 apart.").arg(natural_, 0, 'g', 3)
+                     : tr("A spacing is wanted: the projection leads to %1 m, which is no round one.")
+                           .arg(natural_, 0, 'g', 6);
+}
+
+void TerrainForm::showSpacingWanted() {
+  const QString why = spacingWanted();
+  QPalette colours;
+  colours.setColor(QPalette::WindowText, faultColour(colours));
+  spacingWanted_->setPalette(colours);
+  spacingWanted_->setText(why);
+  spacingWanted_->setVisible(!why.isEmpty());
 }
 
 bool TerrainForm::show(const RasterPreview& preview) {
@@ -253,7 +283,9 @@ bool TerrainForm::show(const RasterPreview& preview) {
   if (isFresh_) suggest(preview);
   isFresh_ = false;
   const bool isChanged = suggestPlace(preview);
+  if (spacing_->text().isEmpty()) natural_ = preview.spacing[0];
   spacing_->setPlaceholderText(tr("as it is: %1").arg(preview.spacing[0], 0, 'g', 6));
+  showSpacingWanted();
   takeExtent(preview);
   return isChanged;
 }
@@ -351,6 +383,7 @@ QString TerrainForm::fault() {
   }
   if (spacing_->number() && *spacing_->number() <= 0)
     return refuse(spacing_, tr("The spacing is a number of metres above 0."));
+  if (const QString why = spacingWanted(); !why.isEmpty()) return refuse(spacing_, why);
   for (ProjectionSearch* search : {crs_, reproject_}) {
     if (!search->text().isEmpty() && !search->isValid())
       return refuse(&search->edit(), tr("\"%1\" is no projection that is known here.").arg(search->text()));

@@ -57,6 +57,8 @@ class TerrainForm final : public QWidget {
   void fill(QComboBox& box, const std::vector<std::string>& names);
   void suggest(const RasterPreview& preview);
   bool suggestPlace(const RasterPreview& preview);
+  QString spacingWanted() const;
+  void showSpacingWanted();
   void takeExtent(const RasterPreview& preview);
   bool isWhole() const;
 
@@ -68,6 +70,7 @@ class TerrainForm final : public QWidget {
   ProjectionSearch* crs_;
   ProjectionSearch* reproject_;
   NumberEdit* spacing_;
+  QLabel* spacingWanted_;  // why an empty spacing will not do
   QComboBox* resampling_;
   NumberEdit* west_;
   NumberEdit* south_;
@@ -77,7 +80,9 @@ class TerrainForm final : public QWidget {
   NumberEdit* land_;
   NumberEdit* missing_;
   QLineEdit* target_;
-  QString taken_;  // the file that was last taken
+  QString taken_;         // the file that was last taken
+  QString suggestedFor_;  // the projection that a spacing was last suggested for
+  double natural_ = 0;    // the spacing of the raster where none is given; 0 where that is unknown
   QRectF whole_;
   QSizeF cell_;
   bool isOfPoints_ = false;

@@ -3,6 +3,7 @@
 #include <QFileInfo>
 #include <QHBoxLayout>
 #include <QKeyEvent>
+#include <QLocale>
 #include <QMessageBox>
 #include <QScrollArea>
 #include <QStorageInfo>
@@ -12,8 +13,10 @@
 #include <map>
 
 #include "conversion/raster_preview.h"
-#include "shell/import/terrain_packing.h"
+#include "shell/import/file_drop.h"
 #include "shell/import/terrain_plan.h"
+#include "shell/import/work_host.h"
+#include "shell/import/work_results.h"
 #include "shell/shades.h"
 
 namespace gridbay::shell {
@@ -23,14 +26,11 @@ constexpr int kDelay = 300;  // milliseconds from an edit to the look at what it
 constexpr int kMost = 1200;  // points of a picture along an axis
 constexpr int kParts = 1000;
 
-// Tells how far the work is, and names the fields.
-class FormConversion final : public ConversionHost {
+// Names the fields.
+class FormConversion final : public WorkHost {
  public:
-  explicit FormConversion(const WorkApart::Progress& progress) : progress_(progress) {}
+  using WorkHost::WorkHost;
 
-  bool reached(std::size_t done, std::size_t total) override {
-    return progress_(static_cast<double>(done) / static_cast<double>(std::max<std::size_t>(total, 1)));
-  }
   std::string option(std::string_view name, std::string_view) const override {
     static const std::map<std::string_view, std::string> kFields{
         {"band", "\"Band\""},        {"crs", "\"Projection of the file\""}, {"extent", "\"Window\""},
@@ -39,16 +39,12 @@ class FormConversion final : public ConversionHost {
     const auto found = kFields.find(name);
     return found == kFields.end() ? std::string(name) : found->second;
   }
-  std::string itemTypeList() const override { return "the list of \"Item type\" has all"; }
-
- private:
-  const WorkApart::Progress& progress_;
 };
 
 }  // namespace
 
-TerrainImport::TerrainImport(std::function<std::vector<Use>()> uses, QWidget* parent)
-    : QDialog(parent), findUses_(std::move(uses)), form_(new TerrainForm(this)), work_(nullptr) {
+TerrainImport::TerrainImport(std::function<UseStrip::Offer(const QString& map)> uses, QWidget* parent)
+    : QDialog(parent), form_(new TerrainForm(this)), work_(nullptr) {
   setWindowTitle(tr("Import Terrain"));
   auto* layout = new QVBoxLayout(this);
   auto* columns = new QHBoxLayout;
@@ -71,10 +67,15 @@ TerrainImport::TerrainImport(std::function<std::vector<Use>()> uses, QWidget* pa
   status_ = new QLabel(this);
   status_->setWordWrap(true);
   layout->addWidget(status_);
-  layout->addWidget(makeUseStrip());
+  uses_ = new UseStrip(tr("Use the map as the bathymetr&y of"), std::move(uses), this);
+  layout->addWidget(uses_);
   layout->addWidget(makeButtons());
   resize(1050, 720);
 
+  connect(uses_, &UseStrip::viewWanted, this, &TerrainImport::viewWanted);
+  new FileDrop(*this, [this](const QString& path) {
+    if (stage_ != Stage::importing) form_->setFile(path);
+  });
   delay_.setSingleShot(true);
   delay_.setInterval(kDelay);
   connect(&delay_, &QTimer::timeout, this, &TerrainImport::read);
@@ -109,32 +110,6 @@ QWidget* TerrainImport::makePictures() {
   layout->addLayout(row, 1);
   layout->addWidget(pointed_);
   return pictures;
-}
-
-QWidget* TerrainImport::makeUseStrip() {
-  useStrip_ = new QWidget(this);
-  auto* layout = new QHBoxLayout(useStrip_);
-  layout->setContentsMargins({});
-  use_ = new QComboBox(useStrip_);
-  use_->setObjectName("use");
-  auto* act = new QPushButton(tr("Use it"), useStrip_);
-  act->setObjectName("act");
-  auto* view = new QPushButton(tr("View"), useStrip_);
-  view->setObjectName("view");
-  for (QPushButton* button : {act, view}) button->setAutoDefault(false);
-  auto* label = new QLabel(tr("Use the map as the bathymetry of"), useStrip_);
-  label->setBuddy(use_);
-  layout->addWidget(label);
-  layout->addWidget(use_, 1);
-  layout->addWidget(act);
-  layout->addWidget(view);
-  useStrip_->hide();
-  connect(act, &QPushButton::clicked, this, [this] {
-    const auto place = static_cast<std::size_t>(use_->currentIndex());
-    if (place < uses_.size()) uses_[place].act(made_);
-  });
-  connect(view, &QPushButton::clicked, this, [this] { emit viewWanted(made_); });
-  return useStrip_;
 }
 
 QWidget* TerrainImport::makeButtons() {
@@ -185,7 +160,7 @@ void TerrainImport::tell(const QString& text, bool isFault) {
 
 void TerrainImport::readSoon() {
   work_.stop();
-  useStrip_->hide();
+  uses_->hide();
   enter(Stage::ready);
   import_->setEnabled(false);
   delay_.start();
@@ -195,12 +170,10 @@ void TerrainImport::read() {
   tell({}, false);
   if (form_->file().text().isEmpty()) return;
   enter(Stage::reading);
-  work_.begin(
-      [wanted = form_->preview()](const WorkApart::Progress& progress) {
-        FormConversion host(progress);
-        return packed(previewRaster(wanted, kMost, host));
-      },
-      false);
+  work_.begin([wanted = form_->preview()](const WorkApart::Progress& progress) {
+    FormConversion host(progress);
+    return packed(previewRaster(wanted, kMost, host));
+  });
 }
 
 void TerrainImport::takePreview(const std::optional<std::string>& bytes) {
@@ -237,7 +210,7 @@ void TerrainImport::showPlan() {
   histogram_->setLand(land);
   const RasterPreview& raster = *shown_;
   summary_->setText(form_->window().isValid() ? summaryOf(raster, form_->window(), land) : QString());
-  if (stage_ == Stage::ready) useStrip_->hide();
+  if (stage_ == Stage::ready) uses_->hide();
   const QStorageInfo disk(QFileInfo(form_->target().text()).path());
   const auto [nx, ny] = pointsIn(raster, form_->window());
   const double size = static_cast<double>(sizeof(float)) * nx * ny;
@@ -246,7 +219,10 @@ void TerrainImport::showPlan() {
              .arg(QString::fromStdString(raster.unit)),
          true);
   } else if (disk.isValid() && size > static_cast<double>(disk.bytesAvailable())) {
-    tell(tr("The disk of %1 has no room for the map.").arg(form_->target().text()), true);
+    tell(tr("The disk of %1 has no room for the map: %2 are free.")
+             .arg(form_->target().text(),
+                  QLocale().formattedDataSize(disk.bytesAvailable(), 1, QLocale::DataSizeTraditionalFormat)),
+         true);
   } else {
     tell({}, false);
   }
@@ -290,7 +266,7 @@ void TerrainImport::startImport() {
         FormConversion host(progress);
         return packed(convertRaster(wanted, host));
       },
-      true);
+      made_);
 }
 
 void TerrainImport::takeImport(const std::optional<std::string>& bytes) {
@@ -302,11 +278,7 @@ void TerrainImport::takeImport(const std::optional<std::string>& bytes) {
     return;
   }
   tell(QString::fromStdString(*summary).trimmed(), false);
-  uses_ = findUses_();
-  use_->clear();
-  for (const Use& use : uses_) use_->addItem(use.text);
-  useStrip_->show();
-  use_->setFocus();
+  uses_->offer(made_);
 }
 
 void TerrainImport::cancel() {

@@ -1,6 +1,5 @@
 #pragma once
 
-#include <QComboBox>
 #include <QDialog>
 #include <QLabel>
 #include <QProgressBar>
@@ -8,12 +7,12 @@
 #include <QTimer>
 #include <functional>
 #include <optional>
-#include <vector>
 
 #include "shell/background_work.h"
 #include "shell/import/height_histogram.h"
 #include "shell/import/terrain_form.h"
 #include "shell/import/terrain_preview.h"
+#include "shell/import/use_strip.h"
 
 namespace gridbay::shell {
 
@@ -22,14 +21,8 @@ namespace gridbay::shell {
 class TerrainImport final : public QDialog {
   Q_OBJECT
  public:
-  // Where a map can be put to use, "Area 1 of harbour.v27", and how.
-  struct Use {
-    QString text;
-    std::function<void(const QString& map)> act;
-  };
-
   // `uses` is asked for whenever a map has been made.
-  TerrainImport(std::function<std::vector<Use>()> uses, QWidget* parent);
+  TerrainImport(std::function<UseStrip::Offer(const QString& map)> uses, QWidget* parent);
   ~TerrainImport() override;
 
   TerrainForm& form() { return *form_; }
@@ -52,7 +45,6 @@ class TerrainImport final : public QDialog {
   enum class Stage { reading, ready, importing };
 
   QWidget* makePictures();
-  QWidget* makeUseStrip();
   QWidget* makeButtons();
   void readSoon();
   void read();
@@ -65,16 +57,13 @@ class TerrainImport final : public QDialog {
   void enter(Stage stage);
   void tell(const QString& text, bool isFault);
 
-  std::function<std::vector<Use>()> findUses_;
-  std::vector<Use> uses_;
   TerrainForm* form_;
   TerrainPreview* preview_;
   HeightHistogram* histogram_;
   QLabel* pointed_ = nullptr;
   QLabel* summary_ = nullptr;
   QLabel* status_ = nullptr;
-  QWidget* useStrip_ = nullptr;
-  QComboBox* use_ = nullptr;
+  UseStrip* uses_ = nullptr;
   QProgressBar* progress_ = nullptr;
   QPushButton* import_ = nullptr;
   QPushButton* cancel_ = nullptr;

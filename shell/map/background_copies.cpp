@@ -4,7 +4,7 @@
 #include <algorithm>
 #include <utility>
 
-#include "shell/import/terrain_packing.h"
+#include "shell/import/work_results.h"
 
 namespace gridbay::shell {
 namespace {

@@ -9,7 +9,7 @@
 #include <optional>
 #include <vector>
 
-#include "shell/import/background_work.h"
+#include "shell/background_work.h"
 #include "shell/map/background_worker.h"
 
 namespace gridbay::shell {

@@ -25,9 +25,11 @@ namespace fs = std::filesystem;
 using test::ProgramRun;
 using test::runTool;
 using test::textOf;
+using ::testing::ElementsAre;
 using ::testing::HasSubstr;
 using ::testing::IsEmpty;
 using ::testing::Not;
+using ::testing::Truly;
 
 // A raster of 4 x 3 points with one missing value, row 0 in the north.
 constexpr std::string_view kRaster =
@@ -132,6 +134,18 @@ TEST_F(ConvertRaster, WhatCannotBeDone) {
       test::runProgram("gdal_translate", {"-q", "-a_srs", "EPSG:4326", raster, folder.file("d.tif")}).status,
       0);
   EXPECT_THAT(refused({folder.file("d.tif"), out, "--land", "1"}), HasSubstr("The raster is in degrees"));
+}
+
+// By its size, and with nothing that is left where it was going to be.
+TEST_F(ConvertRaster, WhatTheDiskHasNoRoomForIsRefusedBefore) {
+  if (fs::space(fs::path(out).parent_path()).available > 1'900'000'000'000U)
+    GTEST_SKIP() << "the disk has room for it";
+  const std::string raster = folder.write("r.asc", kRaster);
+  EXPECT_THAT(refused({raster, out, "--land", "60", "--crs", "UTM-32", "--resample", "0.00005"}),
+              HasSubstr("take 1.92e+03 GB, and the disk has "));
+  EXPECT_THAT(refused({raster, out, "--land", "60", "--crs", "UTM-32", "--resample", "0.000001"}),
+              HasSubstr("points 1e-06 apart would be 4e+07 x 3e+07 of them"));
+  EXPECT_EQ(std::distance(fs::directory_iterator(fs::path(out).parent_path()), {}), 1);
 }
 
 // Of a plane the values are known wherever a point lies; to be half a point off would be 0.05 there.
@@ -653,6 +667,49 @@ TEST_F(ConvertSeries, WithoutAStartTheTableTellsWhatItHolds) {
               HasSubstr("may be day/month/year or month/day/year: the first is meant"));
   EXPECT_THAT(runTool({"convert", "series", open, out, "--force", "--dates", "mdy"}).out,
               HasSubstr("from 2020-01-02 00:00:00 to 2020-02-02 00:00:00"));
+}
+
+TEST_F(ConvertSeries, MissingValuesAreTold) {
+  const auto values = [this] {
+    const Result<TsbFile> file = TsbFile::open(out);
+    std::vector<double> read(file->definition().time.count);
+    for (std::size_t step = 0; step < read.size(); ++step)
+      EXPECT_TRUE(file->read(1, step, std::span<double>(&read[step], 1)));
+    for (double& value : read) value = value == file->definition().items[0].deleteValue ? NAN : value;
+    return read;
+  };
+  const auto isGone = [](double value) { return std::isnan(value); };
+  // In place of those that are recognised, and with a start as well.
+  const std::string text =
+      folder.write("q.csv", "d,Q\n2020-01-01,-9999\n2020-01-02,-5\n2020-01-03,1e3\n2020-01-04,\n");
+  const ProgramRun run = runTool({"convert", "series", text, out, "--missing", "-5", "--missing", "1000"});
+  ASSERT_EQ(run.status, 0) << run.err;
+  EXPECT_THAT(run.err, Not(HasSubstr("-9999")));
+  EXPECT_THAT(values(), ElementsAre(-9999, Truly(isGone), Truly(isGone), Truly(isGone)));
+  fs::remove(out);
+  EXPECT_EQ(convert("0,1\n1,-5\n2,\n", {"--missing", "-5"}).status, 0);
+  EXPECT_THAT(values(), ElementsAre(1, Truly(isGone), Truly(isGone)));
+  fs::remove(out);
+  EXPECT_THAT(convert("0,1\n1,\n").err, HasSubstr("line 2: \"\" is no number"));
+  EXPECT_THAT(convert("0,1\n1,2\n", {"--missing", "nan"}).err,
+              HasSubstr("--missing cannot be nan: it is a finite number"));
+  EXPECT_THAT(convert("0,1\n1,2\n", {"--missing", "none"}).err, HasSubstr("--missing"));
+  EXPECT_FALSE(fs::exists(out));
+}
+
+TEST_F(ConvertSeries, TextsInOtherCharacters) {
+  std::string wide("\xff\xfe");
+  for (const char c : std::string("d;Q (m\xb3/s)\r\n2020-01-01;1,5\r\n2020-01-02;2\r\n")) wide += {c, '\0'};
+  for (const std::string& text :
+       {wide, wide.substr(2), std::string("d;Q (m\xb3/s)\n2020-01-01;1,5\n2020-01-02;2\n")}) {
+    const ProgramRun run = runTool({"convert", "series", folder.write("q.csv", text), out, "--force"});
+    ASSERT_EQ(run.status, 0) << run.err;
+    EXPECT_THAT(run.out, HasSubstr("Q of 2 time steps"));
+    EXPECT_EQ(info()["items"][0]["type"], 100001);
+  }
+  fs::remove(out);
+  EXPECT_THAT(runTool({"convert", "series", folder.write("q.csv", std::string("a\0b\0\0\1", 6)), out}).err,
+              HasSubstr("q.csv\": it is no text"));
 }
 
 TEST_F(ConvertSeries, WhatTheTableDoesNotTellIsAskedFor) {

@@ -6,6 +6,7 @@
 
 #include "conversion/series_table.h"
 #include "conversion/table_headings.h"
+#include "conversion/table_text.h"
 #include "core/date_time.h"
 #include "platform/units/units.h"
 
@@ -54,6 +55,15 @@ TEST(TableGuess, RecognisesManyForms) {
        "2020-01-01 00:10:00",
        {2},
        {"wl"},
+       0},
+      {"tabs below a heading of blanks",
+       "date     water surface(m)\n2020-01-01\t1\n2020-01-02\t2.5\n",
+       '\t',
+       false,
+       1,
+       "2020-01-02 00:00:00",
+       {2.5},
+       {"water surface"},
        0},
       {"semicolons and commas",
        "Datum;Pegel (m);Q (m³/s)\n01.02.2020 00:00;1,25;10,5\n01.02.2020 06:00;1,5;11\n",
@@ -220,13 +230,15 @@ TEST(TableGuess, RecognisesManyForms) {
   };
   for (const Case& it : cases) {
     SCOPED_TRACE(it.name);
-    const auto [form, doubts, dateDoubt] = guessTable(it.text);
+    const Result<std::string> text = tableText(it.text);
+    ASSERT_TRUE(text);
+    const auto [form, doubts, missingDoubts, dateDoubt] = guessTable(*text);
     EXPECT_EQ(form.separator, it.separator);
     EXPECT_EQ(form.decimalComma, it.decimalComma);
     EXPECT_EQ(form.headerLines, it.headerLines);
-    EXPECT_EQ(doubts.size() + (dateDoubt.empty() ? 0U : 1U), it.doubts)
+    EXPECT_EQ(doubts.size() + missingDoubts.size() + (dateDoubt.empty() ? 0U : 1U), it.doubts)
         << ::testing::PrintToString(doubts) << dateDoubt;
-    const Result<SeriesTable> table = readSeriesTable(it.text, form);
+    const Result<SeriesTable> table = readSeriesTable(*text, form);
     ASSERT_TRUE(table) << table.error();
     EXPECT_EQ(table->faultCount, 0U) << table->faults.front().why;
     ASSERT_GT(table->times.size(), 1U);
@@ -243,7 +255,7 @@ TEST(TableGuess, RecognisesManyForms) {
 TEST(TableGuess, TimesThatAreNumbersNeedAStart) {
   for (const auto& [heading, unit] : std::vector<std::pair<std::string, std::string>>{
            {"time [h]", "h"}, {"Minutes", "min"}, {"t (sec)", "s"}, {"days", "d"}}) {
-    auto [form, doubts, dateDoubt] = guessTable(heading + ",Q\n0,1\n1,2\n2,4\n");
+    auto [form, doubts, missingDoubts, dateDoubt] = guessTable(heading + ",Q\n0,1\n1,2\n2,4\n");
     EXPECT_EQ(form.columns[0].role, Role::time) << heading;
     EXPECT_EQ(form.timeUnit, unit) << heading;
     EXPECT_THAT(doubts, ElementsAre("The table does not tell the moment of time 0"));
@@ -267,7 +279,7 @@ TEST(TableGuess, WhatIsAmbiguousIsSaid) {
   EXPECT_EQ(guessTable("d,Q\n01-02-20,1\n02-02-20,2\n").form.dateOrder, DateOrder::dayMonthYear);
   EXPECT_THAT(guessTable("d;Q\n2020-01-01;1,250\n2020-01-02;2,500\n").doubts,
               ElementsAre("The comma in \"1,250\" may part thousands; it is taken for the decimal one"));
-  EXPECT_THAT(guessTable("d,Q\n2020-01-01,-9999\n2020-01-02,-9999\n2020-01-03,1\n").doubts,
+  EXPECT_THAT(guessTable("d,Q\n2020-01-01,-9999\n2020-01-02,-9999\n2020-01-03,1\n").missingDoubts,
               ElementsAre("-9999 stands 2 times for a value: it is taken for a missing one"));
   EXPECT_THAT(guessTable("d,Q [furlongs?]\n2020-01-01,1\n2020-01-02,2\n").doubts,
               ElementsAre("\"furlongs?\" of \"Q\" is no unit that is known"));

@@ -7,10 +7,10 @@
 #include <chrono>
 #include <csignal>
 #include <filesystem>
-#include <fstream>
 #include <thread>
 
 #include "platform/apart.h"
+#include "platform/files/unfinished_file.h"
 #include "platform/no_copy_now.h"
 #include "tests/support/temporary_folder.h"
 
@@ -70,23 +70,25 @@ TEST(WorkApart, ACrashOrAnExceptionEndsTheWorkAlone) {
 
 TEST(WorkApart, IsStoppedByItsEnd) {
   const test::TemporaryFolder folder;
-  const std::string left = folder.file("left");
+  const std::string wanted = folder.file("wanted");
+  const auto isEmpty = [&] { return std::filesystem::is_empty(std::filesystem::path(wanted).parent_path()); };
   for (const bool heeds : {true, false}) {
     const auto start = std::chrono::steady_clock::now();
     {
-      const Result<WorkApart> work = WorkApart::begin([&](const WorkApart::Progress& progress) {
-        const std::ofstream made(left);
-        while (progress(0) || !heeds) std::this_thread::sleep_for(std::chrono::milliseconds(5));
-        std::filesystem::remove(left);
-        return std::string();
-      });
+      const Result<WorkApart> work = WorkApart::begin(
+          [&](const WorkApart::Progress& progress) {
+            const UnfinishedFile made(wanted);
+            while (progress(0) || !heeds) std::this_thread::sleep_for(std::chrono::milliseconds(5));
+            return std::string();
+          },
+          wanted);
       ASSERT_TRUE(work);
-      while (!std::filesystem::exists(left)) std::this_thread::yield();
+      while (isEmpty()) std::this_thread::yield();
     }
-    // It has put away what it had begun; what heeds nothing is ended a while later.
-    EXPECT_EQ(std::filesystem::exists(left), !heeds);
+    // It has put away what it had begun; what heeds nothing is ended a while later, and leaves nothing
+    // either.
+    EXPECT_TRUE(isEmpty());
     EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(heeds ? 10 : 20));
-    std::filesystem::remove(left);
   }
 }
 

@@ -250,7 +250,7 @@ class NewUserTest final : public DesktopFixture {
               ";" + QByteArray::number(18 * std::sin(minute / 60.0 * M_PI), 'f', 2) + ";1.5\n";
     write(file("discharge.csv"), rows);
     pressInWindow(Qt::Key_I, Qt::ControlModifier | Qt::ShiftModifier);
-    auto* dialog = window_->findChild<SeriesImport*>();
+    SeriesImport* dialog = window_->seriesImport();
     QVERIFY(dialog != nullptr && dialog->isVisible());
     chooseFiles({file("discharge.csv")});
     QTest::mouseClick(&buttonOf(*dialog, "Open table..."), Qt::LeftButton);
@@ -260,12 +260,24 @@ class NewUserTest final : public DesktopFixture {
              qPrintable(dialog->coverage()->text()));
     QTest::mouseClick(dialog->importButton(), Qt::LeftButton);
     QTRY_VERIFY(QFile::exists(file("discharge.tsb0")));
+    auto* use = dialog->findChild<QComboBox*>("use");
+    QTRY_VERIFY(dialog->findChild<QLabel*>("why")->isVisible() && !use->isVisible());
 
+    // The source takes a file then, and the import offers it.
+    window_->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(window_.get()));
     QVERIFY(tab().goToPage(kFlows));
     chooseCell(1, "Type", "From file");
-    chooseFiles({file("discharge.tsb0")});
-    clickCell(1, "...");
+    dialog->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(dialog));
+    QTRY_VERIFY(use->isVisible());
+    QCOMPARE(use->count(), 1);
+    QTest::mouseClick(&buttonOf(*dialog, "Use it"), Qt::LeftButton);
     QTRY_VERIFY(textOfCell(1, "File name").endsWith("discharge.tsb0"));
+    QTest::mouseClick(&buttonOf(*dialog, "Close"), Qt::LeftButton);
+    QTRY_VERIFY(window_->seriesImport() == nullptr);
+    window_->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(window_.get()));
     QCOMPARE(textOfCell(1, "Item Name Magnitude"), QString("Discharge"));
   }
 

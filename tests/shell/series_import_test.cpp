@@ -3,17 +3,23 @@
 
 #include "shell/import/series_import.h"
 
+#include <sys/resource.h>
+
 #include <QClipboard>
 #include <QDir>
 #include <QMenuBar>
 #include <QSignalSpy>
 #include <QStatusBar>
+#include <QStringEncoder>
 #include <cmath>
+#include <csignal>
 
 #include "platform/tsb/tsb_file.h"
 #include "platform/units/units.h"
 #include "shell/appearance.h"
+#include "shell/shades.h"
 #include "tests/shell/desktop_fixture.h"
+#include "tests/shell/import_checks.h"
 #include "tests/shell/real_keys.h"
 
 namespace gridbay::shell {
@@ -21,13 +27,22 @@ namespace gridbay::shell {
 class SeriesImportTest final : public DesktopFixture {
   Q_OBJECT
 
+  static constexpr int kLong = 60'000;  // milliseconds
+
   std::unique_ptr<SeriesImport> dialog_;
 
   static Period periodOf(std::array<std::int32_t, 6> begin, std::array<std::int32_t, 6> end) {
     return {DateTime::of(begin), DateTime::of(end)};
   }
   void showDialog(std::optional<Period> period = {}) {
-    dialog_ = std::make_unique<SeriesImport>(period, folder_->path(), nullptr);
+    dialog_ = std::make_unique<SeriesImport>(
+        [this, period] {
+          return SeriesImport::Setup{period, folder_->path()};
+        },
+        [](const QString&) {
+          return UseStrip::Offer{{}, "nothing is open"};
+        },
+        nullptr);
     dialog_->show();
     dialog_->activateWindow();
     QVERIFY(QTest::qWaitForWindowActive(dialog_.get()));
@@ -35,13 +50,14 @@ class SeriesImportTest final : public DesktopFixture {
   void open(const QByteArray& text) {
     write(file("table.csv"), text);
     QVERIFY(dialog_->openTable(file("table.csv")));
-    QTRY_VERIFY(!dialog_->isReading());
+    settle();
   }
+  void settle() { QTRY_VERIFY_WITH_TIMEOUT(!dialog_->isReading(), kLong); }
   void paste(const QString& text) {
     QApplication::clipboard()->setText(text);
     focus(&dialog_->preview());
     pressKey(Qt::Key_V, Qt::ControlModifier);
-    QTRY_VERIFY(!dialog_->isReading());
+    settle();
   }
   // On this platform the window is not active again once a list or a box has closed.
   void focus(QWidget* widget) {
@@ -58,6 +74,16 @@ class SeriesImportTest final : public DesktopFixture {
     focus(edit);
     pressKey(Qt::Key_Tab);
   }
+  // Presses Import; whether the series was written.
+  bool import() {
+    const QSignalSpy spy(dialog_.get(), &SeriesImport::imported);
+    QTest::mouseClick(dialog_->importButton(), Qt::LeftButton);
+    return QTest::qWaitFor([this] { return !dialog_->isImporting(); }, kLong) && spy.size() == 1;
+  }
+  template <class Widget>
+  Widget& part(const char* name) {
+    return *dialog_->findChild<Widget*>(name);
+  }
   QString verdict() { return dialog_->verdict()->text(); }
   const ColumnRows::Row& row(std::size_t n) { return dialog_->columns().rows().at(n - 1); }
   static std::vector<double> valuesOf(const TsbFile& file, std::size_t item) {
@@ -70,6 +96,11 @@ class SeriesImportTest final : public DesktopFixture {
     Result<TsbFile> opened = TsbFile::open(file(name).toStdString());
     if (!opened) qFatal("%s", opened.error().c_str());
     return std::move(*opened);
+  }
+  static QByteArray longTable(int lines) {
+    QByteArray text = "Time,Q\n";
+    for (int i = 0; i < lines; ++i) text += QByteArray::number(43831 + i / 1440.0, 'f', 6) + ",1.5\n";
+    return text;
   }
   QStringList folderFiles() {
     return QDir(folder_->path()).entryList({"*tsb0*"}, QDir::Files | QDir::Hidden);
@@ -89,17 +120,17 @@ class SeriesImportTest final : public DesktopFixture {
   void whatIsRecognisedIsShown() {
     showDialog(periodOf({2020, 2, 1, 0, 0, 0}, {2020, 2, 1, 2, 0, 0}));
     open("Datum;Pegel (m);Q [m3/s];note\n01.02.2020 00:00;1,25;10;a\n01.02.2020 02:00;1,5;-9999;b\n");
-    QCOMPARE(dialog_->separator()->currentText(), QString("Semicolon"));
-    QCOMPARE(dialog_->decimals()->currentText(), QString("Comma"));
-    QCOMPARE(dialog_->headings()->value(), 1);
-    QCOMPARE(dialog_->dates()->currentText(), QString("Day first"));
+    QCOMPARE(dialog_->form().separator().currentText(), QString("Semicolon"));
+    QCOMPARE(dialog_->form().decimals().currentText(), QString("Comma"));
+    QCOMPARE(dialog_->form().headings().value(), 1);
+    QCOMPARE(dialog_->form().dates().currentText(), QString("Day first"));
     QCOMPARE(row(1).role->currentText(), QString("Date"));
     QCOMPARE(row(2).name->text(), QString("Pegel"));
     QCOMPARE(row(2).type->currentText(), QString("Water level"));
     QCOMPARE(row(2).unit->text(), QString("m"));
     QCOMPARE(row(3).type->currentText(), QString("Discharge"));
     QCOMPARE(row(4).role->currentText(), QString("Left out"));
-    QVERIFY(!row(4).name->isEnabled() && !dialog_->start()->isEnabled());
+    QVERIFY(!row(4).name->isEnabled() && !dialog_->form().start().isEnabled());
     QCOMPARE(dialog_->doubts()->text(),
              QString("-9999 stands once for a value: it is taken for a missing one."));
     QCOMPARE(verdict(), QString("2 lines are read."));
@@ -119,12 +150,12 @@ class SeriesImportTest final : public DesktopFixture {
   void aSpreadsheetIsPasted() {
     showDialog();
     paste("Date\tLevel\r\n2020-01-31 00:00\t1.5\r\n2020-01-31 00:30\t1.75\r\n2020-01-31 01:00\t\r\n");
-    QCOMPARE(dialog_->separator()->currentText(), QString("Tab"));
+    QCOMPARE(dialog_->form().separator().currentText(), QString("Tab"));
     QCOMPARE(dialog_->result()->text(), file("pasted.tsb0"));
-    QSignalSpy spy(dialog_.get(), &SeriesImport::imported);
-    QTest::mouseClick(dialog_->importButton(), Qt::LeftButton);
-    QCOMPARE(spy.size(), 1);
-    QVERIFY(!dialog_->isVisible());
+    QVERIFY(import());
+    QVERIFY(verdict().contains("pasted.tsb0: Level of 3 time steps, 1800 s apart"));
+    QCOMPARE(part<QLabel>("why").text(), QString("nothing is open"));
+    QVERIFY(!part<QWidget>("act").isVisible() && part<QWidget>("view").isVisible());
     const TsbFile made = result("pasted.tsb0");
     QCOMPARE(made.definition().items[0].name, std::string("Level"));
     QCOMPARE(made.definition().items[0].type, item::kWaterLevel);
@@ -139,7 +170,7 @@ class SeriesImportTest final : public DesktopFixture {
     QCOMPARE(row(1).role->currentText(), QString("Time since start"));
     QVERIFY(verdict().contains("no moment of the form"));
     QVERIFY(!dialog_->importButton()->isEnabled());
-    fill(dialog_->start(), "2021-05-01 06:00:00");
+    fill(&dialog_->form().start(), "2021-05-01 06:00:00");
     QTRY_COMPARE(verdict(), QString("What \"what\" holds is not known: it needs an item type."));
     // An item type is typed by its name, a unit that is none of it is told.
     fill(row(3).type->lineEdit(), "Salinity");
@@ -154,9 +185,9 @@ class SeriesImportTest final : public DesktopFixture {
     pressKey(Qt::Key_Down);
     QCOMPARE(row(4).role->currentText(), QString("Left out"));
     fill(dialog_->result(), file("changed"));
-    QTRY_VERIFY(!dialog_->isReading());
+    settle();
     QCOMPARE(dialog_->plot().graphCount(), 2);
-    QVERIFY(dialog_->importTable());
+    QVERIFY(import());
     const TsbFile made = result("changed.tsb0");
     QCOMPARE(made.definition().items.size(), std::size_t{2});
     QCOMPARE(made.definition().items[0].name, std::string("Gauge 7"));
@@ -171,8 +202,7 @@ class SeriesImportTest final : public DesktopFixture {
     open("d,Q\n2020-01-01,5\n2020-01-02,6\n");
     fill(row(2).unit, "l/s");
     QVERIFY(dialog_->isReading());
-    QTest::mouseClick(dialog_->importButton(), Qt::LeftButton);
-    QTRY_VERIFY(!dialog_->isVisible());
+    QVERIFY(import());
     const std::vector<double> values = valuesOf(result("table.tsb0"), 1);
     QVERIFY(std::abs(values.at(0) - 0.005) < 1e-12 && std::abs(values.at(1) - 0.006) < 1e-12);
   }
@@ -186,9 +216,9 @@ class SeriesImportTest final : public DesktopFixture {
         QString(
             "The series does not cover the simulation period, 2020-01-02 00:00:00 to 2020-06-01 00:00:00."));
     const double before = dialog_->plot().graph(0)->data()->at(0)->key;
-    focus(dialog_->dates());
+    focus(&dialog_->form().dates());
     pressKey(Qt::Key_Down);
-    QCOMPARE(dialog_->dates()->currentText(), QString("Month first"));
+    QCOMPARE(dialog_->form().dates().currentText(), QString("Month first"));
     QTRY_COMPARE(before - dialog_->plot().graph(0)->data()->at(0)->key, 30 * 86400.0);
     // The shade is in view with the series.
     QVERIFY(dialog_->plot().xAxis->range().upper >= dialog_->plot().shade()->bottomRight->coords().x());
@@ -213,7 +243,7 @@ class SeriesImportTest final : public DesktopFixture {
       QCOMPARE(lines.index(bad, 0).data(Qt::ToolTipRole).toString(), QString("\"x\" is no number"));
       QVERIFY(lines.index(bad, 0).data(Qt::ForegroundRole) != lines.index(5, 0).data(Qt::ForegroundRole));
     }
-    QVERIFY(dialog_->importTable());
+    QVERIFY(import());
     QCOMPARE(result("table.tsb0").definition().time.count, std::size_t{398});
   }
 
@@ -221,7 +251,7 @@ class SeriesImportTest final : public DesktopFixture {
     showDialog();
     paste("words and nothing else\nmore words");
     QCOMPARE(verdict(), QString("A table of times and values is expected, line by line"));
-    QVERIFY(!dialog_->importButton()->isEnabled() && !dialog_->importTable());
+    QVERIFY(!dialog_->importButton()->isEnabled() && !import());
     QApplication::clipboard()->clear();
     focus(&dialog_->preview());
     pressKey(Qt::Key_V, Qt::ControlModifier);
@@ -231,7 +261,7 @@ class SeriesImportTest final : public DesktopFixture {
     QVERIFY(texts.size() == 1 && texts[0].contains("away.csv"));
     // The separator can be said, too.
     open("d;Q\n2020-01-01;1\n2020-01-02;2\n");
-    focus(dialog_->separator());
+    focus(&dialog_->form().separator());
     pressKey(Qt::Key_Down);
     QTRY_COMPARE(verdict(), QString("A table of times and values is expected, line by line"));
     pressKey(Qt::Key_Up);
@@ -243,57 +273,167 @@ class SeriesImportTest final : public DesktopFixture {
     showDialog();
     open("d,Q\n2020-01-01,1\n2020-01-02,2\n");
     write(file("table.tsb0"), "of old");
-    QStringList texts = answers({QMessageBox::No}, [this] { QVERIFY(!dialog_->importTable()); });
+    QStringList texts = answers({QMessageBox::No}, [this] { QVERIFY(!import()); });
     QVERIFY(texts.size() == 1 && texts[0].contains("is there already. Replace it?"));
     QCOMPARE(textOf(file("table.tsb0")), QString("of old"));
     // Nor is the table itself.
     QFile::rename(file("table.csv"), file("in.tsb0"));
     QVERIFY(dialog_->openTable(file("in.tsb0")));
-    QTRY_VERIFY(!dialog_->isReading());
-    texts = answers({QMessageBox::Ok}, [this] { QVERIFY(!dialog_->importTable()); });
-    QVERIFY(texts.size() == 1 && texts[0].contains("is a file that is read here"));
+    settle();
+    QVERIFY(!import());
+    QVERIFY(verdict().contains("is a file that is read here"));
     fill(dialog_->result(), file("table.tsb0"));
-    answers({QMessageBox::Yes}, [this] { QVERIFY(dialog_->importTable()); });
+    answers({QMessageBox::Yes}, [this] { QVERIFY(import()); });
     QCOMPARE(result("table.tsb0").definition().time.count, std::size_t{2});
   }
 
   void whereNothingCanBeWrittenThatIsTold() {
     showDialog();
     open("d,Q\n2020-01-01,1\n2020-01-02,2\n");
-    fill(dialog_->result(), file("table.csv/x.tsb0"));
-    const QStringList texts = answers({QMessageBox::Ok}, [this] { QVERIFY(!dialog_->importTable()); });
-    QVERIFY(texts.size() == 1 && texts[0].contains("x.tsb0"));
-    QVERIFY(dialog_->isVisible() && dialog_->importButton()->isEnabled());
+    for (const QString& path : {file("table.csv/x.tsb0"), file("no/x.tsb0"), QString("/proc/x.tsb0")}) {
+      fill(dialog_->result(), path);
+      QVERIFY(!import());
+      QVERIFY2(verdict().contains("x.tsb0"), qPrintable(verdict()));
+      QVERIFY(dialog_->isVisible() && dialog_->importButton()->isEnabled());
+    }
+    // A disk that is full.
+    fill(dialog_->result(), file("x.tsb0"));
+    rlimit before{};
+    getrlimit(RLIMIT_FSIZE, &before);
+    const auto handler = signal(SIGXFSZ, SIG_IGN);
+    const rlimit little{4096, before.rlim_max};
+    setrlimit(RLIMIT_FSIZE, &little);
+    const bool isWritten = import();
+    setrlimit(RLIMIT_FSIZE, &before);
+    signal(SIGXFSZ, handler);
+    QVERIFY(!isWritten);
+    QVERIFY2(verdict().contains("the disk is full"), qPrintable(verdict()));
     QVERIFY(folderFiles().isEmpty());
   }
 
   void aLongImportIsStopped() {
     showDialog();
-    QByteArray text = "Time,Q\n";
-    for (int i = 0; i < 400'000; ++i) text += QByteArray::number(43831 + i / 1440.0, 'f', 6) + ",1.5\n";
-    open(text);
+    open(longTable(400'000));
     QCOMPARE(verdict(), QString("400000 lines are read."));
-    QTimer::singleShot(40, dialog_.get(), [this] {
-      QVERIFY(!dialog_->columns().isEnabled());
-      QTest::keyClick(dialog_.get(), Qt::Key_Escape);
-    });
-    QVERIFY(!dialog_->importTable());
-    QCOMPARE(verdict(), QString("The conversion was stopped; nothing is written"));
+    const auto begin = [this] {
+      QTest::mouseClick(dialog_->importButton(), Qt::LeftButton);
+      QVERIFY(dialog_->isImporting() && !dialog_->columns().isEnabled());
+    };
+    begin();
+    QTest::keyClick(dialog_.get(), Qt::Key_Escape);
+    QCOMPARE(verdict(), QString("The import was stopped; nothing is written."));
     QVERIFY(folderFiles().isEmpty());
-    // It can be made after all, and while it is read the window can go.
+    begin();
+    QTest::mouseClick(&part<QPushButton>("cancel"), Qt::LeftButton);
+    QVERIFY(folderFiles().isEmpty());
+    // What is killed leaves nothing either.
+    begin();
+    for (const QString& copy :
+         textOf(QString("/proc/%1/task/%1/children").arg(getpid())).split(' ', Qt::SkipEmptyParts))
+      kill(copy.toInt(), SIGKILL);
+    QTRY_COMPARE(verdict(), QString("The import came to a sudden end; nothing is written"));
+    QVERIFY(folderFiles().isEmpty());
+    // It can be made after all, and while it is read or written the window can go.
     QVERIFY(dialog_->isVisible() && dialog_->columns().isEnabled());
-    QVERIFY(dialog_->importTable());
-    showDialog();
+    QVERIFY(import());
+    QCOMPARE(folderFiles(), QStringList("table.tsb0"));
     QVERIFY(dialog_->openTable(file("table.csv")));
     QVERIFY(dialog_->isReading());
     pressKey(Qt::Key_Escape);
     QVERIFY(!dialog_->isVisible());
   }
 
+  void theWindowLivesWhileAMillionLinesAreRead() {
+    showDialog();
+    write(file("table.csv"), longTable(1'000'000));
+    QVERIFY(dialog_->openTable(file("table.csv")));
+    QTimer ticks;
+    int count = 0;
+    connect(&ticks, &QTimer::timeout, [&count] { ++count; });
+    ticks.start(10);
+    QTRY_VERIFY_WITH_TIMEOUT(!dialog_->isReading(), kLong);
+    QCOMPARE(verdict(), QString("1000000 lines are read."));
+    const int whileRead = count;
+    QVERIFY(import());
+    QVERIFY2(whileRead > 5 && count > whileRead + 5, qPrintable(QString("%1 %2").arg(whileRead).arg(count)));
+    QCOMPARE(result("table.tsb0").definition().time.count, std::size_t{1'000'000});
+  }
+
+  void whatIsNoMissingValueIsRefusedAtItsField() {
+    showDialog();
+    open("d,Q\n2020-01-01,1\n2020-01-02,-777.25\n2020-01-03,3\n");
+    auto& why = part<QLabel>("missingFault");
+    focus(&dialog_->form().missing());
+    typeKeys("-777.25 none");
+    QVERIFY(why.isVisible() && why.text().startsWith("Missing: \"none\" is no number."));
+    QVERIFY(!dialog_->importButton()->isEnabled() && verdict() == why.text());
+    QCOMPARE(dialog_->form().missing().palette().color(QPalette::Text), faultColour(dialog_->palette()));
+    fill(&dialog_->form().missing(), "-777.25; 4,5");
+    settle();
+    QCOMPARE(verdict(), QString("3 lines are read."));
+    QVERIFY(!why.isVisible());
+    QVERIFY(std::isnan(dialog_->plot().graph(0)->data()->at(1)->value));
+    // They are shown with all of their digits.
+    QCOMPARE(dialog_->form().missing().text(), QString("-777.25 4.5"));
+  }
+
+  void tablesOfAllSorts() {
+    showDialog();
+    const QByteArray plain = "d,Q\n2020-01-01,1.5\n2020-01-02,2.5\n";
+    const QString text = QString::fromUtf8(plain);
+    QStringEncoder little(QStringEncoder::Utf16LE);
+    QStringEncoder big(QStringEncoder::Utf16BE, QStringEncoder::Flag::WriteBom);
+    struct Case {
+      QByteArray text;
+      QString says;
+    };
+    for (const Case& each :
+         {Case{"\xef\xbb\xbf" + plain, "2 lines are read."},
+          {"\xef\xbb\xbf" + plain.mid(4), "2 lines are read."},  // with no heading
+          {little(text), "2 lines are read."},
+          {big(text), "2 lines are read."},
+          {"d,Q [m\xb3/s]\r2020-01-01,1.5\r2020-01-02,2.5\r", "2 lines are read."},
+          {"", "A table of times and values is expected, line by line"},
+          {"2020-01-01,1\n", "1 lines are read."},
+          {"d,Q\n", "A table of times and values is expected, line by line"},
+          {"d,Q\n2020-01-01,1\n2020-01-03,2\n2020-01-02,3\n2020-01-04,3\n",
+           "3 lines are read. 1 line can't be read and is left out; line 4: the time does not rise."},
+          {"d,Q\n2020-01-01,1\n2020-01-01,2\n2020-01-02,3\n",
+           "2 lines are read. 1 line can't be read and is left out; line 3: the time does not rise."},
+          {"d;Q\n2020-01-01;1\n2020-01-02;2\n2020-01-03,3\n",
+           "2 lines are read. 1 line can't be read and is left out; line 4: 1 fields, where the lines before "
+           "have 2."},
+          {"d;Q\n2020-01-01;1,5\n2020-01-02;2,25\n", "2 lines are read."}}) {
+      open(each.text);
+      if (each.says.startsWith("1 lines") || each.says.startsWith("2 lines")) {
+        fill(row(2).type->lineEdit(), "Discharge");
+        settle();
+      }
+      QVERIFY2(verdict() == each.says, qPrintable(verdict() + each.text));
+    }
+    // What is no text at all.
+    write(file("table.csv"), QByteArray("\x7f"
+                                        "ELF\0\1\2\0\0\0\3",
+                                        12));
+    const QStringList texts =
+        answers({QMessageBox::Ok}, [this] { QVERIFY(!dialog_->openTable(file("table.csv"))); });
+    QVERIFY(texts.size() == 1 && texts[0].contains("it is no text"));
+  }
+
+  void aFileIsDropped() {
+    showDialog();
+    write(file("dropped.csv"), "d,Q\n2020-01-01,1\n2020-01-02,2\n");
+    drop(*dialog_, {QUrl("https://somewhere.org/a.csv")}, false);
+    drop(*dialog_, {QUrl::fromLocalFile(file("dropped.csv"))}, true);
+    QTRY_COMPARE(verdict(), QString("2 lines are read."));
+    QCOMPARE(dialog_->result()->text(), file("dropped.tsb0"));
+    for (const QLineEdit* edit : dialog_->findChildren<QLineEdit*>()) QVERIFY(!edit->acceptDrops());
+  }
+
   void tabGoesAsTheWindowReads() {
     showDialog();
     open("d,Q\n2020-01-01,1\n2020-01-02,2\n");
-    focus(dialog_->separator());
+    focus(&dialog_->form().separator());
     QStringList names;
     for (int i = 0; i < 13; ++i) {
       pressKey(Qt::Key_Tab);
@@ -303,6 +443,7 @@ class SeriesImportTest final : public DesktopFixture {
     QCOMPARE(names, (QStringList{"What column 1 holds", "What column 2 holds", "Name of column 2",
                                  "Item type of column 2", "Unit of column 2", "Lines of the table",
                                  "Browse for the time series to write"}));
+    checkAccelerators(*dialog_);
   }
 
   void theMenuBringsItWithTheSimulationShaded() {
@@ -331,7 +472,83 @@ class SeriesImportTest final : public DesktopFixture {
                  qPrintable(dialog->verdict()->text()));
     QTest::mouseClick(dialog->importButton(), Qt::LeftButton);
     QTRY_VERIFY(window_->statusBar()->currentMessage().contains("pasted.tsb0: Column 2 of 2 time steps"));
+    // Nothing asks for a discharge; what to do about it is said. The help is there meanwhile.
+    const QString why = dialog->findChild<QLabel*>("why")->text();
+    QVERIFY2(why.startsWith("s.v27 has no place that asks for such a series now."), qPrintable(why));
+    QTest::keyClick(dialog, Qt::Key_F1);
+    QVERIFY(window_->help().browser().toPlainText().startsWith("Import Series"));
     QCOMPARE(result("pasted.tsb0").definition().items[0].type, item::kDischarge);
+  }
+
+  // Rain of a file, an item of several; and the wind, which wants two.
+  void aSeriesIsPutToUseWhereItIsAskedFor() {
+    const QString rain = "HYDRODYNAMIC_MODULE/SOURCE_AND_SINK/PrecipitationType=0";
+    const QString wind = "HYDRODYNAMIC_MODULE/WIND_CONDITIONS/Data_Format=2";
+    makeWindow();
+    run("v27setup", {"set", "s.v27", rain, wind});
+    QVERIFY(window_->openDocument(file("s.v27")) != nullptr);
+    write(file("rain.csv"),
+          "d,A rain [mm/d],B rain [mm/d],speed [m/s],direction "
+          "[deg]\n1990-01-01,1,2,3,4\n1990-01-02,5,6,7,8\n");
+    window_->importSeries();
+    SeriesImport& dialog = *window_->seriesImport();
+    QVERIFY(QTest::qWaitForWindowActive(&dialog));
+    QVERIFY(dialog.openTable(file("rain.csv")));
+    QTRY_VERIFY_WITH_TIMEOUT(!dialog.isReading(), kLong);
+    const std::array types{"", "Evaporation and precipitation", "Evaporation and precipitation", "Wind speed",
+                           "Wind direction"};
+    for (std::size_t i = 1; i < types.size(); ++i) {
+      QComboBox* type = dialog.columns().rows().at(i).type;
+      type->setFocus();
+      type->lineEdit()->selectAll();
+      typeKeys(types[i]);
+      if (QApplication::activePopupWidget() != nullptr) pressKey(Qt::Key_Escape);
+      pressKey(Qt::Key_Tab);
+    }
+    QTRY_VERIFY2_WITH_TIMEOUT(!dialog.isReading() && dialog.importButton()->isEnabled(),
+                              qPrintable(dialog.verdict()->text()), kLong);
+    QTest::mouseClick(dialog.importButton(), Qt::LeftButton);
+    auto* use = dialog.findChild<QComboBox*>("use");
+    QTRY_VERIFY2_WITH_TIMEOUT(use->isVisible(), qPrintable(dialog.verdict()->text()), kLong);
+    QStringList offered;
+    for (int i = 0; i < use->count(); ++i) offered << use->itemText(i);
+    QCOMPARE(
+        offered,
+        (QStringList{"Hydrodynamic Parameters, Source and Sink: Precipitation, File name of s.v27 (A rain)",
+                     "Hydrodynamic Parameters, Source and Sink: Precipitation, File name of s.v27 (B rain)",
+                     "Hydrodynamic Parameters, Wind Conditions: Wind, Data file of s.v27"}));
+    // The second rain: the file and its item in one step.
+    const auto rainFile = [this] {
+      QWidget* shown = tab().pane().widgetOf("File name", 2);
+      if (shown->focusProxy() != nullptr) shown = shown->focusProxy();
+      return qobject_cast<QLineEdit*>(shown)->text();
+    };
+    use->setCurrentIndex(1);
+    SetupEditor& editor = window_->currentDocument()->editor();
+    const std::uint64_t before = editor.modelState();
+    QTest::mouseClick(dialog.findChild<QPushButton*>("act"), Qt::LeftButton);
+    QVERIFY(rainFile().endsWith("rain.tsb0"));
+    QCOMPARE(editor.undoable()->name, std::string("File name"));
+    QVERIFY(window_->saveDocument(file("s.v27")));
+    QVERIFY(textOf(file("s.v27"))
+                .contains(QRegularExpression(
+                    "Precipitation \\{\\s+File_Name \\(file\\)\"[^\"]*rain.tsb0\"\\s+Item_Numbers 2\\s")));
+    window_->currentDocument()->undo();
+    QCOMPARE(editor.modelState(), before);
+    // One that does not reach as far as the simulation is taken when the user agrees.
+    const SeriesPlaces places = editor.seriesPlaces(file("rain.tsb0").toStdString());
+    QVERIFY(places.places.size() == 3 && places.places[0].doubt.empty());
+    write(file("short.csv"), "d,rain\n1990-01-01 12:00,1\n1990-01-01 12:10,2\n");
+    run("v27setup", {"convert", "series", "short.csv", "short.tsb0", "--item-type", "100088"});
+    const SeriesPlaces doubtful = editor.seriesPlaces(file("short.tsb0").toStdString());
+    QVERIFY(doubtful.places.size() == 1 && !doubtful.places[0].doubt.empty());
+    QCOMPARE(doubtful.others.size(), std::size_t{1});
+    QCOMPARE(editor.useSeries(file("short.tsb0").toStdString(), doubtful.places[0]), std::string());
+    QTRY_VERIFY(rainFile().endsWith("short.tsb0"));
+    // A place that is gone meanwhile is told.
+    SeriesPlace gone = doubtful.places[0];
+    gone.page = 1;
+    QVERIFY(!editor.useSeries(file("short.tsb0").toStdString(), gone).empty());
   }
 
   void picturesAreTaken() {

@@ -10,6 +10,7 @@
 #include "shell/appearance.h"
 #include "shell/grid_view.h"
 #include "tests/shell/desktop_fixture.h"
+#include "tests/shell/import_checks.h"
 
 namespace gridbay::shell {
 
@@ -42,6 +43,7 @@ class TerrainImportTest : public DesktopFixture {
   void project(const char* name, const QString& words) {
     auto& search = part<ProjectionSearch>(name);
     search.edit().setFocus();
+    search.edit().selectAll();
     QTest::keyClicks(&search.edit(), words);
     QTRY_VERIFY(search.completer().popup()->isVisible());
     QTest::keyClick(search.completer().popup(), Qt::Key_Return);
@@ -104,7 +106,8 @@ class TerrainImportTest : public DesktopFixture {
   void cleanupTestCase() { folder_.reset(); }
   void init() {
     makeWindow();
-    for (const char* made : {"slope.tsb2", "points.tsb2", "degrees.tsb2", "estuary_new.tsb2"})
+    for (const char* made :
+         {"slope.tsb2", "points.tsb2", "degrees.tsb2", "estuary_new.tsb2", "one.tsb2", "gone.tsb2"})
       QFile::remove(file(made));
   }
   void cleanup() { window_.reset(); }
@@ -345,6 +348,66 @@ class TerrainImportTest : public DesktopFixture {
       QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
       QCOMPARE(QApplication::focusWidget()->objectName(), QString(next));
     }
+    checkAccelerators(dialog());
+  }
+
+  void aFileIsDropped() {
+    open("estuary.asc");
+    drop(dialog(), {QUrl::fromLocalFile(file("slope.asc"))}, true);
+    settle();
+    QCOMPARE(text("file"), file("slope.asc"));
+    QVERIFY(summary().startsWith("40 x 30 points"));
+    for (const QLineEdit* edit : dialog().findChildren<QLineEdit*>()) QVERIFY(!edit->acceptDrops());
+  }
+
+  void aSpacingThatIsTakenAwayStaysSo() {
+    open("estuary.asc");
+    project("crs", "32632");
+    project("reproject", "32631");
+    const QString suggested = text("spacing");
+    QVERIFY(suggested.toDouble() > 0);
+    auto& why = part<QLabel>("spacingWanted");
+    QVERIFY(!why.isVisible());
+    typeIn("spacing", "");
+    QCOMPARE(text("spacing"), QString());
+    QVERIFY2(why.isVisible() && why.text().startsWith("A spacing is wanted: the projection leads to "),
+             qPrintable(why.text()));
+    import();
+    QCOMPARE(dialog().status().text(), why.text());
+    QCOMPARE(dialog().focusWidget()->objectName(), QString("spacing"));
+    // Another projection brings one again.
+    project("reproject", "3035");
+    QVERIFY(number("spacing") > 0 && !why.isVisible());
+  }
+
+  void rastersOfAllSorts() {
+    const QByteArray place = "\nxllcorner 1000\nyllcorner 2000\ncellsize 10\nNODATA_value -99\n";
+    // One point, and nothing but missing values.
+    write(file("one.asc"), "ncols 1\nnrows 1" + place + "3\n");
+    open("one.asc");
+    QVERIFY2(summary().startsWith("1 x 1 points"), qPrintable(summary()));
+    import();
+    QCOMPARE(valuesOf(read(file("one.tsb2"))), std::vector<float>{3});
+    write(file("gone.asc"), "ncols 3\nnrows 2" + place + "-99 -99 -99\n-99 -99 -99\n");
+    typeIn("file", file("gone.asc"));
+    QVERIFY2(summary().endsWith("0 wet, 0 dry, 6 missing"), qPrintable(summary()));
+    import();
+    QCOMPARE(valuesOf(read(file("gone.tsb2"))), std::vector<float>(6, 10.0F));
+    // A huge map is refused before it is begun, by its size.
+    typeIn("file", file("estuary.asc"));
+    project("crs", "32632");
+    typeIn("target", file("huge.tsb2"));
+    const QStringList before = files();
+    typeIn("spacing", "0.03");
+    if (!dialog().status().text().contains("no room")) QSKIP("the disk has room for it");
+    import();
+    const QString told = dialog().status().text();
+    QVERIFY2(told.contains("GB free"), qPrintable(told));
+    typeIn("spacing", "0.0001");
+    QVERIFY2(dialog().status().text().contains("points 0.0001 apart would be"),
+             qPrintable(dialog().status().text()));
+    QVERIFY(!part<QPushButton>("import").isEnabled());
+    QCOMPARE(files(), before);
   }
 
   // For the eye: pictures in light and dark where a folder for them is named.

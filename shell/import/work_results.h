@@ -4,6 +4,7 @@
 
 #include "conversion/background.h"
 #include "conversion/raster_preview.h"
+#include "conversion/series_table.h"
 #include "platform/result.h"
 
 namespace gridbay::shell {
@@ -12,8 +13,11 @@ namespace gridbay::shell {
 std::string packed(const Result<RasterPreview>& preview);
 std::string packed(const Result<ConvertedRaster>& converted);
 std::string packed(const Result<BackgroundCopy>& copy);
+std::string packed(Result<SeriesTable> table);
+std::string packed(const Result<ConvertedSeries>& converted);
 Result<RasterPreview> unpackedPreview(const std::string& bytes);
-// The words about the map that was made.
+Result<SeriesTable> unpackedTable(const std::string& bytes);
+// The words about the map or series that was made.
 Result<std::string> unpackedSummary(const std::string& bytes);
 Result<BackgroundCopy> unpackedCopy(const std::string& bytes);
 

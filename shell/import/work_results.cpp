@@ -1,21 +1,34 @@
-#include "shell/import/terrain_packing.h"
+#include "shell/import/work_results.h"
+
+#include <utility>
 
 #include "platform/packing.h"
 
-namespace gridbay::shell {
-namespace {
+namespace gridbay {
 
-void pass(Packing& pack, RasterPreview& each) {
+// Found by the packing, as they stand beside it.
+static void pass(Packing& pack, RasterPreview& each) {
   pack(each.columns, each.rows, each.values, each.points, each.first, each.spacing, each.rotation,
        each.hasPlace, each.isOfPoints, each.isOwnMap, each.unit, each.projection, each.projectionName,
        each.itemType, each.valueUnit, each.landValue, each.middle, each.bands, each.rasters);
 }
-void pass(Packing& pack, BackgroundCopy& each) {
+static void pass(Packing& pack, BackgroundCopy& each) {
   pack(each.file, each.isWhole, each.isFull, each.rasters.all, each.rasters.shown);
 }
-void pass(Packing& pack, std::string& text) {
-  pack(text);
+static void pass(Packing& pack, TableColumn& each) {
+  pack(each.role, each.name, each.unit, each.itemType);
 }
+static void pass(Packing& pack, TableFault& each) {
+  pack(each.line, each.text, each.why);
+}
+static void pass(Packing& pack, SeriesTable& each) {
+  pack(each.start, each.timeUnit, each.times, each.items, each.values, each.faults, each.faultCount);
+}
+
+}  // namespace gridbay
+
+namespace gridbay::shell {
+namespace {
 
 template <class Value>
 std::string packedResult(Result<Value> result) {
@@ -23,8 +36,15 @@ std::string packedResult(Result<Value> result) {
   bool isMade = static_cast<bool>(result);
   std::string error = isMade ? std::string() : result.error();
   pack(isMade, error);
-  if (isMade) pass(pack, *result);
+  if (isMade) pack(*result);
   return std::move(pack.bytes());
+}
+
+// Of what is only told in words.
+template <class Converted>
+std::string packedSummary(const Result<Converted>& converted) {
+  if (!converted) return packedResult(Result<std::string>(Failure{converted.error()}));
+  return packedResult(Result<std::string>(converted->summary));
 }
 
 template <class Value>
@@ -35,7 +55,7 @@ Result<Value> unpackedResult(const std::string& bytes) {
   pack(isMade, error);
   if (!isMade) return Failure{error};
   Value value;
-  pass(pack, value);
+  pack(value);
   return value;
 }
 
@@ -46,16 +66,27 @@ std::string packed(const Result<RasterPreview>& preview) {
 }
 
 std::string packed(const Result<ConvertedRaster>& converted) {
-  if (!converted) return packedResult(Result<std::string>(Failure{converted.error()}));
-  return packedResult(Result<std::string>(converted->summary));
+  return packedSummary(converted);
 }
 
 std::string packed(const Result<BackgroundCopy>& copy) {
   return packedResult(copy);
 }
 
+std::string packed(Result<SeriesTable> table) {
+  return packedResult(std::move(table));
+}
+
+std::string packed(const Result<ConvertedSeries>& converted) {
+  return packedSummary(converted);
+}
+
 Result<RasterPreview> unpackedPreview(const std::string& bytes) {
   return unpackedResult<RasterPreview>(bytes);
+}
+
+Result<SeriesTable> unpackedTable(const std::string& bytes) {
+  return unpackedResult<SeriesTable>(bytes);
 }
 
 Result<std::string> unpackedSummary(const std::string& bytes) {
