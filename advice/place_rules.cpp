@@ -122,7 +122,7 @@ std::optional<Run> usablePart(AdviceContext& context, const GridFacts& grid, int
     for (int other = 1; other <= context.model.boundary->GetCount(); ++other) {
       const Run taken = runOf(context, other);
       const bool isSameLine = taken.first != taken.last && commonOf(taken, run);
-      if (other != number && isSameLine && commonOf(taken, {point, point})) return true;
+      if (other != number && isSameLine && commonOf(taken, Run{point, point})) return true;
     }
     return false;
   };

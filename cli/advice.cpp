@@ -14,7 +14,7 @@
 namespace gridbay::cli {
 namespace {
 
-struct Options {
+struct FixOptions {
   std::string file;
   std::size_t number = 0;
 };
@@ -24,7 +24,7 @@ std::string valueAt(SetupFile& setup, const std::string& keyword, const std::str
   return found ? shownValues(found->node()) : std::string();
 }
 
-int fix(const Options& options, const Console& console) {
+int fix(const FixOptions& options, const Console& console) {
   ConsoleMessageHost host(console);
   Result<SetupFile> setup = SetupFile::open(options.file, &host);
   if (!setup) return console.fail(setup.error());
@@ -131,7 +131,7 @@ nlohmann::ordered_json adviceJson(const Advice& advice, std::size_t number) {
 }
 
 void addFix(CLI::App& tool, Action& action) {
-  std::shared_ptr<Options> options;
+  std::shared_ptr<FixOptions> options;
   CLI::App& command =
       addCommand(tool, action, "fix", "Makes the fix of an advice and saves the setup", fix, options);
   command.add_option("FILE", options->file, "The setup")->required();

@@ -11,7 +11,7 @@
 namespace gridbay::cli {
 namespace {
 
-struct Options {
+struct AreaOptions {
   std::string setup;
   std::string grid;
   int number = 0;
@@ -20,7 +20,7 @@ struct Options {
   bool snap = false;
 };
 
-Result<std::optional<GridPoint>> given(const Options& options) {
+Result<std::optional<GridPoint>> given(const AreaOptions& options) {
   if (!options.at) return std::optional<GridPoint>();
   const std::optional<GridPoint> point = pointOfText(*options.at);
   if (!point) return Failure{fmt::format("\"{}\" is no grid point; write it as J,K", *options.at)};
@@ -75,14 +75,14 @@ void tellFaults(SetupMap& map, CGlobalKvs& root, int number, const Console& cons
   if (area != nullptr && !area->fault.empty()) console.note(area->fault);
 }
 
-int finish(SetupFile& setup, const Options& options, int number, SetupMap& map, const Console& console) {
+int finish(SetupFile& setup, const AreaOptions& options, int number, SetupMap& map, const Console& console) {
   tellFaults(map, setup.model(), number, console);
   if (const int status = saveSetup(setup, options.setup, console); status != kClean) return status;
   console.out << placeText(setup.model().bathymetry->at(number), number) << '\n';
   return kClean;
 }
 
-int add(const Options& options, SetupFile& setup, const std::optional<GridPoint>& at,
+int add(const AreaOptions& options, SetupFile& setup, const std::optional<GridPoint>& at,
         const Console& console) {
   CGlobalKvs& root = setup.model();
   SetupMap map;
@@ -103,7 +103,7 @@ int add(const Options& options, SetupFile& setup, const std::optional<GridPoint>
   return finish(setup, options, number, map, console);
 }
 
-int move(const Options& options, SetupFile& setup, const std::optional<GridPoint>& at,
+int move(const AreaOptions& options, SetupFile& setup, const std::optional<GridPoint>& at,
          const Console& console) {
   CGlobalKvs& root = setup.model();
   const int count = root.bathymetry->GetCount();
@@ -130,7 +130,7 @@ int move(const Options& options, SetupFile& setup, const std::optional<GridPoint
   return finish(setup, options, options.number, map, console);
 }
 
-int remove(const Options& options, SetupFile& setup, const std::optional<GridPoint>&,
+int remove(const AreaOptions& options, SetupFile& setup, const std::optional<GridPoint>&,
            const Console& console) {
   CGlobalKvs& root = setup.model();
   const int count = root.bathymetry->GetCount();
@@ -162,8 +162,8 @@ int remove(const Options& options, SetupFile& setup, const std::optional<GridPoi
 }
 
 // Opens the setup for an edit, which saves it, at the point that was given.
-template <int edit(const Options&, SetupFile&, const std::optional<GridPoint>&, const Console&)>
-int opened(const Options& options, const Console& console) {
+template <int edit(const AreaOptions&, SetupFile&, const std::optional<GridPoint>&, const Console&)>
+int opened(const AreaOptions& options, const Console& console) {
   const Result<std::optional<GridPoint>> at = given(options);
   if (!at) return console.fail(at.error());
   ConsoleMessageHost host(console);
@@ -172,7 +172,7 @@ int opened(const Options& options, const Console& console) {
   return edit(options, *setup, *at, console);
 }
 
-void addPosition(CLI::App& command, Options& options) {
+void addPosition(CLI::App& command, AreaOptions& options) {
   command.add_option("--in", options.enclosing, "Number of the area that encloses it");
   command.add_option("--at", options.at, "J,K: the point of that area at which its first point lies");
   command.add_flag("--snap", options.snap,
@@ -184,7 +184,7 @@ void addPosition(CLI::App& command, Options& options) {
 void addArea(CLI::App& tool, Action& action) {
   CLI::App& area = *tool.add_subcommand("area", "Adds, moves and removes nested areas");
   area.require_subcommand(1);
-  std::shared_ptr<Options> options;
+  std::shared_ptr<AreaOptions> options;
   CLI::App& adding = addCommand(area, action, "add", "Adds an area of a grid file (default: in area 1)",
                                 opened<add>, options);
   adding.add_option("FILE", options->setup, "The setup")->required();

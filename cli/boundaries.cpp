@@ -7,12 +7,12 @@
 namespace gridbay::cli {
 namespace {
 
-struct Options {
+struct BoundariesOptions {
   std::string file;
   bool detect = false;
 };
 
-int boundaries(const Options& options, const Console& console) {
+int boundaries(const BoundariesOptions& options, const Console& console) {
   ConsoleMessageHost host(console);
   Result<SetupFile> setup = SetupFile::open(options.file, &host);
   if (!setup) return console.fail(setup.error());
@@ -41,7 +41,7 @@ int boundaries(const Options& options, const Console& console) {
 }  // namespace
 
 void addBoundaries(CLI::App& tool, Action& action) {
-  std::shared_ptr<Options> options;
+  std::shared_ptr<BoundariesOptions> options;
   CLI::App& command =
       addCommand(tool, action, "boundaries", "Lists the open boundaries", boundaries, options);
   command.add_option("FILE", options->file, "The setup")->required();

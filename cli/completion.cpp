@@ -12,7 +12,7 @@
 namespace gridbay::cli {
 namespace {
 
-struct Options {
+struct CompletionOptions {
   std::string shell;
 };
 
@@ -79,7 +79,7 @@ void replaceAll(std::string& text, std::string_view what, std::string_view by) {
     text.replace(at, what.size(), by);
 }
 
-int printScript(const Options& options, const Console& console) {
+int printScript(const CompletionOptions& options, const Console& console) {
   std::string script(
       std::ranges::find(kShells, options.shell, [](const auto& s) { return s.first; })->second);
   std::string function = fmt::format("_{}_complete", toolName());
@@ -183,7 +183,7 @@ void printCompletions(const CLI::App& tool, std::span<const char* const> words, 
 }
 
 void addCompletion(CLI::App& tool, Action& action) {
-  std::shared_ptr<Options> options;
+  std::shared_ptr<CompletionOptions> options;
   CLI::App& command =
       addCommand(tool, action, "completion", "Prints what makes a shell complete this tool's command lines",
                  printScript, options);

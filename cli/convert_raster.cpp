@@ -9,7 +9,7 @@
 namespace gridbay::cli {
 namespace {
 
-struct Options {
+struct RasterConversionOptions {
   RasterConversion conversion;
   std::vector<int> window;     // of four numbers, or none
   std::vector<double> extent;  // likewise
@@ -17,7 +17,7 @@ struct Options {
   std::string gridding;  // empty for none
 };
 
-int doConvert(const Options& options, const Console& console) {
+int doConvertRaster(const RasterConversionOptions& options, const Console& console) {
   RasterConversion conversion = options.conversion;
   if (!options.window.empty())
     conversion.window = {options.window[0], options.window[1], options.window[2], options.window[3]};
@@ -31,9 +31,9 @@ int doConvert(const Options& options, const Console& console) {
 }  // namespace
 
 void addConvertRaster(CLI::App& convert, Action& action) {
-  std::shared_ptr<Options> given;
-  CLI::App& command =
-      addCommand(convert, action, "raster", "Makes a map (tsb2) from a raster of any kind", doConvert, given);
+  std::shared_ptr<RasterConversionOptions> given;
+  CLI::App& command = addCommand(convert, action, "raster", "Makes a map (tsb2) from a raster of any kind",
+                                 doConvertRaster, given);
   RasterConversion* options = &given->conversion;
   command
       .add_option("IN", options->in,

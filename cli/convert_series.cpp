@@ -5,7 +5,7 @@
 namespace gridbay::cli {
 namespace {
 
-int doConvert(const SeriesConversion& options, const Console& console) {
+int doConvertSeries(const SeriesConversion& options, const Console& console) {
   return convertWith(convertSeries, options, console);
 }
 
@@ -14,7 +14,7 @@ int doConvert(const SeriesConversion& options, const Console& console) {
 void addConvertSeries(CLI::App& convert, Action& action) {
   std::shared_ptr<SeriesConversion> options;
   CLI::App& command = addCommand(convert, action, "series", "Makes a time series (tsb0) from delimited text",
-                                 doConvert, options);
+                                 doConvertSeries, options);
   command
       .add_option("IN", options->in, "Lines of a time and values, between commas, semicolons, tabs or blanks")
       ->required();

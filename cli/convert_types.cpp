@@ -8,11 +8,11 @@
 namespace gridbay::cli {
 namespace {
 
-struct Options {
+struct TypesConversionOptions {
   bool json = false;
 };
 
-int types(const Options& options, const Console& console) {
+int types(const TypesConversionOptions& options, const Console& console) {
   nlohmann::ordered_json list = nlohmann::ordered_json::array();
   for (const QunItem& quantity : qunItems()) {
     const QunUnit& unit = *qunBaseUnit(quantity.code);
@@ -29,7 +29,7 @@ int types(const Options& options, const Console& console) {
 }  // namespace
 
 void addConvertTypes(CLI::App& convert, Action& action) {
-  std::shared_ptr<Options> options;
+  std::shared_ptr<TypesConversionOptions> options;
   CLI::App& command =
       addCommand(convert, action, "types",
                  "Lists the item types: code, name, and the base unit that values are in", types, options);

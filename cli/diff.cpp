@@ -12,7 +12,7 @@ namespace {
 
 using Json = nlohmann::ordered_json;
 
-struct Options {
+struct DiffOptions {
   std::string own;
   std::string other;
   bool asWritten = false;
@@ -37,7 +37,7 @@ Json jsonOf(const KeywordDifference& keyword) {
           {"b", jsonOf(keyword.other)}};
 }
 
-void printJson(const SetupDifference& found, const Options& options, const Console& console) {
+void printJson(const SetupDifference& found, const DiffOptions& options, const Console& console) {
   Json report{
       {"a", options.own}, {"b", options.other}, {"differences", Json::array()}, {"keywords", Json::array()}};
   for (const Difference& difference : found.differences) report["differences"].push_back(jsonOf(difference));
@@ -54,7 +54,7 @@ void printKeywords(const SetupDifference& found, const Console& console) {
     console.out << fmt::format("{}: {}\n", keyword.path, words(keyword.own, keyword.other));
 }
 
-void printWords(const SetupDifference& found, const Options& options, const Console& console) {
+void printWords(const SetupDifference& found, const DiffOptions& options, const Console& console) {
   console.out << fmt::format("A: {}\nB: {}\n", options.own, options.other);
   std::string page;
   for (const Difference& difference : found.differences) {
@@ -67,7 +67,7 @@ void printWords(const SetupDifference& found, const Options& options, const Cons
   }
 }
 
-int diff(const Options& options, const Console& console) {
+int diff(const DiffOptions& options, const Console& console) {
   ConsoleMessageHost host(console);
   Result<SetupFile> own = SetupFile::open(options.own, &host);
   if (!own) return console.fail(own.error());
@@ -90,7 +90,7 @@ int diff(const Options& options, const Console& console) {
 }  // namespace
 
 void addDiff(CLI::App& tool, Action& action) {
-  std::shared_ptr<Options> options;
+  std::shared_ptr<DiffOptions> options;
   CLI::App& command = addCommand(
       tool, action, "diff",
       "Shows what differs between two setups, in the words of their pages; exit status 0 for nothing, 1 "

@@ -12,14 +12,14 @@
 namespace gridbay::cli {
 namespace {
 
-struct Options {
+struct EnsembleOptions {
   std::string table;
   std::string base;
   std::string folder;
   bool force = false;
 };
 
-int ensemble(const Options& options, const Console& console) {
+int ensemble(const EnsembleOptions& options, const Console& console) {
   Result<EnsembleTable> table =
       readEnsembleTable(options.table, std::filesystem::path(options.base).stem().string());
   if (!table) return console.fail(table.error());
@@ -56,7 +56,7 @@ int ensemble(const Options& options, const Console& console) {
 }  // namespace
 
 void addEnsemble(CLI::App& tool, Action& action) {
-  std::shared_ptr<Options> options;
+  std::shared_ptr<EnsembleOptions> options;
   CLI::App& command = addCommand(
       tool, action, "ensemble", "Makes setups that differ in what a table says, and checks them on all cores",
       ensemble, options);

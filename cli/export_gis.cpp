@@ -13,13 +13,13 @@
 namespace gridbay::cli {
 namespace {
 
-struct Options {
+struct GisExportOptions {
   std::string setup;
   std::string out;
   bool force = false;
 };
 
-int exportGis(const Options& options, const Console& console) {
+int exportGis(const GisExportOptions& options, const Console& console) {
   if (!sameName(std::filesystem::path(options.out).extension().string(), ".gpkg"))
     return console.fail(fmt::format("\"{}\" must end in .gpkg", options.out));
   ConsoleMessageHost host(console);
@@ -59,7 +59,7 @@ int exportGis(const Options& options, const Console& console) {
 void addExport(CLI::App& tool, Action& action) {
   CLI::App& exporting = *tool.add_subcommand("export", "Writes a setup for other programs");
   exporting.require_subcommand(1);
-  std::shared_ptr<Options> options;
+  std::shared_ptr<GisExportOptions> options;
   CLI::App& gis =
       addCommand(exporting, action, "gis",
                  "All that is placed, as a GeoPackage with a layer for each kind, in the projection "

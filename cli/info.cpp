@@ -25,7 +25,7 @@
 namespace gridbay::cli {
 namespace {
 
-struct Options {
+struct InfoOptions {
   std::string file;
   bool json = false;
 };
@@ -303,7 +303,7 @@ void printSetup(const Json& report, const Console& console) {
   }
 }
 
-int print(const Json& report, const Options& options, void (*readable)(const Json&, const Console&),
+int print(const Json& report, const InfoOptions& options, void (*readable)(const Json&, const Console&),
           const Console& console) {
   if (options.json) {
     console.out << report.dump(2, ' ', false, Json::error_handler_t::replace) << '\n';
@@ -323,7 +323,7 @@ bool looksLikeDataFile(const std::string& path) {
   return text == "\x89HDF" || text.starts_with("CDF");
 }
 
-int info(const Options& options, const Console& console) {
+int info(const InfoOptions& options, const Console& console) {
   if (looksLikeDataFile(options.file)) {
     const Result<TsbFile> file = TsbFile::open(options.file);
     if (!file) return console.fail(file.error());
@@ -338,7 +338,7 @@ int info(const Options& options, const Console& console) {
 }  // namespace
 
 void addInfo(CLI::App& tool, Action& action) {
-  std::shared_ptr<Options> options;
+  std::shared_ptr<InfoOptions> options;
   CLI::App& command =
       addCommand(tool, action, "info", "Tells what a setup or a data file holds", info, options);
   command.add_option("FILE", options->file, "The setup or data file")->required();

@@ -23,7 +23,7 @@ Json byArea(List& list, const Describe& describe) {
   return report;
 }
 // "32 in area 1, map r.tsb2, item 1 in area 2"
-std::string wordsOfAreas(const Json& entries) {
+std::string wordsOfStarts(const Json& entries) {
   std::string text;
   for (const Json& entry : entries) {
     std::string value;
@@ -80,7 +80,7 @@ Json describeSurfaceElevation(CGlobalKvs& model) {
   });
 }
 void printSurfaceElevation(const Json& report, const Line& line) {
-  line("Initial level", wordsOfAreas(report));
+  line("Initial level", wordsOfStarts(report));
 }
 
 Json describeWind(CGlobalKvs& model) {
@@ -135,7 +135,7 @@ Json describeViscosity(CGlobalKvs& model) {
 }
 void printViscosity(const Json& report, const Line& line) {
   std::string text = report["type"].get<std::string>();
-  if (report.contains("areas")) text += ", " + wordsOfAreas(report["areas"]);
+  if (report.contains("areas")) text += ", " + wordsOfStarts(report["areas"]);
   line("Eddy viscosity", text);
 }
 
@@ -155,11 +155,11 @@ Json describeResistance(CGlobalKvs& model) {
 }
 void printResistance(const Json& report, const Line& line) {
   line("Resistance",
-       fmt::format("{} number, {}{}", report["number"].get<std::string>(), wordsOfAreas(report["areas"]),
+       fmt::format("{} number, {}{}", report["number"].get<std::string>(), wordsOfStarts(report["areas"]),
                    report["wave_induced"].get<bool>() ? "; induced by waves" : ""));
 }
 
-constexpr Topic kTopics[] = {
+constexpr Topic kConditionTopics[] = {
     {"boundaries", describeBoundaries, printBoundaries},
     {"initial_level", describeSurfaceElevation, printSurfaceElevation},
     {"wind", describeWind, printWind},
@@ -170,7 +170,7 @@ constexpr Topic kTopics[] = {
 }  // namespace
 
 std::span<const Topic> conditionTopics() {
-  return kTopics;
+  return kConditionTopics;
 }
 
 }  // namespace gridbay::cli

@@ -35,7 +35,7 @@ void printDefinition(const Json& report, const Line& line) {
                    report["processes_disabled"].get<bool>() ? ", which are disabled" : ""));
 }
 
-Json describeStart(CGlobalKvs& model) {
+Json describeEcologyStart(CGlobalKvs& model) {
   return describeBeginning(*model.wqsStartingConditions, [&model] {
     return describeEntryAreas<WqsVariables>(*model.wqsInitialConditions);
   });
@@ -87,26 +87,26 @@ void printForcings(const Json& report, const Line& line) {
   printGiven("Forcing", report, line);
 }
 
-Json describeBudgets(CGlobalKvs& model) {
+Json describeEcologyBudgets(CGlobalKvs& model) {
   return model.massBudget->GetCount() > 0 ? describeMassFiles(*model.wqsMassBudget) : Json::array();
 }
 
-constexpr Topic kTopics[] = {
+constexpr Topic kEcologyTopics[] = {
     {"definition", describeDefinition, printDefinition},
-    {"initially", describeStart, printBeginning},
+    {"initially", describeEcologyStart, printBeginning},
     {"constants", describeAllGiven<&CGlobalKvs::wqsConstants>, printConstants},
     {"forcings", describeAllGiven<&CGlobalKvs::wqsForcings>, printForcings},
     {"dispersion", dispersionTopic<&CGlobalKvs::wqsAdDispersion>, printDispersion},
     {"boundaries", boundaryTopic<&CGlobalKvs::wqsAdBoundary, WqsVariables>, printBoundaryValues},
     {"sources", sourceTopic<&CGlobalKvs::wqsAdSourceSink, WqsVariables>, printSourceValues},
-    {"mass_budgets", describeBudgets, printMassFiles},
+    {"mass_budgets", describeEcologyBudgets, printMassFiles},
     {"outputs", outputTopic<&CGlobalKvs::wqsResults>, printTransportOutputs},
 };
 
 }  // namespace
 
 std::span<const Topic> ecologyTopics() {
-  return kTopics;
+  return kEcologyTopics;
 }
 
 }  // namespace gridbay::cli

@@ -34,7 +34,7 @@ void printTask(const Json& report, const Line& line) {
 }
 
 // Of a layer's thickness the format and the constant of area 1 hold for all areas.
-Json describeStart(CGlobalKvs& model) {
+Json describeMudStart(CGlobalKvs& model) {
   return describeBeginning(*model.nmtStartingConditions, [&model] {
     const CNmtTaskSelectionKvs& task = *model.nmtTaskSelection;
     Json report = Json::array();
@@ -59,7 +59,7 @@ Json describeStart(CGlobalKvs& model) {
 }
 
 // How the fractions settle in the one task; how the layers of the bed erode in the other.
-Json describeBed(CGlobalKvs& model) {
+Json describeMudBed(CGlobalKvs& model) {
   if (!model.nmtTaskSelection->multiFraction) {
     const bool byFactor = model.nmtMlErosionCharacteristics->useConstantErosionCoefficient != 0;
     Json report{
@@ -80,7 +80,7 @@ Json describeBed(CGlobalKvs& model) {
   }
   return {{"settling", settling}};
 }
-void printBed(const Json& report, const Line& line) {
+void printMudBed(const Json& report, const Line& line) {
   if (report.contains("settling")) {
     for (const Json& fraction : report["settling"])
       line("Settling", fmt::format("{} at {}", fraction["name"].get<std::string>(),
@@ -94,7 +94,7 @@ void printBed(const Json& report, const Line& line) {
 }
 
 // Only the layers feel waves.
-Json describeWaves(CGlobalKvs& model) {
+Json describeMudWaves(CGlobalKvs& model) {
   const CNmtWaveDataKvs& waves = *model.nmtWaveData;
   if (model.nmtTaskSelection->multiFraction || waves.description == CNmtWaveDataKvs::kExcluded)
     return {{"given_as", "none"}};
@@ -109,14 +109,14 @@ Json describeWaves(CGlobalKvs& model) {
           {"direction", quantity(waves.angleWithTrueNorth, item::kWaveDirection)}};
 }
 
-constexpr Topic kTopics[] = {
+constexpr Topic kMudTopics[] = {
     {"task", describeTask, printTask},
-    {"initially", describeStart, printBeginning},
+    {"initially", describeMudStart, printBeginning},
     {"dispersion", dispersionTopic<&CGlobalKvs::nmtDispersionCoef>, printDispersion},
     {"boundaries", boundaryTopic<&CGlobalKvs::nmtBoundary, MudFractions>, printBoundaryValues},
     {"sources", sourceTopic<&CGlobalKvs::nmtSourceSink, MudFractions>, printSourceValues},
-    {"bed", describeBed, printBed},
-    {"waves", describeWaves, printWaves},
+    {"bed", describeMudBed, printMudBed},
+    {"waves", describeMudWaves, printWaves},
     {"lines", placesTopic<&CGlobalKvs::nmtLineDischarge>, printLines},
     {"boxes", placesTopic<&CGlobalKvs::nmtBoxSummation>, printBoxes},
     {"outputs", outputTopic<&CGlobalKvs::nmtResult>, printTransportOutputs},
@@ -125,7 +125,7 @@ constexpr Topic kTopics[] = {
 }  // namespace
 
 std::span<const Topic> mudTransportTopics() {
-  return kTopics;
+  return kMudTopics;
 }
 
 }  // namespace gridbay::cli

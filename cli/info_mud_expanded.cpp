@@ -38,7 +38,7 @@ void printCounts(const Json& report, const Line& line) {
                           report["salinity"].get<bool>() ? ", with salinity" : ""));
 }
 
-Json describeStart(CGlobalKvs& model) {
+Json describeExpandedMudStart(CGlobalKvs& model) {
   CNmtExpInitialConditionsKvs& initial = *model.nmtExpInitialConditions;
   return describeBeginning(*model.nmtExpStartingConditions, [&] {
     Json report = Json::array();
@@ -52,7 +52,7 @@ Json describeStart(CGlobalKvs& model) {
 }
 
 // The layers of the bed: how thick and how dense they are, and what part each fraction has in them.
-Json describeBed(CGlobalKvs& model) {
+Json describeExpandedMudBed(CGlobalKvs& model) {
   CNmtExpInitialConditionsKvs& initial = *model.nmtExpInitialConditions;
   Json report = Json::array();
   for (int layer = 1; layer <= initial.thicknesses.GetCount(); ++layer) {
@@ -74,7 +74,7 @@ Json describeBed(CGlobalKvs& model) {
   }
   return report;
 }
-void printBed(const Json& report, const Line& line) {
+void printExpandedMudBed(const Json& report, const Line& line) {
   int layer = 0;
   for (const Json& of : report) {
     line(
@@ -84,7 +84,7 @@ void printBed(const Json& report, const Line& line) {
   }
 }
 
-Json describeWaves(CGlobalKvs& model) {
+Json describeExpandedMudWaves(CGlobalKvs& model) {
   using Waves = CNmtExpWavesKvs;
   if (model.nmtExpForcings->includeWaves == 0) return {{"given_as", "none"}};
   switch (model.nmtExpWaves->typeOfWaveVariation) {
@@ -128,29 +128,29 @@ void printMorphology(const Json& report, const Line& line) {
          fmt::format("the bed changes the flow, {:g} times as fast", report["speed_up"].get<double>()));
 }
 
-Json describeBudgets(CGlobalKvs& model) {
+Json describeExpandedMudBudgets(CGlobalKvs& model) {
   return model.massBudget->GetCount() > 0 ? describeMassFiles(*model.nmtExpMassBudget) : Json::array();
 }
 
-constexpr Topic kTopics[] = {
+constexpr Topic kExpandedMudTopics[] = {
     {"counts", describeCounts, printCounts},
-    {"initially", describeStart, printBeginning},
-    {"bed", describeBed, printBed},
+    {"initially", describeExpandedMudStart, printBeginning},
+    {"bed", describeExpandedMudBed, printExpandedMudBed},
     {"dispersion", dispersionTopic<&CGlobalKvs::nmtExpDispersionCoef>, printDispersion},
     {"boundaries", boundaryTopic<&CGlobalKvs::nmtExpBoundary, ExpandedMudEntries>, printBoundaryValues},
     {"sources", sourceTopic<&CGlobalKvs::nmtExpSources, ExpandedMudEntries>, printSourceValues},
-    {"waves", describeWaves, printWaves},
+    {"waves", describeExpandedMudWaves, printWaves},
     {"dredging", describeDredging, printDredging},
     {"morphology", describeMorphology, printMorphology},
     {"lines", placesTopic<&CGlobalKvs::nmtExpLineDischarge>, printLines},
-    {"mass_budgets", describeBudgets, printMassFiles},
+    {"mass_budgets", describeExpandedMudBudgets, printMassFiles},
     {"outputs", outputTopic<&CGlobalKvs::nmtExpResult>, printTransportOutputs},
 };
 
 }  // namespace
 
 std::span<const Topic> expandedMudTopics() {
-  return kTopics;
+  return kExpandedMudTopics;
 }
 
 }  // namespace gridbay::cli

@@ -113,7 +113,7 @@ void printHotStart(const Json& report, const Line& line) {
                                                   : std::string("not written"));
 }
 
-constexpr Topic kTopics[] = {
+constexpr Topic kStructureTopics[] = {
     {"dikes", describeDikes, printDikes},           {"weirs", describeWeirs, printWeirs},
     {"culverts", describeCulverts, printCulverts},  {"outputs", describeOutputs, printOutputs},
     {"hot_start", describeHotStart, printHotStart},
@@ -122,7 +122,7 @@ constexpr Topic kTopics[] = {
 }  // namespace
 
 std::span<const Topic> structureTopics() {
-  return kTopics;
+  return kStructureTopics;
 }
 
 }  // namespace gridbay::cli

@@ -83,7 +83,7 @@ void printFeedback(const Json& report, const Line& line) {
   if (report.get<bool>()) line("Feedback", "salinity and temperature change the density of the water");
 }
 
-Json describeStart(CGlobalKvs& model) {
+Json describeTransportStart(CGlobalKvs& model) {
   return describeBeginning(*model.nadStartingConditions, [&model] {
     return describeEntryAreas<AdComponents>(*model.nadInitialConcentration);
   });
@@ -121,13 +121,13 @@ void printDeposition(const Json& report, const Line& line) {
   if (!report["soil"].is_null()) printEntryAreas("From the soil", report["soil"], line);
 }
 
-Json describeBudgets(CGlobalKvs& model) {
+Json describeTransportBudgets(CGlobalKvs& model) {
   return model.moduleSelection->HasMassBudget() ? describeMassFiles(*model.nadMassBudget) : Json::array();
 }
-constexpr Topic kTopics[] = {
+constexpr Topic kTransportTopics[] = {
     {"components", describeComponents, printComponents},
     {"feedback", describeFeedback, printFeedback},
-    {"initially", describeStart, printBeginning},
+    {"initially", describeTransportStart, printBeginning},
     {"dispersion", dispersionTopic<&CGlobalKvs::nadDispersionCoef>, printDispersion},
     {"boundaries", boundaryTopic<&CGlobalKvs::nadBoundary, AdComponents>, printBoundaryValues},
     {"sources", sourceTopic<&CGlobalKvs::nadSourceSink, AdComponents>, printSourceValues},
@@ -137,14 +137,14 @@ constexpr Topic kTopics[] = {
     {"deposition", describeDeposition, printDeposition},
     {"lines", placesTopic<&CGlobalKvs::nadLineDischarge>, printLines},
     {"boxes", placesTopic<&CGlobalKvs::nadBoxSummation>, printBoxes},
-    {"mass_budgets", describeBudgets, printMassFiles},
+    {"mass_budgets", describeTransportBudgets, printMassFiles},
     {"outputs", outputTopic<&CGlobalKvs::nadResult>, printTransportOutputs},
 };
 
 }  // namespace
 
 std::span<const Topic> advectionDispersionTopics() {
-  return kTopics;
+  return kTransportTopics;
 }
 
 }  // namespace gridbay::cli

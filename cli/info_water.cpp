@@ -122,7 +122,7 @@ void printInfiltration(const Json& report, const Line& line) {
   line("Infiltration", text);
 }
 
-constexpr Topic kTopics[] = {
+constexpr Topic kWaterTopics[] = {
     {"precipitation", describePrecipitation, printPrecipitation},
     {"evaporation", describeEvaporation, printEvaporation},
     {"sources", describeSources, printSources},
@@ -132,7 +132,7 @@ constexpr Topic kTopics[] = {
 }  // namespace
 
 std::span<const Topic> waterTopics() {
-  return kTopics;
+  return kWaterTopics;
 }
 
 }  // namespace gridbay::cli

@@ -15,7 +15,7 @@ namespace {
 
 using Json = nlohmann::ordered_json;
 
-struct Options {
+struct MergeOptions {
   std::string base;
   std::string own;
   std::string other;
@@ -27,7 +27,7 @@ struct Options {
   bool json = false;
 };
 
-Result<SetupOnDisk> open(const std::string& path, const Options& options, MessageHost& host) {
+Result<SetupOnDisk> open(const std::string& path, const MergeOptions& options, MessageHost& host) {
   const std::string& start = options.asWritten ? options.out : path;
   Result<SetupFile> setup = SetupFile::open(path, &host, start);
   if (!setup) return Failure{setup.error()};
@@ -68,7 +68,7 @@ unsigned tellFaults(SetupFile& result, const Console& console) {
   return faults;
 }
 
-int merge(const Options& options, const Console& console) {
+int merge(const MergeOptions& options, const Console& console) {
   if (const Outcome may = mayWrite(options.out, options.force, {}, "--force"); !may)
     return console.fail(may.error());
   ConsoleMessageHost host(console);
@@ -119,7 +119,7 @@ int merge(const Options& options, const Console& console) {
 }  // namespace
 
 void addMerge(CLI::App& tool, Action& action) {
-  std::shared_ptr<Options> options;
+  std::shared_ptr<MergeOptions> options;
   CLI::App& command = addCommand(
       tool, action, "merge",
       "Makes one setup of two that come from a third; exit status 0 for a clean merge, 1 for conflicts, 2 "

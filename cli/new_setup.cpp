@@ -11,7 +11,7 @@
 namespace gridbay::cli {
 namespace {
 
-struct Options {
+struct NewSetupOptions {
   std::string file;
   std::vector<std::string> areas;
   std::vector<int> enclosing;
@@ -31,7 +31,7 @@ NewArea areaOf(const std::string& text) {
 }
 
 // An --enclosing belongs to the --area before it.
-Result<std::vector<NewArea>> areasOf(const Options& options) {
+Result<std::vector<NewArea>> areasOf(const NewSetupOptions& options) {
   std::vector<NewArea> areas;
   std::size_t nextArea = 0;
   std::size_t nextEnclosing = 0;
@@ -49,7 +49,7 @@ Result<std::vector<NewArea>> areasOf(const Options& options) {
   return areas;
 }
 
-int newSetup(const Options& options, const Console& console) {
+int newSetup(const NewSetupOptions& options, const Console& console) {
   const Result<std::vector<NewArea>> areas = areasOf(options);
   if (!areas) return console.fail(areas.error());
   std::vector<std::string> grids;
@@ -78,7 +78,7 @@ int newSetup(const Options& options, const Console& console) {
 }  // namespace
 
 void addNew(CLI::App& tool, Action& action) {
-  std::shared_ptr<Options> options;
+  std::shared_ptr<NewSetupOptions> options;
   CLI::App& command =
       addCommand(tool, action, "new", "Makes a setup with the defaults of a new one", newSetup, options);
   command.add_option("FILE", options->file, "The setup to write")->required();

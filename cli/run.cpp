@@ -17,7 +17,7 @@ namespace {
 constexpr const char* kEngineNames[] = {"gridbay.exe", "gridbay"};
 constexpr const char* kEngineVariable = "GRIDBAY_ENGINE";
 
-struct Options {
+struct RunOptions {
   std::vector<std::string> files;
   std::string engine;
   std::string statusOf;
@@ -38,7 +38,7 @@ std::filesystem::path programFolder() {
 }
 
 // The engine that the user names, or else the one beside this program, or on the PATH.
-Result<std::string> findEngine(const Options& options) {
+Result<std::string> findEngine(const RunOptions& options) {
   const char* variable = std::getenv(kEngineVariable);
   for (const std::string& named : {options.engine, std::string(variable == nullptr ? "" : variable)}) {
     if (named.empty()) continue;
@@ -73,7 +73,7 @@ int check(const std::string& file, bool force, const Console& console) {
   return kFaultsFound;
 }
 
-int runOne(const Options& options, const Console& console) {
+int runOne(const RunOptions& options, const Console& console) {
   const std::string& file = options.files.front();
   if (const int status = check(file, options.force, console); status != kClean) return status;
   const Result<std::string> engine = findEngine(options);
@@ -85,7 +85,7 @@ int runOne(const Options& options, const Console& console) {
   return end->status;
 }
 
-int run(const Options& options, const Console& console) {
+int run(const RunOptions& options, const Console& console) {
   if (!options.statusOf.empty()) return showRun(options.statusOf, console);
   if (options.files.empty()) return console.fail("FILE is required");
   const bool bySlurm = options.slurm && slurm::isThere();
@@ -100,7 +100,7 @@ int run(const Options& options, const Console& console) {
 }  // namespace
 
 void addRun(CLI::App& tool, Action& action) {
-  std::shared_ptr<Options> options;
+  std::shared_ptr<RunOptions> options;
   CLI::App& command =
       addCommand(tool, action, "run", "Checks setups and hands them to the engine", run, options);
   command.footer(

@@ -10,7 +10,7 @@
 namespace gridbay::cli {
 namespace {
 
-struct Options {
+struct ValidateOptions {
   std::string file;
   bool json = false;
   bool advice = false;
@@ -34,7 +34,7 @@ nlohmann::ordered_json jsonOf(const CMessage& message, bool namesPages) {
   return json;
 }
 
-int validate(const Options& options, const Console& console) {
+int validate(const ValidateOptions& options, const Console& console) {
   ConsoleMessageHost host(console);
   Result<SetupFile> setup = SetupFile::open(options.file, &host);
   if (!setup) return console.fail(setup.error());
@@ -62,7 +62,7 @@ int validate(const Options& options, const Console& console) {
 }  // namespace
 
 void addValidate(CLI::App& tool, Action& action) {
-  std::shared_ptr<Options> options;
+  std::shared_ptr<ValidateOptions> options;
   CLI::App& command = addCommand(tool, action, "validate", "Checks a setup and the data files that it names",
                                  validate, options);
   command.add_option("FILE", options->file, "The setup")->required();

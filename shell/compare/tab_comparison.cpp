@@ -116,7 +116,7 @@ void TabComparison::compare() {
   timer_.stop();
   work_.stop();
   if (comparison().isCurrent()) return showFound();
-  work_.begin([&setups = comparison()](const WorkApart::Progress&) { return setups.compare(); }, false);
+  work_.begin([&setups = comparison()](const WorkApart::Progress&) { return setups.compare(); });
   emit atWork();
 }
 

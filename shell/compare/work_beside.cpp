@@ -29,7 +29,7 @@ std::optional<std::string> workBeside(const WorkApart::Work& work, const QString
   std::optional<std::string> made;
   QObject::connect(&beside, &BackgroundWork::ended, &beside,
                    [&](const std::optional<std::string>& text) { made = text; });
-  beside.begin(work, false);
+  beside.begin(work);
   waitFor(beside, title, parent);
   return made;
 }

@@ -76,13 +76,11 @@ void BackgroundCopies::beginNext() {
   current_ = next->first;
   atWork_ = *std::exchange(next->second.wanted, std::nullopt);
   emit progressed(current_, 0);
-  work_.begin(
-      [wanted = atWork_, made = folder_->filePath(QString::number(++count_)).toStdString()](
-          const WorkApart::Progress& progress) {
-        return packed(copyBackground(wanted.source.path.toStdString(), wanted.source.raster.toStdString(),
-                                     wanted.projection, pixelsOf(wanted.frame), made, progress));
-      },
-      true);
+  work_.begin([wanted = atWork_, made = folder_->filePath(QString::number(++count_)).toStdString()](
+                  const WorkApart::Progress& progress) {
+    return packed(copyBackground(wanted.source.path.toStdString(), wanted.source.raster.toStdString(),
+                                 wanted.projection, pixelsOf(wanted.frame), made, progress));
+  });
 }
 
 void BackgroundCopies::take(const std::optional<std::string>& bytes) {
