@@ -128,6 +128,7 @@ void MainWindow::useSeries(DocumentTab& tab, const SeriesPlace& place, const QSt
   if (!doubt.empty() && !tab.askYesNo(doubt)) return;
   const std::string fault = tab.editor().useSeries(series.toStdString(), place);
   tab.goToPage(place.page);
+  tab.pane().refresh();  // which may have been the page before
   if (!fault.empty()) {
     tell(QString::fromStdString(fault));
   } else {
