@@ -40,7 +40,10 @@ class SeriesGiver final : public NoHost {
   const std::string& refused() const { return refused_; }
 
   bool choose(CVdFileSelectorDlg& selector) override {
-    if (!isReadable_ || selector.kind() != kSeries) return false;
+    // Some name no extension of their own.
+    const bool isOfSeries =
+        selector.kind() == kSeries || selector.filter().find(kSeries) != std::string::npos;
+    if (!isReadable_ || !isOfSeries) return false;
     findWays(selector);
     if (ways_.empty()) return false;
     selector.SetFileName(file_);

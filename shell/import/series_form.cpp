@@ -78,8 +78,14 @@ SeriesForm::SeriesForm(QWidget* parent)
   connect(headings_, &QSpinBox::valueChanged, this, &SeriesForm::partsChanged);
   for (QComboBox* each : {decimals_, dates_, timeUnit_})
     connect(each, &QComboBox::activated, this, &SeriesForm::changed);
-  for (QLineEdit* each : {missing_, start_})
-    connect(each, &QLineEdit::editingFinished, this, &SeriesForm::changed);
+  // Not when it is only left.
+  for (QLineEdit* each : {missing_, start_}) {
+    connect(each, &QLineEdit::editingFinished, this, [this, each] {
+      if (!each->isModified()) return;
+      each->setModified(false);
+      emit changed();
+    });
+  }
   connect(missing_, &QLineEdit::textChanged, this, [this] {
     showFault();
     emit typed();

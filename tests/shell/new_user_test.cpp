@@ -270,7 +270,7 @@ class NewUserTest final : public DesktopFixture {
     chooseCell(1, "Type", "From file");
     dialog->activateWindow();
     QVERIFY(QTest::qWaitForWindowActive(dialog));
-    QTRY_VERIFY(use->isVisible());
+    QTRY_VERIFY2(use->isVisible(), qPrintable(dialog->findChild<QLabel*>("why")->text()));
     QCOMPARE(use->count(), 1);
     QTest::mouseClick(&buttonOf(*dialog, "Use it"), Qt::LeftButton);
     QTRY_VERIFY(textOfCell(1, "File name").endsWith("discharge.tsb0"));
