@@ -5,7 +5,6 @@
 namespace gridbay::texts {
 
 // Flood and dry.
-inline constexpr Text utmZone{"%s-%.0f"};
 inline constexpr Text dryingAboveFlooding{"Drying depth must be smaller that flooding depth"};
 inline constexpr Text dryingNotPositive{"Drying depth must be positive"};
 
