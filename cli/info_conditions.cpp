@@ -1,5 +1,6 @@
 #include <fmt/format.h>
 
+#include "cli/info_families.h"
 #include "cli/info_topics.h"
 #include "hydrodynamic/boundary.h"
 #include "hydrodynamic/eddy_viscosity.h"
@@ -22,21 +23,6 @@ Json byArea(List& list, const Describe& describe) {
   }
   return report;
 }
-// "32 in area 1, map r.tsb2, item 1 in area 2"
-std::string wordsOfStarts(const Json& entries) {
-  std::string text;
-  for (const Json& entry : entries) {
-    std::string value;
-    if (entry.contains("file")) {
-      value = "map " + wordsOfFile(entry);
-    } else {
-      value = entry.contains("value") ? wordsOfQuantity(entry["value"]) : "none";
-    }
-    text += fmt::format("{}{} in area {}", text.empty() ? "" : "; ", value, entry["area"].get<int>());
-  }
-  return text;
-}
-
 Json describeBoundaries(CGlobalKvs& model) {
   using Condition = CNhdBoundaryObjectKvs;
   Json report = Json::array();
@@ -80,7 +66,7 @@ Json describeSurfaceElevation(CGlobalKvs& model) {
   });
 }
 void printSurfaceElevation(const Json& report, const Line& line) {
-  line("Initial level", wordsOfStarts(report));
+  line("Initial level", wordsOfAreas(report));
 }
 
 Json describeWind(CGlobalKvs& model) {
@@ -135,7 +121,7 @@ Json describeViscosity(CGlobalKvs& model) {
 }
 void printViscosity(const Json& report, const Line& line) {
   std::string text = report["type"].get<std::string>();
-  if (report.contains("areas")) text += ", " + wordsOfStarts(report["areas"]);
+  if (report.contains("areas")) text += ", " + wordsOfAreas(report["areas"]);
   line("Eddy viscosity", text);
 }
 
@@ -155,7 +141,7 @@ Json describeResistance(CGlobalKvs& model) {
 }
 void printResistance(const Json& report, const Line& line) {
   line("Resistance",
-       fmt::format("{} number, {}{}", report["number"].get<std::string>(), wordsOfStarts(report["areas"]),
+       fmt::format("{} number, {}{}", report["number"].get<std::string>(), wordsOfAreas(report["areas"]),
                    report["wave_induced"].get<bool>() ? "; induced by waves" : ""));
 }
 

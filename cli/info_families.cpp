@@ -114,10 +114,13 @@ std::string wordsOfConcentrations(const Json& report) {
 std::string wordsOfAreas(const Json& areas) {
   std::string text;
   for (const Json& area : areas) {
-    const bool isFile = area.contains("file");
-    text += fmt::format("{}{} in area {}", text.empty() ? "" : "; ",
-                        isFile ? "map " + wordsOfFile(area) : wordsOfQuantity(area["value"]),
-                        area["area"].get<int>());
+    std::string value = "none";
+    if (area.contains("file")) {
+      value = "map " + wordsOfFile(area);
+    } else if (area.contains("value")) {
+      value = wordsOfQuantity(area["value"]);
+    }
+    text += fmt::format("{}{} in area {}", text.empty() ? "" : "; ", value, area["area"].get<int>());
   }
   return text;
 }

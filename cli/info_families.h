@@ -216,6 +216,7 @@ Json outputTopic(CGlobalKvs& model) {
 
 // Each told with a label of its own, from what was described.
 std::string wordsOfConcentrations(const Json& report);
+// "32 in area 1; map r.tsb2 in area 2", and "none" for one with neither.
 std::string wordsOfAreas(const Json& areas);
 void printBoundaryValues(const Json& places, const Line& line);
 void printSourceValues(const Json& places, const Line& line);
