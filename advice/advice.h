@@ -22,7 +22,7 @@ struct AdviceFile {
 
 // An entry of a list that goes, with what all modules say of it. Numbers from 1.
 struct AdviceRemoval {
-  enum class List { boundary, source, weir, culvert };
+  enum class List { boundary, weir, culvert };
 
   List list;
   int number;

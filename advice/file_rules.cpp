@@ -32,6 +32,7 @@ struct NamedFile {
   PagePlace place;
   std::vector<std::string> further;  // their keywords
   bool isResult = false;
+  bool isRead = false;
 };
 
 // A name that is to take the place of another one, with the file that is made for it.
@@ -208,7 +209,8 @@ void adviseFileNames(AdviceContext& context) {
   const auto note = [](std::map<std::string, NamedFile>& files, const std::string& name,
                        const PagePlace& place, const Node& keyword) {
     NamedFile& file = files[name];
-    file.isResult |= keyword.values()[0].kind() == ValueKind::resultFileName;
+    const bool isResult = keyword.values()[0].kind() == ValueKind::resultFileName;
+    (isResult ? file.isResult : file.isRead) = true;
     if (file.place.keyword.empty()) {
       file.place = place;
     } else {
@@ -231,11 +233,13 @@ void adviseFileNames(AdviceContext& context) {
     });
   }
   for (const auto& [name, named] : outside) {
-    adviseName(context, name, named,
-               name.starts_with('/') ? "is named absolutely, and lies outside of the setup's folder."
-                                     : "lies outside of the setup's folder.",
-               "When the folder is moved or sent, the file stays behind.",
-               inFolder(context, folder, name, named.isResult));
+    adviseName(
+        context, name, named,
+        name.starts_with('/') ? "is named absolutely, and lies outside of the setup's folder."
+                              : "lies outside of the setup's folder.",
+        "When the folder is moved or sent, the file stays behind.",
+        // What is written by one part and read by another has to stay one file.
+        named.isResult && named.isRead ? std::nullopt : inFolder(context, folder, name, named.isResult));
   }
   for (const auto& [name, named] : absolute) {
     adviseName(context, name, named, "is named absolutely.",

@@ -19,8 +19,6 @@ namespace {
 
 using Told = std::function<bool(double)>;
 
-constexpr std::string_view kStopped = "The fix was stopped";
-
 Outcome copy(const AdviceFile& file, const Told& progress) {
   constexpr std::size_t kBytesAtOnce = std::size_t{1} << 20;
   std::ifstream from(file.from, std::ios::binary);
@@ -35,7 +33,7 @@ Outcome copy(const AdviceFile& file, const Told& progress) {
     const auto read = static_cast<std::size_t>(from.gcount());
     if (const Outcome written = to->write(std::string_view(piece).substr(0, read)); !written) return written;
     done += static_cast<double>(read);
-    if (progress && !progress(done / size)) return Failure{std::string(kStopped)};
+    if (progress && !progress(done / size)) return Failure{std::string(kFixStopped)};
   }
   if (from.bad()) return Failure{fmt::format("{} can't be read", file.from)};
   return to->commit();
@@ -65,7 +63,7 @@ void fill(std::vector<double>& values, const TsbItem& item, const TsbTimeAxis& t
   }
 }
 
-Outcome writeFilled(const AdviceFile& file) {
+Outcome writeFilled(const AdviceFile& file, const Told& progress) {
   const Result<TsbFile> from = TsbFile::open(file.from);
   if (!from) return Failure{from.error()};
   TsbDefinition definition = from->definition();
@@ -78,10 +76,9 @@ Outcome writeFilled(const AdviceFile& file) {
   for (std::size_t item = 1; item <= definition.items.size(); ++item) {
     if (const Outcome read = from->readSteps(item, 0, std::span(values)); !read) return read;
     fill(values, definition.items[item - 1], definition.time);
-    for (std::size_t step = 0; step < values.size(); ++step) {
-      const std::span<const double> value(&values[step], 1);
-      if (const Outcome written = to->write(item, step, value); !written) return written;
-    }
+    if (const Outcome written = to->write(item, 0, std::span<const double>(values)); !written) return written;
+    const double done = static_cast<double>(item) / static_cast<double>(definition.items.size());
+    if (progress && !progress(done)) return Failure{std::string(kFixStopped)};
   }
   return to->commit();
 }
@@ -97,7 +94,7 @@ Outcome makeFiles(std::span<const AdviceFile> files, const std::function<bool(do
     std::error_code error;
     Outcome made = std::filesystem::exists(file.to, error)
                        ? Failure{fmt::format("There is a file {} already", file.to)}
-                   : file.fillsGaps ? writeFilled(file)
+                   : file.fillsGaps ? writeFilled(file, part)
                                     : copy(file, part);
     if (!made) {
       removeFiles(files.first(i));
@@ -113,7 +110,7 @@ void removeFiles(std::span<const AdviceFile> files) {
 }
 
 bool isSmallAndSame(const std::string& a, const std::string& b) {
-  constexpr std::uintmax_t kMost = 4'000'000;  // bytes
+  constexpr std::uintmax_t kMost = 100'000;  // bytes
   std::error_code error;
   const std::uintmax_t size = std::filesystem::file_size(a, error);
   if (error || size > kMost || std::filesystem::file_size(b, error) != size || error) return false;

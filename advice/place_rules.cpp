@@ -118,13 +118,15 @@ std::optional<Run> usablePart(AdviceContext& context, const GridFacts& grid, int
   const bool isLine = inGrid.first != inGrid.last && (inGrid.first.j == inGrid.last.j || inGrid.isAlongJ());
   if (!isPoint && !isLine) return std::nullopt;
   const Run run = onEdge(grid, inGrid);
+  std::vector<Run> taken;  // along it by others
+  for (int other = 1; other <= context.model.boundary->GetCount(); ++other) {
+    const Run each = runOf(context, other);
+    if (other != number && each.first != each.last && commonOf(each, run)) taken.push_back(each);
+  }
   const auto isTaken = [&](GridPoint point) {
-    for (int other = 1; other <= context.model.boundary->GetCount(); ++other) {
-      const Run taken = runOf(context, other);
-      const bool isSameLine = taken.first != taken.last && commonOf(taken, run);
-      if (other != number && isSameLine && commonOf(taken, Run{point, point})) return true;
-    }
-    return false;
+    return std::ranges::any_of(taken, [&](const Run& each) {
+      return commonOf(each, Run{point, point}).has_value();
+    });
   };
   const auto isWater = [&](GridPoint point) {
     return grid.landValue < 0 || grid.isWaterAtBorder(point.j, point.k);

@@ -128,13 +128,8 @@ int stableDivisor(double step, const Courant& worst) {
 
 // A shorter time step for the same period: what counts time steps counts as many more.
 std::optional<AdviceFix> withShorterSteps(AdviceContext& context, int divisor) {
-  constexpr std::array<std::string_view, 13> kCounts{"Number_Of_Timesteps",     "Warm_Up_Period",
-                                                     "First_Time_Step",         "Last_Time_Step",
-                                                     "Time_Step_Interval",      "Start_Time_Step",
-                                                     "End_Time_Step",           "Update_Frequency",
-                                                     "InundationFileStoreStep", "Start_AD_at_HD_Time_Step",
-                                                     "End_AD_at_HD_Time_Step",  "Start_MT_at_HD_Time_Step",
-                                                     "End_MT_at_HD_Time_Step"};
+  constexpr std::array<std::string_view, 4> kCounts{"Number_Of_Timesteps", "Time_Step_Interval",
+                                                    "Update_Frequency", "InundationFileStoreStep"};
   const KvsFile* file = context.written();
   if (file == nullptr) return std::nullopt;
   const double step = double{context.model.simulationPeriod->timeStepInterval} / divisor;
@@ -142,13 +137,20 @@ std::optional<AdviceFix> withShorterSteps(AdviceContext& context, int divisor) {
                 {{fmt::format("{}/Time_Step_Interval", kPeriod), fmt::format("{:.7g}", step)}}};
   bool fits = true;
   eachKeyword(*file, [&](const PagePlace& place, const Node& keyword) {
-    if (keyword.values().size() != 1 || keyword.values()[0].kind() != ValueKind::integer) return;
-    if (std::ranges::none_of(kCounts, [&](std::string_view name) { return sameName(name, keyword.name()); }))
-      return;
-    const long long count = std::atoll(std::string(keyword.values()[0].text()).c_str());
-    if (count <= 0 || !findKeyword(context.model, place.keyword, context.documentPath)) return;
-    fits = fits && count * divisor < std::numeric_limits<std::int32_t>::max();
-    fix.settings.push_back({place.keyword, std::to_string(count * divisor)});
+    const bool isCount =
+        keyword.values().size() == 1 && keyword.values()[0].kind() == ValueKind::integer &&
+        std::ranges::any_of(kCounts, [&](std::string_view name) { return sameName(name, keyword.name()); });
+    if (!isCount && runStepsIn(keyword) == 0) return;
+    std::vector<long long> counts;
+    bool isOther = false;
+    for (const Value& value : keyword.values()) {
+      const long long count = wholeOf(value);
+      counts.push_back(count > 0 ? count * divisor : count);
+      isOther |= count > 0;
+      fits = fits && counts.back() < std::numeric_limits<std::int32_t>::max();
+    }
+    if (isOther && findKeyword(context.model, place.keyword, context.documentPath))
+      fix.settings.push_back({place.keyword, fmt::format("{}", fmt::join(counts, ","))});
   });
   return fits ? std::optional(std::move(fix)) : std::nullopt;
 }

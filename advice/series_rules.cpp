@@ -3,6 +3,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <array>
 #include <cmath>
 #include <filesystem>
 #include <limits>
@@ -40,27 +41,24 @@ constexpr double kDay = 86400;  // seconds
 
 // Gives what counts the run's time steps other numbers: those of keywords that the model holds.
 void addSteps(AdviceContext& context, AdviceFix& fix, const std::function<long long(long long)>& moved) {
-  constexpr std::string_view kSteps[] = {"First_Time_Step",
-                                         "Last_Time_Step",
-                                         "Start_Time_Step",
-                                         "End_Time_Step",
-                                         "Start_AD_at_HD_Time_Step",
-                                         "End_AD_at_HD_Time_Step",
-                                         "Start_MT_at_HD_Time_Step",
-                                         "End_MT_at_HD_Time_Step",
-                                         "Warm_Up_Period"};
   const KvsFile* file = context.written();
   if (file == nullptr) return;
   eachKeyword(*file, [&](const PagePlace& place, const Node& keyword) {
-    const auto isNamed = [&](std::string_view name) { return sameName(name, keyword.name()); };
-    if (keyword.values().size() != 1 || keyword.values()[0].kind() != ValueKind::integer ||
-        std::ranges::none_of(kSteps, isNamed))
-      return;
-    const long long step = std::atoll(std::string(keyword.values()[0].text()).c_str());
+    const int steps = runStepsIn(keyword);
+    if (steps == 0) return;
     const bool isOfWarmUp = sameName("Warm_Up_Period", keyword.name());
-    const long long now = isOfWarmUp ? std::min(step, moved(std::numeric_limits<int>::max())) : moved(step);
-    if (now != step && findKeyword(context.model, place.keyword, context.documentPath))
-      fix.settings.push_back({place.keyword, std::to_string(now)});
+    std::vector<long long> values;
+    bool isOther = false;
+    for (const Value& value : keyword.values()) {
+      const long long step = wholeOf(value);
+      long long now = step;
+      if (static_cast<int>(values.size()) < steps)
+        now = isOfWarmUp ? std::min(step, moved(std::numeric_limits<int>::max())) : moved(step);
+      isOther |= now != step;
+      values.push_back(now);
+    }
+    if (isOther && findKeyword(context.model, place.keyword, context.documentPath))
+      fix.settings.push_back({place.keyword, fmt::format("{}", fmt::join(values, ","))});
   });
 }
 
@@ -72,13 +70,15 @@ AdviceFix shorterRun(AdviceContext& context, long long steps) {
   return fix;
 }
 
-// A run that begins so many time steps later, and ends when it did.
-AdviceFix laterRun(AdviceContext& context, long long later) {
+// A run that begins so many time steps later, and ends when it did; nothing where that is no date.
+std::optional<AdviceFix> laterRun(AdviceContext& context, long long later) {
   const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
   const long long steps = period.LastTimeStep() - later;
   const DateTime start =
       period.start.plusDays(static_cast<double>(later) * double{period.timeStepInterval} / kDay);
-  const auto [year, month, day, hour, minute, second] = *start.parts();
+  const auto parts = start.parts();
+  if (!parts) return std::nullopt;
+  const auto [year, month, day, hour, minute, second] = *parts;
   AdviceFix fix{"Begin with the series",
                 {{fmt::format("{}/Start_Time", kPeriodPath),
                   fmt::format("{},{},{},{},{},{}", year, month, day, hour, minute, second)},
@@ -108,7 +108,8 @@ void advisePeriod(AdviceContext& context, const UsedSeries& used, const TsbTimeA
                   {},
                   kTodo};
     const double later = std::ceil((first.linear() - period.start.linear() - kHalfSecond) * stepsInDay);
-    if (later >= 1 && later < period.LastTimeStep())
+    // A series with no dates begins with the run, and would move with it.
+    if (time.isCalendar() && later >= 1 && later < period.LastTimeStep())
       advice.fix = laterRun(context, static_cast<long long>(later));
     context.add(std::move(advice));
   }
@@ -134,6 +135,13 @@ std::optional<AdviceFix> withoutGaps(AdviceContext& context, const UsedSeries& u
   if (!facts.file.axes.empty() || used.keywords.empty() || context.documentPath.empty() ||
       !std::ranges::all_of(facts.items, hasValues))
     return std::nullopt;
+  // Between 350 and 10 degrees lies north, and not the mean of both.
+  constexpr std::array kDirections{item::kWindDirection, item::kMeanWaveDirection, item::kWaveDirection,
+                                   item::kFlowDirection};
+  for (std::size_t i = 0; i < facts.items.size(); ++i) {
+    if (facts.items[i].missing > 0 && std::ranges::count(kDirections, facts.file.items[i].type) > 0)
+      return std::nullopt;
+  }
   const std::filesystem::path path(used.file.path);
   const std::string name = context.freeName(path.stem().string() + "_filled" + path.extension().string());
   AdviceFix fix{fmt::format("Fill the gaps, in {}", name)};

@@ -5,6 +5,7 @@
 #include <nlohmann/json.hpp>
 
 #include "advice/advisor.h"
+#include "advice/fix_files.h"
 #include "cli/advice_report.h"
 #include "cli/commands.h"
 #include "setup/dlg_enumerator.h"
@@ -44,7 +45,10 @@ int fix(const FixOptions& options, const Console& console) {
     before.push_back(valueAt(*setup, setting.path, options.file));
   if (const Outcome done = makeFix(setup->model(), *advice.fix, options.file); !done)
     return console.fail(done.error());
-  if (const int status = saveSetup(*setup, options.file, console); status != kClean) return status;
+  if (const int status = saveSetup(*setup, options.file, console); status != kClean) {
+    removeFiles(advice.fix->files);
+    return status;
+  }
   console.out << advice.fix->name << '\n';
   for (const AdviceFile& file : advice.fix->files)
     console.out << fmt::format("  made {} of {}\n", file.to, file.from);
@@ -125,6 +129,8 @@ nlohmann::ordered_json adviceJson(const Advice& advice, std::size_t number) {
     for (const AdviceFile& file : advice.fix->files) files.push_back({{"from", file.from}, {"to", file.to}});
     json["fix"] = {
         {"name", advice.fix->name}, {"settings", std::move(settings)}, {"files", std::move(files)}};
+    json["fix"]["removes"] = nullptr;
+    if (advice.fix->removal) json["fix"]["removes"] = advice.place.thing;
   }
   json["todo"] = advice.todo;
   return json;

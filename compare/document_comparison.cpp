@@ -4,6 +4,7 @@
 #include <map>
 #include <optional>
 #include <set>
+#include <string_view>
 
 #include "compare/compared_model.h"
 #include "compare/difference_packing.h"
@@ -164,7 +165,13 @@ class DocumentComparison final : public SetupComparison {
         merge_.isOfFiles ? document_.file().tree(document_.path()) : std::move(merge_.own);
     const Merge merge = std::move(merge_);
     merge_ = {};
-    return bring({*before, *merged.file, *merge.source, merge.path}, 0, "Merge");
+    return bring({.before = *before,
+                  .after = *merged.file,
+                  .source = *merge.source,
+                  .path = merge.path,
+                  .isOfFiles = merge.isOfFiles,
+                  .nothing = "The second setup has changed nothing that is not here already"},
+                 0, "Merge");
   }
 
  private:
@@ -186,15 +193,23 @@ class DocumentComparison final : public SetupComparison {
     const KvsHandle own = document_.file().tree(path);
     const KvsHandle taken =
         withTaken(*own, *other_->tree(path), [&](const std::string& each) { return paths.contains(each); });
-    return bring({*own, *taken, document_.file().source(), path}, page, name);
+    return bring(
+        {.before = *own,
+         .after = *taken,
+         .source = document_.file().source(),
+         .path = path,
+         .nothing = "It follows from other values, or is none of the model, and can't be taken over alone"},
+        page, name);
   }
 
   // What a step makes of the document.
   struct Change {
     const KvsFile& before;  // as a save writes it
     const KvsFile& after;
-    const KvsFile& source;    // whose options are exchanged
-    const std::string& path;  // that file names in `after` start from
+    const KvsFile& source;          // whose options are exchanged
+    const std::string& path;        // that file names in `after` start from
+    bool isOfFiles = false;         // whose unknown sections come too
+    std::string_view nothing = {};  // what is said where nothing changes
   };
 
   // Gives the document what differs between two files. Parts of the model that are the same in both keep what
@@ -204,10 +219,9 @@ class DocumentComparison final : public SetupComparison {
     from.Load(&change.before.tree().root(), document_.path());
     CGlobalKvs to;
     to.Load(&change.after.tree().root(), change.path);
-    const bool hasSameOptions = sameOptions(change.before, change.after);
-    if (hasSameOptions && from.SameState(to))
-      return "It follows from other values, or is none of the model, and can't be taken over alone";
-    KvsHandle source = hasSameOptions ? nullptr : withOptions(change.source, change.after);
+    const bool keepsSource = !change.isOfFiles && sameOptions(change.before, change.after);
+    if (keepsSource && from.SameState(to)) return std::string(change.nothing);
+    KvsHandle source = keepsSource ? nullptr : withOptions(change.source, change.after);
     const bool isDone = document_.Attempt([&] {
       const std::vector<CKvsBase*> parts = document_.root().children();
       const std::vector<CKvsBase*> olds = from.children();

@@ -4,8 +4,10 @@
 
 #include <algorithm>
 #include <array>
+#include <cctype>
 #include <cmath>
 #include <fstream>
+#include <string>
 #include <string_view>
 
 #include "conversion/gdal_files.h"
@@ -39,9 +41,16 @@ bool namesSuchFiles(const char* path) {
   if (driver == nullptr || !std::string_view(GDALGetDriverShortName(driver)).ends_with("VRT")) return false;
   std::ifstream file(path);
   for (std::string line; std::getline(file, line);) {
-    for (const char* word :
-         {"NETCDF:", "HDF5:", "BAG:", ".nc<", ".h5<", ".hdf5<", ".bag<", ".grd<", ".nc\""}) {
+    std::ranges::transform(line, line.begin(),
+                           [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
+    for (const std::string_view word : {"netcdf:", "hdf5:", "bag:"}) {
       if (line.find(word) != std::string::npos) return true;
+    }
+    // As the text of an element, or as an attribute.
+    for (const std::string_view ending : {".nc", ".nc4", ".cdf", ".h5", ".he5", ".hdf5", ".bag", ".grd"}) {
+      for (const char behind : {'<', '"'}) {
+        if (line.find(std::string(ending) + behind) != std::string::npos) return true;
+      }
     }
   }
   return false;
@@ -123,6 +132,7 @@ bool copyRaster(Dataset source, const CopyWanted& wanted, BackgroundCopy& copy, 
   GDALTranslateOptionsSetProgress(options.get(), goesOn,
                                   const_cast<std::function<bool(double)>*>(&wanted.progress));
   const Dataset made(GDALTranslate(copy.file.c_str(), source.get(), options.get(), nullptr));
+  if (made) GDALFlushCache(made.get());  // a full disk may show here first
   if (made && CPLGetLastErrorType() != CE_Failure) return true;
   *error = lastError("it can't be read");
   return false;

@@ -10,15 +10,15 @@ namespace gridbay {
 namespace {
 
 constexpr std::string_view kMark = "\xef\xbb\xbf";
+constexpr std::string_view kPlain = "UTF-8";
 
 // By the C library; nothing where the bytes are not of that encoding.
 std::optional<std::string> converted(std::string_view bytes, const char* encoding) {
   const iconv_t conversion = ::iconv_open("UTF-8", encoding);
   if (conversion == iconv_t(-1)) return std::nullopt;
   std::string text(bytes.size() + bytes.size() / 2 + 16, '\0');
-  std::string from(bytes);
-  char* in = from.data();
-  std::size_t inLeft = from.size();
+  char* in = const_cast<char*>(bytes.data());  // which it only reads
+  std::size_t inLeft = bytes.size();
   std::size_t done = 0;
   bool isGood = true;
   while (isGood && inLeft > 0) {
@@ -46,15 +46,18 @@ const char* encodingOf(std::string_view bytes) {
   const std::size_t most = size / 4;  // a half of them
   if (zeros[0] == 0 && zeros[1] > most) return "UTF-16LE";
   if (zeros[1] == 0 && zeros[0] > most) return "UTF-16BE";
-  return "UTF-8";
+  return kPlain.data();
 }
 
 }  // namespace
 
 Result<std::string> tableText(std::string_view bytes) {
   const char* encoding = encodingOf(bytes);
-  std::optional<std::string> text = converted(bytes, encoding);
-  if (!text && encoding == std::string_view("UTF-8")) text = converted(bytes, "WINDOWS-1252");
+  const bool isPlain = encoding == kPlain && std::ranges::all_of(bytes, [](char c) {
+                         return static_cast<unsigned char>(c) < 0x80;
+                       });
+  std::optional<std::string> text = isPlain ? std::optional(std::string(bytes)) : converted(bytes, encoding);
+  if (!text && encoding == kPlain) text = converted(bytes, "WINDOWS-1252");
   if (!text || text->find('\0') != text->npos) return Failure{"it is no text"};
   if (text->starts_with(kMark)) text->erase(0, kMark.size());
   if (text->find('\n') == text->npos) std::ranges::replace(*text, '\r', '\n');

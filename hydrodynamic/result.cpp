@@ -270,4 +270,7 @@ double CNhdResultKvs::TotalSizeMB() {
          basic->bathymetry->EstimateSizeMB(hotStartItems() + beside.hotStartItems);
 }
 
+// What is compiled into Output::Save is looked for by a debug build.
+template class TableKvs<CNhdResultObjectKvs>;
+
 }  // namespace gridbay

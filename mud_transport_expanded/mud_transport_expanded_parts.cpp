@@ -48,4 +48,8 @@ void MudTransportExpandedParts::create(CKvsBase& root) {
               nmtExpLineDischarge, nmtExpResult);
 }
 
+// Of these nothing calls what they put something else in the place of; a debug build looks for it.
+template class TableKvs<CNmtExpSandFractionObjectKvs>;
+template class TableKvs<CNmtExpWaterColParametersKvs>;
+
 }  // namespace gridbay

@@ -28,6 +28,7 @@ class Packing {
 
  private:
   void raw(void* at, std::size_t size) {
+    if (size == 0) return;
     if (!reads_) {
       bytes_.append(static_cast<const char*>(at), size);
     } else if (bytes_.size() - at_ >= size) {

@@ -10,7 +10,7 @@
 namespace gridbay {
 namespace {
 
-constexpr std::size_t kMostPlaces = 1000;
+constexpr std::size_t kMostPlaces = 200;
 constexpr std::string_view kSeries = "tsb0";
 
 // Answers who asks for a file: with the series, where it is one that is asked for.
@@ -121,7 +121,7 @@ class Rehearsal {
   SeriesPlaces find() {
     if (!giver_.isReadable()) return {};
     for (const ComparedPage& page : model_.pages()) {
-      if (found_.places.size() >= kMostPlaces) break;
+      if (isFull()) break;
       if (model_.isVisible(page.id) && model_.page(page.id) != nullptr) findOn(page);
     }
     found_.others.assign(others_.begin(), others_.end());
@@ -148,6 +148,7 @@ class Rehearsal {
   }
 
  private:
+  bool isFull() const { return found_.places.size() >= kMostPlaces; }
   // The table whose current row decides what the rest of the page shows; null for none.
   static CV27SetupGridWnd* masterOf(CV27SetupFormView& page) {
     for (const Control& control : page.form().controls()) {
@@ -165,9 +166,9 @@ class Rehearsal {
     page.OnUpdate();
     CV27SetupGridWnd* master = masterOf(page);
     const int rows = master == nullptr ? 0 : master->GetRowCount();
-    for (int current = std::min(rows, 1); current <= rows; ++current) {
+    for (int current = std::min(rows, 1); current <= rows && !isFull(); ++current) {
       show(page, master, current);
-      for (int i = 0; i < static_cast<int>(page.form().controls().size()); ++i) {
+      for (int i = 0; i < static_cast<int>(page.form().controls().size()) && !isFull(); ++i) {
         const Control& control = page.form().controls()[static_cast<std::size_t>(i)];
         if (control.grid != nullptr) {
           // Its rows are not of the row that is current.
@@ -198,7 +199,7 @@ class Rehearsal {
 
   void findIn(const ComparedPage& entry, CV27SetupGridWnd& grid, int current, int control) {
     if (!grid.IsEnabled()) return;
-    for (int row = 1; row <= grid.GetRowCount(); ++row) {
+    for (int row = 1; row <= grid.GetRowCount() && !isFull(); ++row) {
       for (int column = 1; column <= grid.GetColCount(); ++column) {
         CellStyle style;
         grid.GetStyleRowCol(row, column, style);

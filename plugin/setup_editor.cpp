@@ -4,6 +4,7 @@
 #include <stdexcept>
 
 #include "advice/advisor.h"
+#include "advice/fix_files.h"
 #include "compare/document_comparison.h"
 #include "map/document_map.h"
 #include "plugin/cover_pages.h"
@@ -97,7 +98,8 @@ class Editor final : public SetupEditor {
   }
   bool makeFix(const Advice& advice) override {
     if (!advice.fix) return false;
-    const bool isMade = document_.Attempt([this, &fix = *advice.fix] {
+    bool isStopped = false;
+    const bool isMade = document_.Attempt([this, &isStopped, &fix = *advice.fix] {
       Outcome made;
       const auto make = [&](const Progress& progress) {
         made = gridbay::makeFix(document_.root(), fix, document_.path(), progress);
@@ -107,9 +109,10 @@ class Editor final : public SetupEditor {
       } else {
         document_.host().doLongWork(fix.name, make);
       }
-      if (!made) throw std::runtime_error(made.error());
+      isStopped = !made && made.error() == kFixStopped;
+      if (!made && !isStopped) throw std::runtime_error(made.error());
     });
-    if (!isMade) return false;
+    if (!isMade || isStopped) return false;
     document_.Touch(advice.place.page);
     document_.SetModifiedFlag();
     document_.RecordEdit(advice.place.page, advice.fix->name);

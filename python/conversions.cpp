@@ -7,6 +7,7 @@
 
 #include "conversion/raster_conversion.h"
 #include "conversion/series_conversion.h"
+#include "platform/files/may_write.h"
 #include "platform/units/units.h"
 #include "python/arguments.h"
 #include "python/item_type_text.h"
@@ -131,10 +132,14 @@ py::dict convert(Result<Converted> (*work)(const Conversion&, ConversionHost&), 
   const Result<Converted> converted = work(conversion, host);
   if (!converted) {
     if (converted.error() == kConversionStopped) throw Refusal{kStopped, converted.error(), conversion.in};
-    if (!std::filesystem::exists(conversion.in))
+    std::error_code error;
+    if (!std::filesystem::exists(conversion.in, error))
       throw fileRefusal(conversion.in, converted.error(), "a file that is there");
-    if (!conversion.force && std::filesystem::exists(conversion.out))
+    const Outcome free = mayWrite(conversion.out, conversion.force, {&conversion.in, 1}, "force=True");
+    if (!free && free.error() == converted.error())
       throw fileRefusal(conversion.out, converted.error(), kNewFile);
+    if (converted.error().find('"' + conversion.out + '"') != std::string::npos)
+      throw fileRefusal(conversion.out, converted.error(), "a file that can be written");
     Refusal wrong = fileRefusal(conversion.in, converted.error(), allowed);
     wrong.kind = kWrongValue;
     throw wrong;

@@ -49,7 +49,7 @@ struct Taken<NewArea> {
   }
   static std::string fileGiven(py::handle value, const std::string& path) {
     if (value.is_none()) throw refusal(kWrongType, path, shown(value), kAreas);
-    return fileOf(value, path);
+    return absolutePath(fileOf(value, path), {});  // the current folder may be another one later
   }
 };
 
@@ -177,8 +177,8 @@ class Document {
     const std::string name(withoutTarget(path));
     PathAccess look{.what = PathAccess::What::look, .onlySections = section};
     if (!setup_.model().AccessPath(name, look) || look.isSection != section) return false;
-    if (!section) return true;
-    // A look passes what a file of another model may have.
+    if (!section || !sameName(stepOf(name).first, "BIO_RIG_MODULE")) return true;
+    // A look there passes what a file of another model may have.
     const KvsHandle scratch = kvsCreate();
     PathAccess write{
         .what = PathAccess::What::write, .out = scratch.get(), .documentPath = &path_, .onlySections = true};

@@ -1,5 +1,6 @@
 #include "setup/edit_history.h"
 
+#include <algorithm>
 #include <iterator>
 
 namespace gridbay {
@@ -63,6 +64,10 @@ void EditHistory::apply(CGlobalKvs& model, const std::vector<PartChange>& change
   } else {
     for (auto part = changes.rbegin(); part != changes.rend(); ++part) both(*part);
   }
+}
+
+bool EditHistory::hasState(std::uint64_t state) const {
+  return std::ranges::find(steps_, state, &Step::state) != steps_.end();
 }
 
 // Steps that could be done again start from a state that is gone then.

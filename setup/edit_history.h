@@ -54,6 +54,9 @@ class EditHistory {
   // A number for the present state of the model, by which it is known again after an undo or a redo.
   std::uint64_t state() const { return done_ == 0 ? firstState_ : steps_[done_ - 1].state; }
 
+  // Whether a step leads to the state of that number, which an undo can leave then, or a redo reach.
+  bool hasState(std::uint64_t state) const;
+
   // The present state is the one on file; whether it is so again.
   void markSaved() { saved_ = done_; }
   void markUnsaved() { saved_ = kNeverSaved; }

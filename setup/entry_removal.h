@@ -17,8 +17,7 @@ void removeEntry(List& list, int number) {
   list.SetCount(list.GetCount() - 1);
 }
 
-// The same for an open boundary and for a source or sink, with what all modules say of it.
+// The same for an open boundary, with what all modules say of it.
 void removeBoundary(CGlobalKvs& root, int number);
-void removeSource(CGlobalKvs& root, int number);
 
 }  // namespace gridbay

@@ -410,6 +410,10 @@ PagePlace placeOfMessage(const CMessage& message) {
     place.field = field->field;
     place.fieldNumber = field->number;
   }
+  // A result's file that belongs to no output is one of the hot start files.
+  const bool isOnResultPage = std::ranges::find(kResultPages, message.page) != std::end(kResultPages);
+  if (isOnResultPage && message.entries.empty() && firstOf(message.text, texts::resultFileNotValid.format))
+    place.field = "Hot start files";
   for (const Text& text :
        {texts::dataFileNotValid, texts::waveOrGrainFileNotValid, texts::resultFileNotValid}) {
     if (const std::optional<std::string> name = firstOf(message.text, text.format)) place.value = *name;

@@ -109,7 +109,10 @@ void CV27SetupDoc::ReplaceSource(KvsHandle source) {
 void CV27SetupDoc::RecordEdit(PageId page, std::string name, bool continues) {
   const bool isRecorded =
       history_.record(root(), page, std::move(name), continues, touched(), replaced_ != nullptr);
-  if (isRecorded && replaced_ != nullptr) sources_.push_back({history_.state(), std::move(replaced_)});
+  if (isRecorded && replaced_ != nullptr) {
+    std::erase_if(sources_, [this](const SourceChange& each) { return !history_.hasState(each.state); });
+    sources_.push_back({history_.state(), std::move(replaced_)});
+  }
   if (!history_.isSaved()) SetModifiedFlag();
 }
 

@@ -9,7 +9,11 @@ void BackgroundWork::begin(const WorkApart::Work& work, const QString& file) {
   Result<WorkApart> begun = WorkApart::begin(work, file.toStdString());
   if (!begun) {
     QMetaObject::invokeMethod(
-        this, [this] { emit ended(std::nullopt); }, Qt::QueuedConnection);
+        this,
+        [this, round = round_] {
+          if (round == round_) emit ended(std::nullopt);
+        },
+        Qt::QueuedConnection);
     return;
   }
   work_ = std::make_unique<WorkApart>(std::move(*begun));
@@ -18,6 +22,7 @@ void BackgroundWork::begin(const WorkApart::Work& work, const QString& file) {
 }
 
 void BackgroundWork::stop() {
+  ++round_;
   notifier_.reset();
   work_.reset();
 }

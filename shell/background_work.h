@@ -3,6 +3,7 @@
 #include <QObject>
 #include <QSocketNotifier>
 #include <QString>
+#include <cstdint>
 #include <memory>
 #include <optional>
 #include <string>
@@ -34,6 +35,7 @@ class BackgroundWork final : public QObject {
 
   std::unique_ptr<WorkApart> work_;
   std::unique_ptr<QSocketNotifier> notifier_;
+  std::uint64_t round_ = 0;  // one more at each stop: what is of an earlier one is not told
 };
 
 }  // namespace gridbay::shell

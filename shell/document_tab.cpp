@@ -178,7 +178,10 @@ bool DocumentTab::goToPlace(const PagePlace& place, Keyboard keyboard) {
   const auto page = static_cast<std::int32_t>(place.page);
   if (currentPage() != page && !goToPage(page)) return false;
   QWidget* found = pane_->goTo(place);
-  if (found != nullptr && keyboard == Keyboard::follows) found->setFocus(Qt::OtherFocusReason);
+  if (found != nullptr && keyboard == Keyboard::follows) {
+    window()->activateWindow();  // who asks may be in a window of its own
+    found->setFocus(Qt::OtherFocusReason);
+  }
   return true;
 }
 

@@ -502,6 +502,7 @@ void GridView::mouseReleaseEvent(QMouseEvent* event) {
 }
 
 void GridView::keyPressEvent(QKeyEvent* event) {
+  if (event->key() == Qt::Key_Space && event->isAutoRepeat()) return;
   const QModelIndex index = currentIndex();
   const CellKind kind = index.isValid() ? model_->style(index).kind : CellKind::label;
   const bool isEnter = event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter;

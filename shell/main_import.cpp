@@ -73,6 +73,7 @@ void MainWindow::importSeries() {
       DocumentTab* tab = currentDocument();
       if (tab == nullptr) return found;
       found.period = tab->editor().summary().period;
+      found.state.emplace(tab, tab->editor().modelState());
       const QString path = QString::fromStdString(tab->editor().path());
       if (!path.isEmpty()) found.folder = QFileInfo(path).absolutePath();
       return found;

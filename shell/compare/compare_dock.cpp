@@ -102,7 +102,9 @@ QAction* CompareDock::makeAction(const QString& text, const QKeySequence& key, v
 
 void CompareDock::showDocument(DocumentTab* tab) {
   if (TabComparison* before = comparison()) disconnect(before, nullptr, this, nullptr);
+  if (tab_ != nullptr) disconnect(tab_.data(), nullptr, this, nullptr);
   tab_ = tab;
+  if (tab != nullptr) connect(tab, &DocumentTab::pageShown, this, &CompareDock::enableActions);
   if (TabComparison* on = comparison()) {
     connect(on, &TabComparison::changed, this, &CompareDock::fill);
     connect(on, &TabComparison::atWork, this, &CompareDock::showWork);
@@ -190,7 +192,7 @@ void CompareDock::enableActions() {
   const bool hasSome = on != nullptr && !on->differences().empty();
   for (QAction* action : {next_, previous_, takeAll_}) action->setEnabled(hasSome);
   take_->setEnabled(hasSome && on->current() >= 0);
-  takePage_->setEnabled(hasSome);
+  takePage_->setEnabled(hasSome && (on->current() >= 0 || tab_->currentPage() != 0));
   end_->setEnabled(on != nullptr);
 }
 

@@ -41,10 +41,13 @@ bool MainWindow::mergeInto(DocumentTab& tab, const QString& base, const QString&
   SetupComparison& setups = tab.editor().comparison();
   std::string fault = setups.startMerge(base.toStdString(), own.toStdString(), other.toStdString());
   if (fault.empty() && !setups.questions().empty()) {
+    bool isCancelled = false;
     const std::optional<std::string> words =
         workBeside([&setups](const WorkApart::Progress&) { return setups.wordQuestions(); },
-                   tr("Merging %1...").arg(QFileInfo(other).fileName()), &tab);
-    if (!words || !setups.takeQuestions(*words)) return false;
+                   tr("Merging %1...").arg(QFileInfo(other).fileName()), &tab, isCancelled);
+    if (isCancelled) return false;
+    // Where there are no words for them they are asked by their paths.
+    if (words) setups.takeQuestions(*words);
     const QString ownName = own.isEmpty() ? tab.name() : QFileInfo(own).fileName();
     const QString otherName = QFileInfo(other).fileName();
     MergeDialog dialog(ownName, ownName == otherName ? other : otherName, setups.questions(), this);

@@ -145,7 +145,9 @@ void TabComparison::showFound() {
 bool TabComparison::finish() {
   if (comparison().isCurrent()) return true;
   if (!work_.isRunning() || timer_.isActive()) compare();
-  waitFor(work_, tr("Comparing %1 and %2...").arg(tab_.name(), otherName()), &tab_);
+  const bool isDone = waitFor(work_, tr("Comparing %1 and %2...").arg(tab_.name(), otherName()), &tab_);
+  // It goes on beside the window.
+  if (!isDone) compare();
   return comparison().isCurrent();
 }
 

@@ -36,7 +36,10 @@ bool FileDrop::eventFilter(QObject* watched, QEvent* event) {
     return true;
   }
   drop->acceptProposedAction();
-  if (!isDrag) take_(path);
+  // Not within the drop, which another program waits for.
+  if (!isDrag)
+    QMetaObject::invokeMethod(
+        this, [this, path] { take_(path); }, Qt::QueuedConnection);
   return true;
 }
 

@@ -109,6 +109,10 @@ void SeriesForm::showForm(const TableForm& form) {
   missing_->setText(missing.join(' '));
   start_->setText(QString::fromStdString(form.start));
   timeUnit_->setCurrentText(QString::fromStdString(form.timeUnit));
+  enable(form);
+}
+
+void SeriesForm::enable(const TableForm& form) {
   const bool isNumeric = form.hasRole(Role::time);
   start_->setEnabled(isNumeric);
   timeUnit_->setEnabled(isNumeric);

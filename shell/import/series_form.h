@@ -18,6 +18,8 @@ class SeriesForm final : public QWidget {
   explicit SeriesForm(QWidget* parent);
 
   void showForm(const TableForm& form);
+  // Only what can be used with it; what is typed stays.
+  void enable(const TableForm& form);
   // Fills in what the fields say; the columns stay as they are.
   void takeInto(TableForm& form) const;
   // What is wrong with a field, which shows it too; empty where nothing is.

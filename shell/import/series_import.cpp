@@ -10,6 +10,7 @@
 #include <QMessageBox>
 #include <QSplitter>
 #include <QVBoxLayout>
+#include <algorithm>
 #include <cmath>
 #include <utility>
 
@@ -206,7 +207,11 @@ QWidget* SeriesImport::buildButtons() {
     layout->addWidget(button);
   }
   connect(cancel_, &QPushButton::clicked, this, &SeriesImport::cancel);
-  connect(import_, &QPushButton::clicked, this, &SeriesImport::startImport);
+  // By its key it is pressed with the focus in an edit, which tells what was typed once it is left.
+  connect(import_, &QPushButton::clicked, this, [this] {
+    import_->setFocus();
+    startImport();
+  });
   connect(help_, &QPushButton::clicked, this, &SeriesImport::helpWanted);
   connect(close_, &QPushButton::clicked, this, &QDialog::reject);
   return row;
@@ -262,8 +267,9 @@ void SeriesImport::keyPressEvent(QKeyEvent* event) {
 void SeriesImport::changeEvent(QEvent* event) {
   QDialog::changeEvent(event);
   if (event->type() != QEvent::ActivationChange || !isActiveWindow()) return;
+  const auto before = setup_.state;
   takeSetup();
-  uses_->seekAgain();
+  if (!setup_.state || setup_.state != before) uses_->seekAgain();
 }
 
 void SeriesImport::done(int result) {
@@ -283,12 +289,20 @@ void SeriesImport::takeSetup() {
 }
 
 void SeriesImport::showTable(std::shared_ptr<const std::string> text, const QString& title) {
+  isWanted_ = false;
+  // Those that were typed before there was a table.
+  const std::vector<double> missing = text_ == nullptr ? form_.missing : std::vector<double>();
   text_ = std::move(text);
   title_ = title;
   sourceText_->setText(title);
   // Times that are numbers most likely count from where the simulation begins.
   if (form_.start.empty() && setup_.period) form_.start = dateTimeText((*setup_.period)[0]);
-  takeGuess(guessTable(*text_));
+  TableGuess guess = guessTable(*text_);
+  for (const double number : missing) {
+    if (std::ranges::find(guess.form.missing, number) == guess.form.missing.end())
+      guess.form.missing.push_back(number);
+  }
+  takeGuess(std::move(guess));
   reread();
 }
 
@@ -336,8 +350,10 @@ void SeriesImport::orderTabs() {
 }
 
 void SeriesImport::formChanged() {
-  if (text_ == nullptr) return;
   fields_->takeInto(form_);
+  if (text_ == nullptr) return;
+  // What is wrong stays to be seen.
+  if (fields_->fault().isEmpty()) fields_->showForm(form_);
   readSoon();
 }
 
@@ -354,7 +370,7 @@ void SeriesImport::reread() {
   work_.stop();
   uses_->hide();
   read_.reset();
-  fields_->showForm(form_);
+  fields_->enable(form_);
   preview_->show(*text_, form_);
   previewView_->resizeColumnsToContents();
   if (faultOf(form_).empty()) {
@@ -374,6 +390,8 @@ void SeriesImport::takeRead(const std::optional<std::string>& bytes) {
   if (*read_) {
     preview_->showFaults((*read_)->faults);
     plot_->showTable(**read_);
+  } else {
+    plot_->showTable({});
   }
   showCoverage();
   enter(Stage::ready);
@@ -469,6 +487,7 @@ void SeriesImport::startImport() {
 
 void SeriesImport::write(const QString& path) {
   made_ = path;
+  before_ = fileStamp(made_.toStdString());
   uses_->hide();
   enter(Stage::importing);
   const SeriesTarget target{.out = path.toStdString(),
@@ -493,13 +512,17 @@ void SeriesImport::takeImport(const std::optional<std::string>& bytes) {
   const QString told = textOf(*summary).trimmed();
   tell(told, false);
   emit imported(told);
+  takeSetup();
   uses_->offer(made_);
 }
 
 void SeriesImport::cancel() {
   work_.stop();
   enter(Stage::ready);
-  tell(tr("The import was stopped; nothing is written."), false);
+  tell(fileStamp(made_.toStdString()) == before_
+           ? tr("The import was stopped; nothing is written.")
+           : tr("%1 was written before the import could be stopped.").arg(made_),
+       false);
 }
 
 }  // namespace gridbay::shell

@@ -6,10 +6,13 @@
 #include <QPushButton>
 #include <QTableView>
 #include <QTimer>
+#include <cstdint>
 #include <memory>
 #include <optional>
+#include <utility>
 
 #include "conversion/table_guess.h"
+#include "platform/files/file_stamp.h"
 #include "shell/background_work.h"
 #include "shell/import/column_rows.h"
 #include "shell/import/import_plot.h"
@@ -29,9 +32,12 @@ class SeriesImport final : public QDialog {
   struct Setup {
     std::optional<Period> period = {};
     QString folder = {};
+    // Which one, and in which state: while that is the same the uses are not looked for again.
+    std::optional<std::pair<const void*, std::uint64_t>> state = {};
   };
 
-  // `setup` is asked for whenever the window is turned to, as is `uses` for a series that has been written.
+  // `setup` is asked for whenever the window is turned to, as is `uses`, after a change of the setup, for a
+  // series that has been written.
   SeriesImport(std::function<Setup()> setup, std::function<UseStrip::Offer(const QString& series)> uses,
                QWidget* parent);
   ~SeriesImport() override;
@@ -103,9 +109,10 @@ class SeriesImport final : public QDialog {
   TableForm form_;
   std::optional<Result<SeriesTable>> read_;
   Stage stage_ = Stage::ready;
-  bool isWanted_ = false;  // the import, once all is read
-  QString made_;           // the series that is being made, or was
-  QTimer rereading_;       // from a change to a new look
+  bool isWanted_ = false;            // the import, once all is read
+  QString made_;                     // the series that is being made, or was
+  std::optional<FileStamp> before_;  // what was there before it
+  QTimer rereading_;                 // from a change to a new look
   BackgroundWork work_;
 
   QWidget* body_;

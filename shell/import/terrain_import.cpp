@@ -133,7 +133,11 @@ QWidget* TerrainImport::makeButtons() {
   layout->addWidget(progress_, 1);
   for (QPushButton* button : {cancel_, import_, help, close}) layout->addWidget(button);
   connect(cancel_, &QPushButton::clicked, this, &TerrainImport::cancel);
-  connect(import_, &QPushButton::clicked, this, &TerrainImport::startImport);
+  // By its key it is pressed with the focus in an edit, which tells of another file once it is left.
+  connect(import_, &QPushButton::clicked, this, [this] {
+    import_->setFocus();
+    if (import_->isEnabled()) startImport();
+  });
   connect(help, &QPushButton::clicked, this, &TerrainImport::helpWanted);
   connect(close, &QPushButton::clicked, this, &QDialog::reject);
   return row;
@@ -259,6 +263,7 @@ void TerrainImport::startImport() {
     if (answer != QMessageBox::Yes) return;
     wanted.force = true;
   }
+  before_ = fileStamp(made_.toStdString());
   enter(Stage::importing);
   tell(tr("Importing..."), false);
   work_.begin(
@@ -292,8 +297,13 @@ void TerrainImport::cancel() {
     summary_->clear();
   }
   enter(Stage::ready);
-  tell(wasImporting ? tr("The import was stopped; nothing is written.") : tr("The reading was stopped."),
-       false);
+  if (!wasImporting) {
+    tell(tr("The reading was stopped."), false);
+  } else if (fileStamp(made_.toStdString()) == before_) {
+    tell(tr("The import was stopped; nothing is written."), false);
+  } else {
+    tell(tr("%1 was written before the import could be stopped.").arg(made_), false);
+  }
 }
 
 // Return in a field is no end of the dialog, and Esc ends first what is going on.

@@ -8,6 +8,7 @@
 #include <functional>
 #include <optional>
 
+#include "platform/files/file_stamp.h"
 #include "shell/background_work.h"
 #include "shell/import/height_histogram.h"
 #include "shell/import/terrain_form.h"
@@ -71,7 +72,8 @@ class TerrainImport final : public QDialog {
   BackgroundWork work_;
   Stage stage_ = Stage::ready;
   std::optional<RasterPreview> shown_;
-  QString made_;  // the map that is being made, or was
+  QString made_;                     // the map that is being made, or was
+  std::optional<FileStamp> before_;  // what was there before it
 };
 
 }  // namespace gridbay::shell

@@ -73,6 +73,13 @@ void BackgroundCopies::beginNext() {
   if (next == copies_.end()) return emit ended();
   if (!mayBegin_()) return retry_.start();
   if (folder_ == nullptr) folder_ = std::make_unique<QTemporaryDir>();
+  if (!folder_->isValid()) {
+    const QString why = folder_->errorString();
+    folder_.reset();
+    next->second.failed = std::exchange(next->second.wanted, std::nullopt);
+    emit failed(next->first, tr("cannot make a temporary folder: %1").arg(why));
+    return beginNext();
+  }
   current_ = next->first;
   atWork_ = *std::exchange(next->second.wanted, std::nullopt);
   emit progressed(current_, 0);
@@ -95,6 +102,7 @@ void BackgroundCopies::take(const std::optional<std::string>& bytes) {
       removeFile(std::exchange(copy.before, QString::fromStdString(copy.is.file)));
       copy.is = std::move(*made);
       copy.made = atWork_;
+      copy.failed.reset();
       if (copy.wanted && suits(copy, *copy.wanted)) copy.wanted.reset();
       emit this->made(id);
     } else {

@@ -60,9 +60,9 @@ class BackgroundCopies final : public QObject {
   void take(const std::optional<std::string>& bytes);
 
   std::function<bool()> mayBegin_;
+  std::unique_ptr<QTemporaryDir> folder_;  // goes after the work that writes into it
   BackgroundWork work_;
   QTimer retry_;
-  std::unique_ptr<QTemporaryDir> folder_;
   std::map<int, Copy> copies_;
   int current_ = 0;  // the one that is at work; 0 for none
   Wanted atWork_;

@@ -194,9 +194,10 @@ void MapBackgrounds::take(BackgroundPicture picture) {
     return requestAgain();
   }
   if (background.needsCopy && picture.fault.isEmpty()) {
+    // Those that are known stay where the copy has been forgotten meanwhile.
     const RasterNames& names = copies_.rastersOf(picture.id);
-    picture.raster = QString::fromStdString(names.shown);
-    picture.rasters.clear();
+    picture.raster = names.all.empty() ? background.raster : QString::fromStdString(names.shown);
+    picture.rasters = names.all.empty() ? background.rasters : QStringList();
     for (const std::string& name : names.all) picture.rasters << QString::fromStdString(name);
   }
   const QString before = told(background);

@@ -57,6 +57,7 @@ class MapBackgrounds final : public QObject {
   void request(const MapFrame& frame, const std::string& projection);
   // Those above the terrain, or those below it.
   void paint(QPainter& painter, const MapFrame& frame, bool above) const;
+  const MapFrame& frame() const { return frame_; }  // that was asked for last
   bool isSettled() const { return (worker_ == nullptr || worker_->isIdle()) && copies_.isIdle(); }
 
  signals:

@@ -351,8 +351,9 @@ void MapCanvas::keyPressEvent(QKeyEvent* event) {
     case Qt::Key_Home:
       fit();
       return pointByKeys();
-    case Qt::Key_Space:
-      return pressMiddle();
+    case Qt::Key_Space:  // held down it counts once
+      if (!event->isAutoRepeat()) pressMiddle();
+      return;
     case Qt::Key_Left:
       frame.pan({pan, 0});
       break;

@@ -96,6 +96,7 @@ MapDock::MapDock(QWidget* parent)
   refreshTimer_.setSingleShot(true);
   connect(&refreshTimer_, &QTimer::timeout, this, [this] {
     if (tab_ == nullptr) return;
+    pickCell_ = QPersistentModelIndex();  // what it is to hold may be another thing now
     followSetup();
     canvas_->refresh();
     canvas_->setMarks(marksOf(tab_->advice(), canvas_->scene()));
@@ -103,6 +104,7 @@ MapDock::MapDock(QWidget* parent)
   });
   // One behind another dock counts as visible, and only the signal tells.
   connect(this, &QDockWidget::visibilityChanged, this, [this](bool isShown) {
+    if (!isShown && window()->isMinimized()) return;
     isShown_ = isShown;
     follow();
   });
@@ -180,6 +182,7 @@ void MapDock::buildTools() {
   pick_ = tools_->addAction(tr("Pick"), this, &MapDock::startPick);
   pick_->setToolTip(tr("Pick on the map what the page's current cell is to hold (Ctrl+Shift+M)"));
   pick_->setShortcut(Qt::CTRL | Qt::SHIFT | Qt::Key_M);
+  if (parentWidget() != nullptr) parentWidget()->addAction(pick_);  // also where the map is not shown
   pick_->setCheckable(true);
   tools_->addSeparator();
   QAction* whole = tools_->addAction(tr("Whole map"), canvas_, &MapCanvas::fit);
@@ -236,9 +239,12 @@ void MapDock::showDocument(DocumentTab* tab) {
 
 // Shows what is wanted, while anyone can see it.
 void MapDock::follow() {
-  DocumentTab* tab = isShown_ ? wanted_.data() : nullptr;
+  // An export goes on behind another dock.
+  const bool isKept = isShown_ || (export_->isRunning() && wanted_ == tab_);
+  DocumentTab* tab = isKept ? wanted_.data() : nullptr;
   if (tab == tab_) return;
   if (tab_ != nullptr) {
+    if (export_->isRunning()) emit failed(tr("The export was stopped; nothing is written."));
     frames_[tab_] = canvas_->isFitted() ? std::nullopt : std::optional(canvas_->frame());
     keepFrame(setupOf(*tab_), frames_[tab_]);
     export_->cancel();
@@ -422,11 +428,13 @@ void MapDock::buildStrips() {
     if (fault.isEmpty()) readout_->setText(tr("\"%1\" is written.").arg(path));
     if (!fault.isEmpty()) emit failed(fault);
     emit exported(path, fault);
+    follow();
   });
   connect(exportStrip_, &WorkStrip::cancelled, this, [this] {
     export_->cancel();
     exportStrip_->hide();
     readout_->setText(tr("The export was stopped; nothing is written."));
+    follow();
   });
 }
 

@@ -359,6 +359,7 @@ void MapDrawing::paintLabels(QPainter& painter, const MapFrame& frame, Labels& l
   for (const Label& label : labels.all) {
     if (painted == kMost) return;
     const QRectF box = boxOfBadge(painter, label.place, label.text);
+    if (!box.intersects(all)) continue;
     const QPointF aside(box.width() / 2 + kApart, 0);
     const QPointF above(0, -(label.isBeside ? 2 : 1) * box.height());
     std::array<QPointF, 5> shifts{QPointF(), above, -above, aside, -aside};
@@ -367,7 +368,7 @@ void MapDrawing::paintLabels(QPainter& painter, const MapFrame& frame, Labels& l
       const QRectF there = box.translated(shift);
       return std::ranges::none_of(labels.taken, [&](const QRectF& each) { return each.intersects(there); });
     });
-    if (!box.intersects(all) || (free == shifts.end() && !label.isLit)) continue;
+    if (free == shifts.end() && !label.isLit) continue;
     const QPointF shift = free == shifts.end() ? shifts.front() : *free;
     paintBadge(painter, label.place + shift, label.text, label.colour);
     labels.taken.push_back(box.translated(shift));

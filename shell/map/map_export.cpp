@@ -121,6 +121,9 @@ void MapExport::cancel() {
   worker_.reset();
   picture_.reset();
   terrain_.clear();
+  MapBackgrounds& backgrounds = canvas_.backgrounds();
+  if (canvas_.editor() != nullptr && !path_.isEmpty() && !(backgrounds.frame() == canvas_.frame()))
+    backgrounds.request(canvas_.frame(), canvas_.scene().projectionText);
 }
 
 double MapExport::done() const {
@@ -137,8 +140,14 @@ double MapExport::done() const {
 
 void MapExport::look() {
   constexpr qint64 kWhile = 200;  // milliseconds
-  const bool isReady = (terrain_.empty() || picture_) && canvas_.backgrounds().isSettled();
-  if (isReady) return end(write());
+  MapBackgrounds& backgrounds = canvas_.backgrounds();
+  if (terrain_.empty() || picture_) {
+    if (!(backgrounds.frame() == frame_)) {  // the map has moved on
+      backgrounds.request(frame_, canvas_.scene().projectionText);
+    } else if (backgrounds.isSettled()) {
+      return end(write());
+    }
+  }
   if (elapsed_.elapsed() > kWhile) emit progressed(path_, done());
 }
 

@@ -642,6 +642,8 @@ TEST_F(BesideDocument, AMergeIsOneStep) {
   comparison->questions()[0].takesOther = true;
   EXPECT_EQ(comparison->finishMerge(), "");
   EXPECT_FLOAT_EQ(document.root().areaDescription->dryingDepth, 0.02F);
+  ASSERT_EQ(comparison->startMerge(base, {}, base), "");
+  EXPECT_EQ(comparison->finishMerge(), "The second setup has changed nothing that is not here already");
 }
 
 // What was found of a setup that has been edited since, or beside another one, changes nothing.
@@ -727,6 +729,21 @@ TEST_F(BesideDocument, OptionsAreBroughtIn) {
   document.Redo();
   ASSERT_TRUE(document.OnSaveDocument(own));
   EXPECT_TRUE(compare(own, other).isSame());
+}
+
+// What this version does not know of the first of two files is asked for at the save, and not before.
+TEST_F(BesideDocument, AMergeOfFilesKeepsWhatIsUnknown) {
+  const std::string base = make("base.v27", "flood.v27");
+  const std::string second = make("second.v27", "flood.v27", {kFlooding + "=0.3"});
+  std::string text = test::textOf(base);
+  text.insert(text.find("MODULE_SELECTION {"), "LATER_PART {\na 1\n}\n");
+  const std::string first = folder.write("first.v27", text);
+  ASSERT_TRUE(document.OnNewDocument());
+  ASSERT_EQ(comparison->startMerge(base, first, second), "");
+  EXPECT_EQ(comparison->finishMerge(), "");
+  EXPECT_THAT(document.file().unknownSections(), ::testing::Contains(HasSubstr("LATER_PART")));
+  document.Undo();
+  EXPECT_THAT(document.file().unknownSections(), IsEmpty());
 }
 
 // Three files become a new document, with file names that lead where they led.

@@ -68,6 +68,7 @@ class MudWater : public ::testing::Test {
   test::TemporaryFolder folder;
   test::Model model;
   CGlobalKvs& root = model.root;
+  CNmtTaskSelectionKvs& task = *root.nmtTaskSelection;
 };
 
 class MudInitial : public MudWater {

@@ -2,6 +2,7 @@
 
 import copy
 import datetime
+import os
 import pathlib
 import pickle
 
@@ -255,6 +256,15 @@ def test_copies_and_options(setup, tmp_path):
     assert opened.copy()[option] == 4 and "Flux_Limit 4" in opened.text()
     with pytest.raises(WrongType):
         opened[option] = "four"
+
+
+def test_a_grid_is_found_from_another_folder(grid, tmp_path, monkeypatch):
+    monkeypatch.chdir(os.path.dirname(grid))
+    setup = gridbay_setup.new(areas=[os.path.basename(grid)])
+    monkeypatch.chdir("/")
+    setup.save(tmp_path / "moved.v27")
+    named = setup["NESTED_MODEL_GLOBALS/BATHYMETRY_SELECTION/AREA_1/DATA_FILE/FILE_NAME"]
+    assert os.path.samefile(tmp_path / named, grid)
 
 
 def test_new_with_nested_areas(grid, tmp_path):

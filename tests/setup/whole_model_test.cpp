@@ -593,7 +593,9 @@ constexpr Told kTold[] = {
 TEST_P(WholeModel, EachMessageLeadsToAFieldOrARow) {
   std::set<std::string> seen;
   const auto leads = [&](const CMessage& message) {
-    if (!seen.insert(message.text).second) return;
+    const int entry = message.entries.empty() ? 0 : message.entries.front().number;
+    if (!seen.insert(fmt::format("{} {} {}", static_cast<int>(message.page), entry > 0, message.text)).second)
+      return;
     std::string topic;
     std::string local;
     const auto id = static_cast<std::int32_t>(message.page);

@@ -227,6 +227,8 @@ class CompareTest final : public DesktopFixture {
 
   void aPageAndAllAreTakenOver() {
     QVERIFY(compareWith("o.v27"));
+    // No page is shown yet.
+    QVERIFY(dock().takeAllAction()->isEnabled() && !dock().takePageAction()->isEnabled());
     QVERIFY(tab().goToPage(kAreas));
     click(dock().takePageAction());
     QCOMPARE(undoName(), QString("Take over Basic Parameters, Bathymetry"));

@@ -682,7 +682,13 @@ class MapTest : public DesktopFixture {
     QVERIFY(table->hasFocus() || table->isAncestorOf(QApplication::focusWidget()));
     QCOMPARE(tab().pane().currentCell().row, 6 * (next - 1) + 3);
     QCOMPARE(tab().pane().currentCell().column, 2);
-    for (int i = 0; i < 2; ++i) tab().undo();
+    QTest::keyClick(QApplication::focusWidget(),
+                    Qt::Key_2);  // opens the editor, which has the keyboard from here
+    QTest::keyClicks(QApplication::focusWidget(), ".5");
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
+    QCoreApplication::processEvents();  // it is entered by a queued call
+    QCOMPARE(table->model()->index(6 * (next - 1) + 2, 1).data(Qt::EditRole).toString().toDouble(), 2.5);
+    for (int i = 0; i < 3; ++i) tab().undo();
     QCoreApplication::processEvents();
     QVERIFY(undoName().isEmpty());
     QCOMPARE(*feature(MapKind::boundary)->points, found);

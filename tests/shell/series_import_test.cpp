@@ -205,6 +205,27 @@ class SeriesImportTest final : public DesktopFixture {
     QVERIFY(import());
     const std::vector<double> values = valuesOf(result("table.tsb0"), 1);
     QVERIFY(std::abs(values.at(0) - 0.005) < 1e-12 && std::abs(values.at(1) - 0.006) < 1e-12);
+    // And so it does where Import is pressed by its key.
+    fill(dialog_->result(), file("again"));
+    focus(row(2).name);
+    row(2).name->selectAll();
+    typeKeys("Inflow");
+    const QSignalSpy spy(dialog_.get(), &SeriesImport::imported);
+    pressKey(Qt::Key_I, Qt::AltModifier);
+    QTRY_COMPARE(spy.size(), 1);
+    QCOMPARE(result("again.tsb0").definition().items[0].name, std::string("Inflow"));
+  }
+
+  void anImportThatWaitsIsOfItsTableAlone() {
+    showDialog();
+    write(file("long.csv"), longTable(200'000));
+    QVERIFY(dialog_->openTable(file("long.csv")));
+    QTest::mouseClick(dialog_->importButton(), Qt::LeftButton);
+    QVERIFY(dialog_->isImporting());
+    open("d,Q\n2020-01-01,1\n2020-01-02,2\n");
+    QVERIFY(!dialog_->isImporting());
+    QCOMPARE(verdict(), QString("2 lines are read."));
+    QVERIFY(folderFiles().isEmpty());
   }
 
   void anOrderThatIsOpenIsSaidAndChosen() {
@@ -368,6 +389,12 @@ class SeriesImportTest final : public DesktopFixture {
     QVERIFY(why.isVisible() && why.text().startsWith("Missing: \"none\" is no number."));
     QVERIFY(!dialog_->importButton()->isEnabled() && verdict() == why.text());
     QCOMPARE(dialog_->form().missing().palette().color(QPalette::Text), faultColour(dialog_->palette()));
+    // It stays as it was typed, with what is wrong, once it is left and all is read again.
+    const QString typed = dialog_->form().missing().text();
+    pressKey(Qt::Key_Tab);
+    settle();
+    QCOMPARE(dialog_->form().missing().text(), typed);
+    QVERIFY(why.isVisible() && verdict() == why.text() && !dialog_->importButton()->isEnabled());
     fill(&dialog_->form().missing(), "-777.25; 4,5");
     settle();
     QCOMPARE(verdict(), QString("3 lines are read."));

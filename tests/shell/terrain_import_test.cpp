@@ -354,8 +354,8 @@ class TerrainImportTest : public DesktopFixture {
   void aFileIsDropped() {
     open("estuary.asc");
     drop(dialog(), {QUrl::fromLocalFile(file("slope.asc"))}, true);
+    QTRY_COMPARE(text("file"), file("slope.asc"));
     settle();
-    QCOMPARE(text("file"), file("slope.asc"));
     QVERIFY(summary().startsWith("40 x 30 points"));
     for (const QLineEdit* edit : dialog().findChildren<QLineEdit*>()) QVERIFY(!edit->acceptDrops());
   }
