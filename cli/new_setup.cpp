@@ -59,11 +59,7 @@ int newSetup(const NewSetupOptions& options, const Console& console) {
   ConsoleMessageHost host(console);
   SetupFile setup(&host);
   CGlobalKvs& model = setup.model();
-  if (const auto fault = layAreas(model, *areas)) {
-    const bool isPlaced = fault->area > 1 && !fault->isOfFile;
-    return console.fail(fault->text +
-                        (isPlaced ? " (FILE@J,K; --enclosing N for another area than the one before)" : ""));
-  }
+  if (const auto fault = layAreas(model, *areas)) return console.fail(fault->text);
   if (!options.start.empty()) {
     const std::optional<DateTime> start = dateTimeOfText(options.start);
     if (!start)

@@ -70,12 +70,19 @@ class Editor final : public SetupEditor {
     return items;
   }
   void applyRules() override { tree_.OnUpdate(&document_.root()); }
+  // What a page writes when it is left is an edit.
+  void leavePage() {
+    if (page_ == nullptr) return;
+    const std::uint64_t before = document_.ModelState();
+    page_->OnLeave();
+    if (document_.ModelState() != before) document_.SetModifiedFlag();
+  }
   // A page that is left may still write; that is not for a model that has just been read.
   void dropPage() { page_.reset(); }
   Form* openPage(std::int32_t id) override {
     std::string topic;
     std::string local;
-    if (page_ != nullptr) page_->OnLeave();
+    leavePage();
     page_ = makePage(document_.enumerator().GetPageClass(id, &topic, &local), document_);
     return page_ == nullptr ? nullptr : &page_->form();
   }

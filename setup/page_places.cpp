@@ -191,6 +191,7 @@ constexpr PageRow kPages[] = {
 // Pages on which a text means another field than on others.
 constexpr PageId kResultPages[] = {PageId::hdResult, PageId::adResult, PageId::mtResult, PageId::mtExpResult,
                                    PageId::ecoResults};
+constexpr PageId kSourcesPage[] = {PageId::hdSourceAndSink};
 constexpr PageId kLinePages[] = {PageId::adLineDischarge, PageId::adBoxSummation, PageId::mtLineDischarge,
                                  PageId::mtBoxSummation, PageId::mtExpLineDischarge};
 
@@ -237,6 +238,7 @@ constexpr FieldRow kFields[] = {
     {texts::updateFrequencyTooHigh, "Update frequency:"},
     {texts::negativeWindSpeed, "Speed:"},
 
+    {texts::dataFileNotValid, "File name", 1, kSourcesPage},
     {texts::resultFileNotValid, "Data File"},
     {texts::associatedAreaMissing, "Area"},
     {texts::gridPointOutOfRange, "J", 1, kResultPages},

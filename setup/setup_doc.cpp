@@ -113,7 +113,6 @@ void CV27SetupDoc::RecordEdit(PageId page, std::string name, bool continues) {
     std::erase_if(sources_, [this](const SourceChange& each) { return !history_.hasState(each.state); });
     sources_.push_back({history_.state(), std::move(replaced_)});
   }
-  if (!history_.isSaved()) SetModifiedFlag();
 }
 
 void CV27SetupDoc::exchangeSource(std::uint64_t state) {

@@ -112,8 +112,8 @@ void MapExport::begin(const QString& path) {
     });
     worker_->paint(std::move(request));
   }
-  elapsed_.start();
   timer_.start();
+  emit progressed(path_, 0);
 }
 
 void MapExport::cancel() {
@@ -139,7 +139,6 @@ double MapExport::done() const {
 }
 
 void MapExport::look() {
-  constexpr qint64 kWhile = 200;  // milliseconds
   MapBackgrounds& backgrounds = canvas_.backgrounds();
   if (terrain_.empty() || picture_) {
     if (!(backgrounds.frame() == frame_)) {  // the map has moved on
@@ -148,7 +147,7 @@ void MapExport::look() {
       return end(write());
     }
   }
-  if (elapsed_.elapsed() > kWhile) emit progressed(path_, done());
+  emit progressed(path_, done());
 }
 
 QString MapExport::write() const {

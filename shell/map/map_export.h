@@ -1,6 +1,5 @@
 #pragma once
 
-#include <QElapsedTimer>
 #include <QObject>
 #include <QTimer>
 #include <memory>
@@ -37,7 +36,6 @@ class MapExport final : public QObject {
 
   MapCanvas& canvas_;
   QTimer timer_;
-  QElapsedTimer elapsed_;
   QString path_;
   MapFrame frame_;
   std::vector<TerrainArea> terrain_;  // that is in the picture

@@ -67,7 +67,10 @@ TEST_F(AdResultPage, TheSubsetIsChosenInADialog) {
   };
   outputs().OnClickedButtonRowCol(1, 5);
   EXPECT_EQ(output().part.x, (USubLine{7, 120, 1}));
-  output().areaNumber = 2;
+  output().areaNumber = 2;  // the limits stay those of the first area
+  outputs().OnClickedButtonRowCol(1, 5);
+  EXPECT_TRUE(host.texts.empty());
+  root().bathymetry->SetNoAreas(0);
   outputs().OnClickedButtonRowCol(1, 5);
   EXPECT_EQ(host.texts, Labels{"Error: Associated area is invalid!"});
 }

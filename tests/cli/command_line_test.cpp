@@ -305,7 +305,7 @@ TEST_F(Tool, AFileIsSetByAnyOfItsNames) {
         {"/var/g.tsb2", "/var/g.tsb2"}}) {
     const ProgramRun run = runTool({"set", setup, key + "=" + given});
     EXPECT_EQ(run.status, 0) << run.err;
-    EXPECT_EQ(get(key), "\"" + written + "\"\n");
+    EXPECT_EQ(get(key), written + "\n");
   }
 }
 

@@ -120,7 +120,9 @@ TEST_P(HostileCounts, AreBelievedAsFarAsTheFileBearsThemOut) {
   EXPECT_EQ(countFor("2147483647"), kSlack);
   ASSERT_THAT(texts, SizeIs(1));  // all faults in one list
   EXPECT_THAT(texts[0], HasSubstr("2147483647"));
-  EXPECT_THAT(texts[0], HasSubstr("(2048 times)"));
+  const bool isTold =
+      std::string_view(GetParam().keyword) != "NoOfPolygons";  // a polygon that is not there is no fault
+  EXPECT_EQ(texts[0].find("(2048 times)") != std::string::npos, isTold) << texts[0];
   EXPECT_LT(texts[0].size(), 1000U);
   EXPECT_EQ(countFor("99999999999999999999"), 0);
 }

@@ -60,7 +60,7 @@ class MapTest : public DesktopFixture {
     release(to);
     QCoreApplication::processEvents();
   }
-  void settle() { QTRY_VERIFY(canvas().isSettled()); }
+  void settle() { QTRY_VERIFY_WITH_TIMEOUT(canvas().isSettled(), 30000); }
 
   const MapFeature* feature(MapKind kind, int number = 1) {
     for (const MapFeature& each : canvas().scene().features) {
@@ -878,7 +878,7 @@ class MapTest : public DesktopFixture {
     // Stopped, and nothing is written.
     window_->map().exportTo(file("stopped.png"));
     QVERIFY(!grid.isTried());
-    QTRY_VERIFY(window_->map().exportStrip().isVisible());
+    QVERIFY(window_->map().exportStrip().isVisible());
     QTest::mouseClick(&window_->map().exportStrip().cancel(), Qt::LeftButton);
     QVERIFY(!window_->map().exportStrip().isVisible());
     QVERIFY(!QFile::exists(file("stopped.png")));

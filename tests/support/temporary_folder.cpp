@@ -5,6 +5,7 @@
 #include <cstdlib>
 #include <fstream>
 #include <iterator>
+#include <sstream>
 
 namespace gridbay::test {
 
@@ -28,7 +29,9 @@ std::string TemporaryFolder::write(std::string_view name, std::string_view text)
 
 std::string textOf(const std::string& path) {
   std::ifstream file(path, std::ios::binary);
-  return {std::istreambuf_iterator<char>(file), {}};
+  std::ostringstream text;
+  if (file.peek() != std::ifstream::traits_type::eof()) text << file.rdbuf();
+  return std::move(text).str();
 }
 
 SmallDisk::SmallDisk(const fs::path& folder, std::size_t bytes) : folder_(folder) {
