@@ -213,13 +213,13 @@ std::string faultOf(Form& form, const PagePlace& place) {
     if (place.isInTable() && control.grid != nullptr && control.visible && isIn(*control.grid, place))
       return {};
   }
-  if (place.field.empty() && place.value.empty())
-    return place.isInTable() ? "no table has its row" : "leads to the page alone";
   // A file that the page shows once its layer is chosen: the row of that.
   const auto hasRow = [&](const Control& control) {
     return control.grid != nullptr && control.visible && isIn(*control.grid, {.entries = place.entries});
   };
   if (place.isInTable() && place.field.empty() && std::ranges::any_of(form.controls(), hasRow)) return {};
+  if (place.field.empty() && place.value.empty())
+    return place.isInTable() ? "no table has its row" : "leads to the page alone";
   int number = place.fieldNumber;
   for (const Control& control : form.controls()) {
     if (!place.field.empty() ? control.label == place.field && --number == 0
