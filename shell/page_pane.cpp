@@ -273,6 +273,12 @@ QWidget* PagePane::widgetAt(const PagePlace& place) const {
         return part.grid;
     }
   }
+  // What is shown once its layer is chosen: the row of that.
+  if (place.entries.size() > 1 && place.field.empty()) {
+    PagePlace outer = place;
+    outer.entries.resize(1);
+    return widgetAt(outer);
+  }
   if (place.isInTable() && place.field.empty()) return nullptr;
   if (!place.field.empty()) return widgetOf(QString::fromStdString(place.field), place.fieldNumber);
   const auto holds = [&](const Part& part) {

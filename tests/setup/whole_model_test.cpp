@@ -215,7 +215,10 @@ std::string faultOf(Form& form, const PagePlace& place) {
   }
   // A file that the page shows once its layer is chosen: the row of that.
   const auto hasRow = [&](const Control& control) {
-    return control.grid != nullptr && control.visible && isIn(*control.grid, {.entries = place.entries});
+    if (control.grid == nullptr || !control.visible) return false;
+    if (place.entries.empty()) return false;
+    return isIn(*control.grid, {.entries = place.entries}) ||
+           isIn(*control.grid, {.entries = {place.entries[0]}});
   };
   if (place.isInTable() && place.field.empty() && std::ranges::any_of(form.controls(), hasRow)) return {};
   if (place.field.empty() && place.value.empty())
