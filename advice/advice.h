@@ -5,6 +5,7 @@
 #include <string_view>
 #include <vector>
 
+#include "advice/file_making.h"
 #include "core/grid_point.h"
 #include "core/page_place.h"
 #include "setup/path_setting.h"
@@ -14,8 +15,8 @@ namespace gridbay {
 // A data file that is made of another one; both by their absolute names.
 struct AdviceFile {
   std::string from;
-  std::string to;          // which is not there yet
-  bool fillsGaps = false;  // missing values of a series lie on the line between their neighbours; else a copy
+  std::string to;  // which is not there yet
+  FileMaking making = FileCopy{};
 
   bool operator==(const AdviceFile&) const = default;
 };

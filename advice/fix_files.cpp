@@ -3,29 +3,22 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <cmath>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
-#include <vector>
+#include <variant>
 
-#include "platform/files/paths.h"
 #include "platform/files/save_file.h"
-#include "platform/tsb/tsb_file.h"
-#include "platform/tsb/tsb_writer.h"
 
 namespace gridbay {
-namespace {
-
-using Told = std::function<bool(double)>;
-
-Outcome copy(const AdviceFile& file, const Told& progress) {
+Outcome makeFile(const FileCopy&, const std::string& fromPath, const std::string& toPath,
+                 const FileProgress& progress) {
   constexpr std::size_t kBytesAtOnce = std::size_t{1} << 20;
-  std::ifstream from(file.from, std::ios::binary);
+  std::ifstream from(fromPath, std::ios::binary);
   std::error_code error;
-  const auto size = static_cast<double>(std::filesystem::file_size(file.from, error));
-  if (!from || error) return Failure{fmt::format("{} can't be read", file.from)};
-  Result<FileSave> to = FileSave::begin(file.to);
+  const auto size = static_cast<double>(std::filesystem::file_size(fromPath, error));
+  if (!from || error) return Failure{fmt::format("{} can't be read", fromPath)};
+  Result<FileSave> to = FileSave::begin(toPath);
   if (!to) return Failure{to.error()};
   std::string piece(kBytesAtOnce, '\0');
   double done = 0;
@@ -35,67 +28,22 @@ Outcome copy(const AdviceFile& file, const Told& progress) {
     done += static_cast<double>(read);
     if (progress && !progress(done / size)) return Failure{std::string(kFixStopped)};
   }
-  if (from.bad()) return Failure{fmt::format("{} can't be read", file.from)};
+  if (from.bad()) return Failure{fmt::format("{} can't be read", fromPath)};
   return to->commit();
 }
 
-// Each run of missing values by the line between the values around it; at the ends by the one beside it.
-void fill(std::vector<double>& values, const TsbItem& item, const TsbTimeAxis& time) {
-  const auto isMissing = [&](double value) {
-    return !std::isfinite(value) || static_cast<float>(value) == static_cast<float>(item.deleteValue);
-  };
-  std::vector<std::size_t> known;
-  for (std::size_t i = 0; i < values.size(); ++i) {
-    if (!isMissing(values[i])) known.push_back(i);
-  }
-  if (known.empty()) return;
-  for (std::size_t i = 0; i < values.size(); ++i) {
-    const auto behind = std::ranges::lower_bound(known, i);
-    if (behind != known.end() && *behind == i) continue;
-    if (behind == known.begin()) {
-      values[i] = values[*behind];
-    } else if (const std::size_t before = *std::prev(behind); behind == known.end()) {
-      values[i] = values[before];
-    } else {
-      const double part = (time.at(i) - time.at(before)) / (time.at(*behind) - time.at(before));
-      values[i] = values[before] + part * (values[*behind] - values[before]);
-    }
-  }
-}
-
-Outcome writeFilled(const AdviceFile& file, const Told& progress) {
-  const Result<TsbFile> from = TsbFile::open(file.from);
-  if (!from) return Failure{from.error()};
-  TsbDefinition definition = from->definition();
-  if (!definition.axes.empty()) return Failure{fmt::format("{} is no time series", file.from)};
-  definition.history += fmt::format("{}missing values filled by the lines between their neighbours",
-                                    definition.history.empty() ? "" : "\n");
-  Result<TsbWriter> to = TsbWriter::create(file.to, definition);
-  if (!to) return Failure{to.error()};
-  std::vector<double> values(definition.time.count);
-  for (std::size_t item = 1; item <= definition.items.size(); ++item) {
-    if (const Outcome read = from->readSteps(item, 0, std::span(values)); !read) return read;
-    fill(values, definition.items[item - 1], definition.time);
-    if (const Outcome written = to->write(item, 0, std::span<const double>(values)); !written) return written;
-    const double done = static_cast<double>(item) / static_cast<double>(definition.items.size());
-    if (progress && !progress(done)) return Failure{std::string(kFixStopped)};
-  }
-  return to->commit();
-}
-
-}  // namespace
-
-Outcome makeFiles(std::span<const AdviceFile> files, const std::function<bool(double)>& progress) {
+Outcome makeFiles(std::span<const AdviceFile> files, const FileProgress& progress) {
   for (std::size_t i = 0; i < files.size(); ++i) {
     const AdviceFile& file = files[i];
     const auto part = [&](double done) {
       return !progress || progress((static_cast<double>(i) + done) / static_cast<double>(files.size()));
     };
     std::error_code error;
-    Outcome made = std::filesystem::exists(file.to, error)
-                       ? Failure{fmt::format("There is a file {} already", file.to)}
-                   : file.fillsGaps ? writeFilled(file, part)
-                                    : copy(file, part);
+    Outcome made =
+        std::filesystem::exists(file.to, error)
+            ? Failure{fmt::format("There is a file {} already", file.to)}
+            : std::visit([&](const auto& making) { return makeFile(making, file.from, file.to, part); },
+                         file.making);
     if (!made) {
       removeFiles(files.first(i));
       return made;

@@ -85,12 +85,6 @@ std::string thingOf(std::string_view what, int number);
 PagePlace placeOfEntry(PageId page, std::string_view what, ListEntry entry, std::string keyword,
                        std::string_view column = {});
 
-// How many of the first values of a keyword are time steps of the run: 1, 2 for "TRange", whose third is an
-// interval, and 0 for any other keyword.
-int runStepsIn(const Node& keyword);
-// The whole number that a value is.
-long long wholeOf(const Value& value);
-
 // Of areas and their grids.
 void adviseAreaPositions(AdviceContext& context);
 void adviseProjections(AdviceContext& context);

@@ -8,6 +8,7 @@
 #include <limits>
 
 #include "advice/rules.h"
+#include "advice/run_steps.h"
 #include "basic/area_description.h"
 #include "basic/bathymetry.h"
 #include "basic/boundary.h"

@@ -9,6 +9,7 @@
 #include <limits>
 
 #include "advice/rules.h"
+#include "advice/run_steps.h"
 #include "basic/bathymetry.h"
 #include "basic/simulation_period.h"
 #include "core/letters.h"
@@ -146,7 +147,8 @@ std::optional<AdviceFix> withoutGaps(AdviceContext& context, const UsedSeries& u
   const std::string name = context.freeName(path.stem().string() + "_filled" + path.extension().string());
   AdviceFix fix{fmt::format("Fill the gaps, in {}", name)};
   for (const std::string& keyword : used.keywords) fix.settings.push_back({keyword, name});
-  fix.files.push_back({used.file.path, absolutePath(name, folderOfFile(context.documentPath)), true});
+  fix.files.push_back(
+      {used.file.path, absolutePath(name, folderOfFile(context.documentPath)), FilledSeries{}});
   return fix;
 }
 
