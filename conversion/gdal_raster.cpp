@@ -252,7 +252,8 @@ class Warp {
     const std::unique_ptr<char*, FreeTexts> settings(texts);
     return GDALCreateGenImgProjTransformer2(source, nullptr, projection.empty() ? nullptr : settings.get());
   }
-  // A grid northwards up, at whole multiples of its spacing, that covers the raster.
+  // A grid northwards up, at whole multiples of its spacing. Its points are those that lie in the raster:
+  // beyond its edge there would be a border of nothing.
   static bool cover(GDALDatasetH source, const std::string& own, const std::string& projection,
                     double spacing, double* transform, int* columns, int* rows) {
     void* way = transformer(source, own, projection);
@@ -263,10 +264,13 @@ class Warp {
     GDALDestroyGenImgProjTransformer(way);
     if (done != CE_None) return false;
     if (!(spacing > 0)) return true;
-    const double west = std::floor(extent[0] / spacing) * spacing;
-    const double north = std::ceil(extent[3] / spacing) * spacing;
-    const double across = std::ceil((extent[2] - west) / spacing);
-    const double down = std::ceil((north - extent[1]) / spacing);
+    constexpr double kInside = 1e-6;  // of a spacing
+    const auto firstBeyond = [=](double edge) { return std::ceil(edge / spacing - 0.5 + kInside); };
+    const auto lastBefore = [=](double edge) { return std::floor(edge / spacing - 0.5 - kInside); };
+    const double west = firstBeyond(extent[0]) * spacing;
+    const double north = (lastBefore(extent[3]) + 1) * spacing;
+    const double across = lastBefore(extent[2]) - firstBeyond(extent[0]) + 1;
+    const double down = lastBefore(extent[3]) - firstBeyond(extent[1]) + 1;
     constexpr double kMost = 1e6;  // columns or rows
     if (!(across >= 1 && down >= 1 && across <= kMost && down <= kMost)) {
       CPLError(CE_Failure, CPLE_AppDefined, "points %g apart would be %g x %g of them", spacing, across,

@@ -29,6 +29,11 @@ std::string stemOf(const fs::path& target, pid_t process) {
 
 UnfinishedFile::UnfinishedFile(const std::string& target) : target_(endOfLinks(target)) {
   const fs::path end(target_);
+  struct stat old {};
+  if (::stat(target_.c_str(), &old) == 0 && !S_ISREG(old.st_mode)) {
+    errno = S_ISDIR(old.st_mode) ? EISDIR : EPERM;
+    return;
+  }
   std::string hidden = (folderOf(end) / (stemOf(end, ::getpid()) + "XXXXXX")).string();
   const FileDescriptor made(::mkostemp(hidden.data(), O_CLOEXEC));
   if (!made) return;

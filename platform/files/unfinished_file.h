@@ -11,7 +11,7 @@ namespace gridbay {
 class UnfinishedFile {
  public:
   // Of a file that is going to be `target`, or what that links to. It has no path, with the reason in
-  // `errno`, where none can be made.
+  // `errno`, where none can be made: above all where a folder, a device or a pipe has that name.
   explicit UnfinishedFile(const std::string& target);
   ~UnfinishedFile();
   UnfinishedFile(const UnfinishedFile&) = delete;

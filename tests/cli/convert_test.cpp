@@ -1,5 +1,6 @@
 #include <fmt/format.h>
 #include <gmock/gmock.h>
+#include <sys/stat.h>
 
 #include <array>
 #include <cmath>
@@ -219,10 +220,44 @@ TEST_F(ConvertRaster, PointsAndAnExtent) {
                  "--extent", "10,10,30,20"});
   ASSERT_EQ(run.status, 0) << run.err;
   EXPECT_EQ(values(6), (std::vector<float>{2, 3, 4, 2, 3, 4}));
-  run = runTool({"convert", "raster", folder.write("r.asc", kRaster), out, "--land", "60", "--resample", "20",
+  run = runTool({"convert", "raster", folder.write("r.asc", kRaster), out, "--land", "60", "--resample", "15",
                  "--resampling", "greatest", "--force"});
   ASSERT_EQ(run.status, 0) << run.err;
-  EXPECT_EQ(values(4), (std::vector<float>{5, 6, 9, 11}));
+  EXPECT_EQ(values(4), (std::vector<float>{1, 3, 9, 11}));
+}
+
+// Points beyond the edge of the raster would be a border of land, which closes it.
+TEST_F(ConvertRaster, AnotherSpacingHasNoBorderOfNothing) {
+  std::string rows = "ncols 41\nnrows 31\nxllcorner 500003\nyllcorner 6000007\ncellsize 1\n";
+  for (int row = 0; row < 31; ++row) {
+    for (int column = 0; column < 41; ++column) rows += "-2 ";
+    rows += "\n";
+  }
+  const std::string raster = folder.write("s.asc", rows);
+  for (const char* resampling : {"nearest", "bilinear", "cubic", "mean"}) {
+    for (const double spacing : {0.7, 2.0, 3.0, 5.0}) {
+      SCOPED_TRACE(fmt::format("{} {}", resampling, spacing));
+      run = runTool({"convert", "raster", raster, out, "--force", "--land", "60", "--crs", "UTM-32",
+                     "--resample", fmt::format("{}", spacing), "--resampling", resampling});
+      ASSERT_EQ(run.status, 0) << run.err;
+      const std::size_t columns = info()["axes"][0]["points"];
+      const std::size_t count = columns * info()["axes"][1]["points"].get<std::size_t>();
+      EXPECT_GE(static_cast<double>(columns), 41 / spacing - 1);
+      EXPECT_THAT(values(count), ::testing::Each(::testing::FloatNear(-2, 1e-5F)));
+      const double first = info()["axes"][0]["first"];
+      EXPECT_GE(first, 500003);
+      EXPECT_LT(first, 500003 + spacing);
+    }
+  }
+}
+
+// A pipe, as any device, would be lost for all who use it.
+TEST_F(ConvertRaster, APipeIsNotReplaced) {
+  const std::string raster = folder.write("r.asc", kRaster);
+  ASSERT_EQ(::mkfifo(out.c_str(), 0600), 0);
+  EXPECT_THAT(refused({raster, out, "--land", "60", "--crs", "UTM-32", "--force"}),
+              HasSubstr("is a device or a pipe"));
+  EXPECT_TRUE(fs::is_fifo(out));
 }
 
 TEST_F(ConvertRaster, WhatIsThereIsReplacedOnlyWhenAsked) {

@@ -2,6 +2,7 @@
 
 #include <gmock/gmock.h>
 #include <poll.h>
+#include <sys/stat.h>
 
 #include <atomic>
 #include <chrono>
@@ -90,6 +91,15 @@ TEST(WorkApart, IsStoppedByItsEnd) {
     EXPECT_TRUE(isEmpty());
     EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(heeds ? 10 : 20));
   }
+}
+
+TEST(UnfinishedFileTest, TakesNoNameOfAFolderOrAPipe) {
+  const test::TemporaryFolder folder;
+  const std::string pipe = folder.file("pipe");
+  ASSERT_EQ(::mkfifo(pipe.c_str(), 0600), 0);
+  EXPECT_EQ(UnfinishedFile(pipe).path(), "");
+  EXPECT_TRUE(std::filesystem::is_fifo(pipe));
+  EXPECT_EQ(UnfinishedFile(std::filesystem::path(pipe).parent_path().string()).path(), "");
 }
 
 }  // namespace platform_work_apart_test
