@@ -21,18 +21,21 @@ struct AdviceFile {
   bool operator==(const AdviceFile&) const = default;
 };
 
-// An entry of a list that goes, with what all modules say of it. Numbers from 1.
+// What a fix takes out of a list, by its number from 1: an entry, with what all modules say of it, or the
+// points of its line that lie where the one before them does.
 struct AdviceRemoval {
-  enum class List { boundary, weir, culvert };
+  enum class List { boundary, source, weir, culvert, dike };
+  enum class What { entry, equalPoints };
 
   List list;
   int number;
+  What what = What::entry;
 
   bool operator==(const AdviceRemoval&) const = default;
 };
 
 // What mends a thing, whole or not at all: files that are made, then keywords with other values in their
-// order, then an entry that goes.
+// order, then what goes.
 struct AdviceFix {
   std::string name;  // of the step, as in "Undo Move area 2"
   std::vector<Setting> settings = {};

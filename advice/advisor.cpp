@@ -3,19 +3,19 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <cctype>
 #include <exception>
 #include <filesystem>
 
 #include "advice/fix_files.h"
+#include "advice/removal.h"
 #include "advice/rules.h"
 #include "basic/bathymetry.h"
+#include "basic/nesting.h"
 #include "platform/files/paths.h"
-#include "setup/entry_removal.h"
 #include "setup/page_places.h"
 #include "setup/setting.h"
-#include "structures/culvert.h"
 #include "structures/dike.h"
-#include "structures/weir.h"
 
 namespace gridbay {
 namespace {
@@ -44,17 +44,6 @@ std::optional<double> freeOnDisk(const std::string& folder) {
   return static_cast<double>(space.available) / kMegabyte;
 }
 
-void remove(CGlobalKvs& model, const AdviceRemoval& removal) {
-  switch (removal.list) {
-    case AdviceRemoval::List::boundary:
-      return removeBoundary(model, removal.number);
-    case AdviceRemoval::List::weir:
-      return removeEntry(*model.nhdWeir, removal.number);
-    case AdviceRemoval::List::culvert:
-      return removeEntry(*model.nhdCulvert, removal.number);
-  }
-}
-
 }  // namespace
 
 std::span<const AdviceRule> adviceRules() {
@@ -63,6 +52,14 @@ std::span<const AdviceRule> adviceRules() {
 
 std::string thingOf(std::string_view what, int number) {
   return fmt::format("{} {}", what, number);
+}
+
+std::string capital(std::string_view text) {
+  return static_cast<char>(std::toupper(text.front())) + std::string(text.substr(1));
+}
+
+std::string valueOf(GridPoint point) {
+  return fmt::format("{},{}", point.j, point.k);
 }
 
 PagePlace placeOfEntry(PageId page, std::string_view what, ListEntry entry, std::string keyword,
@@ -82,6 +79,21 @@ const GridFacts* AdviceContext::grid(int number) {
     at->second = files.grid(area->fileName.absolute(), model.bathymetry->hotStart == 1 ? kOfHotStart : 1);
   }
   return at->second;
+}
+
+std::vector<GridRectangle> AdviceContext::coverOf(int number) {
+  std::vector<GridRectangle> cover;
+  for (int inner = 2; inner <= model.bathymetry->GetCount(); ++inner) {
+    const CBathymetryObjectKvs& area = *model.bathymetry->GetArea(inner);
+    const GridFacts* facts = grid(inner);
+    if (area.enclosingArea != number || facts == nullptr) continue;
+    const auto last = [](std::int32_t origin, int count) {
+      return origin > 1'000'000'000 ? origin : origin + count / kNestingRatio;
+    };
+    cover.push_back(
+        {area.origin.j, last(area.origin.j, facts->noJ), area.origin.k, last(area.origin.k, facts->noK)});
+  }
+  return cover;
 }
 
 // Longitude and latitude are what counts: a projection may be without a zone.
@@ -219,8 +231,9 @@ Outcome makeFix(CGlobalKvs& model, const AdviceFix& fix, const std::string& docu
         return done;
       }
     }
-    if (fix.removal) remove(model, *fix.removal);
+    if (fix.removal) makeRemoval(model, *fix.removal);
   } catch (...) {
+    model.AssignState(before);
     removeFiles(fix.files);
     throw;
   }

@@ -36,11 +36,9 @@ bool GridFacts::isWaterAtBorder(int j, int k) const {
   return k == noK - 1 && at(north, j);
 }
 
-std::optional<bool> GridFacts::isWater(int j, int k) const {
-  if (!contains(j, k)) return false;
-  if (isOnBorder(j, k)) return isWaterAtBorder(j, k);
-  if (blockSize != 1) return std::nullopt;
-  return lowestOfBlocks(j, k) < landValue;
+GridPoint GridFacts::lowestPoint(int blockJ, int blockK) const {
+  const auto at = static_cast<int>(lowestAt(blockJ, blockK));
+  return {blockJ * blockSize + at % blockSize, blockK * blockSize + at / blockSize};
 }
 
 struct DataFileFacts::Entry {
@@ -107,9 +105,15 @@ void DataFileFacts::Entry::startGrid() {
            static_cast<std::size_t>(grid->blockSize);
   };
   while (blocks(x.points) * blocks(y.points) > kMostBlocks) ++grid->blockSize;
-  grid->lowestOfBlocks =
-      CVdArray2D<float>(static_cast<int>(blocks(x.points)), static_cast<int>(blocks(y.points)));
-  std::ranges::fill(grid->lowestOfBlocks.values(), INFINITY);
+  const auto fill = [&](auto& array, auto value) {
+    array = {static_cast<int>(blocks(x.points)), static_cast<int>(blocks(y.points))};
+    std::ranges::fill(array.values(), value);
+  };
+  fill(grid->lowestOfBlocks, INFINITY);
+  if (grid->blockSize > 1) {
+    fill(grid->highestOfBlocks, -INFINITY);
+    fill(grid->lowestAt, 0U);
+  }
   grid->lowest = INFINITY;
   grid->highest = -INFINITY;
 }
@@ -122,14 +126,21 @@ void DataFileFacts::Entry::readRows() {
   if (!file->readRows(item, 0, next, std::span(values))) return fail();
   const TsbItem& kind = grid->file.items[item - 1];
   const std::span<float> lowest = grid->lowestOfBlocks.values();
+  const std::span<float> highest = grid->highestOfBlocks.values();
+  const std::span<std::uint32_t> lowestAt = grid->lowestAt.values();
   const auto blockColumns = static_cast<std::size_t>(grid->lowestOfBlocks.endJ());
   const auto size = static_cast<std::size_t>(grid->blockSize);
   for (std::size_t row = 0; row < rows; ++row) {
     const std::span<const float> line = std::span(values).subspan(row * columns, columns);
-    float* blocks = &lowest[(next + row) / size * blockColumns];
+    const std::size_t first = (next + row) / size * blockColumns;
     for (std::size_t j = 0; j < columns; ++j) {
-      if (isMissing(line[j], kind)) continue;
-      blocks[j / size] = std::min(blocks[j / size], line[j]);
+      const std::size_t block = first + j / size;
+      const bool isHole = isMissing(line[j], kind);
+      if (size > 1) highest[block] = isHole ? INFINITY : std::max(highest[block], line[j]);
+      if (isHole) continue;
+      if (size > 1 && line[j] < lowest[block])
+        lowestAt[block] = static_cast<std::uint32_t>((next + row) % size * size + j % size);
+      lowest[block] = std::min(lowest[block], line[j]);
       grid->lowest = std::min(grid->lowest, line[j]);
       grid->highest = std::max(grid->highest, line[j]);
     }
@@ -139,7 +150,9 @@ void DataFileFacts::Entry::readRows() {
     if (next + row + 1 == static_cast<std::size_t>(grid->noK)) grid->north.assign(line.begin(), line.end());
   }
   next += rows;
-  if (next == static_cast<std::size_t>(grid->noK)) finish();
+  if (next < static_cast<std::size_t>(grid->noK)) return;
+  if (size == 1) grid->highestOfBlocks = grid->lowestOfBlocks;
+  finish();
 }
 
 // Of a profile the jump is that of its first point; missing values are looked for in all.

@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "core/array2d.h"
+#include "core/grid_point.h"
 #include "platform/cartography/cartography.h"
 #include "platform/tsb/tsb_types.h"
 
@@ -29,16 +30,19 @@ struct GridFacts {
   float highest = 0;
   // The border, by rising J or K.
   std::vector<float> west, east, south, north;
-  // The lowest value of each square block of points: of each point, unless the grid is large.
+  // The lowest and the highest value of each square block of points, which is a single point unless the grid
+  // is large; where values are missing the highest is infinite.
   int blockSize = 1;
   CVdArray2D<float> lowestOfBlocks;
+  CVdArray2D<float> highestOfBlocks;
+  CVdArray2D<std::uint32_t> lowestAt;  // its place in its block, row by row; empty where each is a point
 
   // Whether a point of the border is water.
   bool isWaterAtBorder(int j, int k) const;
   bool isOnBorder(int j, int k) const { return j == 0 || k == 0 || j == noJ - 1 || k == noK - 1; }
   bool contains(int j, int k) const { return j >= 0 && k >= 0 && j < noJ && k < noK; }
-  // Whether a point is water; nothing where only its block is known.
-  std::optional<bool> isWater(int j, int k) const;
+  // Where the lowest value of a block is.
+  GridPoint lowestPoint(int blockJ, int blockK) const;
 };
 
 // What advice has to know of a file whose values go on in time.

@@ -17,6 +17,8 @@
 
 namespace gridbay {
 
+class CBoundaryObjectKvs;
+
 // A grid's place on a map: its projection, the easting and northing of its first point (metres), and its
 // turn.
 struct GridPlace {
@@ -24,6 +26,13 @@ struct GridPlace {
   double easting = 0;
   double northing = 0;
   double rotation = 0;
+};
+
+// Points of a grid, the last ones with it.
+struct GridRectangle {
+  int firstJ, lastJ, firstK, lastK;
+
+  bool contains(int j, int k) const { return firstJ <= j && j <= lastJ && firstK <= k && k <= lastK; }
 };
 
 // What the rules look at, and where they leave what they find.
@@ -40,6 +49,8 @@ class AdviceContext {
 
   // The grid of area n, from 1; null where there is none, or as long as it is not known.
   const GridFacts* grid(int number);
+  // The points of area n that areas embedded in it cover, by the grids that are known.
+  std::vector<GridRectangle> coverOf(int number);
   // Where it lies; nothing without a projection.
   std::optional<GridPlace> placeOf(int number);
   // Whether two texts name one projection.
@@ -80,6 +91,15 @@ std::span<const AdviceRule> adviceRules();
 
 // "area 2"
 std::string thingOf(std::string_view what, int number);
+
+// With a capital letter in front.
+std::string capital(std::string_view text);
+
+// A grid point as a keyword takes it: "3,14".
+std::string valueOf(GridPoint point);
+
+// The points of a boundary; nothing for a diagonal, which has none.
+std::optional<GridRectangle> pointsOf(const CBoundaryObjectKvs& boundary);
 
 // An entry of a page's list, by its number of so many.
 PagePlace placeOfEntry(PageId page, std::string_view what, ListEntry entry, std::string keyword,

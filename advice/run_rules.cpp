@@ -14,7 +14,6 @@
 #include "basic/boundary.h"
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
-#include "basic/nesting.h"
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "core/letters.h"
@@ -42,26 +41,6 @@ PagePlace onPeriod(std::string_view keyword, std::string_view field, int fieldNu
       PageId::simulationPeriod, {}, fmt::format("{}/{}", kPeriod, keyword), std::string(field), fieldNumber};
 }
 
-struct Rectangle {
-  int firstJ, lastJ, firstK, lastK;
-};
-
-// The points of an area that areas embedded in it cover.
-std::vector<Rectangle> coverOf(AdviceContext& context, int number) {
-  std::vector<Rectangle> cover;
-  for (int inner = 2; inner <= context.model.bathymetry->GetCount(); ++inner) {
-    const CBathymetryObjectKvs& area = *context.model.bathymetry->GetArea(inner);
-    const GridFacts* grid = context.grid(inner);
-    if (area.enclosingArea != number || grid == nullptr) continue;
-    const auto last = [](std::int32_t origin, int count) {
-      return origin > 1'000'000'000 ? origin : origin + count / kNestingRatio;
-    };
-    cover.push_back(
-        {area.origin.j, last(area.origin.j, grid->noJ), area.origin.k, last(area.origin.k, grid->noK)});
-  }
-  return cover;
-}
-
 struct Deepest {
   double depth = 0;
   GridPoint point;
@@ -71,7 +50,7 @@ struct Deepest {
 // that are covered in part.
 Deepest deepestOf(AdviceContext& context, int number) {
   const GridFacts& grid = *context.grid(number);
-  const std::vector<Rectangle> cover = coverOf(context, number);
+  const std::vector<GridRectangle> cover = context.coverOf(number);
   const int size = grid.blockSize;
   Deepest deepest;
   for (int k = 0; k < grid.lowestOfBlocks.endK(); ++k) {
@@ -79,17 +58,23 @@ Deepest deepestOf(AdviceContext& context, int number) {
     for (int j = 0; j < grid.lowestOfBlocks.endJ(); ++j) {
       const double depth = -double{row[static_cast<std::size_t>(j)]};
       if (!(depth > deepest.depth)) continue;
-      const bool isCovered = std::ranges::any_of(cover, [&](const Rectangle& area) {
+      const bool isCovered = std::ranges::any_of(cover, [&](const GridRectangle& area) {
         return area.firstJ <= (j + 1) * size - 1 && j * size <= area.lastJ &&
                area.firstK <= (k + 1) * size - 1 && k * size <= area.lastK;
       });
-      if (!isCovered) deepest = {depth, {j * size, k * size}};
+      if (!isCovered) deepest = {depth, grid.lowestPoint(j, k)};
     }
   }
   return deepest;
 }
 
 constexpr double kStableCourant = 5;
+constexpr double kLongestStep = 86400;
+
+// Whether an engine takes a time step of so many seconds.
+bool isStep(double seconds) {
+  return seconds > 0 && seconds <= kLongestStep;
+}
 
 // The greatest Courant number of all areas for a time step (s), and where it is; 0 where no water is known.
 struct Courant {
@@ -111,32 +96,33 @@ Courant worstCourant(AdviceContext& context, double step) {
   return worst;
 }
 
-// A whole number by which the step is divided: at least the wanted one, and a step with few digits if there
-// is one near.
-int divisorOf(double step, int wanted) {
-  for (int divisor = wanted; divisor <= 2 * wanted; ++divisor) {
+// A whole number by which a step (s, of a day at most) is divided: at least what is wanted for the Courant
+// number, and a step with few digits if there is one near.
+int stableDivisor(double step, const Courant& worst) {
+  constexpr double kMostTimes = 1e9;
+  constexpr double kRounding = 1 + 1e-6;  // of a step as a keyword has it
+  const auto wanted =
+      static_cast<int>(std::clamp(std::ceil(worst.number * kRounding / kStableCourant), 1.0, kMostTimes));
+  for (int divisor = wanted; divisor <= 2 * wanted && step * 100 >= divisor; ++divisor) {
     const double hundredths = step / divisor * 100;
-    if (hundredths >= 1 && std::abs(hundredths - std::round(hundredths)) < 1e-4) return divisor;
+    if (std::abs(hundredths - std::round(hundredths)) < 1e-4) return divisor;
   }
   return wanted;
 }
 
-int stableDivisor(double step, const Courant& worst) {
-  constexpr double kMostTimes = 1e6;
-  return divisorOf(step,
-                   static_cast<int>(std::clamp(std::ceil(worst.number / kStableCourant), 1.0, kMostTimes)));
-}
-
-// A shorter time step for the same period: what counts time steps counts as many more.
+// A shorter time step for the same period, or for as much of it as can be counted: what counts time steps
+// counts as many more. Nothing where the setup can't be written, which a save tells.
 std::optional<AdviceFix> withShorterSteps(AdviceContext& context, int divisor) {
   constexpr std::array<std::string_view, 4> kCounts{"Number_Of_Timesteps", "Time_Step_Interval",
                                                     "Update_Frequency", "InundationFileStoreStep"};
+  constexpr long long kMost = std::numeric_limits<std::int32_t>::max() - 1;
   const KvsFile* file = context.written();
   if (file == nullptr) return std::nullopt;
-  const double step = double{context.model.simulationPeriod->timeStepInterval} / divisor;
-  AdviceFix fix{fmt::format("Time step of {:.6g} s", step),
+  const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
+  const double step = double{period.timeStepInterval} / divisor;
+  const bool fits = static_cast<long long>(period.LastTimeStep()) * divisor <= kMost;
+  AdviceFix fix{fmt::format("Time step of {:.6g} s{}", step, fits ? "" : ", and a shorter run"),
                 {{fmt::format("{}/Time_Step_Interval", kPeriod), fmt::format("{:.7g}", step)}}};
-  bool fits = true;
   eachKeyword(*file, [&](const PagePlace& place, const Node& keyword) {
     const bool isCount =
         keyword.values().size() == 1 && keyword.values()[0].kind() == ValueKind::integer &&
@@ -146,14 +132,13 @@ std::optional<AdviceFix> withShorterSteps(AdviceContext& context, int divisor) {
     bool isOther = false;
     for (const Value& value : keyword.values()) {
       const long long count = wholeOf(value);
-      counts.push_back(count > 0 ? count * divisor : count);
-      isOther |= count > 0;
-      fits = fits && counts.back() < std::numeric_limits<std::int32_t>::max();
+      counts.push_back(count > 0 ? std::min(count * divisor, kMost) : count);
+      isOther |= count != counts.back();
     }
     if (isOther && findKeyword(context.model, place.keyword, context.documentPath))
       fix.settings.push_back({place.keyword, fmt::format("{}", fmt::join(counts, ","))});
   });
-  return fits ? std::optional(std::move(fix)) : std::nullopt;
+  return fix;
 }
 
 // A code with the values that it can have.
@@ -176,8 +161,7 @@ void adviseCode(AdviceContext& context, const Code& code) {
                "The engine knows no such code, and stops or takes another one.",
                code.place,
                {},
-               AdviceFix{fmt::format("{}{} of {}", static_cast<char>(std::toupper(code.what[0])),
-                                     code.what.substr(1), code.usual),
+               AdviceFix{fmt::format("{} of {}", capital(code.what), code.usual),
                          {{code.place.keyword, std::to_string(code.usual)}}}});
 }
 
@@ -195,11 +179,15 @@ void adviseCodesOf(AdviceContext& context, PageId page, std::string_view thing, 
   }
 }
 
+// A warm-up in the first part of a run of so many steps.
+Setting warmUpWithin(int steps) {
+  constexpr int kPart = 10;
+  return {fmt::format("{}/Warm_Up_Period", kPeriod), std::to_string(steps / kPart)};
+}
+
 void adviseNumbersOfSteps(AdviceContext& context) {
   const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
-  constexpr double kLongest = 86400;
-  if (!(period.timeStepInterval > 0) || !std::isfinite(period.timeStepInterval) ||
-      period.timeStepInterval > kLongest) {
+  if (!isStep(period.timeStepInterval)) {
     constexpr double kUsual = 30;
     const std::string usual =
         fmt::format("{:.6g}", kUsual / stableDivisor(kUsual, worstCourant(context, kUsual)));
@@ -212,57 +200,62 @@ void adviseNumbersOfSteps(AdviceContext& context) {
                            {{fmt::format("{}/Time_Step_Interval", kPeriod), usual}}}});
   }
   if (period.LastTimeStep() < 1) {
+    constexpr int kUsual = 100;
+    AdviceFix fix{fmt::format("{} time steps", kUsual),
+                  {{fmt::format("{}/Number_Of_Timesteps", kPeriod), std::to_string(kUsual)}}};
+    if (period.warmUpPeriod > kUsual) fix.settings.push_back(warmUpWithin(kUsual));
     context.add({{},
                  fmt::format("The simulation has {} time steps.", period.LastTimeStep()),
                  "The run ends where it begins, and calculates nothing.",
                  onPeriod("Number_Of_Timesteps", "Last:"),
                  {},
-                 AdviceFix{"100 time steps", {{fmt::format("{}/Number_Of_Timesteps", kPeriod), "100"}}}});
+                 std::move(fix)});
   }
 }
 
 void adviseCounts(AdviceContext& context) {
-  const auto most = [&](PageId page, std::string_view keyword, std::string_view field, std::string_view what,
+  const auto most = [&](PageId page, std::string keyword, std::string_view field, std::string_view what,
                         int count, int limit) {
     if (count <= limit) return;
-    context.add(
-        {{},
-         fmt::format("There are {} {}.", count, what),
-         fmt::format("Engines take at most {}.", limit),
-         {page, {}, std::string(keyword), std::string(field)},
-         {},
-         {},
-         fmt::format("Only you know which {} can go: lower the number once the last ones are those.", what)});
+    const int over = count - limit;
+    context.add({{},
+                 fmt::format("There are {} {}s.", count, what),
+                 fmt::format("Engines take at most {}.", limit),
+                 {page, {}, keyword, std::string(field)},
+                 {},
+                 AdviceFix{over == 1 ? fmt::format("The last {} out", what)
+                                     : fmt::format("The last {} {}s out", over, what),
+                           {{keyword, std::to_string(limit)}}}});
   };
   CGlobalKvs& model = context.model;
   most(PageId::hdResult, "HYDRODYNAMIC_MODULE/OUTPUT_SPECIFICATION/Number_Of_Output_areas",
-       "Number of Output Areas", "outputs", model.nhdResult->outputs.GetCount(), CNhdResultKvs::kMostOutputs);
-  most(PageId::massBudget, "NESTED_MODEL_GLOBALS/MASS_BUDGET/NoOfPolygons",
-       "&Number of polygons:", "polygons", model.massBudget->GetCount(), CMassBudgetKvs::kMostOnPage);
-  most(PageId::weirs, "HYDRODYNAMIC_MODULE/STRUCTURE_MODULE/WEIR/number_of_weirs", "Number of weirs", "weirs",
+       "Number of Output Areas", "output", model.nhdResult->outputs.GetCount(), CNhdResultKvs::kMostOutputs);
+  most(PageId::massBudget, "NESTED_MODEL_GLOBALS/MASS_BUDGET/NoOfPolygons", "&Number of polygons:", "polygon",
+       model.massBudget->GetCount(), CMassBudgetKvs::kMostOnPage);
+  most(PageId::weirs, "HYDRODYNAMIC_MODULE/STRUCTURE_MODULE/WEIR/number_of_weirs", "Number of weirs", "weir",
        model.nhdWeir->GetCount(), LineStructure::kMost);
   most(PageId::culverts, "HYDRODYNAMIC_MODULE/STRUCTURE_MODULE/CULVERTS/number_of_Culverts",
-       "Number of culverts", "culverts", model.nhdCulvert->GetCount(), LineStructure::kMost);
+       "Number of culverts", "culvert", model.nhdCulvert->GetCount(), LineStructure::kMost);
 }
 
 }  // namespace
 
 void adviseCourant(AdviceContext& context) {
   const double step = context.model.simulationPeriod->timeStepInterval;
-  if (!(step > 0) || !std::isfinite(step)) return;
+  if (!isStep(step)) return;
   const Courant worst = worstCourant(context, step);
   if (!(worst.number > kStableCourant)) return;
   const int divisor = stableDivisor(step, worst);
-  context.add(
-      {{},
-       fmt::format("The Courant number is {:.3g} in area {}, {:.4g} m deep; beyond {} a run is often "
-                   "unstable. A time step of {:.6g} s would do.",
-                   worst.number, worst.area, worst.where.depth, kStableCourant, step / divisor),
-       "The fastest waves cross more grid spacings in a time step than the scheme follows.",
-       onPeriod("Time_Step_Interval", "Time step interval:"),
-       {.area = worst.area, .points = {worst.where.point}},
-       withShorterSteps(context, divisor),
-       "Choose a shorter time step, or a shorter period: what counts time steps is too large for both."});
+  std::optional<AdviceFix> fix = withShorterSteps(context, divisor);
+  if (!fix) return;
+  context.add({{},
+               fmt::format("The Courant number is {:.3g} in area {}, {:.4g} m deep; beyond {} a run is often "
+                           "unstable. A time step of {:.6g} s would do.",
+                           worst.number, worst.area, worst.where.depth, kStableCourant, step / divisor),
+               "The fastest waves cross more grid spacings in a time step than the scheme follows.",
+               onPeriod("Time_Step_Interval", "Time step interval:"),
+               {.area = worst.area, .points = {worst.where.point}},
+               std::move(fix)});
 }
 
 void adviseThresholds(AdviceContext& context) {
@@ -285,16 +278,13 @@ void adviseThresholds(AdviceContext& context) {
 void adviseWarmUp(AdviceContext& context) {
   const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
   if (period.LastTimeStep() < 1 || period.warmUpPeriod <= period.LastTimeStep()) return;
-  constexpr int kPart = 10;
   context.add({{},
                fmt::format("The warm-up ends at time step {}, the run at {}.", period.warmUpPeriod,
                            period.LastTimeStep()),
                "The boundaries never come to their full values.",
                onPeriod("Warm_Up_Period", "Last:", 2),
                {},
-               AdviceFix{"Warm-up in the first tenth of the run",
-                         {{fmt::format("{}/Warm_Up_Period", kPeriod),
-                           std::to_string(period.LastTimeStep() / kPart)}}}});
+               AdviceFix{"Warm-up in the first tenth of the run", {warmUpWithin(period.LastTimeStep())}}});
 }
 
 void adviseCodes(AdviceContext& context) {

@@ -6,6 +6,7 @@
 
 #include "advice/advisor.h"
 #include "advice/fix_files.h"
+#include "advice/removal.h"
 #include "cli/advice_report.h"
 #include "cli/commands.h"
 #include "setup/dlg_enumerator.h"
@@ -130,7 +131,7 @@ nlohmann::ordered_json adviceJson(const Advice& advice, std::size_t number) {
     json["fix"] = {
         {"name", advice.fix->name}, {"settings", std::move(settings)}, {"files", std::move(files)}};
     json["fix"]["removes"] = nullptr;
-    if (advice.fix->removal) json["fix"]["removes"] = advice.place.thing;
+    if (advice.fix->removal) json["fix"]["removes"] = textOf(*advice.fix->removal);
   }
   json["todo"] = advice.todo;
   return json;

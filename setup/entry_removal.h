@@ -10,14 +10,17 @@ void moveUp(List& list, int number) {
   for (int next = number; next < list.GetCount(); ++next) list.at(next).AssignState(list.at(next + 1));
 }
 
-// Takes an entry out of a list that nobody follows; those behind it take its number.
+// Takes an entry out of a list that nobody follows; those behind it take its number. A number out of range
+// is a std::invalid_argument.
 template <class List>
 void removeEntry(List& list, int number) {
+  list.at(number);
   moveUp(list, number);
   list.SetCount(list.GetCount() - 1);
 }
 
-// The same for an open boundary, with what all modules say of it.
+// The same for an open boundary, and for a source or sink, with what all modules say of it.
 void removeBoundary(CGlobalKvs& root, int number);
+void removeSource(CGlobalKvs& root, int number);
 
 }  // namespace gridbay

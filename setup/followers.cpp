@@ -289,6 +289,15 @@ void removeBoundary(CGlobalKvs& root, int number) {
   removeEntry(*root.boundary, number);
 }
 
+void removeSource(CGlobalKvs& root, int number) {
+  moveUp(*root.nhdSourceSink, number);
+  moveUp(*root.nadSourceSink, number);
+  moveUp(*root.nmtSourceSink, number);
+  moveUp(*root.nmtExpSources, number);
+  moveUp(*root.wqsAdSourceSink, number);
+  removeEntry(*root.sourceSink, number);
+}
+
 void CGlobalKvs::TellFollowers(const CKvsBase& leader, std::span<const int> counts) {
   for (const LeaderRow& row : kLeaders) {
     if (&row.leader(*this) != &leader) continue;

@@ -16,6 +16,7 @@
 #include "basic/area_description.h"
 #include "basic/bathymetry.h"
 #include "basic/boundary.h"
+#include "basic/mass_budget.h"
 #include "basic/module_selection.h"
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
@@ -139,11 +140,26 @@ TEST_F(AdviceTest, TheRun) {
   };
   const auto step = [this](float seconds) { model->simulationPeriod->timeStepInterval = seconds; };
   const auto flow = [this]() -> CNhdBoundaryObjectKvs& { return *model->nhdBoundary->GetItem(1); };
+  const auto structures = [](auto& list, int count) {
+    list.SetCount(count);
+    for (int number = 1; number <= count; ++number) {
+      LineStructure& structure = *list.GetItem(number);
+      structure.coordinateType = "UTM-32";
+      structure.x = {480100, 480200};
+      structure.y = {6100100, 6100200};
+    }
+  };
   speaks({
       {"courant",
        "The Courant number is 70.1 in area 2, 5 m deep; beyond 5 a run is often unstable. A time step of 20 "
        "s would do.",
        "Time step of 20 s", [=] { step(300); }},
+      {"courant", "A time step of 20 s would do.", "Time step of 20 s, and a shorter run",
+       [=, this] {
+         step(300);
+         model->simulationPeriod->noPointsInTime = 200'000'001;
+         model->simulationPeriod->warmUpPeriod = 200'000'000;
+       }},
       {"flood-and-dry", "The flooding depth of 0.2 m is 20 times the drying depth of 0.01 m.",
        "Flooding depth", [=] { depths(0.01F, 0.2F); }},
       {"warm-up", "The warm-up ends at time step 400, the run at 360.",
@@ -161,7 +177,19 @@ TEST_F(AdviceTest, TheRun) {
          model->nhdResult->outputs.SetCount(1);
          model->nhdResult->outputs.GetItem(1)->type = 9;
        }},
-      {"engine", "There are 19 outputs.", "", [this] { model->nhdResult->outputs.SetCount(19); }},
+      {"engine", "The simulation has 0 time steps.", "100 time steps",
+       [this] {
+         model->simulationPeriod->noPointsInTime = 1;
+         model->simulationPeriod->warmUpPeriod = 400;  // which would come to lie behind the run
+       }},
+      {"engine", "There are 19 outputs.", "The last output out",
+       [this] { model->nhdResult->outputs.SetCount(19); }},
+      {"engine", "There are 303 polygons.", "The last 3 polygons out",
+       [this] { model->massBudget->SetNoPolygons(303); }},
+      {"engine", "There are 1002 weirs.", "The last 2 weirs out",
+       [=, this] { structures(*model->nhdWeir, 1002); }},
+      {"engine", "There are 1001 culverts.", "The last culvert out",
+       [=, this] { structures(*model->nhdCulvert, 1001); }},
   });
   isSilent({
       [=] { step(21); },
@@ -197,182 +225,13 @@ TEST_F(AdviceTest, AShorterTimeStepKeepsThePeriod) {
   EXPECT_EQ(period.warmUpPeriod, 90);
   EXPECT_EQ(steps, (USubLine{0, 360, 30}));
   EXPECT_NEAR(period.End().linear(), end.linear(), 1e-9);
-}
-
-TEST_F(AdviceTest, WhatIsPlaced) {
-  const auto boundary = [this](int n, int firstJ, int firstK, int lastJ, int lastK) {
-    if (model->boundary->GetCount() < n) model->boundary->SetNoBoundaries(n);
-    model->boundary->GetItem(n)->Set(firstJ, firstK, lastJ, lastK);
-  };
-  const auto source = [this](GridPoint point) { model->sourceSink->GetItem(1)->source = point; };
-  speaks({
-      {"boundary", "Boundary 1 from (0,0) to (0,40) goes beyond area 1, whose last point is (30,30).",
-       "Boundary 1 from (0,0) to (0,30)", [=] { boundary(1, 0, 0, 0, 40); }},
-      {"boundary", "Boundary 1 is a single point, (0,4).", "Boundary 1 from (0,0) to (0,30)",
-       [=] { boundary(1, 0, 4, 0, 4); }},
-      {"boundary", "Boundary 1 from (5,0) to (5,30) does not lie on the border of area 1.",
-       "Boundary 1 from (0,0) to (0,30)", [=] { boundary(1, 5, 0, 5, 30); }},
-      {"boundary", "Boundary 1 from (30,0) to (30,30) lies wholly on land.", "Boundary 1 out",
-       [=] { boundary(1, 30, 0, 30, 30); }},
-      {"boundary", "Boundary 1 from (20,0) to (0,0) ends on land: 6 of its 21 points are land.",
-       "Boundary 1 from (14,0) to (0,0)", [=] { boundary(1, 20, 0, 0, 0); }},
-      {"boundary", "Boundaries 1 and 2 have 11 points in common.", "Boundary 2 from (0,30) to (0,21)",
-       [=] {
-         boundary(1, 0, 0, 0, 20);
-         boundary(2, 0, 30, 0, 10);
-       }},
-      {"boundary", "Boundary 1 from (40,40) to (50,40) goes beyond area 1", "Boundary 1 out",
-       [=] { boundary(1, 40, 40, 50, 40); }},
-      {"boundary", "Boundary 1 from (0,0) to (40,30) goes beyond area 1", "",
-       [=] { boundary(1, 0, 0, 40, 30); }},
-      {"boundary", "Boundaries 1 and 2 have 6 points in common.", "Boundary 2 out",
-       [=] { boundary(2, 0, 5, 0, 10); }},
-      {"boundary", "Boundary 1 from (0,0) to (0,40) goes beyond area 1", "Boundary 1 from (0,0) to (0,30)",
-       [=, this] {
-         boundary(1, 0, 0, 0, 40);
-         model->boundary->defaultPosition = 1;  // found by the program in another grid
-       }},
-      {"source", "Source 1 at (30,5) lies on the edge of area 1.", "",
-       [=] {
-         source({30, 5});
-       }},
-      {"source", "Source 1 at (5,0) lies on the edge of area 1.", "Move source 1 to (5,1)",
-       [=] {
-         source({5, 0});
-       }},
-      {"source", "Source 1 at (0,10) lies in boundary 1.", "Move source 1 to (1,10)",
-       [=] {
-         source({0, 10});
-       }},
-      {"source", "Sink 1 at (9,3) lies on the edge of area 2.", "Move sink 1 to (8,3)",
-       [this] {
-         CSourceSinkObjectKvs& pair = *model->sourceSink->GetItem(1);
-         pair.type = CSourceSinkObjectKvs::kPair;
-         pair.sink = {9, 3};
-         pair.sinkArea = 2;
-       }},
-      {"structure", "Weir 1 lies outside of all areas.", "Weir 1 out",
-       [this] {
-         weir({400000, 400100}, {6100100, 6100200});
-       }},
-      {"structure", "Points 2 and 3 of weir 1 are equal.", "Point 3 of weir 1 out",
-       [this] {
-         weir({480100, 480200, 480200, 480300}, {6100100, 6100200, 6100200, 6100200});
-       }},
-      {"structure", "Weir 1 lies outside of all areas.", "Projection of weir 1",
-       [this] {
-         weir({480100, 480200}, {6100100, 6100200}).coordinateType = "UTM-33";
-       }},
-      {"structure", "Points 1 and 2 of weir 1 are equal.", "Weir 1 out",
-       [this] {
-         weir({480100, 480100}, {6100100, 6100100});
-       }},
-      {"structure", "Culvert 1 lies outside of all areas.", "Culvert 1 out",
-       [this] {
-         model->nhdCulvert->SetCount(1);
-         CNhdCulvertObjectKvs& made = *model->nhdCulvert->GetItem(1);
-         made.coordinateType = "UTM-32";
-         made.x = {400000, 400100};
-         made.y = {6100100, 6100200};
-       }},
-      {"structure", "Weir 1 has 1 point.", "Weir 1 out", [this] { weir({480100}, {6100100}); }},
-      {"structure", "Points 1 and 2 of dike 1 are equal.", "Point 2 of dike 1 out",
-       [this] {
-         dike({{480100, 6100100, 1}, {480100, 6100100, 2}, {480300, 6100100, 3}});
-       }},
-      {"structure", "Dike 1 lies outside of all areas.", "Dike 1 out of use",
-       [this] {
-         dike({{480100, 5100100, 1}, {480300, 5100100, 3}});
-       }},
-  });
-  isSilent({
-      [=] {
-        boundary(2, 0, 0, 14, 0);  // they meet in a corner
-      },
-      [=] {
-        boundary(1, 0, 0, 0, 10);
-        boundary(2, 0, 11, 0, 30);
-      },
-      [=] {
-        source({1, 1});
-      },
-      [this] {
-        CSourceSinkObjectKvs& sink = *model->sourceSink->GetItem(1);
-        sink.type = CSourceSinkObjectKvs::kIsolatedSink;
-        sink.sink = {3, 3};
-        sink.source = {0, 0};  // not in use
-      },
-      [this] {
-        weir({470000, 490000}, {6100100, 6100200});
-      },  // through the area
-      [this] {
-        dike({{480100, 6100100, 1}, {480300, 6100100, 3}});
-      },
-      [this] {
-        dike({{480100, 5100100, 1}, {480300, 5100100, 3}}).include = 0;
-      },
-      [this] {
-        double x = 0, y = 0, longitude = 0, latitude = 0;
-        CVdMapProjection("UTM-32").Proj2Geo(480500, 6100500, &longitude, &latitude);
-        CVdMapProjection("UTM-33").Geo2Proj(longitude, latitude, &x, &y);
-        weir({x, x + 100}, {y, y + 100}).coordinateType = "UTM-33";
-      },
-  });
-}
-
-TEST_F(AdviceTest, TheEqualPointOfADikeGoesWithItsLevel) {
-  CNhdDikeObjectKvs& made = dike({{480100, 6100100, 1}, {480100, 6100100, 2}, {480300, 6100100, 3}});
-  const std::vector<Advice> found = look();
-  ASSERT_EQ(found.size(), 1U);
-  EXPECT_EQ(found[0].site.mapPoints.size(), 3U);
-  ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
-  ASSERT_EQ(made.points.size(), 2U);
-  EXPECT_EQ(std::as_const(made.points)[0].z, 1);
-  EXPECT_EQ(std::as_const(made.points)[1].x, 480300);
-  EXPECT_EQ(std::as_const(made.points)[1].z, 3);
-}
-
-// What all modules say of the entries behind it stays with them.
-TEST_F(AdviceTest, AnEntryThatGoesTakesItsOwnAlong) {
-  const auto named = [](auto& list) {
-    for (int number = 1; number <= list.GetCount(); ++number) list.GetItem(number)->format = number;
-  };
-  const auto namesOf = [](auto& list) {
-    std::string names;
-    for (int number = 1; number <= list.GetCount(); ++number)
-      names += std::to_string(list.GetItem(number)->format);
-    return names;
-  };
-  const auto fill = [&](int count) {
-    model->boundary->SetNoBoundaries(count);
-    model->sourceSink->SetNoSources(count);
-    for (int number = 1; number <= count; ++number) {
-      model->boundary->GetItem(number)->Set(number, 0, number, 0);
-      model->sourceSink->GetItem(number)->source = {number, number};
-      model->nhdBoundary->GetItem(number)->value = static_cast<float>(number);
-    }
-    named(*model->nadBoundary);
-    named(*model->nmtBoundary);
-    named(*model->nmtExpBoundary);
-    named(*model->wqsAdBoundary);
-    named(*model->nadSourceSink);
-    named(*model->nmtSourceSink);
-    named(*model->nmtExpSources);
-    named(*model->wqsAdSourceSink);
-  };
-  fill(3);
-  using List = AdviceRemoval::List;
-  ASSERT_TRUE(makeFix(*model, {"Out", {}, {}, AdviceRemoval{List::boundary, 2}}, path));
-  ASSERT_EQ(model->boundary->GetCount(), 2);
-  EXPECT_EQ(model->boundary->GetItem(2)->first.j, 3);
-  EXPECT_FLOAT_EQ(model->nhdBoundary->GetItem(2)->value, 3);
-  EXPECT_EQ(namesOf(*model->nadBoundary) + namesOf(*model->nmtBoundary) + namesOf(*model->nmtExpBoundary) +
-                namesOf(*model->wqsAdBoundary),
-            "13131313");
-  model->nhdWeir->SetCount(3);
-  ASSERT_TRUE(makeFix(*model, {"Out", {}, {}, AdviceRemoval{List::weir, 2}}, path));
-  ASSERT_EQ(model->nhdWeir->GetCount(), 2);
-  EXPECT_EQ(model->nhdWeir->GetItem(2)->name, "Weir 3");
+  // Of more time steps than can be counted the run takes as many as can.
+  period.timeStepInterval = 300;
+  period.noPointsInTime = 200'000'001;
+  steps = {10, 200'000'000, 100'000'000};
+  ASSERT_TRUE(makeFix(*model, *look().at(0).fix, path));
+  EXPECT_EQ(period.LastTimeStep(), 2147483646);
+  EXPECT_EQ(steps, (USubLine{150, 2147483646, 1'500'000'000}));
 }
 
 TEST_F(AdviceTest, Series) {
@@ -721,6 +580,7 @@ TEST_F(AdviceTest, OfALargeGridBlocksAreKept) {
   model->simulationPeriod->timeStepInterval = 20;
   EXPECT_EQ(look().size(), 1U);
   EXPECT_THAT(look()[0].doubt, HasSubstr("in area 1, 80 m deep"));
+  EXPECT_EQ(look()[0].site.points, (std::vector<GridPoint>{{1000, 700}}));
 }
 
 TEST_F(AdviceTest, TheShippedExamplesAreFreeOfIt) {
