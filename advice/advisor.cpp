@@ -11,6 +11,7 @@
 #include "advice/removal.h"
 #include "advice/rules.h"
 #include "basic/bathymetry.h"
+#include "basic/grid_file.h"
 #include "basic/nesting.h"
 #include "platform/files/paths.h"
 #include "setup/page_places.h"
@@ -75,8 +76,7 @@ const GridFacts* AdviceContext::grid(int number) {
   const auto [at, isNew] = grids_.try_emplace(number, nullptr);
   const CBathymetryObjectKvs* area = model.bathymetry->GetArea(number);
   if (isNew && area != nullptr && !area->fileName.empty()) {
-    constexpr std::size_t kOfHotStart = 2;
-    at->second = files.grid(area->fileName.absolute(), model.bathymetry->hotStart == 1 ? kOfHotStart : 1);
+    at->second = files.grid(area->fileName.absolute(), elevationItem());
   }
   return at->second;
 }
@@ -94,6 +94,10 @@ std::vector<GridRectangle> AdviceContext::coverOf(int number) {
         {area.origin.j, last(area.origin.j, facts->noJ), area.origin.k, last(area.origin.k, facts->noK)});
   }
   return cover;
+}
+
+std::size_t AdviceContext::elevationItem() const {
+  return static_cast<std::size_t>(gridbay::elevationItem(model.bathymetry->hotStart == 1));
 }
 
 // Longitude and latitude are what counts: a projection may be without a zone.
@@ -159,6 +163,21 @@ std::string AdviceContext::freeName(const std::string& name) {
     if (!std::filesystem::exists(absolute, error) && names_.insert(absolute).second) return free;
     free = fmt::format("{}_{}{}", path.stem().string(), number, path.extension().string());
   }
+}
+
+std::vector<std::string> AdviceContext::keywordsNaming(const std::string& path) {
+  std::vector<std::string> keywords;
+  const std::string folder = folderOfFile(documentPath);
+  if (const KvsFile* file = written()) {
+    eachKeyword(*file, [&](const PagePlace& place, const Node& keyword) {
+      const auto isIts = [&](const Value& value) {
+        return value.kind() == ValueKind::fileName && !value.text().empty() &&
+               absolutePath(value.text(), folder) == path;
+      };
+      if (keyword.values().size() == 1 && isIts(keyword.values()[0])) keywords.push_back(place.keyword);
+    });
+  }
+  return keywords;
 }
 
 const KvsFile* AdviceContext::written() {

@@ -4,6 +4,7 @@
 #include <string>
 #include <variant>
 
+#include "advice/grid_making.h"
 #include "platform/result.h"
 
 namespace gridbay {
@@ -19,7 +20,7 @@ struct FilledSeries {
 };
 
 // How a data file is made of another one.
-using FileMaking = std::variant<FileCopy, FilledSeries>;
+using FileMaking = std::variant<FileCopy, FilledSeries, PlacedGrid, ResampledGrid, LandValueGrid, TurnedGrid>;
 
 // How much is done, 0 to 1; false stops the work.
 using FileProgress = std::function<bool(double)>;

@@ -51,6 +51,8 @@ class AdviceContext {
   const GridFacts* grid(int number);
   // The points of area n that areas embedded in it cover, by the grids that are known.
   std::vector<GridRectangle> coverOf(int number);
+  // The item of the areas' files that has their elevations, from 1.
+  std::size_t elevationItem() const;
   // Where it lies; nothing without a projection.
   std::optional<GridPlace> placeOf(int number);
   // Whether two texts name one projection.
@@ -62,6 +64,8 @@ class AdviceContext {
   // A name in the setup's folder, as near to the given one as there is neither a file of nor another fix
   // with; of a setup that was never saved it is a name in the folder that the program runs in.
   std::string freeName(const std::string& name);
+  // The keywords that name a data file, by its absolute name.
+  std::vector<std::string> keywordsNaming(const std::string& path);
   // The setup as a save would write it, but for the points of dikes, of which there may be very many; null
   // where it can't be written.
   const KvsFile* written();

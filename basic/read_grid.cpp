@@ -16,10 +16,6 @@ namespace gridbay {
 namespace {
 
 constexpr int kLeastPoints = 3;
-// Where the first row of a hot start file's first item says how the area lies.
-constexpr int kEnclosingPlace = 4;
-constexpr int kOriginJPlace = 5;
-constexpr int kOriginKPlace = 6;
 
 // What a grid file says of an area, before any of it counts.
 struct GridFile {
@@ -85,7 +81,7 @@ unsigned CBathymetryObjectKvs::ReadGrid(ValidationList& messages, int areaNumber
       return 1U;
     }
     file.grid = CVdArray2D<float>(file.noJ, file.noK);
-    int status = readItem(header, hotStart ? 2 : 1, file.grid);
+    int status = readItem(header, elevationItem(hotStart), file.grid);
     if (status == 0 && hotStart) {
       file.placement = CVdArray2D<float>(file.noJ, file.noK);
       status = readItem(header, 1, file.placement);

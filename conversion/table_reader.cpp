@@ -18,16 +18,16 @@ using Role = TableColumn::Role;
 constexpr double kSecondsPerDay = 86400;
 constexpr std::string_view kBlanks = " \r\t";
 
-std::string_view trimmed(std::string_view text) {
+std::string_view withoutBlanks(std::string_view text) {
   const std::size_t first = text.find_first_not_of(kBlanks);
   if (first == text.npos) return {};
   return text.substr(first, text.find_last_not_of(kBlanks) - first + 1);
 }
 
 std::string_view unquoted(std::string_view text) {
-  text = trimmed(text);
+  text = withoutBlanks(text);
   const bool isQuoted = text.size() > 1 && text.front() == '"' && text.back() == '"';
-  return isQuoted ? trimmed(text.substr(1, text.size() - 2)) : text;
+  return isQuoted ? withoutBlanks(text.substr(1, text.size() - 2)) : text;
 }
 
 // One line's way to its row.
@@ -125,10 +125,10 @@ std::vector<std::string_view> tableFields(std::string_view line, char separator,
   std::vector<std::string_view> fields;
   if (separator == ' ') {
     const std::string gap(leastBlanks, ' ');
-    for (line = trimmed(line); !line.empty();) {
+    for (line = withoutBlanks(line); !line.empty();) {
       const std::size_t end = std::min(line.find(gap), line.size());
       fields.push_back(unquoted(line.substr(0, end)));
-      line = trimmed(line.substr(end));
+      line = withoutBlanks(line.substr(end));
     }
     return fields;
   }

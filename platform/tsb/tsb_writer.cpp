@@ -362,6 +362,11 @@ Outcome TsbWriter::writeRows(std::size_t item, std::size_t step, std::size_t fir
   return state_->write(item, step, firstRow, values, nc_put_vara_float);
 }
 
+Outcome TsbWriter::writeRows(std::size_t item, std::size_t step, std::size_t firstRow,
+                             std::span<const double> values) {
+  return state_->write(item, step, firstRow, values, nc_put_vara_double);
+}
+
 Outcome TsbWriter::commit() {
   errno = 0;
   const int status = nc_close(std::exchange(state_->file, -1));

@@ -25,6 +25,7 @@ class TsbWriter {
   Outcome write(std::size_t item, std::size_t step, std::span<const double> values);
   // Rows `firstRow` and on of a two-dimensional item; whole rows only.
   Outcome writeRows(std::size_t item, std::size_t step, std::size_t firstRow, std::span<const float> values);
+  Outcome writeRows(std::size_t item, std::size_t step, std::size_t firstRow, std::span<const double> values);
   Outcome commit();
 
  private:

@@ -93,10 +93,10 @@ TEST_F(AdviceTest, AreasAndTheirFiles) {
        [this] {
          model->bathymetry->GetArea(2)->origin = {5, 6};
        }},
-      {"area-position", "the nearest point to where its file's coordinates put it, and yet 15 m off", "",
-       [=] { moved(15); }},
-      {"area-position", "it belongs at (-45,6), 4590 m away. There it does not lie inside area 1.", "",
-       [=] { moved(-51 * 90); }},
+      {"area-position", "the nearest point to where its file's coordinates put it, and yet 15 m off",
+       "Values of area 2 at points that nest, in inner_nested.tsb2", [=] { moved(15); }},
+      {"area-position", "it belongs at (-45,6), 4590 m away. There it does not lie inside area 1.",
+       "Coordinates of area 2 by its place in the setup, in inner_placed.tsb2", [=] { moved(-51 * 90); }},
       {"area-position", "There it does not lie inside area 2.", "Move area 3 into area 1",
        [this] {
          write({"third.tsb2", 10, 30, kInner + 6 * 90, kInnerNorth}, sea);
@@ -107,19 +107,22 @@ TEST_F(AdviceTest, AreasAndTheirFiles) {
       {"projection", "The setup is in WGS 84 / UTM zone 33N, the file of area 1 in WGS 84 / UTM zone 32N.",
        "Projection of area 1", [=] { own("UTM-33"); }},
       {"projection",
-       "The file of area 2 is in WGS 84 / UTM zone 33N, that of area 1 in WGS 84 / UTM zone 32N.", "",
-       zone33},
-      {"projection", "The axes of area 2's file begin at 480840, 6100540", "", [=] { moved(0, 300); }},
+       "The file of area 2 is in WGS 84 / UTM zone 33N, that of area 1 in WGS 84 / UTM zone 32N.",
+       "Values of area 2 in the projection of area 1, in inner_nested.tsb2", zone33},
+      {"projection", "The axes of area 2's file begin at 480840, 6100540",
+       "Axes of area 2's file from its longitude and latitude, in inner_placed.tsb2", [=] { moved(0, 300); }},
       {"projection", "There is no projection \"UTM-0\", in which weir 1 is given.", "Projection of weir 1",
        [this] {
          weir({480100, 480200}, {6100100, 6100200}).coordinateType = "UTM-0";
        }},
-      {"land-value", "No point of area 1 lies below its land value of 6 m", "",
+      {"land-value", "No point of area 1 lies below its land value of 6 m",
+       "Turn the depths of area 1 to elevations, in outer_turned.tsb2",
        [this] {
          model->boundary->SetNoBoundaries(0);
          write({"outer.tsb2"}, [](int, int) { return 8.0F; });
        }},
-      {"land-value", "The highest point of area 1 lies at 3 m, below its land value of 6 m", "",
+      {"land-value", "The highest point of area 1 lies at 3 m, below its land value of 6 m",
+       "Land value of 1 m for area 1, in outer_land.tsb2",
        [this] { write({"outer.tsb2"}, [](int j, int) { return j < 15 ? -5.0F : 3.0F; }); }},
   });
   isSilent({
