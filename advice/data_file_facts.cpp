@@ -19,10 +19,6 @@ constexpr std::size_t kPiece = 1 << 18;             // values that are read at a
 constexpr std::size_t kMostSeriesValues = 16'000'000;
 constexpr std::size_t kMostProjections = 64;
 
-bool isMissing(float value, const TsbItem& item) {
-  return !std::isfinite(value) || value == static_cast<float>(item.deleteValue);
-}
-
 }  // namespace
 
 bool GridFacts::isWaterAtBorder(int j, int k) const {
@@ -51,14 +47,14 @@ struct DataFileFacts::Entry {
   std::size_t next = 0;         // row of a grid; value of a series, item by item
   std::optional<GridFacts> grid;
   std::optional<SeriesFacts> series;
-  float last = 0;  // of the series
-  bool hasLast = false;
+  std::vector<double> course = {};  // of the item that is read, at its first point
 
   void open();
   void readOn();
   void startGrid();
   void readRows();
   void readSteps();
+  void finishItem(std::size_t number);
   void fail() {
     grid.reset();
     series.reset();
@@ -67,6 +63,7 @@ struct DataFileFacts::Entry {
   void finish() {
     isDone = true;
     file.reset();
+    course = {};
   }
 };
 
@@ -155,7 +152,6 @@ void DataFileFacts::Entry::readRows() {
   finish();
 }
 
-// Of a profile the jump is that of its first point; missing values are looked for in all.
 void DataFileFacts::Entry::readSteps() {
   const TsbDefinition& definition = series->file;
   const std::size_t points = definition.pointCount();
@@ -166,33 +162,23 @@ void DataFileFacts::Entry::readSteps() {
   std::vector<float> values(steps * points);
   if (!file->readSteps(number + 1, first, std::span(values))) return fail();
   SeriesFacts::Item& facts = series->items[number];
-  const TsbItem& kind = definition.items[number];
-  if (first == 0) {
-    facts.lowest = INFINITY;
-    facts.highest = -INFINITY;
-    hasLast = false;
-  }
   for (std::size_t i = 0; i < values.size(); ++i) {
-    const std::size_t step = first + i / points;
-    const float value = values[i];
-    if (isMissing(value, kind)) {
-      if (facts.missing++ == 0) facts.firstMissing = step;
-      continue;
-    }
-    if (i % points != 0) continue;
-    facts.lowest = std::min(facts.lowest, value);
-    facts.highest = std::max(facts.highest, value);
-    if (hasLast && std::abs(value - last) > facts.greatestJump) {
-      facts.greatestJump = std::abs(value - last);
-      facts.jumpStep = step;
-      facts.before = last;
-      facts.after = value;
-    }
-    last = value;
-    hasLast = true;
+    if (i % points == 0) course.push_back(values[i]);
+    if (isMissing(values[i], definition.items[number]) && facts.missing++ == 0)
+      facts.firstMissing = first + i / points;
   }
+  if (first + steps == definition.time.count) finishItem(number);
   next += steps;
   if (next == definition.time.count * definition.items.size()) finish();
+}
+
+void DataFileFacts::Entry::finishItem(std::size_t number) {
+  SeriesFacts::Item& facts = series->items[number];
+  if (fillGaps(course, series->file.items[number], series->file.time)) {
+    facts.jump = greatestJump(course);
+    facts.jumping = takeOutJumps(course);
+  }
+  course.clear();
 }
 
 void DataFileFacts::Entry::readOn() {

@@ -11,6 +11,7 @@
 #include <utility>
 #include <vector>
 
+#include "advice/series_mending.h"
 #include "core/array2d.h"
 #include "core/grid_point.h"
 #include "platform/cartography/cartography.h"
@@ -50,11 +51,9 @@ struct SeriesFacts {
   struct Item {
     std::size_t missing = 0;
     std::size_t firstMissing = 0;  // its time step
-    float lowest = 0;
-    float highest = 0;
-    float greatestJump = 0;       // between time steps that follow each other
-    std::size_t jumpStep = 0;     // the later one of them
-    float before = 0, after = 0;  // the values there
+    // Of a profile that of its first point. Gaps lie on the line between their neighbours.
+    std::optional<SeriesJump> jump = {};
+    std::size_t jumping = 0;  // values that are others without jumps
   };
 
   TsbDefinition file;

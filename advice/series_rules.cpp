@@ -3,10 +3,10 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <array>
 #include <cmath>
 #include <filesystem>
 #include <limits>
+#include <set>
 
 #include "advice/rules.h"
 #include "advice/run_steps.h"
@@ -22,19 +22,48 @@
 namespace gridbay {
 namespace {
 
-// A file whose values the run goes through.
+constexpr double kHalfSecond = 0.5 / 86400;  // days
+
+// A file whose values the run goes through, with what is known of it.
 struct UsedSeries {
   PagePlace place;
   const CheckedFile& file;
-  bool isSmooth = false;                   // its values go on without jumps in nature
-  std::vector<std::string> keywords = {};  // all that name it
+  const SeriesFacts& facts;
+  std::vector<std::uint32_t> items;   // from 1
+  bool isSmooth = false;              // its values go on without jumps in nature
+  std::vector<std::string> keywords;  // all that name it
 };
 
-constexpr double kHalfSecond = 0.5 / 86400;  // days
+// When its values are; nothing where its axis is none of time, or it is a single one that holds throughout.
+struct Span {
+  DateTime first;
+  DateTime last;
+  bool isCalendar = false;  // else it begins with the run
 
-std::string momentOf(const DateTime& origin, const CVdUnitConverter& toDays, const TsbTimeAxis& time,
-                     std::size_t step) {
-  return dateTimeText(origin.plusDays(toDays.Convert(time.at(step))));
+  bool covers(const DateTime& begin, const DateTime& end) const {
+    return first.linear() <= begin.linear() + kHalfSecond && last.linear() >= end.linear() - kHalfSecond;
+  }
+};
+
+// The moment of a time step. A relative axis counts from the start of the run, and may be none of time: then
+// it is no valid one.
+DateTime momentAt(AdviceContext& context, const TsbTimeAxis& time, std::size_t step) {
+  const CVdUnitConverter toDays(time.unit, "d");
+  const DateTime origin =
+      time.isCalendar() ? DateTime::of(time.start) : context.model.simulationPeriod->start;
+  return toDays.IsValid() && origin.valid() ? origin.plusDays(toDays.Convert(time.at(step)))
+                                            : DateTime::invalid();
+}
+
+std::string momentOf(AdviceContext& context, const TsbTimeAxis& time, std::size_t step) {
+  const DateTime moment = momentAt(context, time, step);
+  return moment.valid() ? dateTimeText(moment) : fmt::format("{:.6g} {}", time.at(step), time.unit);
+}
+
+std::optional<Span> spanOf(AdviceContext& context, const TsbTimeAxis& time) {
+  if (time.count < 2) return std::nullopt;
+  const Span span{momentAt(context, time, 0), momentAt(context, time, time.count - 1), time.isCalendar()};
+  return span.first.valid() && span.last.valid() ? std::optional(span) : std::nullopt;
 }
 
 constexpr std::string_view kPeriodPath = "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD";
@@ -63,99 +92,187 @@ void addSteps(AdviceContext& context, AdviceFix& fix, const std::function<long l
   });
 }
 
-// A run of fewer time steps, with what is written until then.
-AdviceFix shorterRun(AdviceContext& context, long long steps) {
-  AdviceFix fix{"End with the series",
+// A run of other time steps, with what is written meanwhile: `moved` tells the new number of each step.
+AdviceFix otherRun(AdviceContext& context, std::string name, long long steps,
+                   const std::function<long long(long long)>& moved) {
+  AdviceFix fix{std::move(name),
                 {{fmt::format("{}/Number_Of_Timesteps", kPeriodPath), std::to_string(steps)}}};
-  addSteps(context, fix, [steps](long long step) { return std::min(step, steps); });
+  addSteps(context, fix, moved);
   return fix;
 }
 
-// A run that begins so many time steps later, and ends when it did; nothing where that is no date.
+AdviceFix shorterRun(AdviceContext& context, long long steps) {
+  return otherRun(context, "End with the series", steps,
+                  [steps](long long step) { return std::min(step, steps); });
+}
+
+// The moment to whole seconds, as a run can begin at; nothing where that is no date.
+std::optional<Setting> beginningAt(const DateTime& moment) {
+  const auto parts = moment.parts();
+  if (!parts) return std::nullopt;
+  return Setting{fmt::format("{}/Start_Time", kPeriodPath), fmt::format("{}", fmt::join(*parts, ","))};
+}
+
+// A run that begins so many time steps later, and ends when it did.
 std::optional<AdviceFix> laterRun(AdviceContext& context, long long later) {
   const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
   const long long steps = period.LastTimeStep() - later;
-  const DateTime start =
-      period.start.plusDays(static_cast<double>(later) * double{period.timeStepInterval} / kDay);
-  const auto parts = start.parts();
-  if (!parts) return std::nullopt;
-  const auto [year, month, day, hour, minute, second] = *parts;
-  AdviceFix fix{"Begin with the series",
-                {{fmt::format("{}/Start_Time", kPeriodPath),
-                  fmt::format("{},{},{},{},{},{}", year, month, day, hour, minute, second)},
-                 {fmt::format("{}/Number_Of_Timesteps", kPeriodPath), std::to_string(steps)}}};
-  addSteps(context, fix, [=](long long step) { return std::clamp(step - later, 0LL, steps); });
+  std::optional<Setting> start =
+      beginningAt(period.start.plusDays(static_cast<double>(later) * double{period.timeStepInterval} / kDay));
+  if (!start) return std::nullopt;
+  AdviceFix fix = otherRun(context, "Begin with the series", steps,
+                           [=](long long step) { return std::clamp(step - later, 0LL, steps); });
+  fix.settings.insert(fix.settings.begin(), std::move(*start));
   return fix;
+}
+
+double stepsInDay(const CSimulationPeriodKvs& period) {
+  return kDay / double{period.timeStepInterval};
+}
+
+// The run at the time of a series, with as many of its steps as fit; nothing where none does, or where
+// another series that covers the run would not cover it any more.
+std::optional<AdviceFix> movedRun(AdviceContext& context, const Span& span, std::span<const UsedSeries> all) {
+  const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
+  std::optional<Setting> start = beginningAt(span.first);
+  if (!span.isCalendar || !start) return std::nullopt;
+  const DateTime begin = DateTime::of(*span.first.parts());
+  const double fitting = std::floor((span.last.linear() - begin.linear() + kHalfSecond) * stepsInDay(period));
+  const double steps = std::min(fitting, double{static_cast<double>(period.LastTimeStep())});
+  if (!(steps >= 1)) return std::nullopt;
+  const DateTime end = begin.plusDays(steps / stepsInDay(period));
+  const auto isLeft = [&](const UsedSeries& each) {
+    const std::optional<Span> other = spanOf(context, each.facts.file.time);
+    return other && other->isCalendar && other->covers(period.start, period.End()) &&
+           !other->covers(begin, end);
+  };
+  if (std::ranges::any_of(all, isLeft)) return std::nullopt;
+  const auto last = static_cast<long long>(steps);
+  AdviceFix fix = otherRun(context, "Move the run to the series", last,
+                           [last](long long step) { return std::min(step, last); });
+  fix.settings.insert(fix.settings.begin(), std::move(*start));
+  return fix;
+}
+
+// A file that is made of the series, for all that take that, under a free name that ends so; the name of the
+// fix ends in it.
+AdviceFix otherFile(AdviceContext& context, const UsedSeries& used, std::string_view ending,
+                    std::string_view what, FileMaking making) {
+  const std::filesystem::path path(used.file.path);
+  const std::string name =
+      context.freeName(fmt::format("{}_{}{}", path.stem().string(), ending, path.extension().string()));
+  AdviceFix fix{fmt::format("{}, in {}", what, name)};
+  for (const std::string& keyword : used.keywords) fix.settings.push_back({keyword, name});
+  fix.files.push_back(
+      {used.file.path, absolutePath(name, folderOfFile(context.documentPath)), std::move(making)});
+  return fix;
+}
+
+// The series over the run where it has none of its own there.
+AdviceFix coveringSeries(AdviceContext& context, const UsedSeries& used, const Span& span) {
+  const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
+  const DateTime end = period.End();
+  const bool isMoved = span.first.linear() > period.start.linear() + kHalfSecond ||
+                       span.last.linear() < period.start.linear() - kHalfSecond;
+  const double shift = isMoved ? period.start.linear() - span.first.linear() : 0;
+  const bool isHeld = span.last.linear() + shift < end.linear() - kHalfSecond;
+  const char* what = !isMoved ? "Hold the last value until the run's end"
+                     : isHeld ? "Begin with the run and hold the last value until its end"
+                              : "Move the series to the run's begin";
+  return otherFile(context, used, isMoved ? "moved" : "held", what,
+                   CoveringSeries{period.start, end, isMoved});
 }
 
 // Whether the file covers the run.
-void advisePeriod(AdviceContext& context, const UsedSeries& used, const TsbTimeAxis& time,
-                  const DateTime& origin, const CVdUnitConverter& toDays) {
+void advisePeriod(AdviceContext& context, const UsedSeries& used, const Span& span,
+                  std::span<const UsedSeries> all) {
   const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
-  const DateTime first = origin.plusDays(toDays.Convert(time.at(0)));
-  const DateTime last = origin.plusDays(toDays.Convert(time.at(time.count - 1)));
   const DateTime end = period.End();
-  if (!first.valid() || !last.valid() || !end.valid() || !period.start.valid()) return;
+  if (!end.valid() || !period.start.valid()) return;
   constexpr const char* kReason = "Beyond it the engine has no values, and stops.";
-  constexpr const char* kTodo = "Choose a series that covers the run, or move the run to where there is one.";
-  const double stepsInDay = kDay / double{period.timeStepInterval};
-  if (first.linear() > period.start.linear() + kHalfSecond) {
-    Advice advice{{},
-                  fmt::format("{} begins at {}, after the run does at {}.", used.file.name,
-                              dateTimeText(first), dateTimeText(period.start)),
-                  kReason,
-                  used.place,
-                  {},
-                  {},
-                  kTodo};
-    const double later = std::ceil((first.linear() - period.start.linear() - kHalfSecond) * stepsInDay);
+  const double lastStep = period.LastTimeStep();
+  // In time steps of the run.
+  const auto stepsTo = [&](const DateTime& moment) {
+    return (moment.linear() - period.start.linear()) * stepsInDay(period);
+  };
+  const double half = kHalfSecond * stepsInDay(period);
+  const auto orElse = [&](std::optional<AdviceFix> fix) {
+    if (!fix) fix = movedRun(context, span, all);
+    return fix ? std::move(*fix) : coveringSeries(context, used, span);
+  };
+  if (span.first.linear() > period.start.linear() + kHalfSecond) {
     // A series with no dates begins with the run, and would move with it.
-    if (time.isCalendar() && later >= 1 && later < period.LastTimeStep())
-      advice.fix = laterRun(context, static_cast<long long>(later));
-    context.add(std::move(advice));
+    const double later = std::ceil(stepsTo(span.first) - half);
+    const bool isPartLeft = std::min(stepsTo(span.last) + half, lastStep) - later >= 1;
+    std::optional<AdviceFix> fix;
+    if (span.isCalendar && later >= 1 && isPartLeft) fix = laterRun(context, static_cast<long long>(later));
+    context.add({{},
+                 fmt::format("{} begins at {}, after the run does at {}.", used.file.name,
+                             dateTimeText(span.first), dateTimeText(period.start)),
+                 kReason,
+                 used.place,
+                 {},
+                 orElse(std::move(fix))});
   }
-  if (last.linear() >= end.linear() - kHalfSecond) return;
-  Advice advice{{},
-                fmt::format("{} ends at {}, in the run, which ends at {}.", used.file.name,
-                            dateTimeText(last), dateTimeText(end)),
-                kReason,
-                used.place,
-                {},
-                {},
-                kTodo};
-  const double steps = std::floor((last.linear() - period.start.linear() + kHalfSecond) * stepsInDay);
-  if (steps >= 1 && steps < period.LastTimeStep())
-    advice.fix = shorterRun(context, static_cast<long long>(steps));
-  context.add(std::move(advice));
+  if (span.last.linear() >= end.linear() - kHalfSecond) return;
+  const double steps = std::floor(stepsTo(span.last) + half);
+  std::optional<AdviceFix> fix;
+  if (steps >= 1 && steps < lastStep) fix = shorterRun(context, static_cast<long long>(steps));
+  context.add({{},
+               fmt::format("{} ends at {}, in the run, which ends at {}.", used.file.name,
+                           dateTimeText(span.last), dateTimeText(end)),
+               kReason,
+               used.place,
+               {},
+               orElse(std::move(fix))});
 }
 
-// A series without gaps beside the setup, for all that take the one with gaps.
-std::optional<AdviceFix> withoutGaps(AdviceContext& context, const UsedSeries& used,
-                                     const SeriesFacts& facts) {
-  const auto hasValues = [&](const SeriesFacts::Item& item) { return item.missing < facts.file.time.count; };
-  if (!facts.file.axes.empty() || used.keywords.empty() || context.documentPath.empty() ||
-      !std::ranges::all_of(facts.items, hasValues))
-    return std::nullopt;
-  // Between 350 and 10 degrees lies north, and not the mean of both.
-  constexpr std::array kDirections{item::kWindDirection, item::kMeanWaveDirection, item::kWaveDirection,
-                                   item::kFlowDirection};
+// What the name of a fix says of the gaps of a file; empty where it has none.
+std::string fillingOf(const SeriesFacts& facts) {
+  std::vector<std::string> empty;
+  std::size_t missing = 0;
   for (std::size_t i = 0; i < facts.items.size(); ++i) {
-    if (facts.items[i].missing > 0 && std::ranges::count(kDirections, facts.file.items[i].type) > 0)
-      return std::nullopt;
+    missing += facts.items[i].missing;
+    if (facts.items[i].missing == facts.file.time.count * facts.file.pointCount())
+      empty.push_back(fmt::format("\"{}\"", facts.file.items[i].name));
   }
-  const std::filesystem::path path(used.file.path);
-  const std::string name = context.freeName(path.stem().string() + "_filled" + path.extension().string());
-  AdviceFix fix{fmt::format("Fill the gaps, in {}", name)};
-  for (const std::string& keyword : used.keywords) fix.settings.push_back({keyword, name});
-  fix.files.push_back(
-      {used.file.path, absolutePath(name, folderOfFile(context.documentPath)), FilledSeries{}});
-  return fix;
+  if (missing == 0) return {};
+  return empty.empty() ? "fill the gaps"
+                       : fmt::format("fill the gaps, with 0 for {}", fmt::join(empty, ", "));
 }
 
-void adviseValues(AdviceContext& context, const UsedSeries& used, const SeriesFacts& facts,
-                  std::uint32_t number, const std::function<std::string(std::size_t)>& moment) {
-  const SeriesFacts::Item& item = facts.items[number - 1];
-  const TsbItem& named = facts.file.items[number - 1];
+AdviceFix withoutGaps(AdviceContext& context, const UsedSeries& used) {
+  std::string what = fillingOf(used.facts);
+  what[0] = 'F';
+  return otherFile(context, used, "filled", what, FilledSeries{});
+}
+
+// Without the jumps of all items that are to be smooth, whoever takes them.
+AdviceFix withoutJumps(AdviceContext& context, const UsedSeries& used, std::span<const UsedSeries> all) {
+  std::set<std::uint32_t> smooth;
+  for (const UsedSeries& each : all) {
+    if (each.isSmooth && each.file.path == used.file.path)
+      smooth.insert(each.items.begin(), each.items.end());
+  }
+  SmoothedSeries making;
+  std::size_t jumping = 0;
+  for (const std::uint32_t number : smooth) {
+    if (!used.facts.items[number - 1].jump) continue;
+    making.items.push_back(number);
+    jumping += used.facts.items[number - 1].jumping;
+  }
+  const std::string filling = fillingOf(used.facts);
+  const std::string what = fmt::format(
+      "Smooth {} {}{} that jump{}{}{}", jumping, used.facts.file.axes.empty() ? "value" : "time step",
+      jumping == 1 ? "" : "s", jumping == 1 ? "s" : "", filling.empty() ? "" : " and ", filling);
+  return otherFile(context, used, "smooth", what, std::move(making));
+}
+
+void adviseValues(AdviceContext& context, const UsedSeries& used, std::span<const UsedSeries> all,
+                  std::uint32_t number) {
+  const SeriesFacts::Item& item = used.facts.items[number - 1];
+  const TsbItem& named = used.facts.file.items[number - 1];
+  const auto moment = [&](std::size_t step) { return momentOf(context, used.facts.file.time, step); };
   if (item.missing > 0) {
     context.add(
         {{},
@@ -164,50 +281,35 @@ void adviseValues(AdviceContext& context, const UsedSeries& used, const SeriesFa
          "What the engine takes in their place is not known.",
          used.place,
          {},
-         withoutGaps(context, used, facts),
-         "Fill them from another source, and choose the file that has them all."});
+         withoutGaps(context, used)});
   }
-  // A smooth curve that is sampled well goes no such way in one step.
-  constexpr std::size_t kLeastSteps = 10;
-  constexpr float kMostPart = 0.6F;
-  const float range = item.highest - item.lowest;
-  if (!used.isSmooth || facts.file.time.count < kLeastSteps || !(item.greatestJump > kMostPart * range) ||
-      range <= 0)
-    return;
+  if (!used.isSmooth || !item.jump) return;
   context.add({{},
                fmt::format("\"{}\" of {} jumps from {:.4g} to {:.4g} {} between {} and {}.", named.name,
-                           used.file.name, item.before, item.after, named.unit, moment(item.jumpStep - 1),
-                           moment(item.jumpStep)),
+                           used.file.name, item.jump->before, item.jump->after, named.unit,
+                           moment(item.jump->step - 1), moment(item.jump->step)),
                "A wave that is none in nature runs through the model; often a value is mistyped.",
                used.place,
                {},
-               {},
-               "Look at the series there, and mend its source where a value is wrong."});
+               withoutJumps(context, used, all)});
 }
 
-void adviseOne(AdviceContext& context, const UsedSeries& used) {
-  if (used.file.path.empty()) return;
-  const SeriesFacts* facts = context.files.series(used.file.path);
-  if (facts == nullptr || facts->file.time.count == 0) return;
-  const TsbTimeAxis& time = facts->file.time;
-  const CVdUnitConverter toDays(time.unit, "d");
-  // A single map holds throughout, and so may a relative axis that is none of time.
-  const DateTime origin =
-      time.isCalendar() ? DateTime::of(time.start) : context.model.simulationPeriod->start;
-  const bool isOfTime = toDays.IsValid() && origin.valid();
-  if (isOfTime && time.count > 1) advisePeriod(context, used, time, origin, toDays);
-  if (!facts->hasValues) return;
-  const auto moment = [&](std::size_t step) {
-    return isOfTime ? momentOf(origin, toDays, time, step)
-                    : fmt::format("{:.6g} {}", time.at(step), time.unit);
-  };
-  std::vector<std::uint32_t> items = used.file.items;
+void adviseOne(AdviceContext& context, const UsedSeries& used, std::span<const UsedSeries> all) {
+  if (const std::optional<Span> span = spanOf(context, used.facts.file.time))
+    advisePeriod(context, used, *span, all);
+  if (!used.facts.hasValues) return;
+  for (const std::uint32_t number : used.items) adviseValues(context, used, all, number);
+}
+
+// The items of a file that are used, of those that it has.
+std::vector<std::uint32_t> itemsOf(const CheckedFile& file, const SeriesFacts& facts) {
+  const auto count = static_cast<std::uint32_t>(facts.file.items.size());
+  std::vector<std::uint32_t> items = file.items;
   if (items.empty()) {
-    for (std::uint32_t number = 1; number <= facts->items.size(); ++number) items.push_back(number);
+    for (std::uint32_t number = 1; number <= count; ++number) items.push_back(number);
   }
-  for (const std::uint32_t number : items) {
-    if (number >= 1 && number <= facts->items.size()) adviseValues(context, used, *facts, number, moment);
-  }
+  std::erase_if(items, [&](std::uint32_t number) { return number < 1 || number > count; });
+  return items;
 }
 
 // A keyword that names a data file.
@@ -265,16 +367,22 @@ void adviseSeries(AdviceContext& context) {
     if (&object != copy.bathymetry.get()) object.Validate(checked, 1);
   }
   const std::vector<NameOnFile> names = namesOnFile(context);
+  std::vector<UsedSeries> all;
   for (const CheckedFile& file : checked.files) {
-    if (!file.coversRun) continue;
+    if (!file.coversRun || file.path.empty()) continue;
+    const SeriesFacts* facts = context.files.series(file.path);
+    if (facts == nullptr || facts->file.time.count == 0) continue;
     PagePlace place = placeOf(file, names);
-    const bool smooth = isSmooth(place);
+    // Of what goes on by levels, as a rating curve, nothing is known.
+    const bool smooth = isSmooth(place) && momentAt(context, facts->file.time, 0).valid();
     std::vector<std::string> keywords;
     for (const NameOnFile& each : names) {
       if (each.path == file.path) keywords.push_back(each.place.keyword);
     }
-    adviseOne(context, {std::move(place), file, smooth, std::move(keywords)});
+    if (keywords.empty()) continue;  // of a setup that can't be written, which a save tells
+    all.push_back({std::move(place), file, *facts, itemsOf(file, *facts), smooth, std::move(keywords)});
   }
+  for (const UsedSeries& used : all) adviseOne(context, used, all);
 }
 
 }  // namespace gridbay

@@ -652,20 +652,6 @@ TEST_F(Tool, AdviceIsTakenByItsNumber) {
   EXPECT_EQ(get(depth), "0.04\n");
   EXPECT_EQ(runTool({"validate", setup, "--advice"}).out, "0 faults\nno advice\n");
 
-  // What no fix can mend says what is to be done.
-  const std::string wind = "HYDRODYNAMIC_MODULE/WIND_CONDITIONS/File_Name";
-  ASSERT_EQ(runTool({"set", setup, wind + "=/elsewhere/wind.tsb0"}).status, 0);
-  EXPECT_THAT(runTool({"validate", setup, "--advice"}).out,
-              HasSubstr("\n  to do: Bring the file into the setup's folder, and choose it there.\n"));
-  const nlohmann::json left = nlohmann::json::parse(runTool({"validate", setup, "--advice", "--json"}).out);
-  EXPECT_TRUE(left["advice"][0]["fix"].is_null());
-  EXPECT_EQ(left["advice"][0]["todo"], "Bring the file into the setup's folder, and choose it there.");
-  run = runTool({"fix", setup, "1"});
-  EXPECT_EQ(run.status, 2);
-  EXPECT_THAT(run.err, HasSubstr("Advice 1 has no fix: /elsewhere/wind.tsb0 is named absolutely"));
-  EXPECT_THAT(run.err, HasSubstr("Bring the file into the setup's folder"));
-  ASSERT_EQ(runTool({"set", setup, wind + "="}).status, 0);
-
   // Faults keep their status, and name their pages beside advice.
   ASSERT_EQ(
       runTool({"set", setup, "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.3", depth + "=0.2"}).status,
