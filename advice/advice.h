@@ -69,8 +69,7 @@ struct Advice {
   std::string reason;     // why that matters
   PagePlace place;
   AdviceSite site = {};
-  std::optional<AdviceFix> fix = {};
-  std::string todo = {};  // what to do at the place, where no fix by the program can be right
+  AdviceFix fix;
 
   bool operator==(const Advice&) const = default;
 };

@@ -107,7 +107,7 @@ void advisePosition(AdviceContext& context, int number) {
       placeOfEntry(PageId::bathymetry, "area", {number, context.model.bathymetry->GetCount()},
                    fmt::format("{}/AREA_{}/Origin", kAreasPath, number), "Origin"),
       {.area = area.enclosingArea, .points = cornersOf(*inner, area.origin)},
-      std::move(fix)};
+      std::move(*fix)};
   if (snapped == area.origin) {
     advice.doubt = fmt::format(
         "Area {} lies at {} of area {}, the nearest point to where its file's coordinates put it, and yet "
@@ -164,9 +164,10 @@ void adviseOwnProjection(AdviceContext& context) {
     const GridFacts* first = context.grid(1);
     const bool isLocal = first != nullptr && projectionIn(*first).empty();
     std::string known = !ofFile.empty() ? ofFile : isLocal ? localText() : anyKnownProjection(context);
-    const std::string name = !ofFile.empty()                    ? "Projection of area 1"
-                             : CVdMapProjection::IsLocal(known) ? "Local coordinates"
-                                                                : "Projection of the grids";
+    const std::string name = !ofFile.empty() ? "Projection of area 1: " + nameOf(context, known)
+                             : CVdMapProjection::IsLocal(known)
+                                 ? "Local coordinates"
+                                 : "Projection of the grids: " + nameOf(context, known);
     return context.add({{},
                         fmt::format("There is no projection \"{}\".", own),
                         "Nothing can be placed by its coordinates.",
@@ -181,7 +182,7 @@ void adviseOwnProjection(AdviceContext& context) {
                std::string(kElsewhere),
                place,
                {},
-               projection("Projection of area 1", ofFile)});
+               projection("Projection of area 1: " + nameOf(context, ofFile), ofFile)});
 }
 
 // The projection of Area 1's file for one that names none that there is, or what else is known. Its longitude
@@ -278,12 +279,17 @@ void adviseFileProjection(AdviceContext& context, int number) {
 }
 
 void adviseStructureProjection(AdviceContext& context, PagePlace place, const std::string& projection) {
-  if (context.files.projection(projection).IsValid()) return;
   std::string known = anyKnownProjection(context);
-  if (CVdMapProjection::IsLocal(known) && !context.files.isComplete()) return;
-  AdviceFix fix{"Projection of " + place.thing, {{place.keyword, std::move(known)}}};
+  const bool isLocal = CVdMapProjection::IsLocal(known);
+  // Without one its points are those of a grid that has none either.
+  if (projection.empty() ? isLocal : context.files.projection(projection).IsValid()) return;
+  if (isLocal && !context.files.isComplete()) return;
+  AdviceFix fix{fmt::format("Projection of {}: {}", place.thing, nameOf(context, known)),
+                {{place.keyword, known}}};
   context.add({{},
-               fmt::format("There is no projection \"{}\", in which {} is given.", projection, place.thing),
+               projection.empty() ? fmt::format("{} names no projection.", capital(place.thing))
+                                  : fmt::format("There is no projection \"{}\", in which {} is given.",
+                                                projection, place.thing),
                "The engine can't place it on the grid.",
                std::move(place),
                {},

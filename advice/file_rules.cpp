@@ -45,7 +45,7 @@ void adviseName(AdviceContext& context, const std::string& name, const NamedFile
                                 named.further.size() == 1 ? "" : "s");
   advice.fix =
       AdviceFix{std::move(better.fix), {{named.place.keyword, better.name}}, std::move(better.files)};
-  for (const std::string& path : named.further) advice.fix->settings.push_back({path, better.name});
+  for (const std::string& path : named.further) advice.fix.settings.push_back({path, better.name});
   context.add(std::move(advice));
 }
 
@@ -60,7 +60,7 @@ std::optional<BetterName> inFolder(AdviceContext& context, const std::string& fo
   const std::string beside = absolutePath(plain, folder);
   const bool isThere = named.isRead && isReadableFile(from);
   if (!named.isResult && isReadableFile(beside) && (!isThere || isSmallAndSame(from, beside)))
-    return BetterName{"Take " + plain, plain};
+    return BetterName{fmt::format("Take {} of the setup's folder", plain), plain};
   if (!isThere && !named.isResult) return std::nullopt;
   const std::string free = context.freeName(plain);
   if (!isThere)
@@ -118,7 +118,8 @@ void adviseFileNames(AdviceContext& context) {
   for (const auto& [name, named] : absolute) {
     adviseName(context, name, named, "is named absolutely.",
                "When the folder is moved or sent, the name leads nowhere.",
-               BetterName{"Take " + pathOnFile(name, folder), pathOnFile(name, folder)});
+               BetterName{fmt::format("Name it {}, from the setup's folder", pathOnFile(name, folder)),
+                          pathOnFile(name, folder)});
   }
 }
 

@@ -341,7 +341,7 @@ void adviseOutputSize(AdviceContext& context) {
                  "The run ends when the disk is full, and may spoil what it has written.",
                  std::move(place),
                  {},
-                 std::move(fix)});
+                 std::move(*fix)});
   }
 }
 

@@ -72,7 +72,6 @@ class AdviceContext {
 
   void add(Advice advice) {
     advice.kind = kind;
-    if (advice.fix) advice.todo.clear();
     found.push_back(std::move(advice));
   }
 

@@ -255,7 +255,7 @@ void adviseCourant(AdviceContext& context) {
                "The fastest waves cross more grid spacings in a time step than the scheme follows.",
                onPeriod("Time_Step_Interval", "Time step interval:"),
                {.area = worst.area, .points = {worst.where.point}},
-               std::move(fix)});
+               std::move(*fix)});
 }
 
 void adviseThresholds(AdviceContext& context) {
@@ -272,7 +272,8 @@ void adviseThresholds(AdviceContext& context) {
                "Points that have run dry stay out for long, and much water comes and goes when they change.",
                {PageId::floodAndDry, {}, keyword, "Flooding depth:"},
                {},
-               AdviceFix{"Flooding depth", {{keyword, fmt::format("{:.6g}", kUsualTimes * drying)}}}});
+               AdviceFix{fmt::format("Flooding depth of {:.6g} m", kUsualTimes * drying),
+                         {{keyword, fmt::format("{:.6g}", kUsualTimes * drying)}}}});
 }
 
 void adviseWarmUp(AdviceContext& context) {

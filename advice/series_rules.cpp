@@ -102,7 +102,10 @@ AdviceFix otherRun(AdviceContext& context, std::string name, long long steps,
 }
 
 AdviceFix shorterRun(AdviceContext& context, long long steps) {
-  return otherRun(context, "End with the series", steps,
+  const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
+  const DateTime end =
+      period.start.plusDays(static_cast<double>(steps) * double{period.timeStepInterval} / kDay);
+  return otherRun(context, fmt::format("End with the series, at {}", dateTimeText(end)), steps,
                   [steps](long long step) { return std::min(step, steps); });
 }
 

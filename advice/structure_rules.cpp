@@ -110,7 +110,8 @@ void adviseLine(AdviceContext& context, const Line& line) {
   add(fmt::format("{} lies outside of all areas.", subject),
       isOwn ? "It has no effect. By the setup's own projection it would lie inside."
             : "It has no effect, unless its coordinates or its projection are wrong.",
-      isOwn ? AdviceFix{"Projection of " + line.thing, {{line.path + "/coordinate_type", own}}}
+      isOwn ? AdviceFix{fmt::format("Projection of {}: {}", line.thing, context.files.projection(own).Name()),
+                        {{line.path + "/coordinate_type", own}}}
             : outOfUse(line));
 }
 

@@ -38,23 +38,20 @@ int fix(const FixOptions& options, const Console& console) {
                     found.empty() ? "none" : std::to_string(found.size()), toolName(), options.file));
   }
   const Advice& advice = found[options.number - 1];
-  if (!advice.fix)
-    return console.fail(
-        fmt::format("Advice {} has no fix: {} {}", options.number, advice.doubt, advice.todo));
   std::vector<std::string> before;
-  for (const Setting& setting : advice.fix->settings)
+  for (const Setting& setting : advice.fix.settings)
     before.push_back(valueAt(*setup, setting.path, options.file));
-  if (const Outcome done = makeFix(setup->model(), *advice.fix, options.file); !done)
+  if (const Outcome done = makeFix(setup->model(), advice.fix, options.file); !done)
     return console.fail(done.error());
   if (const int status = saveSetup(*setup, options.file, console); status != kClean) {
-    removeFiles(advice.fix->files);
+    removeFiles(advice.fix.files);
     return status;
   }
-  console.out << advice.fix->name << '\n';
-  for (const AdviceFile& file : advice.fix->files)
+  console.out << advice.fix.name << '\n';
+  for (const AdviceFile& file : advice.fix.files)
     console.out << fmt::format("  made {} of {}\n", file.to, file.from);
   for (std::size_t i = 0; i < before.size(); ++i) {
-    const std::string& path = advice.fix->settings[i].path;
+    const std::string& path = advice.fix.settings[i].path;
     console.out << fmt::format("  {}: {} -> {}\n", path, before[i], valueAt(*setup, path, options.file));
   }
   return kClean;
@@ -100,14 +97,10 @@ std::string placeText(const PagePlace& place) {
 }
 
 std::string adviceText(const Advice& advice, std::size_t number, const std::string& path) {
-  std::string text =
+  const std::string text =
       fmt::format("advice {}, {}: {} {}\n", number, placeText(advice.place), advice.doubt, advice.reason);
-  if (advice.fix) {
-    text += fmt::format("  fix: {} ({} fix {} {})\n", advice.fix->name, toolName(), shellText(path), number);
-  } else {
-    text += fmt::format("  to do: {}\n", advice.todo);
-  }
-  return text;
+  return text +
+         fmt::format("  fix: {} ({} fix {} {})\n", advice.fix.name, toolName(), shellText(path), number);
 }
 
 nlohmann::ordered_json adviceJson(const Advice& advice, std::size_t number) {
@@ -121,19 +114,14 @@ nlohmann::ordered_json adviceJson(const Advice& advice, std::size_t number) {
       {"doubt", advice.doubt},
       {"reason", advice.reason},
       {"site", siteJson(advice.site)}};
-  json["fix"] = nullptr;
-  if (advice.fix) {
-    nlohmann::ordered_json settings = nlohmann::ordered_json::array();
-    for (const Setting& setting : advice.fix->settings)
-      settings.push_back({{"path", setting.path}, {"value", setting.value}});
-    nlohmann::ordered_json files = nlohmann::ordered_json::array();
-    for (const AdviceFile& file : advice.fix->files) files.push_back({{"from", file.from}, {"to", file.to}});
-    json["fix"] = {
-        {"name", advice.fix->name}, {"settings", std::move(settings)}, {"files", std::move(files)}};
-    json["fix"]["removes"] = nullptr;
-    if (advice.fix->removal) json["fix"]["removes"] = textOf(*advice.fix->removal);
-  }
-  json["todo"] = advice.todo;
+  nlohmann::ordered_json settings = nlohmann::ordered_json::array();
+  for (const Setting& setting : advice.fix.settings)
+    settings.push_back({{"path", setting.path}, {"value", setting.value}});
+  nlohmann::ordered_json files = nlohmann::ordered_json::array();
+  for (const AdviceFile& file : advice.fix.files) files.push_back({{"from", file.from}, {"to", file.to}});
+  json["fix"] = {{"name", advice.fix.name}, {"settings", std::move(settings)}, {"files", std::move(files)}};
+  json["fix"]["removes"] = nullptr;
+  if (advice.fix.removal) json["fix"]["removes"] = textOf(*advice.fix.removal);
   return json;
 }
 

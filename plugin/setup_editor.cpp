@@ -104,9 +104,8 @@ class Editor final : public SetupEditor {
     return advisor_.read(std::chrono::milliseconds(milliseconds));
   }
   bool makeFix(const Advice& advice) override {
-    if (!advice.fix) return false;
     bool isStopped = false;
-    const bool isMade = document_.Attempt([this, &isStopped, &fix = *advice.fix] {
+    const bool isMade = document_.Attempt([this, &isStopped, &fix = advice.fix] {
       Outcome made;
       const auto make = [&](const Progress& progress) {
         made = gridbay::makeFix(document_.root(), fix, document_.path(), progress);
@@ -122,7 +121,7 @@ class Editor final : public SetupEditor {
     if (!isMade || isStopped) return false;
     document_.Touch(advice.place.page);
     document_.SetModifiedFlag();
-    document_.RecordEdit(advice.place.page, advice.fix->name);
+    document_.RecordEdit(advice.place.page, advice.fix.name);
     document_.UpdateAllViews(nullptr);
     return true;
   }

@@ -9,8 +9,7 @@
 namespace gridbay::shell {
 
 QString adviceTip(const Advice& advice) {
-  return QString::fromStdString(advice.doubt + "\n" + advice.reason +
-                                (advice.todo.empty() ? "" : "\n" + advice.todo));
+  return QString::fromStdString(advice.doubt + "\n" + advice.reason);
 }
 
 AdviceStrip::AdviceStrip(QWidget* parent) : QFrame(parent), lines_(new QVBoxLayout(this)) {
@@ -46,24 +45,21 @@ void AdviceStrip::addLine(const Advice& advice, int place) {
   show->setAutoRaise(true);
   show->setToolTip(tr("Go to what it speaks of"));
   show->setAccessibleName(show->toolTip());
-  const std::string whole = advice.doubt + (advice.todo.empty() ? "" : " " + advice.todo);
-  auto* text = new QLabel(QString::fromStdString(whole), line);
+  auto* text = new QLabel(QString::fromStdString(advice.doubt), line);
   text->setTextFormat(Qt::PlainText);
   text->setWordWrap(true);
   text->setToolTip(adviceTip(advice));
   layout->addWidget(show);
   layout->addWidget(text, 1);
   connect(show, &QToolButton::clicked, this, [this, place] { emit chosen(place); });
-  if (advice.fix) {
-    auto* fix = new QToolButton(line);
-    fix->setObjectName("fix");
-    fix->setText(tr("Fix"));
-    fix->setToolTip(QString::fromStdString(advice.fix->name));
-    fix->setAccessibleName(tr("Fix: %1").arg(fix->toolTip()));
-    fix->setFocusPolicy(Qt::StrongFocus);
-    layout->addWidget(fix);
-    connect(fix, &QToolButton::clicked, this, [this, place] { emit fixWanted(place); });
-  }
+  auto* fix = new QToolButton(line);
+  fix->setObjectName("fix");
+  fix->setText(tr("Fix"));
+  fix->setToolTip(QString::fromStdString(advice.fix.name));
+  fix->setAccessibleName(tr("Fix: %1").arg(fix->toolTip()));
+  fix->setFocusPolicy(Qt::StrongFocus);
+  layout->addWidget(fix);
+  connect(fix, &QToolButton::clicked, this, [this, place] { emit fixWanted(place); });
   lines_->addWidget(line);
 }
 

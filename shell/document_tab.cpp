@@ -319,13 +319,12 @@ void DocumentTab::showAdvice() {
 // The setup and its files may be others since the advice was given: it is worked out anew, and made where it
 // still does what was offered.
 void DocumentTab::fixAdvice(std::size_t place) {
-  if (place >= advice_.size() || !advice_[place].fix) return;
+  if (place >= advice_.size()) return;
   Advice wanted = advice_[place];
   commit();
   lookForAdvice();
   const auto now = std::ranges::find_if(advice_, [&](const Advice& each) {
-    return each.kind == wanted.kind && each.place == wanted.place && each.fix &&
-           each.fix->name == wanted.fix->name;
+    return each.kind == wanted.kind && each.place == wanted.place && each.fix.name == wanted.fix.name;
   });
   if (now == advice_.end()) return;
   wanted = *now;

@@ -57,10 +57,8 @@ MessagesDock::MessagesDock(QAction* check, QWidget* parent)
   fix_->setShortcutContext(Qt::WidgetWithChildrenShortcut);
   list_->addAction(fix_);
   list_->setContextMenuPolicy(Qt::ActionsContextMenu);
-  connect(list_, &QTreeWidget::currentItemChanged, this, [this](const QTreeWidgetItem* item) {
-    const int place = adviceAt(item);
-    fix_->setEnabled(place >= 0 && tab_->advice()[static_cast<std::size_t>(place)].fix.has_value());
-  });
+  connect(list_, &QTreeWidget::currentItemChanged, this,
+          [this](const QTreeWidgetItem* item) { fix_->setEnabled(adviceAt(item) >= 0); });
   connect(fix_, &QAction::triggered, this, [this] {
     if (const int place = adviceAt(list_->currentItem()); place >= 0) emit fixWanted(place);
   });
@@ -128,19 +126,13 @@ void MessagesDock::addAdvice(const Advice& advice, int place) {
   item->setIcon(0, toolIcon(Tool::advice));
   item->setToolTip(0, adviceTip(advice));
   auto* button = new QToolButton(list_);
-  button->setText(advice.fix ? tr("Fix") : tr("Show"));
-  button->setToolTip(QString::fromStdString(advice.fix ? advice.fix->name : advice.todo));
+  button->setText(tr("Fix"));
+  button->setToolTip(QString::fromStdString(advice.fix.name));
   button->setAutoRaise(true);
   list_->setItemWidget(item, kFixColumn, button);
   // Not at once: the button goes with the list that the fix changes.
-  const auto pressed = [this, place, isFix = advice.fix.has_value()] {
-    if (isFix) {
-      emit fixWanted(place);
-    } else if (tab_ != nullptr && place < static_cast<int>(tab_->advice().size())) {
-      emit placeChosen(PagePlace(tab_->advice()[static_cast<std::size_t>(place)].place));
-    }
-  };
-  connect(button, &QToolButton::clicked, this, pressed, Qt::QueuedConnection);
+  connect(
+      button, &QToolButton::clicked, this, [this, place] { emit fixWanted(place); }, Qt::QueuedConnection);
 }
 
 void MessagesDock::mark() {

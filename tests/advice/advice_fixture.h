@@ -135,7 +135,7 @@ class AdviceTest : public ::testing::Test {
   struct Speaks {
     std::string_view kind;
     std::string doubt;
-    std::string fix;  // its name; empty where there is none
+    std::string fix;  // its name
     std::function<void()> edit;
   };
   std::string saved() {
@@ -152,26 +152,26 @@ class AdviceTest : public ::testing::Test {
     state.AssignState(*model);
     EditHistory history;
     history.start(*model, {});
-    const Outcome made = makeFix(*model, *advice.fix, path);
+    const Outcome made = makeFix(*model, advice.fix, path);
     ASSERT_TRUE(made) << made.error();
     for (const Advice& left : look()) ADD_FAILURE() << left.kind << ": " << left.doubt;
-    EXPECT_TRUE(history.record(*model, advice.place.page, advice.fix->name, false, {}));
+    EXPECT_TRUE(history.record(*model, advice.place.page, advice.fix.name, false, {}));
     const std::string mended = saved();
     EditHistory::Touched touched;
     history.undo(*model, touched);
     EXPECT_TRUE(model->SameState(state));
     EXPECT_EQ(history.undoStep(), nullptr);
-    for (const AdviceFile& file : advice.fix->files) EXPECT_TRUE(std::filesystem::remove(file.to));
+    for (const AdviceFile& file : advice.fix.files) EXPECT_TRUE(std::filesystem::remove(file.to));
     if (!fixesByTool) return;
     folder.write("setup.v27", before);
     const test::ProgramRun run = test::runTool({"fix", path, "1"});
     EXPECT_EQ(run.status, 0) << run.err;
-    EXPECT_THAT(run.out, ::testing::StartsWith(advice.fix->name + "\n"));
+    EXPECT_THAT(run.out, ::testing::StartsWith(advice.fix.name + "\n"));
     EXPECT_EQ(test::textOf(folder.file("setup.v27")), mended);
-    for (const AdviceFile& file : advice.fix->files) EXPECT_TRUE(std::filesystem::remove(file.to));
+    for (const AdviceFile& file : advice.fix.files) EXPECT_TRUE(std::filesystem::remove(file.to));
   }
 
-  // Each case has one advice, whose fix mends it, or which says what is to be done.
+  // Each case has one advice, whose fix mends it.
   void speaks(const std::vector<Speaks>& cases) {
     for (const Speaks& each : cases) {
       SCOPED_TRACE(each.doubt);
@@ -186,9 +186,9 @@ class AdviceTest : public ::testing::Test {
       EXPECT_THAT(advice.doubt, ::testing::HasSubstr(each.doubt));
       EXPECT_FALSE(advice.reason.empty());
       EXPECT_NE(CDlgEnumerator().GetCaption(static_cast<std::int32_t>(advice.place.page)), "");
-      EXPECT_EQ(advice.fix ? advice.fix->name : "", each.fix);
-      EXPECT_EQ(advice.todo.empty(), advice.fix.has_value());
-      if (advice.fix && !theEdition.wetlandSweepKit) mends(advice);
+      EXPECT_EQ(advice.fix.name, each.fix);
+      EXPECT_FALSE(advice.fix.settings.empty() && advice.fix.files.empty() && !advice.fix.removal);
+      if (!theEdition.wetlandSweepKit) mends(advice);
     }
   }
   void isSilent(const std::vector<std::function<void()>>& edits) {

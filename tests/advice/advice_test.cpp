@@ -103,15 +103,17 @@ TEST_F(AdviceTest, AreasAndTheirFiles) {
          model->bathymetry->SetNoAreas(3);
          model->bathymetry->GetArea(3)->fileName = folder.file("third.tsb2");
        }},
-      {"projection", "There is no projection \"UTM-99\".", "Projection of area 1", [=] { own("UTM-99"); }},
+      {"projection", "There is no projection \"UTM-99\".", "Projection of area 1: WGS 84 / UTM zone 32N",
+       [=] { own("UTM-99"); }},
       {"projection", "The setup is in WGS 84 / UTM zone 33N, the file of area 1 in WGS 84 / UTM zone 32N.",
-       "Projection of area 1", [=] { own("UTM-33"); }},
+       "Projection of area 1: WGS 84 / UTM zone 32N", [=] { own("UTM-33"); }},
       {"projection",
        "The file of area 2 is in WGS 84 / UTM zone 33N, that of area 1 in WGS 84 / UTM zone 32N.",
        "Values of area 2 in the projection of area 1, in inner_nested.tsb2", zone33},
       {"projection", "The axes of area 2's file begin at 480840, 6100540",
        "Axes of area 2's file from its longitude and latitude, in inner_placed.tsb2", [=] { moved(0, 300); }},
-      {"projection", "There is no projection \"UTM-0\", in which weir 1 is given.", "Projection of weir 1",
+      {"projection", "There is no projection \"UTM-0\", in which weir 1 is given.",
+       "Projection of weir 1: WGS 84 / UTM zone 32N",
        [this] {
          weir({480100, 480200}, {6100100, 6100200}).coordinateType = "UTM-0";
        }},
@@ -164,7 +166,7 @@ TEST_F(AdviceTest, TheRun) {
          model->simulationPeriod->warmUpPeriod = 200'000'000;
        }},
       {"flood-and-dry", "The flooding depth of 0.2 m is 20 times the drying depth of 0.01 m.",
-       "Flooding depth", [=] { depths(0.01F, 0.2F); }},
+       "Flooding depth of 0.02 m", [=] { depths(0.01F, 0.2F); }},
       {"warm-up", "The warm-up ends at time step 400, the run at 360.",
        "Warm-up in the first tenth of the run", [this] { model->simulationPeriod->warmUpPeriod = 400; }},
       {"engine", "The time step is 0 s.", "Time step of 15 s", [=] { step(0); }},
@@ -220,9 +222,8 @@ TEST_F(AdviceTest, AShorterTimeStepKeepsThePeriod) {
   const DateTime end = period.End();
   const std::vector<Advice> found = look();
   ASSERT_EQ(found.size(), 1U);
-  ASSERT_TRUE(found[0].fix);
   EXPECT_EQ(found[0].site.area, 2);
-  ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
+  ASSERT_TRUE(makeFix(*model, found[0].fix, path));
   EXPECT_FLOAT_EQ(period.timeStepInterval, 20);
   EXPECT_EQ(period.noPointsInTime, 24 * 15 + 1);
   EXPECT_EQ(period.warmUpPeriod, 90);
@@ -232,7 +233,7 @@ TEST_F(AdviceTest, AShorterTimeStepKeepsThePeriod) {
   period.timeStepInterval = 300;
   period.noPointsInTime = 200'000'001;
   steps = {10, 200'000'000, 100'000'000};
-  ASSERT_TRUE(makeFix(*model, *look().at(0).fix, path));
+  ASSERT_TRUE(makeFix(*model, look().at(0).fix, path));
   EXPECT_EQ(period.LastTimeStep(), 2147483646);
   EXPECT_EQ(steps, (USubLine{150, 2147483646, 1'500'000'000}));
 }
@@ -245,7 +246,7 @@ TEST_F(AdviceTest, Series) {
   constexpr std::size_t kWhole = 13;  // two hours
   speaks({
       {"series", "tide.tsb0 ends at 1990-01-01 13:30:00, in the run, which ends at 1990-01-01 14:00:00.",
-       "End with the series", [=, this] { writeTide(smooth(10), start()); }},
+       "End with the series, at 1990-01-01 13:30:00", [=, this] { writeTide(smooth(10), start()); }},
       {"series", "tide.tsb0 begins at 1990-01-01 12:10:00, after the run does at 1990-01-01 12:00:00.",
        "Begin with the series", [=, this] { writeTide(smooth(kWhole), start().plusDays(10.0 / 1440)); }},
       {"series", "tide.tsb0 begins at 1990-01-03 12:00:00, after the run", "Move the run to the series",
@@ -269,7 +270,7 @@ TEST_F(AdviceTest, Series) {
   EXPECT_THAT(found[0].doubt, HasSubstr("has 2 missing values, the first at 1990-01-01 12:40:00."));
   EXPECT_EQ(found[0].place.thing, "boundary 1");
   // A gap lies on the line between its neighbours.
-  ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
+  ASSERT_TRUE(makeFix(*model, found[0].fix, path));
   EXPECT_EQ(model->nhdBoundary->GetItem(1)->dataFile.fileName.text(), "tide_filled.tsb0");
   const Result<TsbFile> filled = TsbFile::open(folder.file("tide_filled.tsb0"));
   ASSERT_TRUE(filled) << filled.error();
@@ -287,7 +288,7 @@ TEST_F(AdviceTest, Series) {
   model->nhdResult->outputs.SetCount(1);
   model->nhdResult->outputs.GetItem(1)->steps = {0, 360, 10};
   const DateTime end = model->simulationPeriod->End();
-  ASSERT_TRUE(makeFix(*model, *look().at(0).fix, path));
+  ASSERT_TRUE(makeFix(*model, look().at(0).fix, path));
   EXPECT_EQ(dateTimeText(start()), "1990-01-01 12:10:00");
   EXPECT_NEAR(model->simulationPeriod->End().linear(), end.linear(), 1e-9);
   EXPECT_EQ(model->nhdResult->outputs.GetItem(1)->steps, (USubLine{0, 330, 10}));
@@ -298,7 +299,7 @@ TEST_F(AdviceTest, Series) {
   model->nhdResult->outputs.SetCount(2);
   model->nhdResult->outputs.GetItem(1)->steps = {0, 360, 10};
   model->nhdResult->outputs.GetItem(2)->steps = {0, 100, 10};
-  ASSERT_TRUE(makeFix(*model, *look().at(0).fix, path));
+  ASSERT_TRUE(makeFix(*model, look().at(0).fix, path));
   EXPECT_EQ(model->simulationPeriod->LastTimeStep(), 270);
   EXPECT_EQ(model->nhdResult->outputs.GetItem(1)->steps, (USubLine{0, 270, 10}));
   EXPECT_EQ(model->nhdResult->outputs.GetItem(2)->steps, (USubLine{0, 100, 10}));
@@ -312,7 +313,7 @@ TEST_F(AdviceTest, Series) {
   model->nadMassBudget->GetMassFile(1)->steps = {0, 360, 7};
   const std::vector<Advice> ends = look();
   const auto shorter = std::ranges::find_if(
-      ends, [](const Advice& advice) { return advice.fix && advice.fix->name == "End with the series"; });
+      ends, [](const Advice& advice) { return advice.fix.name.starts_with("End with the series, at "); });
   ASSERT_NE(shorter, ends.end());
   ASSERT_TRUE(makeFix(*model, *shorter->fix, path));
   EXPECT_EQ(model->nadMassBudget->GetMassFile(1)->steps, (USubLine{0, 270, 7}));
@@ -430,7 +431,7 @@ TEST_F(AdviceTest, NamesOfFiles) {
   folder.write("fine.tsb2", "other");
   speaks({{"file-name", outside, "Copy fine.tsb2 into the setup's folder as fine_2.tsb2", fine}});
   folder.write("fine.tsb2", "fine");
-  speaks({{"file-name", outside, "Take fine.tsb2", fine}});
+  speaks({{"file-name", outside, "Take fine.tsb2 of the setup's folder", fine}});
   ASSERT_TRUE(makeFix(*model, {"Copy", {}, {{elsewhere.file("fine.tsb2"), folder.file("copy.tsb2")}}}, path));
   EXPECT_EQ(test::textOf(folder.file("copy.tsb2")), "fine");
   const auto result = [&] {
@@ -444,9 +445,8 @@ TEST_F(AdviceTest, NamesOfFiles) {
   model->bathymetry->overlandFile = "/elsewhere/fine.tsb2";
   std::vector<Advice> found = look();
   ASSERT_EQ(found.size(), 1U);
-  ASSERT_TRUE(found[0].fix);
-  EXPECT_EQ(found[0].fix->name, "Take fine.tsb2");
-  ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
+  EXPECT_EQ(found[0].fix.name, "Take fine.tsb2 of the setup's folder");
+  ASSERT_TRUE(makeFix(*model, found[0].fix, path));
   EXPECT_EQ(model->bathymetry->overlandFile.absolute(), beside);
   EXPECT_TRUE(look().empty());
   // A setup that was never saved has no folder.
@@ -462,9 +462,8 @@ TEST_F(AdviceTest, NamesOfFiles) {
   found = advisor.lookThoroughly(*model, path, source.get());
   ASSERT_EQ(found.size(), 1U);
   EXPECT_EQ(found[0].doubt, beside + " is named absolutely.");
-  ASSERT_TRUE(found[0].fix);
   EXPECT_EQ(
-      found[0].fix->settings,
+      found[0].fix.settings,
       (std::vector<Setting>{{"NESTED_MODEL_GLOBALS/BATHYMETRY_SELECTION/Overland_Filename", "fine.tsb2"}}));
 }
 

@@ -90,7 +90,7 @@ class AreaFixes : public test::AdviceTest {
   void mend() {
     const std::vector<Advice> found = look();
     ASSERT_EQ(found.size(), 1U);
-    const Outcome made = makeFix(*model, *found[0].fix, path);
+    const Outcome made = makeFix(*model, found[0].fix, path);
     ASSERT_TRUE(made) << made.error();
   }
 };
@@ -147,12 +147,13 @@ TEST_F(AreaFixes, EachMendsWhatItSpeaksOf) {
          local("inner.tsb2");
          model->bathymetry->projection = "UTM-99";
        }},
-      {"projection", "There is no projection \"UTM-99\".", "Projection of area 1",
+      {"projection", "There is no projection \"UTM-99\".", "Projection of area 1: WGS 84 / UTM zone 32N",
        [this] {
          projection("outer.tsb2", "UTM");
          model->bathymetry->projection = "UTM-99";
        }},
-      {"projection", "There is no projection \"UTM-0\", in which weir 1 is given.", "Projection of weir 1",
+      {"projection", "There is no projection \"UTM-0\", in which weir 1 is given.",
+       "Projection of weir 1: WGS 84 / UTM zone 32N",
        [this] {
          local("outer.tsb2");
          local("inner.tsb2");
@@ -281,8 +282,7 @@ TEST_F(AreaFixes, NoProjectionIsKnownAnywhere) {
   projection("inner.tsb2", "none");
   int fixes = 0;
   for (std::vector<Advice> found = look(); !found.empty() && fixes < 5; found = look()) {
-    ASSERT_TRUE(found[0].fix);
-    ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
+    ASSERT_TRUE(makeFix(*model, found[0].fix, path));
     ++fixes;
   }
   EXPECT_EQ(fixes, 3);

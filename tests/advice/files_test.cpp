@@ -47,7 +47,7 @@ TEST_F(FileFixTest, WhatIsWrittenAndReadStaysOneFile) {
            both}});
   clean();
   both();
-  ASSERT_TRUE(makeFix(*model, *look().at(0).fix, path));
+  ASSERT_TRUE(makeFix(*model, look().at(0).fix, path));
   EXPECT_EQ(model->nhdResult->outputs.GetItem(1)->file.text(), "both_2.tsb2");
   EXPECT_EQ(model->bathymetry->overlandFile.text(), "both_2.tsb2");
   EXPECT_EQ(test::textOf(folder.file("both_2.tsb2")), "held");
@@ -63,9 +63,9 @@ TEST_F(FileFixTest, ACopyForWhichThereIsNoRoomChangesNothing) {
   model->bathymetry->overlandFile = elsewhere.file("fine.tsb2");
   for (const Advice& advice : look()) {
     if (advice.kind != "file-name") continue;
-    EXPECT_EQ(advice.fix->name, "Copy fine.tsb2 into the setup's folder");
+    EXPECT_EQ(advice.fix.name, "Copy fine.tsb2 into the setup's folder");
     const std::string before = saved();
-    const Outcome made = makeFix(*model, *advice.fix, path);
+    const Outcome made = makeFix(*model, advice.fix, path);
     ASSERT_FALSE(made);
     EXPECT_THAT(made.error(), HasSubstr("No space left on device"));
     EXPECT_EQ(saved(), before);
@@ -125,13 +125,13 @@ TEST_F(OutputFixTest, EverMoreUntilItFits) {
   clean();
   both();
   room(whole / 4);
-  ASSERT_TRUE(makeFix(*model, *look().at(0).fix, path));
+  ASSERT_TRUE(makeFix(*model, look().at(0).fix, path));
   EXPECT_EQ(model->nhdResult->outputs.GetItem(1)->steps, (USubLine{0, 360, 5}));
   EXPECT_EQ(model->nadResult->outputs.GetItem(1)->steps, (USubLine{0, 360, 5}));
   clean();
   both();
   room(0.01);
-  ASSERT_TRUE(makeFix(*model, *look().at(0).fix, path));
+  ASSERT_TRUE(makeFix(*model, look().at(0).fix, path));
   EXPECT_EQ(model->nhdResult->outputs.GetItem(1)->steps, (USubLine{360, 360, 1}));
   EXPECT_EQ(model->nhdResult->outputs.GetItem(1)->part.x, (USubLine{0, 30, 2}));
   // Of the module alone.
@@ -200,7 +200,7 @@ TEST_F(OutputFixTest, EachDiskForItself) {
   const std::vector<Advice> found = look();
   ASSERT_EQ(found.size(), 1U);
   EXPECT_EQ(found[0].place.thing, "output 2");
-  ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
+  ASSERT_TRUE(makeFix(*model, found[0].fix, path));
   EXPECT_EQ(model->nhdResult->outputs.GetItem(1)->steps.interval, 1);
   EXPECT_EQ(model->nhdResult->outputs.GetItem(2)->steps.interval, 4);
 }

@@ -168,7 +168,7 @@ TEST_F(AdviceTest, WhatIsPlaced) {
        [this] {
          weir({480100, 480200, 480200, 480300}, {6100100, 6100200, 6100200, 6100200});
        }},
-      {"structure", "Weir 1 lies outside of all areas.", "Projection of weir 1",
+      {"structure", "Weir 1 lies outside of all areas.", "Projection of weir 1: WGS 84 / UTM zone 32N",
        [this] {
          weir({480100, 480200}, {6100100, 6100200}).coordinateType = "UTM-33";
        }},
@@ -245,7 +245,7 @@ TEST_F(AdviceTest, WhatIsPlaced) {
 TEST_F(AdviceTest, ASourceInALargeGridFindsWater) {
   const auto fixWith = [this](const test::Surface& surface) {
     write({"outer.tsb2", 1201, 90}, surface);
-    return look().at(0).fix->name;
+    return look().at(0).fix.name;
   };
   model->bathymetry->SetNoAreas(1);
   model->boundary->SetNoBoundaries(0);
@@ -275,8 +275,8 @@ TEST_F(AdviceTest, AllEqualPointsOfALongLineGo) {
   EXPECT_LE(found[0].site.mapPoints.size(), 1001U);
   EXPECT_EQ(found[0].site.mapPoints.front(), (AdviceSite::MapPoint{480100, 6100100}));
   EXPECT_EQ(found[0].site.mapPoints.back(), (AdviceSite::MapPoint{480100 + 1249, 6100100}));
-  EXPECT_TRUE(found[0].fix->settings.empty());
-  ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
+  EXPECT_TRUE(found[0].fix.settings.empty());
+  ASSERT_TRUE(makeFix(*model, found[0].fix, path));
   ASSERT_EQ(made.size(), 1250U);
   for (std::size_t i = 0; i < made.size(); ++i) {
     EXPECT_EQ(made[i].x, 480100.0 + static_cast<double>(i));
@@ -301,7 +301,7 @@ TEST_F(AdviceTest, TheEqualPointOfADikeGoesWithItsLevel) {
   const std::vector<Advice> found = look();
   ASSERT_EQ(found.size(), 1U);
   EXPECT_EQ(found[0].site.mapPoints.size(), 3U);
-  ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
+  ASSERT_TRUE(makeFix(*model, found[0].fix, path));
   ASSERT_EQ(made.points.size(), 2U);
   EXPECT_EQ(std::as_const(made.points)[0].z, 1);
   EXPECT_EQ(std::as_const(made.points)[1].x, 480300);

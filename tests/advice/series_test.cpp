@@ -62,8 +62,7 @@ class SeriesFixTest : public test::AdviceTest {
   void fixFirst() {
     const std::vector<Advice> found = look();
     ASSERT_FALSE(found.empty());
-    ASSERT_TRUE(found[0].fix);
-    const Outcome made = makeFix(*model, *found[0].fix, path);
+    const Outcome made = makeFix(*model, found[0].fix, path);
     ASSERT_TRUE(made) << made.error();
   }
   void expectNear(const Values& values, const Values& expected) {
@@ -159,8 +158,8 @@ TEST_F(SeriesFixTest, JumpsOfAFileThatSeveralTake) {
   }
   const std::vector<Advice> found = look();
   ASSERT_EQ(found.size(), 3U);
-  EXPECT_EQ(found[0].fix->name, "Smooth 2 values that jump and fill the gaps, in both_smooth.tsb0");
-  EXPECT_EQ(found[1].fix->name, "Fill the gaps, in both_filled.tsb0");
+  EXPECT_EQ(found[0].fix.name, "Smooth 2 values that jump and fill the gaps, in both_smooth.tsb0");
+  EXPECT_EQ(found[1].fix.name, "Fill the gaps, in both_filled.tsb0");
   fixFirst();
   EXPECT_TRUE(look().empty());
   for (int number : {1, 2})
