@@ -146,14 +146,7 @@ std::string AdviceContext::freeName(const std::string& name) {
   const std::string folder = folderOfFile(documentPath);
   if (names_.empty()) {
     names_.insert({});
-    if (const KvsFile* file = written()) {
-      eachKeyword(*file, [&](const PagePlace&, const Node& keyword) {
-        for (const Value& value : keyword.values()) {
-          if (value.kind() == ValueKind::fileName || value.kind() == ValueKind::resultFileName)
-            names_.insert(absolutePath(value.text(), folder));
-        }
-      });
-    }
+    for (const FileKeyword& each : fileKeywords()) names_.insert(absolutePath(each.name, folder));
   }
   const std::filesystem::path path(name);
   std::string free = name;
@@ -197,6 +190,26 @@ const KvsFile* AdviceContext::written() {
     }
   }
   return written_.get();
+}
+
+std::vector<FileKeyword> fileKeywordsOf(const KvsFile& file) {
+  std::vector<FileKeyword> found;
+  eachKeyword(file, [&](const PagePlace& place, const Node& keyword) {
+    if (keyword.values().size() != 1) return;
+    const Value& value = keyword.values()[0];
+    const bool isResult = value.kind() == ValueKind::resultFileName;
+    if ((isResult || value.kind() == ValueKind::fileName) && !value.text().empty())
+      found.push_back({place, std::string(value.text()), isResult});
+  });
+  return found;
+}
+
+const std::vector<FileKeyword>& AdviceContext::fileKeywords() {
+  if (!fileKeywords_) {
+    const KvsFile* file = written();
+    fileKeywords_ = file == nullptr ? std::vector<FileKeyword>() : fileKeywordsOf(*file);
+  }
+  return *fileKeywords_;
 }
 
 Advisor::Advisor() : files_(std::make_unique<DataFileFacts>()), freeMegabytes_(freeOnDisk) {}

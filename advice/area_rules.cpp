@@ -2,11 +2,13 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <cmath>
 
 #include "advice/area_fixes.h"
 #include "basic/bathymetry.h"
 #include "basic/grid_file.h"
+#include "basic/nesting.h"
 #include "structures/culvert.h"
 #include "structures/dike.h"
 #include "structures/weir.h"

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 #include "basic/grid_file.h"
 #include "core/land_value.h"
@@ -149,6 +150,8 @@ void DataFileFacts::Entry::readRows() {
   next += rows;
   if (next < static_cast<std::size_t>(grid->noK)) return;
   if (size == 1) grid->highestOfBlocks = grid->lowestOfBlocks;
+  for (int row = 0; row < grid->lowestOfBlocks.endK(); ++row)
+    grid->lowestOfRows.push_back(std::ranges::min(std::as_const(grid->lowestOfBlocks).row(row)));
   finish();
 }
 
@@ -196,9 +199,10 @@ DataFileFacts::~DataFileFacts() = default;
 
 DataFileFacts::Entry& DataFileFacts::entry(const std::string& path, std::size_t item) {
   std::unique_ptr<Entry>& found = entries_[{path, item}];
-  const std::optional<FileStamp> stamp = fileStamp(path);
   // One that is in use in this look stays, whoever writes to its file.
-  if (found == nullptr || (found->stamp != stamp && !found->isUsed)) {
+  if (found != nullptr && found->isUsed) return *found;
+  const std::optional<FileStamp> stamp = fileStamp(path);
+  if (found == nullptr || found->stamp != stamp) {
     found = std::make_unique<Entry>();
     found->stamp = stamp;
     found->path = path;

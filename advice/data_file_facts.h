@@ -36,6 +36,7 @@ struct GridFacts {
   int blockSize = 1;
   CVdArray2D<float> lowestOfBlocks;
   CVdArray2D<float> highestOfBlocks;
+  std::vector<float> lowestOfRows;     // of blocks
   CVdArray2D<std::uint32_t> lowestAt;  // its place in its block, row by row; empty where each is a point
 
   // Whether a point of the border is water.

@@ -8,18 +8,10 @@
 #include "advice/fix_files.h"
 #include "advice/rules.h"
 #include "platform/files/paths.h"
-#include "setup/page_places.h"
 #include "setup/setup_path.h"
 
 namespace gridbay {
 namespace {
-
-bool isFileName(const Node& keyword) {
-  if (keyword.values().size() != 1) return false;
-  const ValueKind kind = keyword.values()[0].kind();
-  return (kind == ValueKind::fileName || kind == ValueKind::resultFileName) &&
-         !keyword.values()[0].text().empty();
-}
 
 // Where a name stands first, and how often besides.
 struct NamedFile {
@@ -81,31 +73,24 @@ void adviseFileNames(AdviceContext& context) {
   const std::string folder = folderOfFile(context.documentPath);
   std::map<std::string, NamedFile> outside;
   std::map<std::string, NamedFile> absolute;
-  const auto note = [](std::map<std::string, NamedFile>& files, const std::string& name,
-                       const PagePlace& place, const Node& keyword) {
-    NamedFile& file = files[name];
-    const bool isResult = keyword.values()[0].kind() == ValueKind::resultFileName;
-    (isResult ? file.isResult : file.isRead) = true;
+  const auto note = [](std::map<std::string, NamedFile>& files, const FileKeyword& keyword) {
+    NamedFile& file = files[keyword.name];
+    (keyword.isResult ? file.isResult : file.isRead) = true;
     if (file.place.keyword.empty()) {
-      file.place = place;
+      file.place = keyword.place;
     } else {
-      file.further.push_back(place.keyword);
+      file.further.push_back(keyword.place.keyword);
     }
   };
-  if (const KvsFile* written = context.written()) {
-    eachKeyword(*written, [&](const PagePlace& place, const Node& keyword) {
-      if (!isFileName(keyword)) return;
-      const std::string name(keyword.values()[0].text());
-      if (name.starts_with('/') || name.starts_with("../")) note(outside, name, place, keyword);
-    });
+  for (const FileKeyword& each : context.fileKeywords()) {
+    if (each.name.starts_with('/') || each.name.starts_with("../")) note(outside, each);
   }
   if (context.source != nullptr) {
-    eachKeyword(*context.source, [&](const PagePlace& place, const Node& keyword) {
-      if (!isFileName(keyword) || isOption(place.keyword)) return;
-      const std::string name(keyword.values()[0].text());
-      if (name.starts_with('/') && !outside.contains(name) && !pathOnFile(name, folder).starts_with("../"))
-        note(absolute, name, place, keyword);
-    });
+    for (const FileKeyword& each : fileKeywordsOf(*context.source)) {
+      if (each.name.starts_with('/') && !isOption(each.place.keyword) && !outside.contains(each.name) &&
+          !pathOnFile(each.name, folder).starts_with("../"))
+        note(absolute, each);
+    }
   }
   for (const auto& [name, named] : outside) {
     std::optional<BetterName> better = inFolder(context, folder, name, named);

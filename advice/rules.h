@@ -35,6 +35,15 @@ struct GridRectangle {
   bool contains(int j, int k) const { return firstJ <= j && j <= lastJ && firstK <= k && k <= lastK; }
 };
 
+// A keyword with the name of a file, as it stands on file.
+struct FileKeyword {
+  PagePlace place;
+  std::string name;
+  bool isResult = false;
+};
+// Those of a file that name one.
+std::vector<FileKeyword> fileKeywordsOf(const KvsFile& file);
+
 // What the rules look at, and where they leave what they find.
 class AdviceContext {
  public:
@@ -69,6 +78,8 @@ class AdviceContext {
   // The setup as a save would write it, but for the points of dikes, of which there may be very many; null
   // where it can't be written.
   const KvsFile* written();
+  // Its keywords that name a file; none where it can't be written.
+  const std::vector<FileKeyword>& fileKeywords();
 
   void add(Advice advice) {
     advice.kind = kind;
@@ -83,6 +94,7 @@ class AdviceContext {
   std::set<std::string> names_;  // that the setup has, or a fix gives
   KvsHandle written_;
   bool isWritten_ = false;
+  std::optional<std::vector<FileKeyword>> fileKeywords_;
 };
 
 struct AdviceRule {

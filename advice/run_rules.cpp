@@ -54,6 +54,7 @@ Deepest deepestOf(AdviceContext& context, int number) {
   const int size = grid.blockSize;
   Deepest deepest;
   for (int k = 0; k < grid.lowestOfBlocks.endK(); ++k) {
+    if (!(-double{grid.lowestOfRows[static_cast<std::size_t>(k)]} > deepest.depth)) continue;
     const std::span<const float> row = grid.lowestOfBlocks.row(k);
     for (int j = 0; j < grid.lowestOfBlocks.endJ(); ++j) {
       const double depth = -double{row[static_cast<std::size_t>(j)]};

@@ -6,7 +6,9 @@
 #include <cmath>
 #include <filesystem>
 #include <limits>
+#include <map>
 #include <set>
+#include <utility>
 
 #include "advice/rules.h"
 #include "advice/run_steps.h"
@@ -29,9 +31,9 @@ struct UsedSeries {
   PagePlace place;
   const CheckedFile& file;
   const SeriesFacts& facts;
-  std::vector<std::uint32_t> items;   // from 1
-  bool isSmooth = false;              // its values go on without jumps in nature
-  std::vector<std::string> keywords;  // all that name it
+  std::vector<std::uint32_t> items;          // from 1
+  bool isSmooth = false;                     // its values go on without jumps in nature
+  const std::vector<std::string>& keywords;  // all that name it
 };
 
 // When its values are; nothing where its axis is none of time, or it is a single one that holds throughout.
@@ -315,38 +317,41 @@ std::vector<std::uint32_t> itemsOf(const CheckedFile& file, const SeriesFacts& f
   return items;
 }
 
-// A keyword that names a data file.
-struct NameOnFile {
-  PagePlace place;
-  std::string path;
+// The keywords that name a data file: all, and the first on each page for the entries of its lists.
+struct NamesOfFile {
+  using Place = std::pair<PageId, std::vector<int>>;
+
+  std::vector<std::string> keywords;
+  std::map<Place, std::string> first;
+
+  static Place placeOf(PageId page, const std::vector<ListEntry>& entries) {
+    Place place{page, {}};
+    for (const ListEntry& entry : entries) place.second.push_back(entry.number);
+    return place;
+  }
 };
 
-std::vector<NameOnFile> namesOnFile(AdviceContext& context) {
-  std::vector<NameOnFile> names;
-  const KvsFile* file = context.written();
-  if (file == nullptr) return names;
+// By the absolute names of the files.
+std::map<std::string, NamesOfFile> namesOnFile(AdviceContext& context) {
+  std::map<std::string, NamesOfFile> names;
   const std::string folder = folderOfFile(context.documentPath);
-  eachKeyword(*file, [&](const PagePlace& place, const Node& keyword) {
-    if (keyword.values().size() != 1 || keyword.values()[0].kind() != ValueKind::fileName) return;
-    const std::string name(keyword.values()[0].text());
-    if (!name.empty()) names.push_back({place, absolutePath(name, folder)});
-  });
+  for (const auto& [place, name, isResult] : context.fileKeywords()) {
+    if (isResult) continue;
+    NamesOfFile& file = names[absolutePath(name, folder)];
+    file.keywords.push_back(place.keyword);
+    file.first.try_emplace(NamesOfFile::placeOf(place.page, place.entries), place.keyword);
+  }
   return names;
 }
 
 // Where a file is chosen that a check has looked at.
-PagePlace placeOf(const CheckedFile& file, const std::vector<NameOnFile>& names) {
+PagePlace placeOf(const CheckedFile& file, const NamesOfFile& names) {
   PagePlace place{.page = file.page,
                   .thing = thingOf(file.page, file.entries),
                   .value = file.name,
                   .entries = file.entries};
-  const auto isOf = [&](const NameOnFile& each) {
-    const auto isSame = [](const ListEntry& a, const ListEntry& b) { return a.number == b.number; };
-    return each.place.page == file.page && each.path == file.path &&
-           std::ranges::equal(each.place.entries, file.entries, isSame);
-  };
-  if (const auto found = std::ranges::find_if(names, isOf); found != names.end())
-    place.keyword = found->place.keyword;
+  const auto found = names.first.find(NamesOfFile::placeOf(file.page, file.entries));
+  if (found != names.first.end()) place.keyword = found->second;
   return place;
 }
 
@@ -369,21 +374,18 @@ void adviseSeries(AdviceContext& context) {
     CKvsBase& object = row.object(copy);
     if (&object != copy.bathymetry.get()) object.Validate(checked, 1);
   }
-  const std::vector<NameOnFile> names = namesOnFile(context);
+  std::map<std::string, NamesOfFile> names = namesOnFile(context);
   std::vector<UsedSeries> all;
   for (const CheckedFile& file : checked.files) {
     if (!file.coversRun || file.path.empty()) continue;
     const SeriesFacts* facts = context.files.series(file.path);
     if (facts == nullptr || facts->file.time.count == 0) continue;
-    PagePlace place = placeOf(file, names);
+    const NamesOfFile& named = names[file.path];
+    if (named.keywords.empty()) continue;  // of a setup that can't be written, which a save tells
+    PagePlace place = placeOf(file, named);
     // Of what goes on by levels, as a rating curve, nothing is known.
     const bool smooth = isSmooth(place) && momentAt(context, facts->file.time, 0).valid();
-    std::vector<std::string> keywords;
-    for (const NameOnFile& each : names) {
-      if (each.path == file.path) keywords.push_back(each.place.keyword);
-    }
-    if (keywords.empty()) continue;  // of a setup that can't be written, which a save tells
-    all.push_back({std::move(place), file, *facts, itemsOf(file, *facts), smooth, std::move(keywords)});
+    all.push_back({std::move(place), file, *facts, itemsOf(file, *facts), smooth, named.keywords});
   }
   for (const UsedSeries& used : all) adviseOne(context, used, all);
 }

@@ -15,6 +15,7 @@
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "hydrodynamic/result.h"
+#include "hydrodynamic/source_sink.h"
 #include "mud_transport_expanded/task_selection.h"
 #include "platform/cartography/cartography.h"
 #include "platform/tsb/tsb_writer.h"
@@ -47,6 +48,24 @@ std::string writeGrid(std::size_t side, int number = 1, double spacing = 30, dou
   return path;
 }
 
+// A discharge (m3/s) and velocity (m/s) every ten minutes from a moment.
+std::string writeDischarge(const DateTime& start) {
+  constexpr std::size_t kSteps = 1000;
+  TsbDefinition series;
+  series.time.start = *start.parts();
+  series.time.unit = "min";
+  series.time.step = 10;
+  series.time.count = kSteps;
+  series.items = {{"Discharge", 100012, "m^3/s"}, {"Velocity", 100010, "m/s"}};
+  const std::string path = (std::filesystem::temp_directory_path() / "gridbay-bench-advice.tsb0").string();
+  const std::vector<float> values(kSteps, 1);
+  Result<TsbWriter> writer = TsbWriter::create(path, series);
+  if (!writer || !writer->write(1, 0, std::span<const float>(values)) ||
+      !writer->write(2, 0, std::span<const float>(values)) || !writer->commit())
+    std::abort();
+  return path;
+}
+
 // By the points of the grid in each direction and those of a dike.
 void lookForAdvice(benchmark::State& state) {
   const std::string path = writeGrid(static_cast<std::size_t>(state.range(0)));
@@ -68,8 +87,8 @@ BENCHMARK(lookForAdvice)
     ->Args({121, 100000})
     ->Args({10000, 4});
 
-// A setup with much of everything: areas in each other, sources on land and off it, structures, outputs, and
-// in all modules that many components or fractions.
+// A setup with much of everything: areas in each other, sources of which some lie in a boundary, structures,
+// outputs, and in all modules that many components or fractions.
 void lookAtAHugeSetup(benchmark::State& state) {
   constexpr std::size_t kSide = 1000;
   constexpr int kAreas = 9;
@@ -79,15 +98,15 @@ void lookAtAHugeSetup(benchmark::State& state) {
   CGlobalKvs model;
   model.bathymetry->projection = "UTM-32";
   model.bathymetry->SetNoAreas(kAreas);
-  std::vector<std::string> grids;
+  std::vector<std::string> files;
   double spacing = 30;
   double off = 0;
   constexpr int kOrigin = 3;
   for (int number = 1; number <= kAreas; ++number) {
-    grids.push_back(writeGrid(kSide, number, spacing, off));
+    files.push_back(writeGrid(kSide, number, spacing, off));
     off += kOrigin * spacing;
     spacing /= 3;
-    model.bathymetry->GetArea(number)->fileName = grids.back();
+    model.bathymetry->GetArea(number)->fileName = files.back();
     model.bathymetry->GetArea(number)->origin = {kOrigin, kOrigin};
   }
   model.simulationPeriod->timeStepInterval = 0.001F;
@@ -100,8 +119,12 @@ void lookAtAHugeSetup(benchmark::State& state) {
   model.boundary->GetItem(1)->Set(0, 0, 0, kSide - 1);
   const auto sources = static_cast<int>(state.range(0));
   model.sourceSink->SetNoSources(sources);
-  for (int number = 1; number <= sources; ++number)
+  files.push_back(writeDischarge(model.simulationPeriod->start));
+  for (int number = 1; number <= sources; ++number) {
     model.sourceSink->GetItem(number)->source = {number % 20 == 0 ? 0 : 900, number % 900 + 1};
+    model.nhdSourceSink->GetItem(number)->dataFormat = CNhdSourceSinkObjectKvs::kFromFile;
+    model.nhdSourceSink->GetItem(number)->dataFile.fileName = files.back();
+  }
   model.nhdWeir->SetCount(kStructures);
   for (int number = 1; number <= kStructures; ++number) {
     CNhdWeirObjectKvs& weir = *model.nhdWeir->GetItem(number);
@@ -120,7 +143,7 @@ void lookAtAHugeSetup(benchmark::State& state) {
   const std::vector<Advice> found = advisor.lookThoroughly(model, setup);
   for (auto _ : state) benchmark::DoNotOptimize(advisor.look(model, setup));
   state.counters["advice"] = static_cast<double>(found.size());
-  for (const std::string& grid : grids) std::filesystem::remove(grid);
+  for (const std::string& file : files) std::filesystem::remove(file);
 }
 BENCHMARK(lookAtAHugeSetup)
     ->Unit(benchmark::kMillisecond)

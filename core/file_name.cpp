@@ -11,8 +11,9 @@ std::string FileNameValue::absolute() const {
 }
 
 std::string FileNameValue::onFile(const std::string& documentPath) const {
+  if (name_.empty()) return name_;
   const std::string folder = folderOfFile(documentPath);
-  const bool asGiven = name_.empty() || (std::filesystem::path(name_).is_relative() && folder_ == folder);
+  const bool asGiven = std::filesystem::path(name_).is_relative() && folder_ == folder;
   return asGiven ? name_ : pathOnFile(absolute(), folder);
 }
 

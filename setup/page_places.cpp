@@ -339,7 +339,9 @@ int rowOfPolygon(std::string_view text) {
   return text == texts::pointOutsideGrid.format ? 3 : 0;
 }
 
-PagePlace placeOfKeyword(std::string path, const std::vector<ListEntry>& entries) {
+// What the keywords of a section have in common, by its path with a slash behind it, which is their keyword
+// but for the name.
+PagePlace placeOfSection(std::string path, const std::vector<ListEntry>& entries) {
   const auto* row = std::ranges::find_if(kPages, [&](const PageRow& each) { return isIn(path, each.path); });
   PagePlace place{.keyword = std::move(path)};
   if (row == std::end(kPages)) return place;
@@ -357,33 +359,39 @@ std::string_view stemOf(std::string_view name) {
   return end == name.npos ? name : name.substr(0, end + 1);
 }
 
+// Of a section by its path, which ends in a slash but for the target's own. A file may have very many
+// keywords: where they stand is found once for all of a section.
 void eachIn(const Node& section, const std::string& path, std::vector<ListEntry>& entries,
             const std::function<void(const PagePlace& place, const Node& keyword)>& tell) {
   struct Like {
     int seen = 0;
     int all = 0;
   };
-  std::map<std::string, Like, std::less<>> named;
-  std::map<std::string, int, std::less<>> stems;
+  std::map<std::string_view, Like> named;
+  std::map<std::string_view, int> stems;
   for (const Node* node = section.first(); node != nullptr; node = node->next()) {
     if (!node->isSection()) continue;
-    ++named[std::string(node->name())].all;
-    ++stems[std::string(stemOf(node->name()))];
+    ++named[node->name()].all;
+    ++stems[stemOf(node->name())];
   }
+  std::optional<PagePlace> place;
   for (const Node* node = section.first(); node != nullptr; node = node->next()) {
-    std::string here = path + (path.empty() ? "" : "/") + std::string(node->name());
     if (!node->isSection()) {
-      tell(placeOfKeyword(std::move(here), entries), *node);
+      if (!place) place = placeOfSection(path, entries);
+      place->keyword.replace(path.size(), std::string::npos, node->name());
+      tell(*place, *node);
       continue;
     }
-    Like& like = named[std::string(node->name())];
+    std::string here = path + std::string(node->name());
+    Like& like = named[node->name()];
     if (++like.seen > 1) here += fmt::format("[{}]", like.seen);
+    here += '/';
     const std::string_view stem = stemOf(node->name());
     const bool isNumbered = stem.ends_with('_') && stem.size() < node->name().size();
     const bool isRepeated = like.all > 1 || node->name().ends_with("_data");
     if (isNumbered) {
       const int number = std::atoi(std::string(node->name().substr(stem.size())).c_str());
-      entries.push_back({number, stems[std::string(stem)]});
+      entries.push_back({number, stems[stem]});
     } else if (isRepeated) {
       entries.push_back({like.seen, like.all});
     }

@@ -185,6 +185,9 @@ TEST_F(AreaFixes, EachMendsWhatItSpeaksOf) {
          water(2.5F);
        }},
   });
+  speaks({{"land-value", "The highest point of area 1 lies at 5 m",
+           "Turn the depths of area 1 to elevations, in outer_turned.tsb2",
+           [=] { outer([](int j, int) { return j < 15 ? 5.0F : 2.0F; }); }}});
   isSilent({
       [=] {  // all of it is to be flooded
         outer(low);
