@@ -49,6 +49,14 @@ Result<std::vector<NewArea>> areasOf(const NewSetupOptions& options) {
   return areas;
 }
 
+// How the place of an area is told, where it is missing or what was given is none.
+std::string_view hintFor(const AreaFault& fault, const std::vector<NewArea>& areas) {
+  if (fault.area == 0 || areas[fault.area - 1].origin) return {};
+  if (!fault.isOfFile) return fault.area > 1 ? ", as --area FILE@J,K" : "";
+  const bool hasPlace = areas[fault.area - 1].file.find('@') != std::string::npos;
+  return hasPlace ? "; where an area lies is told as FILE@J,K, by two whole numbers" : "";
+}
+
 int newSetup(const NewSetupOptions& options, const Console& console) {
   const Result<std::vector<NewArea>> areas = areasOf(options);
   if (!areas) return console.fail(areas.error());
@@ -59,7 +67,8 @@ int newSetup(const NewSetupOptions& options, const Console& console) {
   ConsoleMessageHost host(console);
   SetupFile setup(&host);
   CGlobalKvs& model = setup.model();
-  if (const auto fault = layAreas(model, *areas)) return console.fail(fault->text);
+  if (const auto fault = layAreas(model, *areas))
+    return console.fail(fmt::format("{}{}", fault->text, hintFor(*fault, *areas)));
   if (!options.start.empty()) {
     const std::optional<DateTime> start = dateTimeOfText(options.start);
     if (!start)

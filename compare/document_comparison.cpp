@@ -1,15 +1,13 @@
 #include "compare/document_comparison.h"
 
-#include <algorithm>
-#include <map>
 #include <optional>
 #include <set>
-#include <string_view>
 
 #include "compare/compared_model.h"
 #include "compare/difference_packing.h"
-#include "compare/setup_merge.h"
-#include "platform/packing.h"
+#include "compare/document_change.h"
+#include "compare/document_merging.h"
+#include "compare/tree_packing.h"
 
 namespace gridbay {
 namespace {
@@ -27,13 +25,26 @@ void makeReadOnly(Form& form) {
 
 class DocumentComparison final : public SetupComparison {
  public:
-  explicit DocumentComparison(CV27SetupDoc& document) : document_(document) {}
+  explicit DocumentComparison(CV27SetupDoc& document) : document_(document), merging_(document) {}
 
-  std::string open(const std::string& path) override {
-    Result<SetupFile> opened = SetupFile::open(path, nullptr);
-    if (!opened) return opened.error();
+  std::string read(const std::string& path) const override {
+    const Result<SetupFile> opened = SetupFile::open(path, nullptr);
+    std::string fault = opened ? std::string() : opened.error();
+    Packing pack;
+    pack(fault);
+    if (opened) passTree(pack, opened->source());
+    return std::move(pack.bytes());
+  }
+  std::string open(const std::string& path, const std::string& read) override {
+    std::string fault;
+    KvsHandle file;
+    Packing pack(read);
+    pack(fault);
+    if (fault.empty()) pack(file);
+    if (fault.empty() && (file == nullptr || !pack.isWhole())) fault = "What was read is incomplete";
+    if (!fault.empty()) return fault;
     close();
-    other_ = std::make_unique<SetupFile>(std::move(*opened));
+    other_ = std::make_unique<SetupFile>(SetupFile::fromTree(std::move(file), path, nullptr));
     otherPath_ = path;
     return {};
   }
@@ -118,61 +129,7 @@ class DocumentComparison final : public SetupComparison {
     return takeKeywords(paths, 0, "Take over all");
   }
 
-  std::string startMerge(const std::string& base, const std::string& own, const std::string& other) override {
-    merge_ = {};
-    Result<SetupFile> baseSetup = SetupFile::open(base, nullptr);
-    if (!baseSetup) return baseSetup.error();
-    Result<SetupFile> otherSetup = SetupFile::open(other, nullptr);
-    if (!otherSetup) return otherSetup.error();
-    std::optional<SetupFile> ownSetup;
-    if (!own.empty()) {
-      Result<SetupFile> opened = SetupFile::open(own, nullptr);
-      if (!opened) return opened.error();
-      ownSetup = std::move(*opened);
-    }
-    // Names of files in the result start where those of its first setup do.
-    const std::string& path = merge_.path = own.empty() ? document_.path() : own;
-    merge_.base = baseSetup->tree(path);
-    merge_.own = ownSetup ? ownSetup->tree(path) : document_.file().tree(path);
-    merge_.other = otherSetup->tree(path);
-    merge_.source = withOptions(ownSetup ? ownSetup->source() : document_.file().source(), *merge_.own);
-    merge_.isOfFiles = ownSetup.has_value();
-    merge_.conflicts = mergeTrees(*merge_.base, *merge_.own, *merge_.other, [](const MergeConflict&) {
-                         return MergeSide::own;
-                       }).conflicts;
-    for (const MergeConflict& conflict : merge_.conflicts) merge_.questions.push_back(questionOf(conflict));
-    return {};
-  }
-  std::string wordQuestions() const override {
-    return packed(questionsOf(merge_.conflicts, *merge_.base, *merge_.own, *merge_.other, merge_.path,
-                              document_.units()));
-  }
-  bool takeQuestions(const std::string& words) override {
-    std::vector<MergeQuestion> questions;
-    if (!unpack(words, questions) || questions.size() != merge_.questions.size()) return false;
-    merge_.questions = std::move(questions);
-    return true;
-  }
-  std::vector<MergeQuestion>& questions() override { return merge_.questions; }
-  std::string finishMerge() override {
-    if (merge_.own == nullptr) return "There is nothing to merge";
-    std::map<std::string, MergeSide> sides;
-    for (const MergeQuestion& question : merge_.questions)
-      sides[question.path] = question.takesOther ? MergeSide::other : MergeSide::own;
-    const MergedTree merged = mergeTrees(*merge_.base, *merge_.own, *merge_.other,
-                                         [&](const MergeConflict& conflict) { return sides[conflict.path]; });
-    const KvsHandle before =
-        merge_.isOfFiles ? document_.file().tree(document_.path()) : std::move(merge_.own);
-    const Merge merge = std::move(merge_);
-    merge_ = {};
-    return bring({.before = *before,
-                  .after = *merged.file,
-                  .source = *merge.source,
-                  .path = merge.path,
-                  .isOfFiles = merge.isOfFiles,
-                  .nothing = "The second setup has changed nothing that is not here already"},
-                 0, "Merge");
-  }
+  SetupMerging& merging() override { return merging_; }
 
  private:
   // What a look was at: the state of the setup and its path, which setup was beside it, and in which units.
@@ -191,66 +148,17 @@ class DocumentComparison final : public SetupComparison {
       return "What makes this difference is not known: take over the keywords that it follows from, or all";
     const std::string& path = document_.path();
     const KvsHandle own = document_.file().tree(path);
-    const KvsHandle taken =
-        withTaken(*own, *other_->tree(path), [&](const std::string& each) { return paths.contains(each); });
-    return bring(
-        {.before = *own,
-         .after = *taken,
-         .source = document_.file().source(),
-         .path = path,
-         .nothing = "It follows from other values, or is none of the model, and can't be taken over alone"},
-        page, name);
+    DocumentChange change =
+        changeOf({.before = *own,
+                  .beforePath = path,
+                  .after = withTaken(*own, *other_->tree(path),
+                                     [&](const std::string& each) { return paths.contains(each); }),
+                  .path = path,
+                  .source = document_.file().source()});
+    if (change.isNone())
+      return "It follows from other values, or is none of the model, and can't be taken over alone";
+    return makeChange(document_, std::move(change), static_cast<PageId>(page), name);
   }
-
-  // What a step makes of the document.
-  struct Change {
-    const KvsFile& before;  // as a save writes it
-    const KvsFile& after;
-    const KvsFile& source;          // whose options are exchanged
-    const std::string& path;        // that file names in `after` start from
-    bool isOfFiles = false;         // whose unknown sections come too
-    std::string_view nothing = {};  // what is said where nothing changes
-  };
-
-  // Gives the document what differs between two files. Parts of the model that are the same in both keep what
-  // stands on no file.
-  std::string bring(const Change& change, std::int32_t page, const std::string& name) {
-    CGlobalKvs from;
-    from.Load(&change.before.tree().root(), document_.path());
-    CGlobalKvs to;
-    to.Load(&change.after.tree().root(), change.path);
-    const bool keepsSource = !change.isOfFiles && sameOptions(change.before, change.after);
-    if (keepsSource && from.SameState(to)) return std::string(change.nothing);
-    KvsHandle source = keepsSource ? nullptr : withOptions(change.source, change.after);
-    const bool isDone = document_.Attempt([&] {
-      const std::vector<CKvsBase*> parts = document_.root().children();
-      const std::vector<CKvsBase*> olds = from.children();
-      const std::vector<CKvsBase*> news = to.children();
-      for (std::size_t i = 0; i < parts.size(); ++i) {
-        if (!olds[i]->SameState(*news[i])) parts[i]->AssignState(*news[i]);
-      }
-    });
-    if (!isDone) return "The edit could not be made";
-    if (source != nullptr) document_.ReplaceSource(std::move(source));
-    const auto id = static_cast<PageId>(page);
-    if (page != 0) document_.Touch(id);
-    document_.SetModifiedFlag();
-    document_.RecordEdit(id, name);
-    document_.UpdateAllViews(nullptr);
-    return {};
-  }
-
-  // Three setups on their way to one.
-  struct Merge {
-    KvsHandle base = {};
-    KvsHandle own = {};
-    KvsHandle other = {};
-    KvsHandle source = {};  // of the first of the two
-    std::string path = {};
-    bool isOfFiles = false;  // and not of the document
-    std::vector<MergeConflict> conflicts = {};
-    std::vector<MergeQuestion> questions = {};
-  };
 
   CV27SetupDoc& document_;
   std::unique_ptr<SetupFile> other_;
@@ -262,7 +170,7 @@ class DocumentComparison final : public SetupComparison {
   KvsHandle shownFile_;
   std::unique_ptr<ComparedModel> shown_;
   CV27SetupFormView* page_ = nullptr;
-  Merge merge_;
+  DocumentMerging merging_;
 };
 
 }  // namespace

@@ -48,14 +48,40 @@ struct MergeQuestion {
   bool takesOther = false;
 };
 
-// An open setup beside another one, which is never changed. All of it is virtual, as a host links nothing of
-// it. What takes long changes nothing here and hands back bytes, so that a copy of the process can do it.
+// Two setups that have come from a third, on their way to one, which an open setup becomes. All of it is
+// virtual, as a host links nothing of it. What takes long changes nothing here and hands back bytes, so that
+// a copy of the process can do it.
+class SetupMerging {
+ public:
+  virtual ~SetupMerging() = default;
+
+  // Reads the setups: the one that two have come from, and these; for an empty `own` the open one as it is
+  // now. What is found, for `start`, which tells what is wrong, or nothing.
+  virtual std::string read(const std::string& base, const std::string& own,
+                           const std::string& other) const = 0;
+  virtual std::string start(const std::string& found) = 0;
+  // Sections of the other setup that this version does not know, by their paths, and that the first has not
+  // alike: they are left out.
+  virtual const std::vector<std::string>& leftOut() const = 0;
+  // What is to be chosen, by its paths, or in the words of the pages once these are worked out and taken.
+  virtual std::vector<MergeQuestion>& questions() = 0;
+  virtual std::string word() const = 0;
+  virtual bool takeWords(const std::string& words) = 0;
+  // Works out the result by what was chosen, for `finish`, which puts it in the place of the setup as one
+  // step. What is wrong, or empty.
+  virtual std::string make() const = 0;
+  virtual std::string finish(const std::string& made) = 0;
+};
+
+// An open setup beside another one, which is never changed. As above, what takes long hands back bytes.
 class SetupComparison {
  public:
   virtual ~SetupComparison() = default;
 
-  // Reads the setup to compare with; what is wrong, or empty, when nothing has been compared yet.
-  virtual std::string open(const std::string& path) = 0;
+  // Reads the setup to compare with: what is read, for `open`, which tells what is wrong, or nothing when
+  // nothing has been compared yet.
+  virtual std::string read(const std::string& path) const = 0;
+  virtual std::string open(const std::string& path, const std::string& read) = 0;
   virtual void close() = 0;
   virtual bool isOpen() const = 0;
   virtual std::string otherPath() const = 0;
@@ -79,15 +105,7 @@ class SetupComparison {
   virtual std::string takeOverPage(std::int32_t id) = 0;
   virtual std::string takeOverAll() = 0;
 
-  // Reads the setups to merge: the one that two have come from, and these; for an empty `own` this setup as
-  // it is now. What is wrong, or empty. Then what is to be chosen, by its paths, or in the words of the pages
-  // once these are worked out and taken; and the result in place of the setup, as one step.
-  virtual std::string startMerge(const std::string& base, const std::string& own,
-                                 const std::string& other) = 0;
-  virtual std::string wordQuestions() const = 0;
-  virtual bool takeQuestions(const std::string& words) = 0;
-  virtual std::vector<MergeQuestion>& questions() = 0;
-  virtual std::string finishMerge() = 0;
+  virtual SetupMerging& merging() = 0;
 };
 
 }  // namespace gridbay

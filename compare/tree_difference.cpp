@@ -49,8 +49,10 @@ const Node* targetOf(const KvsFile& file) {
   return kvsTargetByNameNum(file, CGlobalKvs::kTarget, 1);
 }
 
+constexpr std::string_view kOptions = "OPTION_PARAMETERS";
+
 bool isOptions(const Node& section) {
-  return isOption(std::string(section.name()) + '/');
+  return sameName(section.name(), kOptions);
 }
 
 bool hasOptions(const Node& section) {
@@ -78,6 +80,20 @@ void writeWithOptions(const NodeGroup<2>& sections, KvsFile& file) {
   }
 }
 
+// The options that a save writes, in sections of the top: there a save looks for them by the name of the
+// section that they stand in, wherever that is.
+void writeOptions(const Node& section, KvsFile& file) {
+  for (const Node* node = section.first(); node != nullptr; node = node->next()) {
+    if (!node->isSection() || isOptions(*node)) continue;
+    if (const Node* options = node->section(kOptions)) {
+      kvsAddSection(file, node->name());
+      writeNode(*options, file);
+      kvsEndSection(file);
+    }
+    writeOptions(*node, file);
+  }
+}
+
 }  // namespace
 
 std::vector<KeywordDifference> differencesOf(const Node& own, const Node& other) {
@@ -100,9 +116,13 @@ bool sameOptions(const KvsFile& a, const KvsFile& b) {
 }
 
 KvsHandle withOptions(const KvsFile& file, const KvsFile& other) {
+  const KvsHandle options = kvsCreate();
+  kvsAddTarget(*options, CGlobalKvs::kTarget);
+  writeOptions(*targetOf(other), *options);
+  kvsEndSection(*options);
   KvsHandle made = kvsCreate();
   kvsAddTarget(*made, CGlobalKvs::kTarget);
-  writeWithOptions({targetOf(file), targetOf(other)}, *made);
+  writeWithOptions({targetOf(file), targetOf(*options)}, *made);
   kvsEndSection(*made);
   return made;
 }

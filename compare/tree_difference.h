@@ -29,7 +29,8 @@ KvsHandle withTaken(const KvsFile& own, const KvsFile& other,
 
 // Whether two files of setups have the same options of the engine.
 bool sameOptions(const KvsFile& a, const KvsFile& b);
-// A file of a setup with the options of another one, as far as that has sections for them.
+// A file of a setup that a save passes on the options of another one from, as far as that has sections for
+// them.
 KvsHandle withOptions(const KvsFile& file, const KvsFile& other);
 
 }  // namespace gridbay

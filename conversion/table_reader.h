@@ -22,6 +22,8 @@ struct TableColumn {
   std::string name;
   std::string unit;  // of the values, as data files have it; empty for the base unit of the item type
   int itemType = 0;  // by its code; 0 for none that is known
+
+  bool operator==(const TableColumn&) const = default;
 };
 
 // How a table of text is to be read. It has one column of times, or one of dates with or without a clock.

@@ -1,264 +1,198 @@
 #include "plugin/series_places.h"
 
 #include <algorithm>
+#include <map>
 #include <set>
+#include <tuple>
 
-#include "compare/compared_model.h"
 #include "pages/grid_wnd.h"
-#include "setup/setup_doc.h"
+#include "plugin/series_rehearsal.h"
 
 namespace gridbay {
 namespace {
 
 constexpr std::size_t kMostPlaces = 200;
-constexpr std::string_view kSeries = "tsb0";
+constexpr int kMostTrials = 300;  // of formats, on a page
+constexpr int kEnough = 3;        // rows in which a format asked for no series
 
-// Answers who asks for a file: with the series, where it is one that is asked for.
-class SeriesGiver final : public NoHost {
- public:
-  explicit SeriesGiver(std::string file) : file_(std::move(file)) {
-    isReadable_ = tsbFileRead(file_, &header_) == 0;
+// The frame around a control, as what its name is said of; empty for none.
+std::string frameOf(const Control& control) {
+  for (const Control* group = control.group; group != nullptr; group = group->group) {
+    if (const std::string name = group->name(); !name.empty()) return name + ", ";
   }
-
-  // The items that are to be taken; none for whichever fit.
-  void wish(std::vector<std::uint32_t> items) { wished_ = std::move(items); }
-  bool isReadable() const { return isReadable_; }
-  const std::string& file() const { return file_; }
-
-  // One way of taking the series.
-  struct Way {
-    std::vector<std::uint32_t> items = {};
-    std::string item = {};
-    std::string doubt = {};
-  };
-  // What the last button has led to: the ways, or what was asked for in place of them.
-  void forget() {
-    ways_.clear();
-    refused_.clear();
-  }
-  const std::vector<Way>& ways() const { return ways_; }
-  const std::string& refused() const { return refused_; }
-
-  bool choose(CVdFileSelectorDlg& selector) override {
-    // Some name no extension of their own.
-    const bool isOfSeries =
-        selector.kind() == kSeries || selector.filter().find(kSeries) != std::string::npos;
-    if (!isReadable_ || !isOfSeries) return false;
-    findWays(selector);
-    if (ways_.empty()) return false;
-    selector.SetFileName(file_);
-    if (!selector.GetSelectedItems().empty())
-      selector.SetSelectedItems(wished_.empty() ? ways_.front().items : wished_);
-    return true;
-  }
-
- private:
-  std::vector<std::uint32_t> itemsFor(const CVdRqTsbItem& request) const {
-    std::vector<std::uint32_t> fitting;
-    for (int number = 1; number <= tsbGetNoOfItems(header_); ++number) {
-      if (request.fault(header_, number).empty()) fitting.push_back(static_cast<std::uint32_t>(number));
-    }
-    return fitting;
-  }
-  std::string nameOf(std::uint32_t item) { return tsbItemD(header_, static_cast<int>(item))->name; }
-
-  void findWays(const CVdFileSelectorDlg& selector) {
-    std::vector<std::vector<std::uint32_t>> fitting;
-    for (const auto& request : selector.requests()) {
-      fitting.push_back(itemsFor(*request));
-      if (!fitting.back().empty()) continue;
-      refused_ = request->description();
-      return;
-    }
-    const std::size_t chosen = selector.GetSelectedItems().size();
-    std::string why;
-    if (chosen == 0 || fitting.empty()) {
-      selector.IsTsbFileValid(file_, &why);
-      ways_.push_back({std::vector<std::uint32_t>(chosen, 1), {}, why});
-      return;
-    }
-    // Where one item is asked for each that fits will do.
-    const std::size_t count = fitting.size() == 1 ? fitting.front().size() : 1;
-    for (std::size_t n = 0; n < count; ++n) {
-      Way way{.items = selector.GetSelectedItems()};
-      for (std::size_t i = 0; i < std::min(chosen, fitting.size()); ++i)
-        way.items[i] = fitting[i][i == 0 ? n : std::min(i, fitting[i].size() - 1)];
-      if (fitting.size() == 1) way.item = nameOf(way.items.front());
-      why.clear();
-      if (!selector.IsTsbFileValid(file_, way.items, &why)) way.doubt = why;
-      ways_.push_back(std::move(way));
-    }
-  }
-
-  std::string file_;
-  TsbHeader header_;
-  bool isReadable_ = false;
-  std::vector<std::uint32_t> wished_;
-  std::vector<Way> ways_;
-  std::string refused_;
-};
-
-KvsHandle fileOf(CV27SetupDoc& document) {
-  // A save may leave out what can't be written, of a copy only.
-  CGlobalKvs copy;
-  copy.AssignState(document.root());
-  KvsHandle file = kvsCreate();
-  copy.Save(*file, document.path());
-  return file;
+  return {};
 }
 
-// A copy of a document whose buttons are pressed with nobody to see it.
-class Rehearsal {
+// The button behind the edit of a file.
+bool isBrowse(Form& form, int control) {
+  const auto place = static_cast<std::size_t>(control);
+  const Control& button = form.controls()[place];
+  return place > 0 && button.kind == ControlKind::button && button.usable() &&
+         form.controls()[place - 1].isFile;
+}
+bool isBrowse(const CellStyle& style) {
+  return style.kind == CellKind::button && style.enabled && style.value.find("...") != style.value.npos &&
+         !style.value.starts_with("View");
+}
+
+class PlaceFinder {
  public:
-  Rehearsal(CV27SetupDoc& document, const std::string& file)
-      : document_(document),
-        giver_(file),
-        file_(fileOf(document)),
-        model_(*file_, document.path(), document.units(), &giver_) {
-    model_.assign(document.root());
-  }
+  PlaceFinder(CV27SetupDoc& document, const std::string& file) : copy_(document, file) {}
 
+  // What asks for a series as it is, and then what does so with another format.
   SeriesPlaces find() {
-    if (!giver_.isReadable()) return {};
-    for (const ComparedPage& page : model_.pages()) {
-      if (isFull()) break;
-      if (model_.isVisible(page.id) && model_.page(page.id) != nullptr) findOn(page);
+    if (!copy_.giver().isReadable()) return {};
+    for (const bool triesFormats : {false, true}) {
+      triesFormats_ = triesFormats;
+      others_.clear();
+      for (const ComparedPage& page : copy_.model().pages()) {
+        if (isFull()) break;
+        if (copy_.model().isVisible(page.id) && copy_.model().page(page.id) != nullptr) findOn(page);
+      }
+      found_.others.insert(found_.others.end(), others_.begin(), others_.end());
     }
-    found_.others.assign(others_.begin(), others_.end());
     return std::move(found_);
-  }
-
-  std::string put(const SeriesPlace& place) {
-    const std::string gone = "The page does not ask for such a file any more";
-    CV27SetupFormView* page = model_.isVisible(place.page) ? model_.page(place.page) : nullptr;
-    if (page == nullptr) return gone;
-    show(*page, masterOf(*page), place.currentRow);
-    if (place.control >= static_cast<int>(page->form().controls().size())) return gone;
-    giver_.wish(place.items);
-    press(*page, place.control, place.row, place.column);
-    if (giver_.ways().empty() || !place.name.ends_with(model_.lastEdit())) return gone;
-    const bool isTaken = document_.Attempt([this] { document_.root().AssignState(model_.root()); });
-    if (!isTaken) return "The file can't be taken there";
-    const auto id = static_cast<PageId>(place.page);
-    document_.Touch(id);
-    document_.SetModifiedFlag();
-    document_.RecordEdit(id, model_.lastEdit());
-    document_.UpdateAllViews(nullptr);
-    return {};
   }
 
  private:
   bool isFull() const { return found_.places.size() >= kMostPlaces; }
-  // The table whose current row decides what the rest of the page shows; null for none.
-  static CV27SetupGridWnd* masterOf(CV27SetupFormView& page) {
-    for (const Control& control : page.form().controls()) {
-      if (control.grid != nullptr && control.grid->CurrentRow()) return control.grid;
-    }
-    return nullptr;
-  }
-  static void show(CV27SetupFormView& page, CV27SetupGridWnd* master, int currentRow) {
-    if (master != nullptr && currentRow > 0) master->OnCurrentRow(currentRow);
-    page.OnUpdate();
-  }
 
   void findOn(const ComparedPage& entry) {
-    CV27SetupFormView& page = *model_.page(entry.id);
+    CV27SetupFormView& page = *copy_.model().page(entry.id);
     page.OnUpdate();
-    CV27SetupGridWnd* master = masterOf(page);
+    trials_ = 0;
+    CV27SetupGridWnd* master = SeriesRehearsal::masterOf(page);
     const int rows = master == nullptr ? 0 : master->GetRowCount();
     for (int current = std::min(rows, 1); current <= rows && !isFull(); ++current) {
-      show(page, master, current);
+      SeriesRehearsal::show(page, current);
       for (int i = 0; i < static_cast<int>(page.form().controls().size()) && !isFull(); ++i) {
         const Control& control = page.form().controls()[static_cast<std::size_t>(i)];
+        const SeriesPlace place{
+            .page = entry.id, .name = entry.caption + ": ", .currentRow = current, .control = i};
         if (control.grid != nullptr) {
           // Its rows are not of the row that is current.
-          if (current <= 1 || control.grid != master) findIn(entry, *control.grid, current, i);
+          if (current <= 1 || control.grid != master) findIn(*control.grid, place);
+        } else if (triesFormats_) {
+          tryList(place);
         } else if (isBrowse(page.form(), i)) {
-          tryAt({.page = entry.id,
-                 .name = entry.caption + ": " + frameOf(control),
-                 .currentRow = current,
-                 .control = i});
+          tryAt(place);
         }
       }
     }
   }
-  // The frame around a control, as what its name is said of; empty for none.
-  static std::string frameOf(const Control& control) {
-    for (const Control* group = control.group; group != nullptr; group = group->group) {
-      if (const std::string name = group->name(); !name.empty()) return name + ", ";
-    }
-    return {};
-  }
-  // The button behind the edit of a file.
-  static bool isBrowse(Form& form, int control) {
-    const auto place = static_cast<std::size_t>(control);
-    const Control& button = form.controls()[place];
-    return place > 0 && button.kind == ControlKind::button && button.usable() &&
-           form.controls()[place - 1].isFile;
-  }
 
-  void findIn(const ComparedPage& entry, CV27SetupGridWnd& grid, int current, int control) {
+  void findIn(CV27SetupGridWnd& grid, SeriesPlace place) {
     if (!grid.IsEnabled()) return;
-    for (int row = 1; row <= grid.GetRowCount() && !isFull(); ++row) {
-      for (int column = 1; column <= grid.GetColCount(); ++column) {
+    for (place.row = 1; place.row <= grid.GetRowCount() && !isFull(); ++place.row) {
+      for (place.column = 1; place.column <= grid.GetColCount(); ++place.column) {
         CellStyle style;
-        grid.GetStyleRowCol(row, column, style);
-        const bool browses = style.kind == CellKind::button && style.enabled &&
-                             style.value.find("...") != style.value.npos && !style.value.starts_with("View");
-        if (browses)
-          tryAt({.page = entry.id,
-                 .name = entry.caption + ": ",
-                 .currentRow = current,
-                 .control = control,
-                 .row = row,
-                 .column = column});
+        grid.GetStyleRowCol(place.row, place.column, style);
+        if (triesFormats_ && style.kind == CellKind::dropDown && style.takesValue()) {
+          tryFormats(place, style.choices, style.value);
+        } else if (!triesFormats_ && isBrowse(style)) {
+          tryAt(place);
+        }
       }
     }
   }
 
-  void press(CV27SetupFormView& page, int control, int row, int column) {
-    giver_.forget();
-    Control& pressed = page.form().controls()[static_cast<std::size_t>(control)];
-    if (pressed.grid == nullptr) {
-      page.form().act(pressed);
-    } else {
-      pressed.grid->OnClickedButtonRowCol(row, column);
+  // A list of a page, or its radio buttons.
+  void tryList(const SeriesPlace& place) {
+    const Control& list = copy_.controlOf(place, place.control);
+    const bool isList = list.kind == ControlKind::dropDown || list.kind == ControlKind::radio;
+    if (!isList || !list.usable()) return;
+    const auto now = static_cast<std::size_t>(list.index);
+    tryFormats(place, list.choices, now < list.choices.size() ? list.choices[now] : std::string());
+  }
+
+  // Makes each choice of a list but the one that stands, and presses the buttons that come to life by it. The
+  // list itself may follow what is chosen.
+  void tryFormats(const SeriesPlace& list, std::vector<std::string> choices, const std::string& now) {
+    for (const std::string& choice : choices) {
+      int& vain = vain_[{list.page, list.control, list.column, choice}];
+      if (choice == now || vain >= kEnough || trials_ >= kMostTrials || isFull()) continue;
+      ++trials_;
+      SeriesPlace place = list;
+      place.format = {choice, list.control, list.column};
+      if (copy_.choose(place) && !tryButtons(place)) ++vain;
+      copy_.takeBack(place);
     }
   }
 
-  // Presses the button of a place. What that has changed is taken back.
-  void tryAt(SeriesPlace place) {
-    CV27SetupFormView& page = *model_.page(place.page);
-    press(page, place.control, place.row, place.column);
-    if (!giver_.refused().empty()) others_.insert(place.name + giver_.refused());
-    if (giver_.ways().empty()) return;
-    place.name += model_.lastEdit();
-    for (const SeriesGiver::Way& way : giver_.ways()) {
+  // Whether one of the buttons on the page, or in the row of a table that the format stands in, asks for a
+  // series.
+  bool tryButtons(SeriesPlace place) {
+    bool isAsked = false;
+    if (CV27SetupGridWnd* grid = copy_.controlOf(place, place.control).grid) {
+      for (place.column = 1; place.column <= grid->GetColCount(); ++place.column) {
+        CellStyle style;
+        grid->GetStyleRowCol(place.row, place.column, style);
+        if (isBrowse(style)) isAsked = tryAt(place) || isAsked;
+      }
+      return isAsked;
+    }
+    Form& form = copy_.model().page(place.page)->form();
+    for (place.control = 0; place.control < static_cast<int>(form.controls().size()); ++place.control) {
+      if (isBrowse(form, place.control)) isAsked = tryAt(place) || isAsked;
+    }
+    return isAsked;
+  }
+
+  // Presses the button of a place, unless that is known to ask for a series already; whether it does. What
+  // that has changed is taken back.
+  bool tryAt(SeriesPlace place) {
+    const Button button{place.page, place.currentRow, place.control, place.row, place.column};
+    if (asked_.contains(button)) return false;
+    if (place.row == 0) place.name += frameOf(copy_.controlOf(place, place.control));
+    copy_.press(place);
+    const SeriesGiver& giver = copy_.giver();
+    if (!giver.isAsked()) return false;
+    const bool isNew = !place.format.choice.empty();
+    // With another format still it may take the series.
+    if (!isNew || !giver.ways().empty()) asked_.insert(button);
+    if (!giver.refused().empty()) others_.insert(place.name + giver.refused());
+    if (giver.ways().empty()) return true;
+    place.name += copy_.model().lastEdit();
+    for (const SeriesGiver::Way& way : giver.ways()) {
       place.items = way.items;
       place.item = way.item;
       place.doubt = way.doubt;
       found_.places.push_back(place);
     }
-    model_.assign(document_.root());
-    show(page, masterOf(page), place.currentRow);
+    copy_.takeBack(place);
+    if (isNew) copy_.choose(place);
+    return true;
   }
 
-  CV27SetupDoc& document_;
-  SeriesGiver giver_;
-  KvsHandle file_;
-  ComparedModel model_;
+  using Button = std::tuple<std::int32_t, int, int, int, int>;
+  using Format = std::tuple<std::int32_t, int, int, std::string>;
+
+  SeriesRehearsal copy_;
   SeriesPlaces found_;
   std::set<std::string> others_;
+  bool triesFormats_ = false;
+  std::set<Button> asked_;      // that need no format any more
+  std::map<Format, int> vain_;  // how often a choice has led to no series
+  int trials_ = 0;              // on the page
 };
 
 }  // namespace
 
 SeriesPlaces findSeriesPlaces(CV27SetupDoc& document, const std::string& file) {
-  return Rehearsal(document, file).find();
+  return PlaceFinder(document, file).find();
 }
 
 std::string putSeries(CV27SetupDoc& document, const std::string& file, const SeriesPlace& place) {
-  return Rehearsal(document, file).put(place);
+  SeriesRehearsal copy(document, file);
+  if (!copy.give(place)) return "The page does not ask for such a file any more";
+  const bool isTaken = document.Attempt([&] { document.root().AssignState(copy.model().root()); });
+  if (!isTaken) return "The file can't be taken there";
+  const auto id = static_cast<PageId>(place.page);
+  document.Touch(id);
+  document.SetModifiedFlag();
+  document.RecordEdit(id, copy.model().lastEdit());
+  document.UpdateAllViews(nullptr);
+  return {};
 }
 
 }  // namespace gridbay

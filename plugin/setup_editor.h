@@ -116,8 +116,8 @@ class SetupEditor {
   // Called after each save, whoever has asked for it.
   virtual void onSave(std::function<void()> saved) = 0;
 
-  // Where the setup, as it is now, takes the time series in a file (an absolute path). Puts it there as one
-  // step, which the open page shows too; what is wrong, or empty.
+  // Where the setup takes the time series in a file (an absolute path), as it is now or with another format.
+  // Puts it there as one step, which the open page shows too; what is wrong, or empty.
   virtual SeriesPlaces seriesPlaces(const std::string& file) = 0;
   virtual std::string useSeries(const std::string& file, const SeriesPlace& place) = 0;
 

@@ -21,6 +21,10 @@ namespace {
 struct ItemTypes {
   std::vector<std::string> texts;
 };
+// One number, or several.
+struct Numbers {
+  std::vector<double> all;
+};
 // A moment as a datetime or its text.
 struct MomentText {
   std::string text;
@@ -51,6 +55,14 @@ struct Taken<ItemTypes> {
     for (ItemTypeText& type : Taken<std::vector<ItemTypeText>>::from(given))
       types.texts.push_back(std::move(type.text));
     return types;
+  }
+};
+template <>
+struct Taken<Numbers> {
+  static constexpr const char* kName = "float | list";
+  static Numbers from(const Given& given) {
+    if (PySequence_Check(given.value.ptr()) != 0) return {Taken<std::vector<double>>::from(given)};
+    return {{Taken<double>::from(given)}};
   }
 };
 template <>
@@ -216,8 +228,8 @@ void addConversions(py::module_& module) {
   addFunction(
       module, "convert_series",
       [](Path in, Path out, std::optional<ItemTypes> itemTypes, std::optional<MomentText> start,
-         std::string timeUnit, int skipLines, std::optional<DateOrderName> dates, bool force,
-         std::string history, Progress progress) {
+         std::string timeUnit, int skipLines, std::optional<Numbers> missing,
+         std::optional<DateOrderName> dates, bool force, std::string history, Progress progress) {
         return series({.in = std::move(in),
                        .out = std::move(out),
                        .itemTypes = itemTypes ? std::move(itemTypes->texts) : std::vector<std::string>(),
@@ -226,7 +238,8 @@ void addConversions(py::module_& module) {
                        .skipLines = skipLines,
                        .force = force,
                        .history = std::move(history),
-                       .dateOrder = dates ? std::optional(dates->order) : std::nullopt},
+                       .dateOrder = dates ? std::optional(dates->order) : std::nullopt,
+                       .missing = missing ? std::move(missing->all) : std::vector<double>()},
                       progress.function);
       },
       {file("source"),
@@ -235,6 +248,7 @@ void addConversions(py::module_& module) {
        {"start"},
        {"time_unit"},
        {"skip_lines"},
+       {"missing"},
        {"dates"},
        {"force"},
        {"history"},

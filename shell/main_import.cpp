@@ -1,6 +1,7 @@
 // What is brought in from elsewhere, and where it goes.
 
 #include <QFileInfo>
+#include <QRegularExpression>
 #include <QStatusBar>
 #include <algorithm>
 
@@ -20,6 +21,12 @@ GridModel* areasOf(DocumentTab& tab) {
   if (!tab.goToPage(kAreasPage)) return nullptr;
   auto* view = tab.pane().findChild<GridView*>();
   return view == nullptr ? nullptr : &view->cells();
+}
+
+// Columns of buttons have no name but dots.
+QString nameOf(const SeriesPlace& place) {
+  static const QRegularExpression dots("\\s*\\.\\.\\.\\s*");
+  return QString::fromStdString(place.name).replace(dots, ' ' + MainWindow::tr("file"));
 }
 
 }  // namespace
@@ -101,7 +108,10 @@ UseStrip::Offer MainWindow::seriesUses(const QString& series) {
   const SeriesPlaces found = tab->editor().seriesPlaces(series.toStdString());
   UseStrip::Offer offer;
   for (const SeriesPlace& place : found.places) {
-    QString text = tr("%1 of %2").arg(QString::fromStdString(place.name), tab->name());
+    QString text = tr("%1 of %2").arg(nameOf(place), tab->name());
+    QString format = QString::fromStdString(place.format.choice).trimmed();
+    if (format.endsWith(':')) format.chop(1);
+    if (!format.isEmpty()) text += tr(", given as \"%1\"").arg(format);
     // Of several items that fit it is told which one.
     const auto same = std::ranges::count(found.places, place.name, &SeriesPlace::name);
     if (same > 1) text += " (" + QString::fromStdString(place.item) + ')';
@@ -110,7 +120,7 @@ UseStrip::Offer MainWindow::seriesUses(const QString& series) {
                           }});
   }
   if (!offer.uses.empty()) return offer;
-  offer.why = tr("%1 has no place that asks for such a series now.").arg(tab->name());
+  offer.why = tr("%1 has no place that takes such a series.").arg(tab->name());
   if (!found.others.empty()) {
     constexpr qsizetype kMost = 3;
     QStringList others;
@@ -118,7 +128,6 @@ UseStrip::Offer MainWindow::seriesUses(const QString& series) {
     const QString more = others.size() > kMost ? ", ..." : "";
     offer.why += ' ' + tr("Asked for is: %1.").arg(others.mid(0, kMost).join(", ") + more);
   }
-  offer.why += ' ' + tr("Choose a file with a time series as the format there, and come back here.");
   return offer;
 }
 
@@ -133,7 +142,7 @@ void MainWindow::useSeries(DocumentTab& tab, const SeriesPlace& place, const QSt
   if (!fault.empty()) {
     tell(QString::fromStdString(fault));
   } else {
-    statusBar()->showMessage(tr("%1 has the series.").arg(QString::fromStdString(place.name)));
+    statusBar()->showMessage(tr("%1 has the series.").arg(nameOf(place)));
   }
 }
 

@@ -122,6 +122,7 @@ def convert_series(
     start: Optional[datetime.datetime] = None,
     time_unit: str = "s",
     skip_lines: int = 0,
+    missing: Union[float, Sequence[float], None] = None,
     dates: Optional[str] = None,
     force: bool = False,
     progress: Optional[Progress] = None,
@@ -131,13 +132,15 @@ def convert_series(
     item_type: one for all columns or a list with one for each: code, name or beginning of a name; else as their names
     and units say. start: the moment of time 0, in whole seconds and no time zone; the first column has the times
     then, else dates, names and units are recognised. time_unit: s, min, h or d. skip_lines: heading lines, of which
-    the last names the columns. dates: the order of dates that do not tell it themselves, ymd, dmy or mdy. force:
-    replaces a file that is there.
+    the last names the columns. missing: the number or numbers that stand for missing values; else -9999 and the like
+    are recognised, and with a start no value may be missing. dates: the order of dates that do not tell it themselves,
+    ymd, dmy or mdy. force: replaces a file that is there.
     """
     name = file_name(source, "convert_series(source)")
     converted = _native.convert_series(
         name, file_name(target, "convert_series(target)"), item_type=item_type, start=start, time_unit=time_unit,
-        skip_lines=skip_lines, dates=dates, force=force, progress=progress, history=f"gridbay_setup.convert_series({name!r})",
+        skip_lines=skip_lines, missing=missing, dates=dates, force=force, progress=progress,
+        history=f"gridbay_setup.convert_series({name!r})",
     )  # fmt: skip
     return ConvertedSeries(**converted)
 

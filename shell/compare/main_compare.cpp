@@ -2,6 +2,7 @@
 
 #include <QFileDialog>
 #include <QFileInfo>
+#include <QMessageBox>
 #include <QStatusBar>
 
 #include "shell/compare/merge_dialog.h"
@@ -16,17 +17,35 @@ QString setupFilter(const std::string& kind) {
   return MainWindow::tr("Setups (*.%1);;All files (*)").arg(QString::fromStdString(kind));
 }
 
+// What a merge will leave out of the second setup; empty for nothing.
+QString leftOutText(const SetupMerging& merging, const QString& other) {
+  QStringList sections;
+  for (const std::string& path : merging.leftOut()) sections << QString::fromStdString(path);
+  if (sections.isEmpty()) return {};
+  return MainWindow::tr("This version does not know %1 of %2: the merge leaves it out.")
+      .arg(sections.join(", "), other);
+}
+
+// Asks for what is to be chosen, and tells of what will be left out; false to merge nothing.
+bool askChoices(SetupMerging& merging, const QString& own, const QString& other, QWidget* parent) {
+  const QString leftOut = leftOutText(merging, other);
+  if (!merging.questions().empty())
+    return MergeDialog(own, other, merging.questions(), leftOut, parent).exec() == QDialog::Accepted;
+  return leftOut.isEmpty() ||
+         QMessageBox::question(parent, MainWindow::tr("Merge"),
+                               MainWindow::tr("%1\n\nMerge all the same?").arg(leftOut)) == QMessageBox::Yes;
+}
+
 }  // namespace
 
 bool MainWindow::compareWith(const QString& path) {
   DocumentTab* tab = currentDocument();
   if (tab == nullptr) return false;
-  const QString fault = TabComparison::begin(*tab, path);
+  QString fault;
+  const bool isBegun = TabComparison::begin(*tab, path, fault);
   compare_->showDocument(tab);
-  if (!fault.isEmpty()) {
-    tell(fault);
-    return false;
-  }
+  if (!fault.isEmpty()) tell(fault);
+  if (!isBegun) return false;
   compare_->show();
   compare_->raise();
   // Some differences at a glance.
@@ -36,28 +55,38 @@ bool MainWindow::compareWith(const QString& path) {
   return true;
 }
 
-// What was chosen in a dialog, or else what the first has, is made of the setups.
+// What was chosen in a dialog, or else what the first has, is made of the setups. What takes long goes beside
+// the window.
 bool MainWindow::mergeInto(DocumentTab& tab, const QString& base, const QString& own, const QString& other) {
-  SetupComparison& setups = tab.editor().comparison();
-  std::string fault = setups.startMerge(base.toStdString(), own.toStdString(), other.toStdString());
-  if (fault.empty() && !setups.questions().empty()) {
-    bool isCancelled = false;
-    const std::optional<std::string> words =
-        workBeside([&setups](const WorkApart::Progress&) { return setups.wordQuestions(); },
-                   tr("Merging %1...").arg(QFileInfo(other).fileName()), &tab, isCancelled);
+  SetupMerging& merging = tab.editor().comparison().merging();
+  const QString name = QFileInfo(other).fileName();
+  bool isCancelled = false;
+  const auto beside = [&](const std::function<std::string()>& work) {
+    return workBeside([&work](const WorkApart::Progress&) { return work(); }, tr("Merging %1...").arg(name),
+                      &tab, isCancelled);
+  };
+  const QString suddenEnd = tr("%1 could not be merged: the work came to a sudden end.").arg(name);
+  const auto read =
+      beside([&] { return merging.read(base.toStdString(), own.toStdString(), other.toStdString()); });
+  if (isCancelled) return false;
+  QString fault = read ? QString::fromStdString(merging.start(*read)) : suddenEnd;
+  if (fault.isEmpty() && !merging.questions().empty()) {
+    const auto words = beside([&] { return merging.word(); });
     if (isCancelled) return false;
     // Where there are no words for them they are asked by their paths.
-    if (words) setups.takeQuestions(*words);
-    const QString ownName = own.isEmpty() ? tab.name() : QFileInfo(own).fileName();
-    const QString otherName = QFileInfo(other).fileName();
-    MergeDialog dialog(ownName, ownName == otherName ? other : otherName, setups.questions(), this);
-    if (dialog.exec() != QDialog::Accepted) return false;
+    if (words) merging.takeWords(*words);
   }
-  if (fault.empty()) fault = setups.finishMerge();
+  if (fault.isEmpty()) {
+    const QString ownName = own.isEmpty() ? tab.name() : QFileInfo(own).fileName();
+    if (!askChoices(merging, ownName, ownName == name ? other : name, this)) return false;
+    const auto made = beside([&] { return merging.make(); });
+    if (isCancelled) return false;
+    fault = made ? QString::fromStdString(merging.finish(*made)) : suddenEnd;
+  }
   tab.editor().refreshPage();
   tab.pane().refresh();
-  if (!fault.empty()) tell(QString::fromStdString(fault));
-  return fault.empty();
+  if (!fault.isEmpty()) tell(fault);
+  return fault.isEmpty();
 }
 
 bool MainWindow::merge(const QString& base, const QString& own, const QString& other) {

@@ -19,7 +19,7 @@ QString textOf(const std::optional<std::string>& value) {
 }  // namespace
 
 MergeDialog::MergeDialog(const QString& own, const QString& other, std::vector<MergeQuestion>& questions,
-                         QWidget* parent)
+                         const QString& warning, QWidget* parent)
     : QDialog(parent), questions_(questions), list_(new QTreeWidget(this)) {
   setWindowTitle(tr("Merge"));
   resize(900, 420);
@@ -50,6 +50,13 @@ MergeDialog::MergeDialog(const QString& own, const QString& other, std::vector<M
   connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
   layout->addWidget(note);
   layout->addWidget(list_);
+  if (!warning.isEmpty()) {
+    auto* told = new QLabel(warning, this);
+    told->setObjectName("warning");
+    told->setWordWrap(true);
+    told->setTextFormat(Qt::PlainText);
+    layout->addWidget(told);
+  }
   layout->addWidget(buttons);
 }
 

@@ -14,8 +14,9 @@ namespace gridbay::shell {
 class MergeDialog final : public QDialog {
   Q_OBJECT
  public:
+  // With what else is to be said before; empty for nothing.
   MergeDialog(const QString& own, const QString& other, std::vector<MergeQuestion>& questions,
-              QWidget* parent);
+              const QString& warning, QWidget* parent);
 
   QTreeWidget& list() { return *list_; }
   // The choice for a question: 0 for the first setup, 1 for the other; and for a page, by its place.

@@ -19,12 +19,20 @@ TabComparison* TabComparison::of(DocumentTab* tab) {
   return tab == nullptr ? nullptr : tab->findChild<TabComparison*>(QString(), Qt::FindDirectChildrenOnly);
 }
 
-QString TabComparison::begin(DocumentTab& tab, const QString& path) {
+bool TabComparison::begin(DocumentTab& tab, const QString& path, QString& fault) {
   tab.commit();
+  SetupComparison& setups = tab.editor().comparison();
+  const QString name = QFileInfo(path).fileName();
+  bool isCancelled = false;
+  const std::optional<std::string> read = workBeside(
+      [&setups, file = path.toStdString()](const WorkApart::Progress&) { return setups.read(file); },
+      tr("Reading %1...").arg(name), &tab, isCancelled);
+  if (isCancelled) return false;
   TabComparison* comparison = of(&tab);
   if (comparison != nullptr) comparison->pane_->clear();
-  const std::string fault = tab.editor().comparison().open(path.toStdString());
-  if (fault.empty()) {
+  fault = read ? QString::fromStdString(setups.open(path.toStdString(), *read))
+               : tr("%1 could not be read: its reader came to a sudden end.").arg(name);
+  if (fault.isEmpty()) {
     if (comparison == nullptr) comparison = new TabComparison(tab);
     comparison->notice_->watch(path);
     comparison->differences_.clear();
@@ -33,7 +41,7 @@ QString TabComparison::begin(DocumentTab& tab, const QString& path) {
     comparison->compare();
   }
   if (comparison != nullptr) comparison->showPage();
-  return QString::fromStdString(fault);
+  return fault.isEmpty();
 }
 
 TabComparison::TabComparison(DocumentTab& tab)
@@ -65,7 +73,9 @@ TabComparison::TabComparison(DocumentTab& tab)
   });
   connect(notice_, &FileNotice::readAgain, this, [this] {
     const QString path = QString::fromStdString(comparison().otherPath());
-    if (const QString fault = begin(tab_, path); !fault.isEmpty()) emit failed(fault);
+    QString fault;
+    begin(tab_, path, fault);
+    if (!fault.isEmpty()) emit failed(fault);
   });
   // The widgets go before the form that they show.
   connect(&tab, &DocumentTab::closing, this, [this] {

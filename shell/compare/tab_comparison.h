@@ -18,8 +18,9 @@ class TabComparison final : public QObject {
  public:
   // That of a document; null where it has none.
   static TabComparison* of(DocumentTab* tab);
-  // Begins one, or goes on with another setup; what is wrong, or empty.
-  static QString begin(DocumentTab& tab, const QString& path);
+  // Begins one, or goes on with another setup, which is read beside the window. False where the user has
+  // cancelled that, or else with what is wrong.
+  static bool begin(DocumentTab& tab, const QString& path, QString& fault);
   ~TabComparison() override;
 
   // The comparison goes, and with it all that it shows.

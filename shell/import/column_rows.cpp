@@ -111,9 +111,7 @@ void ColumnRows::take(std::size_t place) {
   const std::string known = unitOfHeading(unit);
   column.unit = known.empty() ? unit : known;
   enable(place);
-  const bool isSame = before.role == column.role && before.name == column.name &&
-                      before.itemType == column.itemType && before.unit == column.unit;
-  if (!isSame) emit changed();
+  if (column != before) emit changed();
 }
 
 void ColumnRows::enable(std::size_t place) {

@@ -5,10 +5,8 @@
 #include <QDir>
 #include <QFileDialog>
 #include <QFileInfo>
-#include <QHeaderView>
 #include <QKeyEvent>
 #include <QMessageBox>
-#include <QSplitter>
 #include <QVBoxLayout>
 #include <algorithm>
 #include <cmath>
@@ -28,19 +26,9 @@ namespace {
 using Role = TableColumn::Role;
 
 constexpr QSize kSize(1120, 760);
-constexpr int kMoment = 120;  // milliseconds from a change to a new look
-constexpr int kParts = 1000;
 
 QString textOf(const std::string& text) {
   return QString::fromStdString(text);
-}
-
-QLabel* makeText(QWidget* parent) {
-  auto* label = new QLabel(parent);
-  label->setWordWrap(true);
-  label->setTextFormat(Qt::PlainText);
-  label->setTextInteractionFlags(Qt::TextSelectableByMouse);
-  return label;
 }
 
 void colourText(QWidget* text, bool isFault) {
@@ -62,7 +50,7 @@ SeriesTable namedItems(SeriesTable table, const TableForm& form) {
 
 SeriesImport::SeriesImport(std::function<Setup()> setup,
                            std::function<UseStrip::Offer(const QString& series)> uses, QWidget* parent)
-    : QDialog(parent), findSetup_(std::move(setup)), work_(nullptr) {
+    : QDialog(parent), findSetup_(std::move(setup)) {
   setWindowTitle(tr("Import Series"));
   resize(kSize);
   body_ = new QWidget(this);
@@ -84,137 +72,36 @@ SeriesImport::SeriesImport(std::function<Setup()> setup,
   layout->addWidget(buildButtons());
 
   // What parts lines and fields leads to another look at all of it.
-  connect(fields_, &SeriesForm::partsChanged, this, &SeriesImport::guess);
+  connect(fields_, &SeriesForm::partsChanged, this, [this] {
+    isWanted_ = false;
+    if (reading_.text() != nullptr)
+      reading_.showParted(fields_->separatorChosen(), fields_->headings().value());
+  });
   connect(fields_, &SeriesForm::changed, this, &SeriesImport::formChanged);
   connect(fields_, &SeriesForm::typed, this, &SeriesImport::showVerdict);
   connect(columns_, &ColumnRows::changed, this, [this] {
-    form_.columns = columns_->columns();
+    reading_.form().columns = columns_->columns();
     readSoon();
   });
+  connect(&reading_, &TableReading::recognised, this, &SeriesImport::showForm);
+  connect(&reading_, &TableReading::changed, this, &SeriesImport::showChanged);
+  connect(&reading_, &TableReading::read, this, &SeriesImport::showRead);
   connect(uses_, &UseStrip::viewWanted, this, &SeriesImport::viewWanted);
-  connect(&work_, &BackgroundWork::progressed, this, [this](double done) {
-    progress_->show();
-    progress_->setValue(static_cast<int>(std::lround(done * kParts)));
-  });
-  connect(&work_, &BackgroundWork::ended, this, [this](const std::optional<std::string>& bytes) {
-    stage_ == Stage::importing ? takeImport(bytes) : takeRead(bytes);
-  });
-  rereading_.setSingleShot(true);
-  rereading_.setInterval(kMoment);
-  connect(&rereading_, &QTimer::timeout, this, &SeriesImport::reread);
+  connect(&work_, &BackgroundWork::progressed, this, &SeriesImport::showProgress);
+  connect(&reading_, &TableReading::progressed, this, &SeriesImport::showProgress);
+  connect(&work_, &BackgroundWork::ended, this, &SeriesImport::takeImport);
   new FileDrop(*this, [this](const QString& path) {
-    if (stage_ != Stage::importing) openTable(path);
+    if (!work_.isRunning()) openTable(path);
   });
   takeSetup();
   showForm();
-  enter(Stage::ready);
+  showStage();
   previewView_->setFocus();
 }
 
 // An edit that goes with the focus in it tells that it was left.
 SeriesImport::~SeriesImport() {
   for (QWidget* each : findChildren<QWidget*>()) disconnect(each, nullptr, this, nullptr);
-}
-
-QWidget* SeriesImport::buildSource() {
-  auto* row = new QWidget(body_);
-  auto* layout = new QHBoxLayout(row);
-  layout->setContentsMargins(0, 0, 0, 0);
-  auto* open = new QPushButton(tr("&Open table..."), row);
-  auto* paste = new QPushButton(tr("&Paste"), row);
-  paste->setToolTip(tr("Takes the cells that were copied from a spreadsheet (Ctrl+V)"));
-  for (QPushButton* button : {open, paste}) {
-    button->setAutoDefault(false);
-    layout->addWidget(button);
-  }
-  sourceText_ = new QLabel(tr("Open a table, drop one here, or paste one (Ctrl+V)."), row);
-  sourceText_->setTextFormat(Qt::PlainText);
-  layout->addWidget(sourceText_, 1);
-  connect(open, &QPushButton::clicked, this, &SeriesImport::browse);
-  connect(paste, &QPushButton::clicked, this, &SeriesImport::pasteTable);
-  return row;
-}
-
-// The columns and the lines of the table beside the plot.
-QWidget* SeriesImport::buildMiddle() {
-  auto* middle = new QSplitter(Qt::Horizontal, body_);
-  columns_ = new ColumnRows(body_);
-  preview_ = new TablePreview(this);
-  previewView_ = new QTableView(body_);
-  previewView_->setModel(preview_);
-  previewView_->setWordWrap(false);
-  previewView_->verticalHeader()->setDefaultSectionSize(previewView_->fontMetrics().height() + 6);
-  previewView_->setAccessibleName(tr("Lines of the table"));
-  previewView_->setTabKeyNavigation(false);
-  auto* left = new QSplitter(Qt::Vertical, middle);
-  left->addWidget(columns_);
-  left->addWidget(previewView_);
-  constexpr int kColumnsHeight = 220;
-  left->setSizes({kColumnsHeight, kSize.height() - kColumnsHeight});
-  auto* right = new QWidget(middle);
-  auto* layout = new QVBoxLayout(right);
-  layout->setContentsMargins(0, 0, 0, 0);
-  plot_ = new ImportPlot(right);
-  coverage_ = makeText(right);
-  layout->addWidget(plot_, 1);
-  layout->addWidget(coverage_);
-  middle->setStretchFactor(0, 1);
-  middle->setStretchFactor(1, 1);
-  return middle;
-}
-
-QWidget* SeriesImport::buildResult() {
-  auto* row = new QWidget(body_);
-  auto* layout = new QHBoxLayout(row);
-  layout->setContentsMargins(0, 0, 0, 0);
-  auto* label = new QLabel(tr("Time series to &write:"), row);
-  result_ = new QLineEdit(row);
-  label->setBuddy(result_);
-  choose_ = new QPushButton("...", row);
-  choose_->setAccessibleName(tr("Browse for the time series to write"));
-  choose_->setAutoDefault(false);
-  layout->addWidget(label);
-  layout->addWidget(result_, 1);
-  layout->addWidget(choose_);
-  connect(result_, &QLineEdit::textChanged, this, &SeriesImport::showVerdict);
-  connect(choose_, &QPushButton::clicked, this, [this] {
-    const QString path = QFileDialog::getSaveFileName(this, {}, result_->text(), tr("Time series (*.tsb0)"),
-                                                      nullptr, QFileDialog::DontConfirmOverwrite);
-    if (!path.isEmpty()) result_->setText(path);
-  });
-  return row;
-}
-
-QWidget* SeriesImport::buildButtons() {
-  auto* row = new QWidget(this);
-  auto* layout = new QHBoxLayout(row);
-  layout->setContentsMargins({});
-  progress_ = new QProgressBar(row);
-  progress_->setRange(0, kParts);
-  QSizePolicy stays = progress_->sizePolicy();
-  stays.setRetainSizeWhenHidden(true);
-  progress_->setSizePolicy(stays);
-  cancel_ = new QPushButton(tr("&Cancel"), row);
-  cancel_->setObjectName("cancel");
-  import_ = new QPushButton(tr("&Import"), row);
-  help_ = new QPushButton(tr("Help"), row);
-  help_->setObjectName("help");
-  close_ = new QPushButton(tr("Close"), row);
-  close_->setObjectName("close");
-  layout->addWidget(progress_, 1);
-  for (QPushButton* button : {cancel_, import_, help_, close_}) {
-    button->setAutoDefault(false);
-    layout->addWidget(button);
-  }
-  connect(cancel_, &QPushButton::clicked, this, &SeriesImport::cancel);
-  // By its key it is pressed with the focus in an edit, which tells what was typed once it is left.
-  connect(import_, &QPushButton::clicked, this, [this] {
-    import_->setFocus();
-    startImport();
-  });
-  connect(help_, &QPushButton::clicked, this, &SeriesImport::helpWanted);
-  connect(close_, &QPushButton::clicked, this, &QDialog::reject);
-  return row;
 }
 
 void SeriesImport::browse() {
@@ -240,7 +127,7 @@ bool SeriesImport::openTable(const QString& path) {
 
 bool SeriesImport::pasteTable() {
   Result<std::string> text = tableText(QApplication::clipboard()->text().toStdString());
-  if (!text || textOf(*text).trimmed().isEmpty()) {
+  if (!text || text->find_first_not_of(" \t\r\n") == std::string::npos) {
     tell(tr("There is no text to paste."), true);
     return false;
   }
@@ -252,11 +139,11 @@ bool SeriesImport::pasteTable() {
 
 // Return in a field is no end of the dialog, and Esc ends first what is being written.
 void SeriesImport::keyPressEvent(QKeyEvent* event) {
-  if (event->matches(QKeySequence::Paste) && stage_ != Stage::importing) {
+  if (event->matches(QKeySequence::Paste) && !work_.isRunning()) {
     pasteTable();
   } else if (event->key() == Qt::Key_F1) {
     emit helpWanted();
-  } else if (event->key() == Qt::Key_Escape && stage_ == Stage::importing) {
+  } else if (event->key() == Qt::Key_Escape && work_.isRunning()) {
     cancel();
   } else {
     QDialog::keyPressEvent(event);
@@ -274,6 +161,7 @@ void SeriesImport::changeEvent(QEvent* event) {
 
 void SeriesImport::done(int result) {
   work_.stop();
+  reading_.stop();
   QDialog::done(result);
 }
 
@@ -290,118 +178,67 @@ void SeriesImport::takeSetup() {
 
 void SeriesImport::showTable(std::shared_ptr<const std::string> text, const QString& title) {
   isWanted_ = false;
-  // Those that were typed before there was a table.
-  const std::vector<double> missing = text_ == nullptr ? form_.missing : std::vector<double>();
-  text_ = std::move(text);
   title_ = title;
   sourceText_->setText(title);
   // Times that are numbers most likely count from where the simulation begins.
-  if (form_.start.empty() && setup_.period) form_.start = dateTimeText((*setup_.period)[0]);
-  TableGuess guess = guessTable(*text_);
-  for (const double number : missing) {
-    if (std::ranges::find(guess.form.missing, number) == guess.form.missing.end())
-      guess.form.missing.push_back(number);
-  }
-  takeGuess(std::move(guess));
-  reread();
-}
-
-void SeriesImport::takeGuess(TableGuess guess) {
-  guess.form.start = form_.start;
-  form_ = std::move(guess.form);
-  QStringList doubts;
-  for (const std::vector<std::string>& said :
-       {guess.doubts, guess.missingDoubts, std::vector<std::string>{guess.dateOrderDoubt}}) {
-    for (const std::string& doubt : said) {
-      if (!doubt.empty()) doubts << textOf(doubt) + '.';
-    }
-  }
-  doubts_->setText(doubts.join('\n'));
-  doubts_->setVisible(!doubts.isEmpty());
-  showForm();
-}
-
-// The user has said how lines and fields are parted.
-void SeriesImport::guess() {
-  if (text_ == nullptr) return;
-  takeGuess(guessTable(*text_, fields_->separatorChosen(), fields_->headings().value()));
-  readSoon();
+  std::string& start = reading_.form().start;
+  if (start.empty() && setup_.period) start = dateTimeText((*setup_.period)[0]);
+  reading_.show(std::move(text));
 }
 
 void SeriesImport::showForm() {
-  fields_->showForm(form_);
-  columns_->showColumns(form_.columns);
+  const QStringList doubts = reading_.doubts();
+  doubts_->setText(doubts.join('\n'));
+  doubts_->setVisible(!doubts.isEmpty());
+  fields_->showForm(reading_.form());
+  // What is being edited there goes on.
+  if (columns_->columns() != reading_.form().columns) columns_->showColumns(reading_.form().columns);
   orderTabs();
 }
 
-// As the window reads; the rows of the columns are new each time.
-void SeriesImport::orderTabs() {
-  QWidget* last = &fields_->timeUnit();
-  const auto goOn = [&last](QWidget* next) {
-    setTabOrder(last, next);
-    last = next;
-  };
-  for (const ColumnRows::Row& row : columns_->rows()) {
-    for (QWidget* each : std::initializer_list<QWidget*>{row.role, row.name, row.type, row.unit}) goOn(each);
-  }
-  for (QWidget* each : std::initializer_list<QWidget*>{previewView_, plot_, result_, choose_}) goOn(each);
-  for (QWidget* each : uses_->inputs()) goOn(each);
-  for (QWidget* each : {cancel_, import_, help_, close_}) goOn(each);
-}
-
 void SeriesImport::formChanged() {
-  fields_->takeInto(form_);
-  if (text_ == nullptr) return;
+  fields_->takeInto(reading_.form());
+  if (reading_.text() == nullptr) return;
   // What is wrong stays to be seen.
-  if (fields_->fault().isEmpty()) fields_->showForm(form_);
+  if (fields_->fault().isEmpty()) fields_->showForm(reading_.form());
   readSoon();
 }
 
 void SeriesImport::readSoon() {
   isWanted_ = false;
   uses_->hide();
-  rereading_.start();
+  reading_.readSoon();
   showVerdict();
 }
 
-void SeriesImport::reread() {
-  rereading_.stop();
-  if (text_ == nullptr) return;
-  work_.stop();
+// Another form, by which the table is not read yet.
+void SeriesImport::showChanged() {
+  const TableForm& form = reading_.form();
   uses_->hide();
-  read_.reset();
-  fields_->enable(form_);
-  preview_->show(*text_, form_);
+  fields_->enable(form);
+  preview_->show(*reading_.text(), form);
   previewView_->resizeColumnsToContents();
-  if (faultOf(form_).empty()) {
-    enter(Stage::reading);
-    work_.begin([this](const WorkApart::Progress& progress) {
-      return packed(readSeriesTable(*text_, form_, progress));
-    });
-  } else {
+  if (!faultOf(form).empty()) {
+    isWanted_ = false;
     plot_->showTable({});
     coverage_->clear();
-    enter(Stage::ready);
   }
+  showStage();
 }
 
-void SeriesImport::takeRead(const std::optional<std::string>& bytes) {
-  read_ = bytes ? unpackedTable(*bytes) : Failure{"The table can't be read: its reader came to a sudden end"};
-  if (*read_) {
-    preview_->showFaults((*read_)->faults);
-    plot_->showTable(**read_);
-  } else {
-    plot_->showTable({});
-  }
+void SeriesImport::showRead() {
+  const Result<SeriesTable>& table = *reading_.table();
+  if (table) preview_->showFaults(table->faults);
+  plot_->showTable(table ? *table : SeriesTable());
   showCoverage();
-  enter(Stage::ready);
+  showStage();
   if (std::exchange(isWanted_, false)) startImport();
 }
 
 void SeriesImport::showCoverage() {
   coverage_->clear();
-  if (!setup_.period || !read_ || !*read_ || (*read_)->times.empty()) return;
-  const bool covers = ImportPlot::covers(**read_, *setup_.period);
+  if (!setup_.period || table() == nullptr || table()->times.empty()) return;
+  const bool covers = ImportPlot::covers(*table(), *setup_.period);
   const QString period =
       tr("%1 to %2")
           .arg(textOf(dateTimeText((*setup_.period)[0])), textOf(dateTimeText((*setup_.period)[1])));
@@ -410,19 +247,26 @@ void SeriesImport::showCoverage() {
   colourText(coverage_, !covers);
 }
 
+// What was read; null for nothing.
+const SeriesTable* SeriesImport::table() const {
+  const std::optional<Result<SeriesTable>>& table = reading_.table();
+  return table && *table ? &**table : nullptr;
+}
+
 // What stands in the way of an import; empty for nothing that is known.
 QString SeriesImport::obstacle() const {
+  const TableForm& form = reading_.form();
   if (const QString why = fields_->fault(); !why.isEmpty()) return why;
-  if (const std::string why = faultOf(form_); !why.empty()) return textOf(why);
-  if (!read_) return {};
-  if (!*read_) return textOf(read_->error());
-  if ((*read_)->times.empty()) return tr("No line can be read; %1").arg(firstFault());
-  if (const std::string why = faultOfItems(form_); !why.empty()) return textOf(why) + '.';
+  if (const std::string why = faultOf(form); !why.empty()) return textOf(why);
+  if (!reading_.table()) return {};
+  if (table() == nullptr) return textOf(reading_.table()->error());
+  if (table()->times.empty()) return tr("No line can be read; %1").arg(firstFault());
+  if (const std::string why = faultOfItems(form); !why.empty()) return textOf(why) + '.';
   return result_->text().trimmed().isEmpty() ? tr("A name for the time series is missing.") : QString();
 }
 
 QString SeriesImport::firstFault() const {
-  const TableFault& fault = (*read_)->faults.front();
+  const TableFault& fault = table()->faults.front();
   return tr("line %1: %2.").arg(fault.line).arg(textOf(fault.why));
 }
 
@@ -432,32 +276,45 @@ void SeriesImport::tell(const QString& text, bool isFault) {
 }
 
 void SeriesImport::showVerdict() {
-  if (stage_ == Stage::importing) {
+  if (work_.isRunning()) {
     tell(tr("Importing..."), false);
     import_->setEnabled(false);
     return;
   }
-  const QString fault = text_ == nullptr ? QString() : obstacle();
+  const bool isThere = reading_.text() != nullptr;
+  const QString fault = isThere ? obstacle() : QString();
   QString told;
   std::size_t bad = 0;
-  if (text_ != nullptr && !read_) {
+  if (reading_.isRecognising()) {
+    told = tr("Looking at all lines...");
+  } else if (isThere && !reading_.table()) {
     told = tr("Reading...");
-  } else if (read_ && *read_) {
-    bad = (*read_)->faultCount;
-    told = tr("%1 lines are read.").arg((*read_)->times.size());
+  } else if (table() != nullptr) {
+    bad = table()->faultCount;
+    told = tr("%1 lines are read.").arg(table()->times.size());
     if (bad == 1) told += ' ' + tr("1 line can't be read and is left out; %1").arg(firstFault());
     if (bad > 1) told += ' ' + tr("%1 lines can't be read and are left out; %2").arg(bad).arg(firstFault());
   }
   tell(fault.isEmpty() ? told : fault, !fault.isEmpty() || bad > 0);
-  import_->setEnabled(text_ != nullptr && fault.isEmpty());
+  import_->setEnabled(isThere && fault.isEmpty());
 }
 
-void SeriesImport::enter(Stage stage) {
-  stage_ = stage;
-  body_->setEnabled(stage != Stage::importing);
-  progress_->setVisible(stage == Stage::importing);
-  progress_->setValue(0);
-  cancel_->setVisible(stage == Stage::importing);
+void SeriesImport::showProgress(double done) {
+  constexpr int kParts = 1000;
+  progress_->setRange(0, kParts);
+  progress_->setValue(static_cast<int>(std::lround(done * kParts)));
+  progress_->show();
+}
+
+// What can be used while something is at work beside the window. How far a look at all lines is isn't known.
+void SeriesImport::showStage() {
+  const bool isWriting = work_.isRunning();
+  body_->setEnabled(!isWriting);
+  const bool canBeCancelled = isWriting || reading_.isRecognising();
+  if (isWriting) showProgress(0);
+  if (!isWriting) progress_->setRange(0, 0);
+  progress_->setVisible(canBeCancelled);
+  cancel_->setVisible(canBeCancelled);
   showVerdict();
 }
 
@@ -469,9 +326,9 @@ bool SeriesImport::mayReplace(const QString& path) {
 
 // What was typed last is read first.
 void SeriesImport::startImport() {
-  if (rereading_.isActive()) reread();
-  isWanted_ = stage_ == Stage::reading;
-  if (isWanted_ || stage_ != Stage::ready || !import_->isEnabled()) return;
+  reading_.readChanged();
+  isWanted_ = reading_.isBusy();
+  if (isWanted_ || work_.isRunning() || !import_->isEnabled()) return;
   QString path = QFileInfo(setup_.folder.isEmpty() ? QDir() : QDir(setup_.folder), result_->text().trimmed())
                      .absoluteFilePath();
   if (!path.endsWith(".tsb0")) path += ".tsb0";
@@ -489,20 +346,20 @@ void SeriesImport::write(const QString& path) {
   made_ = path;
   before_ = fileStamp(made_.toStdString());
   uses_->hide();
-  enter(Stage::importing);
   const SeriesTarget target{.out = path.toStdString(),
                             .title = QFileInfo(title_).completeBaseName().toStdString(),
                             .history = tr("Import Series (%1)").arg(title_).toStdString()};
   work_.begin(
       [this, target](const WorkApart::Progress& progress) {
         WorkHost host(progress);
-        return packed(writeSeriesTable(namedItems(**read_, form_), target, host));
+        return packed(writeSeriesTable(namedItems(*table(), reading_.form()), target, host));
       },
       made_);
+  showStage();
 }
 
 void SeriesImport::takeImport(const std::optional<std::string>& bytes) {
-  enter(Stage::ready);
+  showStage();
   const Result<std::string> summary =
       bytes ? unpackedSummary(*bytes) : Failure{"The import came to a sudden end; nothing is written"};
   if (!summary) {
@@ -517,8 +374,9 @@ void SeriesImport::takeImport(const std::optional<std::string>& bytes) {
 }
 
 void SeriesImport::cancel() {
+  if (!work_.isRunning()) return reading_.stopRecognising();
   work_.stop();
-  enter(Stage::ready);
+  showStage();
   tell(fileStamp(made_.toStdString()) == before_
            ? tr("The import was stopped; nothing is written.")
            : tr("%1 was written before the import could be stopped.").arg(made_),

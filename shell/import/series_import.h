@@ -5,26 +5,25 @@
 #include <QProgressBar>
 #include <QPushButton>
 #include <QTableView>
-#include <QTimer>
 #include <cstdint>
 #include <memory>
 #include <optional>
 #include <utility>
 
-#include "conversion/table_guess.h"
 #include "platform/files/file_stamp.h"
 #include "shell/background_work.h"
 #include "shell/import/column_rows.h"
 #include "shell/import/import_plot.h"
 #include "shell/import/series_form.h"
 #include "shell/import/table_preview.h"
+#include "shell/import/table_reading.h"
 #include "shell/import/use_strip.h"
 
 namespace gridbay::shell {
 
 // Brings a table of text in as a time series: from a file, or what is pasted. How it is read is recognised
 // and shown, can be changed, and is seen at once in the preview and the plot; nothing is written before
-// Import. It is read and written in a copy of the process, so that the window never waits.
+// Import. It is recognised, read and written in a copy of the process, so that the window never waits.
 class SeriesImport final : public QDialog {
   Q_OBJECT
  public:
@@ -57,9 +56,9 @@ class SeriesImport final : public QDialog {
   QLabel* verdict() { return verdict_; }
   QLabel* coverage() { return coverage_; }
   QPushButton* importButton() { return import_; }
-  bool isReading() const { return rereading_.isActive() || (work_.isRunning() && !isImporting()); }
+  bool isReading() const { return reading_.isBusy() && !isImporting(); }
   // It is being written, or is going to be once all is read.
-  bool isImporting() const { return stage_ == Stage::importing || isWanted_; }
+  bool isImporting() const { return work_.isRunning() || isWanted_; }
 
  signals:
   void imported(const QString& summary);
@@ -72,24 +71,22 @@ class SeriesImport final : public QDialog {
   void done(int result) override;
 
  private:
-  enum class Stage { reading, ready, importing };
-
+  static QLabel* makeText(QWidget* parent);
   QWidget* buildSource();
   QWidget* buildMiddle();
   QWidget* buildResult();
   QWidget* buildButtons();
   void browse();
   void showTable(std::shared_ptr<const std::string> text, const QString& title);
-  void guess();
-  void takeGuess(TableGuess guess);
   void showForm();
   void orderTabs();
   void formChanged();
   void readSoon();
-  void reread();
-  void takeRead(const std::optional<std::string>& bytes);
+  void showChanged();
+  void showRead();
   void takeSetup();
   void showCoverage();
+  const SeriesTable* table() const;
   QString obstacle() const;
   QString firstFault() const;
   void showVerdict();
@@ -98,22 +95,19 @@ class SeriesImport final : public QDialog {
   void write(const QString& path);
   void takeImport(const std::optional<std::string>& bytes);
   void cancel();
-  void enter(Stage stage);
+  void showProgress(double done);
+  void showStage();
   bool mayReplace(const QString& path);
 
   std::function<Setup()> findSetup_;
   Setup setup_;
   QString source_;  // the path of the table; empty for one that is pasted
   QString title_;
-  std::shared_ptr<const std::string> text_;
-  TableForm form_;
-  std::optional<Result<SeriesTable>> read_;
-  Stage stage_ = Stage::ready;
+  TableReading reading_{this};
   bool isWanted_ = false;            // the import, once all is read
   QString made_;                     // the series that is being made, or was
   std::optional<FileStamp> before_;  // what was there before it
-  QTimer rereading_;                 // from a change to a new look
-  BackgroundWork work_;
+  BackgroundWork work_{this};        // that writes it
 
   QWidget* body_;
   QLabel* sourceText_ = nullptr;

@@ -18,6 +18,13 @@ static void pass(Packing& pack, BackgroundCopy& each) {
 static void pass(Packing& pack, TableColumn& each) {
   pack(each.role, each.name, each.unit, each.itemType);
 }
+static void pass(Packing& pack, TableForm& each) {
+  pack(each.separator, each.decimalComma, each.headerLines, each.dateOrder, each.start, each.timeUnit,
+       each.takesMissing, each.missing, each.columns);
+}
+static void pass(Packing& pack, TableGuess& each) {
+  pack(each.form, each.doubts, each.missingDoubts, each.dateOrderDoubt);
+}
 static void pass(Packing& pack, TableFault& each) {
   pack(each.line, each.text, each.why);
 }
@@ -73,6 +80,12 @@ std::string packed(const Result<BackgroundCopy>& copy) {
   return packedResult(copy);
 }
 
+std::string packed(TableGuess guess) {
+  Packing pack;
+  pack(guess);
+  return std::move(pack.bytes());
+}
+
 std::string packed(Result<SeriesTable> table) {
   return packedResult(std::move(table));
 }
@@ -83,6 +96,13 @@ std::string packed(const Result<ConvertedSeries>& converted) {
 
 Result<RasterPreview> unpackedPreview(const std::string& bytes) {
   return unpackedResult<RasterPreview>(bytes);
+}
+
+TableGuess unpackedGuess(const std::string& bytes) {
+  TableGuess guess;
+  Packing pack(bytes);
+  pack(guess);
+  return guess;
 }
 
 Result<SeriesTable> unpackedTable(const std::string& bytes) {

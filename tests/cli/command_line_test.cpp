@@ -100,9 +100,12 @@ TEST_F(Tool, NewSaysWhatIsWrongWithItsAreas) {
               HasSubstr("there is no such file"));
   EXPECT_THAT(runTool({"new", setup, "--area", grid + "@1,2"}).err,
               HasSubstr("The first area lies in no other"));
-  EXPECT_THAT(
-      runTool({"new", setup, "--area", grid, "--area", grid}).err,
-      HasSubstr(theEdition.wetlandSweepKit ? "has at most 1 area" : "Area 2 lies in another: say where"));
+  EXPECT_THAT(runTool({"new", setup, "--area", grid, "--area", grid}).err,
+              HasSubstr(theEdition.wetlandSweepKit
+                            ? "has at most 1 area"
+                            : "Area 2 lies in another: say where its first point is, as --area FILE@J,K"));
+  EXPECT_THAT(runTool({"new", setup, "--area", grid + "@1;2"}).err,
+              HasSubstr("where an area lies is told as FILE@J,K, by two whole numbers"));
   EXPECT_THAT(runTool({"new", setup, "--enclosing", "1"}).err,
               HasSubstr("--enclosing follows the --area that it is for"));
   EXPECT_THAT(runTool({"new", setup, "--start", "yesterday"}).err,

@@ -514,6 +514,12 @@ class BesideDocument : public CompareSetups {
     ASSERT_TRUE(document.OnOpenDocument(own));
     comparison = makeSetupComparison(document);
   }
+  std::string beside(const std::string& path) { return comparison->open(path, comparison->read(path)); }
+  SetupMerging& merging() { return comparison->merging(); }
+  std::string startMerge(const std::string& base, const std::string& first, const std::string& second) {
+    return merging().start(merging().read(base, first, second));
+  }
+  std::string finishMerge() { return merging().finish(merging().make()); }
   const std::vector<Difference>& differences() {
     EXPECT_EQ(comparison->take(comparison->compare()), comparison->isOpen());
     return comparison->differences();
@@ -535,7 +541,7 @@ class BesideDocument : public CompareSetups {
 
 TEST_F(BesideDocument, ItLooksAgainAfterAnEdit) {
   EXPECT_THAT(differences(), IsEmpty());
-  EXPECT_EQ(comparison->open(make("b.v27", "flood.v27", {kDrying + "=0.05"})), "");
+  EXPECT_EQ(beside(make("b.v27", "flood.v27", {kDrying + "=0.05"})), "");
   EXPECT_THAT(lines(), ElementsAre("Basic Parameters, Flood and Dry|Drying depth|<0.1 m> <0.05 m>"));
   document.root().areaDescription->floodingDepth = 0.4F;
   document.RecordEdit(PageId::floodAndDry, "Flooding depth");
@@ -548,7 +554,7 @@ TEST_F(BesideDocument, ItLooksAgainAfterAnEdit) {
 TEST_F(BesideDocument, ADifferenceIsTakenOverAsOneStep) {
   const std::string before = textNow();
   const std::string other = make("b.v27", "flood.v27", {kDrying + "=0.05", kFlooding + "=0.3"});
-  ASSERT_EQ(comparison->open(other), "");
+  ASSERT_EQ(beside(other), "");
   EXPECT_EQ(comparison->takeOver(placeOf("Drying depth")), "");
   EXPECT_FLOAT_EQ(document.root().areaDescription->dryingDepth, 0.05F);
   EXPECT_EQ(document.UndoStep()->name, "Take over Drying depth");
@@ -569,7 +575,7 @@ TEST_F(BesideDocument, ARowIsTakenOverWithAllThatIsSaidOfIt) {
       make("b.v27", "flood.v27",
            {kSources + "=2", "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/SOURCE_SINK_2/Source_Point=7,8",
             "HYDRODYNAMIC_MODULE/SOURCE_AND_SINK/SOURCE_SINK_2/Constant_Magnitude=3.5"});
-  ASSERT_EQ(comparison->open(other), "");
+  ASSERT_EQ(beside(other), "");
   EXPECT_EQ(comparison->takeOver(placeOf("Row 2")), "");
   EXPECT_THAT(lines(), IsEmpty());
 }
@@ -580,7 +586,7 @@ TEST_F(BesideDocument, AllIsTakenOver) {
     SCOPED_TRACE(name);
     const std::string before = textNow();
     const std::string other = make("b.v27", name);
-    ASSERT_EQ(comparison->open(other), "");
+    ASSERT_EQ(beside(other), "");
     if (differences().empty()) continue;
     EXPECT_EQ(comparison->takeOverAll(), "");
     EXPECT_THAT(lines(), IsEmpty());
@@ -593,7 +599,7 @@ TEST_F(BesideDocument, AllIsTakenOver) {
 TEST_F(BesideDocument, TheOtherPageCanBeReadOnly) {
   const std::string other = make("b.v27", "flood.v27", {kDrying + "=0.05"});
   EXPECT_EQ(comparison->openPage(26), nullptr);
-  ASSERT_EQ(comparison->open(other), "");
+  ASSERT_EQ(beside(other), "");
   Form* form = comparison->openPage(26);
   ASSERT_NE(form, nullptr);
   EXPECT_EQ(form->find("Drying depth:")->text, "0.05");
@@ -608,14 +614,14 @@ TEST_F(BesideDocument, TheOtherPageCanBeReadOnly) {
 }
 
 TEST_F(BesideDocument, WhatCannotBeReadIsTold) {
-  ASSERT_EQ(comparison->open(make("b.v27", "flood.v27", {kDrying + "=0.05"})), "");
-  EXPECT_THAT(comparison->open(folder.file("none.v27")), HasSubstr("none.v27"));
+  ASSERT_EQ(beside(make("b.v27", "flood.v27", {kDrying + "=0.05"})), "");
+  EXPECT_THAT(beside(folder.file("none.v27")), HasSubstr("none.v27"));
   // The one before stays.
   EXPECT_TRUE(comparison->isOpen());
   EXPECT_THAT(lines(), ::testing::SizeIs(1));
   EXPECT_THAT(comparison->takeOver(9), HasSubstr("no such difference"));
-  EXPECT_THAT(comparison->startMerge(folder.file("none.v27"), {}, own), HasSubstr("none.v27"));
-  EXPECT_THAT(comparison->startMerge(own, {}, folder.write("no.v27", "A {}\n")), HasSubstr("is not a setup"));
+  EXPECT_THAT(startMerge(folder.file("none.v27"), {}, own), HasSubstr("none.v27"));
+  EXPECT_THAT(startMerge(own, {}, folder.write("no.v27", "A {}\n")), HasSubstr("is not a setup"));
 }
 
 TEST_F(BesideDocument, AMergeIsOneStep) {
@@ -624,32 +630,32 @@ TEST_F(BesideDocument, AMergeIsOneStep) {
   document.root().areaDescription->dryingDepth = 0.05F;
   document.RecordEdit(PageId::floodAndDry, "Drying depth");
   const std::string before = textNow();
-  ASSERT_EQ(comparison->startMerge(base, {}, other), "");
-  ASSERT_EQ(comparison->questions().size(), 1U);
-  EXPECT_EQ(comparison->questions()[0].thing, kDrying);
-  EXPECT_FALSE(comparison->takeQuestions(""));
-  EXPECT_TRUE(comparison->takeQuestions(comparison->wordQuestions()));
-  EXPECT_EQ(comparison->questions()[0].pageName, "Basic Parameters, Flood and Dry");
-  EXPECT_EQ(comparison->questions()[0].thing, "Drying depth");
-  EXPECT_EQ(comparison->questions()[0].own, "0.05 m");
-  EXPECT_EQ(comparison->finishMerge(), "");
+  ASSERT_EQ(startMerge(base, {}, other), "");
+  ASSERT_EQ(merging().questions().size(), 1U);
+  EXPECT_EQ(merging().questions()[0].thing, kDrying);
+  EXPECT_FALSE(merging().takeWords(""));
+  EXPECT_TRUE(merging().takeWords(merging().word()));
+  EXPECT_EQ(merging().questions()[0].pageName, "Basic Parameters, Flood and Dry");
+  EXPECT_EQ(merging().questions()[0].thing, "Drying depth");
+  EXPECT_EQ(merging().questions()[0].own, "0.05 m");
+  EXPECT_EQ(finishMerge(), "");
   EXPECT_FLOAT_EQ(document.root().areaDescription->dryingDepth, 0.05F);
   EXPECT_FLOAT_EQ(document.root().areaDescription->floodingDepth, 0.3F);
   EXPECT_EQ(document.UndoStep()->name, "Merge");
   document.Undo();
   EXPECT_EQ(textNow(), before);
-  ASSERT_EQ(comparison->startMerge(base, {}, other), "");
-  comparison->questions()[0].takesOther = true;
-  EXPECT_EQ(comparison->finishMerge(), "");
+  ASSERT_EQ(startMerge(base, {}, other), "");
+  merging().questions()[0].takesOther = true;
+  EXPECT_EQ(finishMerge(), "");
   EXPECT_FLOAT_EQ(document.root().areaDescription->dryingDepth, 0.02F);
-  ASSERT_EQ(comparison->startMerge(base, {}, base), "");
-  EXPECT_EQ(comparison->finishMerge(), "The second setup has changed nothing that is not here already");
+  ASSERT_EQ(startMerge(base, {}, base), "");
+  EXPECT_EQ(finishMerge(), "The second setup has changed nothing that is not here already");
 }
 
 // What was found of a setup that has been edited since, or beside another one, changes nothing.
 TEST_F(BesideDocument, AnOlderLookIsNotTaken) {
   const std::string other = make("b.v27", "flood.v27", {kDrying + "=0.05"});
-  ASSERT_EQ(comparison->open(other), "");
+  ASSERT_EQ(beside(other), "");
   EXPECT_FALSE(comparison->isCurrent());
   const std::string early = comparison->compare();
   document.root().areaDescription->floodingDepth = 0.4F;
@@ -664,7 +670,7 @@ TEST_F(BesideDocument, AnOlderLookIsNotTaken) {
   EXPECT_FALSE(comparison->isCurrent());
   EXPECT_TRUE(comparison->take(early));
   EXPECT_THAT(comparison->differences(), ::testing::SizeIs(1));
-  ASSERT_EQ(comparison->open(other), "");
+  ASSERT_EQ(beside(other), "");
   EXPECT_FALSE(comparison->take(early));
   const std::string found = comparison->compare();
   for (const std::string& bytes :
@@ -683,7 +689,7 @@ TEST_F(BesideDocument, OneOfVeryManyIsTakenOver) {
   ASSERT_TRUE(document.OnOpenDocument(own));
   const std::string other = folder.write("b.v27", withEach(test::textOf(own), "Constant_Magnitude",
                                                            [](int n) { return fmt::format("{}.25", n); }));
-  ASSERT_EQ(comparison->open(other), "");
+  ASSERT_EQ(beside(other), "");
   ASSERT_THAT(differences(), ::testing::SizeIs(kMany));
   const std::string thing = comparison->differences()[600].thing;
   EXPECT_EQ(comparison->takeOver(600), "");
@@ -703,7 +709,7 @@ TEST_F(BesideDocument, OptionsAreBroughtIn) {
     const Node* mode = nodeAt(*file, "NESTED_MODEL_GLOBALS/OPTION_PARAMETERS/mode");
     return mode == nullptr ? std::string() : shownValues(*mode);
   };
-  ASSERT_EQ(comparison->open(other), "");
+  ASSERT_EQ(beside(other), "");
   const auto undoAndRedo = [&](const char* name) {
     EXPECT_EQ(savedMode(), "2");
     EXPECT_EQ(document.UndoStep()->name, name);
@@ -722,13 +728,47 @@ TEST_F(BesideDocument, OptionsAreBroughtIn) {
   EXPECT_EQ(comparison->takeOver(placeOf("NESTED_MODEL_GLOBALS/OPTION_PARAMETERS/mode")), "");
   EXPECT_THAT(lines(), IsEmpty());
   undoAndRedo("Take over NESTED_MODEL_GLOBALS/OPTION_PARAMETERS/mode");
-  ASSERT_EQ(comparison->startMerge(base, {}, other), "");
-  EXPECT_EQ(comparison->finishMerge(), "");
+  ASSERT_EQ(startMerge(base, {}, other), "");
+  EXPECT_EQ(finishMerge(), "");
   undoAndRedo("Merge");
   // It reaches the file, and what stands there beside the options stays.
   document.Redo();
   ASSERT_TRUE(document.OnSaveDocument(own));
   EXPECT_TRUE(compare(own, other).isSame());
+}
+
+// A save writes the options of xenobiotics further in than it looks for them.
+TEST_F(BesideDocument, OptionsOfXenobioticsAreBroughtIn) {
+  if (theEdition.wetlandSweepKit) GTEST_SKIP() << "one module";
+  const std::string type = "NESTED_MODEL_GLOBALS/MODULE_SELECTION/Simulation_Type=8";
+  own = make("a.v27", "flood.v27", {type});
+  ASSERT_TRUE(document.OnOpenDocument(own));
+  std::string text = test::textOf(own);
+  text.insert(text.find("HYDRODYNAMIC_MODULE {"),
+              "XENOBIOTIC_MODULE {\nOPTION_PARAMETERS {\ndeep {\nmode 2\n}\n}\n}\n");
+  const std::string other = folder.write("b.v27", text);
+  const auto savedMode = [&] {
+    const KvsHandle file = document.file().tree(own);
+    const Node* mode =
+        nodeAt(*file, "MUD_TRANSPORT_EXPANDED_MODULE/XENOBIOTIC_MODULE/OPTION_PARAMETERS/deep/mode");
+    return mode == nullptr ? std::string() : shownValues(*mode);
+  };
+  const auto take = [&](const std::function<std::string()>& bring) {
+    EXPECT_EQ(savedMode(), "");
+    EXPECT_EQ(bring(), "");
+    EXPECT_EQ(savedMode(), "2");
+    EXPECT_THAT(lines(), IsEmpty());
+    document.Undo();
+  };
+  ASSERT_EQ(beside(other), "");
+  ASSERT_THAT(lines(), ::testing::SizeIs(1));
+  take([&] { return comparison->takeOver(0); });
+  ASSERT_THAT(lines(), ::testing::SizeIs(1));
+  take([&] { return comparison->takeOverPage(0); });
+  ASSERT_THAT(lines(), ::testing::SizeIs(1));
+  take([&] { return comparison->takeOverAll(); });
+  ASSERT_EQ(startMerge(own, {}, other), "");
+  take([&] { return finishMerge(); });
 }
 
 // What this version does not know of the first of two files is asked for at the save, and not before.
@@ -739,11 +779,57 @@ TEST_F(BesideDocument, AMergeOfFilesKeepsWhatIsUnknown) {
   text.insert(text.find("MODULE_SELECTION {"), "LATER_PART {\na 1\n}\n");
   const std::string first = folder.write("first.v27", text);
   ASSERT_TRUE(document.OnNewDocument());
-  ASSERT_EQ(comparison->startMerge(base, first, second), "");
-  EXPECT_EQ(comparison->finishMerge(), "");
+  ASSERT_EQ(startMerge(base, first, second), "");
+  EXPECT_THAT(merging().leftOut(), IsEmpty());
+  EXPECT_EQ(finishMerge(), "");
   EXPECT_THAT(document.file().unknownSections(), ::testing::Contains(HasSubstr("LATER_PART")));
   document.Undo();
   EXPECT_THAT(document.file().unknownSections(), IsEmpty());
+}
+
+// What it does not know of the second is told before, unless the first has it too.
+TEST_F(BesideDocument, WhatAMergeLeavesOutIsTold) {
+  const std::string base = make("base.v27", "flood.v27");
+  const auto later = [&](const char* name, const char* value) {
+    std::string text = test::textOf(base);
+    text.insert(text.find("MODULE_SELECTION {"), fmt::format("LATER_PART {{\na {}\n}}\n", value));
+    return folder.write(name, text);
+  };
+  const std::string second = later("second.v27", "1");
+  ASSERT_EQ(startMerge(base, {}, second), "");
+  EXPECT_THAT(merging().leftOut(), ElementsAre("NESTED_MODEL_GLOBALS/LATER_PART"));
+  EXPECT_THAT(finishMerge(), HasSubstr("nothing that is not here"));
+  EXPECT_EQ(startMerge(base, later("same.v27", "1"), second), "");
+  EXPECT_THAT(merging().leftOut(), IsEmpty());
+  EXPECT_EQ(startMerge(base, later("other.v27", "2"), second), "");
+  EXPECT_THAT(merging().leftOut(), ElementsAre("NESTED_MODEL_GLOBALS/LATER_PART"));
+}
+
+// What was read, or made, is taken whole and for the setup as it was, or not at all.
+TEST_F(BesideDocument, NothingIsMergedByHalves) {
+  const std::string base = make("base.v27", "flood.v27");
+  const std::string other = make("b.v27", "flood.v27", {kFlooding + "=0.3"});
+  const std::string before = textNow();
+  const std::string read = comparison->read(other);
+  for (const std::string& bytes : {std::string(), read.substr(0, read.size() / 2), read + "x"})
+    EXPECT_THAT(comparison->open(other, bytes), HasSubstr("incomplete"));
+  EXPECT_FALSE(comparison->isOpen());
+  const std::string found = merging().read(base, {}, other);
+  for (const std::string& bytes : {found.substr(0, found.size() / 2), found + "x"})
+    EXPECT_THAT(merging().start(bytes), HasSubstr("incomplete"));
+  EXPECT_THAT(finishMerge(), HasSubstr("nothing to merge"));
+  ASSERT_EQ(merging().start(found), "");
+  const std::string made = merging().make();
+  EXPECT_THAT(merging().finish(made.substr(0, made.size() - 4)), HasSubstr("incomplete"));
+  EXPECT_EQ(textNow(), before);
+  ASSERT_EQ(merging().start(found), "");
+  document.root().areaDescription->dryingDepth = 0.05F;
+  document.RecordEdit(PageId::floodAndDry, "Drying depth");
+  EXPECT_THAT(finishMerge(), HasSubstr("edited since"));
+  document.Undo();
+  ASSERT_EQ(merging().start(found), "");
+  EXPECT_EQ(finishMerge(), "");
+  EXPECT_FLOAT_EQ(document.root().areaDescription->floodingDepth, 0.3F);
 }
 
 // Three files become a new document, with file names that lead where they led.
@@ -752,17 +838,17 @@ TEST_F(BesideDocument, ThreeFilesAreMergedIntoANewOne) {
   const std::string first = make("first.v27", "flood.v27", {kDrying + "=0.05"});
   const std::string second = make("second.v27", "flood.v27", {kDrying + "=0.02", kFlooding + "=0.3"});
   ASSERT_TRUE(document.OnNewDocument());
-  ASSERT_EQ(comparison->startMerge(base, first, second), "");
-  ASSERT_EQ(comparison->questions().size(), 1U);
-  comparison->questions()[0].takesOther = true;
-  EXPECT_EQ(comparison->finishMerge(), "");
+  ASSERT_EQ(startMerge(base, first, second), "");
+  ASSERT_EQ(merging().questions().size(), 1U);
+  merging().questions()[0].takesOther = true;
+  EXPECT_EQ(finishMerge(), "");
   EXPECT_EQ(document.path(), "");
   EXPECT_TRUE(document.IsModified());
   fs::create_directories(folder.file("elsewhere"));
   ASSERT_TRUE(document.OnSaveDocument(folder.file("elsewhere/merged.v27")));
   EXPECT_THAT(linesOf(compare(folder.file("elsewhere/merged.v27"), second).differences), IsEmpty());
-  EXPECT_THAT(comparison->startMerge(base, folder.file("none.v27"), second), HasSubstr("none.v27"));
-  EXPECT_THAT(comparison->finishMerge(), HasSubstr("nothing to merge"));
+  EXPECT_THAT(startMerge(base, folder.file("none.v27"), second), HasSubstr("none.v27"));
+  EXPECT_THAT(finishMerge(), HasSubstr("nothing to merge"));
 }
 
 }  // namespace compare_setups_test

@@ -204,6 +204,9 @@ GRID = {"points": (3, 2), "spacing": (1, 1), "land": 1}
     ("convert_raster", RASTER, "force", "yes", WrongType, "True or False"),
     ("convert_raster", RASTER, "progress", 3, WrongType, "a function of two numbers, or None"),
     ("convert_series", SERIES, "item_type", [999, None], WrongType, "the code or name of an item type"),
+    ("convert_series", SERIES, "missing", "-999", WrongType, "a list"),
+    ("convert_series", SERIES, "missing", [-999, None], WrongType, "a number"),
+    ("convert_series", SERIES, "missing", float("nan"), WrongValue, "a finite number"),
     ("convert_series", SERIES, "start", 5, WrongType, "a datetime of whole seconds without a time zone"),
     ("convert_series", SERIES, "start", AWARE, WrongValue, "a datetime of whole seconds without a time zone"),
     ("convert_series", SERIES, "start", START.replace(microsecond=1), WrongValue, "a datetime of whole seconds"),
@@ -250,3 +253,29 @@ def test_points_and_tables_that_tell_what_they_hold(tmp_path):
     assert gridbay_setup.convert_series(table, tmp_path / "table.tsb0", dates="dmy").items == ["water level"]
     data = gridbay_setup.open_data(tmp_path / "table.tsb0")
     assert data.start == datetime.datetime(2020, 2, 1, 6) and data.items[0].name == "water level"
+
+
+@pytest.mark.parametrize("missing, values", [
+    (None, [1, None, -777, 3]),  # -9999 is recognised
+    (-777, [1, -9999, None, 3]),
+    ([-777, -9999.0], [1, None, None, 3]),
+    (numpy.array([3.0, 1]), [None, -9999, -777, None]),
+    ([], [1, None, -777, 3]),
+])  # fmt: skip
+def test_numbers_stand_for_missing_values(tmp_path, missing, values):
+    table = tmp_path / "gauge.csv"
+    table.write_text("date,water level [m]\n2020-02-01,1\n2020-02-02,-9999\n2020-02-03,-777\n2020-02-04,3\n")
+    gridbay_setup.convert_series(table, tmp_path / "gauge.tsb0", missing=missing)
+    data = gridbay_setup.open_data(tmp_path / "gauge.tsb0")
+    read = data.read_all(1)
+    assert [None if numpy.isnan(value) or value == data.items[0].missing else value for value in read] == values
+
+
+def test_values_may_be_missing_with_a_start_when_it_is_said_which(tmp_path):
+    table = tmp_path / "rain.csv"
+    table.write_text("0,1\n1,-1\n2,3\n")
+    with pytest.raises(WrongValue):
+        gridbay_setup.convert_series(table, tmp_path / "a.tsb0", item_type=999, start=START, missing=float("inf"))
+    gridbay_setup.convert_series(table, tmp_path / "a.tsb0", item_type=999, start=START, missing=-1)
+    data = gridbay_setup.open_data(tmp_path / "a.tsb0")
+    assert numpy.isnan(data.read_all(1)[1]) or data.read_all(1)[1] == data.items[0].missing

@@ -4,6 +4,7 @@
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QLabel>
+#include <QProgressDialog>
 #include <QPushButton>
 #include <QScrollBar>
 #include <QStatusBar>
@@ -13,6 +14,7 @@
 #include "shell/compare/merge_files_dialog.h"
 #include "shell/grid_view.h"
 #include "tests/shell/desktop_fixture.h"
+#include "tests/shell/held_work.h"
 
 namespace gridbay::shell {
 
@@ -85,6 +87,14 @@ class CompareTest final : public DesktopFixture {
     poll.start(10);
     begin();
     return isShown;
+  }
+
+  // Cancels the n-th work beside the window, which is held; whether it was there.
+  static bool cancels(int nth, const std::function<void()>& begin) {
+    signalCopy(nth, SIGSTOP);
+    return with<QProgressDialog>(
+        [](QProgressDialog& dialog) { QTest::mouseClick(dialog.findChild<QPushButton*>(), Qt::LeftButton); },
+        begin);
   }
 
  private slots:
@@ -368,6 +378,61 @@ class CompareTest final : public DesktopFixture {
     QVERIFY(merge(true, true));
     QVERIFY(tab().goToPage(kFloodAndDry));
     QCOMPARE(edit(kDepth).text(), QString("0.05"));
+  }
+
+  // Of both kinds of merge: with something to choose, and without.
+  void whatAMergeLeavesOutIsToldBefore() {
+    makeOther("base.v27", {});
+    QByteArray text = textOf(file("o.v27")).toUtf8();
+    text.insert(text.indexOf("MODULE_SELECTION {"), "LATER_PART {\na 1\n}\n");
+    write(file("o.v27"), text);
+    const auto merge = [this] { return window_->merge(file("base.v27"), {}, file("o.v27")); };
+    for (const auto answer : {QMessageBox::No, QMessageBox::Yes}) {
+      bool isDone = false;
+      const QStringList told = answers({answer}, [&] { isDone = merge(); });
+      QCOMPARE(told.size(), 1);
+      QVERIFY2(told[0].contains("NESTED_MODEL_GLOBALS/LATER_PART of o.v27"), qPrintable(told[0]));
+      QCOMPARE(isDone, answer == QMessageBox::Yes);
+      QCOMPARE(undoName(), QString(isDone ? "Merge" : ""));
+    }
+    window_->undoAction()->trigger();
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    enter(kDepth, "0.01");
+    QString warning;
+    const auto read = [&](MergeDialog& dialog) {
+      warning = dialog.findChild<QLabel*>("warning")->text();
+      dialog.reject();
+    };
+    QVERIFY(with<MergeDialog>(read, [&] { QVERIFY(!merge()); }));
+    QVERIFY2(warning.contains("LATER_PART"), qPrintable(warning));
+  }
+
+  // Reading and merging go beside the window: when either is cancelled or comes to a sudden end, nothing has
+  // changed.
+  void readingAndMergingEndEarly() {
+    makeOther("base.v27", {});
+    const std::uint64_t before = tab().editor().modelState();
+    bool isDone = true;
+    const auto compare = [&] { isDone = window_->compareWith(file("o.v27")); };
+    const auto merge = [&] { isDone = window_->merge(file("base.v27"), {}, file("o.v27")); };
+    QVERIFY(cancels(1, compare));
+    QVERIFY(!isDone && TabComparison::of(&tab()) == nullptr);
+    for (const int step : {1, 2}) {
+      isDone = true;
+      QVERIFY(cancels(step, merge));
+      QVERIFY(!isDone);
+    }
+    for (const auto& [step, act] :
+         {std::pair<int, std::function<void()>>{1, compare}, {1, merge}, {2, merge}}) {
+      isDone = true;
+      signalCopy(step, SIGKILL);
+      const QStringList told = answers({QMessageBox::Ok}, act);
+      QVERIFY(!isDone);
+      QVERIFY2(told.size() == 1 && told[0].contains("came to a sudden end"), qPrintable(told.join("\n")));
+    }
+    QCOMPARE(tab().editor().modelState(), before);
+    QVERIFY(window_->merge(file("base.v27"), {}, file("o.v27")));
+    QVERIFY(compareWith("o.v27"));
   }
 
   // The window goes on while a long comparison is at work, whose result is not that of the setup as it is by

@@ -17,8 +17,10 @@
 #include "platform/tsb/tsb_file.h"
 #include "platform/units/units.h"
 #include "shell/appearance.h"
+#include "shell/grid_view.h"
 #include "shell/shades.h"
 #include "tests/shell/desktop_fixture.h"
+#include "tests/shell/held_work.h"
 #include "tests/shell/import_checks.h"
 #include "tests/shell/real_keys.h"
 
@@ -380,6 +382,60 @@ class SeriesImportTest final : public DesktopFixture {
     QCOMPARE(result("table.tsb0").definition().time.count, std::size_t{1'000'000});
   }
 
+  // A long table is recognised from its first lines at once, and from all of them beside the window.
+  void aLongTableIsRecognisedBesideTheWindow() {
+    showDialog();
+    QByteArray text = "Date,Q [m3/s],water level [m]\n";
+    for (int i = 0; i < 6000; ++i)
+      text += QByteArray::number(i % 12 + 1) + "/" + (i < 5000 ? "1" : "25") + "/" +
+              QByteArray::number(1500 + i / 12) + (i == 4000 ? ",-9999,2\n" : ",1.5,2\n");
+    write(file("table.csv"), text);
+    const auto openSignalled = [this](int signal) {
+      signalCopy(1, signal);
+      return dialog_->openTable(file("table.csv"));
+    };
+    // The first lines are seen, and can be worked at.
+    QVERIFY(openSignalled(SIGSTOP));
+    QCOMPARE(dialog_->preview().model()->rowCount(), 200);
+    QCOMPARE(dialog_->form().dates().currentText(), QString("Day first"));
+    QCOMPARE(dialog_->form().missing().text(), QString());
+    QVERIFY(part<QPushButton>("cancel").isVisible() && dialog_->isReading());
+    fill(row(2).name, "Flow");
+    QTRY_COMPARE(dialog_->lines().headerData(1, Qt::Horizontal, Qt::DisplayRole).toString(), QString("Flow"));
+    // What all lines tell is added to what was changed meanwhile.
+    releaseCopies();
+    settle();
+    QCOMPARE(dialog_->form().dates().currentText(), QString("Month first"));
+    QCOMPARE(dialog_->form().missing().text(), QString("-9999"));
+    QCOMPARE(row(2).name->text(), QString("Flow"));
+    QCOMPARE(verdict(), QString("6000 lines are read."));
+    QVERIFY(!part<QPushButton>("cancel").isVisible());
+    // Cancelled, or ended by a fault of its own: the first lines have to do, which is said.
+    for (const bool isCancelled : {true, false}) {
+      QVERIFY(openSignalled(isCancelled ? SIGSTOP : SIGKILL));
+      if (isCancelled) QTest::mouseClick(&part<QPushButton>("cancel"), Qt::LeftButton);
+      settle();
+      QVERIFY(dialog_->doubts()->text().contains("Only the first 2000 lines were looked at"));
+      QCOMPARE(dialog_->form().dates().currentText(), QString("Day first"));
+      QVERIFY2(verdict().contains("can't be read and are left out"), qPrintable(verdict()));
+    }
+    // What parts the fields is another look at all; an import waits for it.
+    focus(&dialog_->form().separator());
+    pressKey(Qt::Key_Up);
+    pressKey(Qt::Key_Down);
+    settle();
+    QCOMPARE(dialog_->form().missing().text(), QString("-9999"));
+    QVERIFY(!dialog_->doubts()->text().contains("Only the first"));
+    QVERIFY(openSignalled(SIGSTOP));
+    QVERIFY(dialog_->importButton()->isEnabled());
+    QTest::mouseClick(dialog_->importButton(), Qt::LeftButton);
+    QVERIFY(dialog_->isImporting() && folderFiles().isEmpty());
+    releaseCopies();
+    QTRY_COMPARE_WITH_TIMEOUT(folderFiles(), QStringList("table.tsb0"), kLong);
+    QTRY_VERIFY_WITH_TIMEOUT(!dialog_->isImporting(), kLong);
+    QCOMPARE(result("table.tsb0").definition().time.count, std::size_t{6000});
+  }
+
   void whatIsNoMissingValueIsRefusedAtItsField() {
     showDialog();
     open("d,Q\n2020-01-01,1\n2020-01-02,-777.25\n2020-01-03,3\n");
@@ -501,7 +557,7 @@ class SeriesImportTest final : public DesktopFixture {
     QTRY_VERIFY(window_->statusBar()->currentMessage().contains("pasted.tsb0: Column 2 of 2 time steps"));
     // Nothing asks for a discharge; what to do about it is said. The help is there meanwhile.
     const QString why = dialog->findChild<QLabel*>("why")->text();
-    QVERIFY2(why.startsWith("s.v27 has no place that asks for such a series now."), qPrintable(why));
+    QVERIFY2(why.startsWith("s.v27 has no place that takes such a series."), qPrintable(why));
     QTest::keyClick(dialog, Qt::Key_F1);
     QVERIFY(window_->help().browser().toPlainText().startsWith("Import Series"));
     QCOMPARE(result("pasted.tsb0").definition().items[0].type, item::kDischarge);
@@ -573,12 +629,74 @@ class SeriesImportTest final : public DesktopFixture {
     run("v27setup", {"convert", "series", "short.csv", "short.tsb0", "--item-type", "100088"});
     const SeriesPlaces doubtful = editor.seriesPlaces(file("short.tsb0").toStdString());
     QVERIFY(doubtful.places.size() == 1 && !doubtful.places[0].doubt.empty());
-    QCOMPARE(doubtful.others.size(), std::size_t{1});
+    QCOMPARE(doubtful.others.at(0),
+             std::string("Hydrodynamic Parameters, Wind Conditions: Wind, Wind speed"));
     QCOMPARE(editor.useSeries(file("short.tsb0").toStdString(), doubtful.places[0]), std::string());
     // A place that is gone meanwhile is told.
     SeriesPlace gone = doubtful.places[0];
     gone.page = 1;
     QVERIFY(!editor.useSeries(file("short.tsb0").toStdString(), gone).empty());
+  }
+
+  // What is constant today is offered with the format that it takes, which is switched in the same step: a
+  // list of the page for the rain, and one in the row of a table for a source.
+  void aConstantPlaceGetsTheSeriesWithItsFormat() {
+    makeWindow();
+    run("v27setup", {"set", "s.v27", "NESTED_MODEL_GLOBALS/SOURCE_AND_SINK/Number_Of_Sources=3"});
+    QVERIFY(window_->openDocument(file("s.v27")) != nullptr);
+    write(file("both.csv"),
+          "d,rain [mm/d],discharge [m3/s],flow velocity [m/s],water level "
+          "[m]\n1980-01-01,1,2,3,4\n2000-01-02,5,6,7,8\n");
+    window_->importSeries();
+    SeriesImport& dialog = *window_->seriesImport();
+    QVERIFY(QTest::qWaitForWindowActive(&dialog));
+    QVERIFY(dialog.openTable(file("both.csv")));
+    QTRY_VERIFY_WITH_TIMEOUT(!dialog.isReading() && dialog.importButton()->isEnabled(), kLong);
+    QTest::mouseClick(dialog.importButton(), Qt::LeftButton);
+    auto* use = dialog.findChild<QComboBox*>("use");
+    QTRY_VERIFY2_WITH_TIMEOUT(use->isVisible(), qPrintable(dialog.verdict()->text()), kLong);
+    QStringList offered;
+    for (int i = 0; i < use->count(); ++i) offered << use->itemText(i);
+    const QString flow = "Hydrodynamic Parameters, ";
+    QVERIFY2(
+        offered.contains(flow + "Source and Sink: Precipitation, File name of s.v27, given as \"Type 0\""),
+        qPrintable(offered.join("\n")));
+    const QString source = flow + "Source and Sink: file, row 2: (0,0)-> of s.v27, given as \"From file\"";
+    QVERIFY2(offered.contains(source), qPrintable(offered.join("\n")));
+    const QString boundary = flow + "Boundary: Boundary 1, data of s.v27, given as \"Type 0 data file\"";
+    QVERIFY2(offered.contains(boundary), qPrintable(offered.join("\n")));
+    SetupEditor& editor = window_->currentDocument()->editor();
+    const std::uint64_t before = editor.modelState();
+    const auto take = [&](const QString& place) {
+      use->setCurrentIndex(use->findText(place));
+      QTest::mouseClick(dialog.findChild<QPushButton*>("act"), Qt::LeftButton);
+      QVERIFY(window_->saveDocument(file("s.v27")));
+    };
+    take(source);
+    QVERIFY(textOf(file("s.v27"))
+                .contains(QRegularExpression(
+                    "SOURCE_SINK_2 \\{[^}]*Data_Format 1[^}]*both.tsb0\"\\s+Item_Numbers 2 3")));
+    QCOMPARE(tab().pane().tableAt(1)->model()->index(1, 0).data().toString(), QString("From file"));
+    window_->currentDocument()->undo();
+    QCOMPARE(editor.modelState(), before);
+    QCOMPARE(tab().pane().tableAt(1)->model()->index(1, 0).data().toString(), QString("Constant value"));
+    take(boundary);
+    QVERIFY(textOf(file("s.v27")).contains(QRegularExpression("both.tsb0\"\\s+Item_Numbers 4")));
+    window_->currentDocument()->undo();
+    QCOMPARE(editor.modelState(), before);
+    // The format may have been chosen meanwhile, or be none any more.
+    const std::string series = file("both.tsb0").toStdString();
+    const SeriesPlaces places = editor.seriesPlaces(series);
+    const auto rain = std::ranges::find(places.places, std::string("Type 0"),
+                                        [](const SeriesPlace& place) { return place.format.choice; });
+    QVERIFY(rain != places.places.end());
+    SeriesPlace wrong = *rain;
+    wrong.format.choice = "Type 9";
+    QVERIFY(!editor.useSeries(series, wrong).empty());
+    QCOMPARE(editor.useSeries(series, *rain), std::string());
+    QCOMPARE(editor.useSeries(series, *rain), std::string());
+    // It asks for a series as it is now.
+    QVERIFY(editor.seriesPlaces(series).places.front().format.choice.empty());
   }
 
   void picturesAreTaken() {
