@@ -68,7 +68,8 @@ struct Window {
   int rows = 0;
 };
 
-// What a frame and its neighbourhood need of a raster: all of it where they have nothing of it.
+// What a frame and its neighbourhood need of a raster: its first point, to stand for it, where they have
+// nothing of it.
 Window windowOf(GDALDatasetH raster, const std::string& projection, const BackgroundFrame& frame) {
   const Window whole{0, 0, GDALGetRasterXSize(raster), GDALGetRasterYSize(raster)};
   const bool isNamed = GDALGetSpatialRef(raster) != nullptr || GDALGetGCPSpatialRef(raster) != nullptr;
@@ -100,7 +101,7 @@ Window windowOf(GDALDatasetH raster, const std::string& projection, const Backgr
   Window window{at(std::floor(left), whole.columns), at(std::floor(top), whole.rows)};
   window.columns = at(std::ceil(right), whole.columns) - window.left;
   window.rows = at(std::ceil(bottom), whole.rows) - window.top;
-  return window.columns > 0 && window.rows > 0 ? window : whole;
+  return window.columns > 0 && window.rows > 0 ? window : Window{0, 0, 1, 1};
 }
 
 bool copyRaster(Dataset source, const CopyWanted& wanted, BackgroundCopy& copy, std::string* error) {

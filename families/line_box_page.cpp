@@ -10,10 +10,16 @@ PlaceDlg::PlaceDlg(CVdDoc& document, const PlaceTexts& texts, const LineOrBox& i
   const auto copy = [this]() -> LineOrBox& { return copy_; };
   const auto point = [&](std::string_view label, GridPoint LineOrBox::*member) {
     const auto held = [copy, member]() -> GridPoint& { return copy().*member; };
+    FieldPick pick;
     form().Group(label, [&] {
-      form().Number("J", held, &GridPoint::j);
-      form().Number("K", held, &GridPoint::k).Beside();
+      pick.fields = {&form().Number("J", held, &GridPoint::j),
+                     &form().Number("K", held, &GridPoint::k).Beside()};
     });
+    pick.wanted = [copy, held, name = std::string(label)] {
+      return CellPick{.name = name, .area = copy().areaNumber, .held = {{.point = held()}}};
+    };
+    pick.take = [held](std::span<const PickedPlace> places) { held() = places.front().point; };
+    AddPick(std::move(pick));
   };
   point(texts.first, &LineOrBox::first);
   point(texts.last, &LineOrBox::last);

@@ -72,7 +72,8 @@ Stored CGxPoints::store(std::string& cell, std::string_view text) {
 
 void CGxPoints::LayOut() {
   Rows([this] { return GetCount(); });
-  const auto coordinate = [this](std::string_view header, std::string Row::*member) {
+  const Column::Pick pick = pointPick();
+  const auto coordinate = [this, &pick](std::string_view header, std::string Row::*member) {
     const auto cell = [this, member](GridRow row) -> std::string& {
       return rows_[static_cast<std::size_t>(row.item) - 1].*member;
     };
@@ -80,10 +81,30 @@ void CGxPoints::LayOut() {
          .width = 80,
          .get = cell,
          .set = [this, cell](GridRow row, std::string_view text) { return store(cell(row), text); }})
-        .Right();
+        .Right()
+        .Picks(pick);
   };
   coordinate(isInteger_ ? "j" : "x", &Row::first);
   coordinate(isInteger_ ? "k" : "y", &Row::second);
+}
+
+// Points of the grid can be pointed at on a map.
+Column::Pick CGxPoints::pointPick() {
+  if (!isInteger_) return {};
+  const auto rowOf = [this](GridRow row) -> Row& { return rows_[static_cast<std::size_t>(row.item) - 1]; };
+  const auto wanted = [rowOf](GridRow row) {
+    CellPick pick{.name = "Point"};
+    const std::optional<double> j = numberOf(rowOf(row).first);
+    const std::optional<double> k = numberOf(rowOf(row).second);
+    if (j && k) pick.held = {{.point = {wholeOf(*j), wholeOf(*k)}}};
+    return std::optional(pick);
+  };
+  const auto take = [rowOf](GridRow row, std::span<const PickedPlace> places) {
+    const GridPoint point = places.front().point;
+    rowOf(row) = {std::to_string(point.j), std::to_string(point.k)};
+    return Stored::taken;
+  };
+  return {wanted, take};
 }
 
 CPoints4Dlg::CPoints4Dlg(CVdDoc& document, std::span<const double> j, std::span<const double> k,

@@ -30,6 +30,7 @@ class CGxPoints final : public ColumnGrid {
 
  private:
   void LayOut() override;
+  Column::Pick pointPick();
   std::string shown(double value) const;
   Stored store(std::string& cell, std::string_view text);
 

@@ -25,10 +25,12 @@ bool hasAreaOrTells(CVdDoc& document, const ResultLimits& limits) {
   return limits.hasArea;
 }
 
-bool chooseResultPart(CVdDoc& document, const ResultLimits& limits, USubArea& part, USubLine& steps) {
+bool chooseResultPart(CVdDoc& document, const ResultLimits& limits, std::int32_t area, USubArea& part,
+                      USubLine& steps, bool isLine) {
   if (!hasAreaOrTells(document, limits)) return false;
   CV27SetupResultSubsetDialog dialog(CV27SetupResultSubsetDialog::rangeOf(part, steps), limits.lastJ,
                                      limits.lastK, limits.lastStep);
+  dialog.SetPick(area, isLine);
   if (dialog.DoModal(document.host()) != 1) return false;
   CV27SetupResultSubsetDialog::copyBack(dialog.range(), part, steps);
   return true;

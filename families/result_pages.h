@@ -15,9 +15,10 @@ namespace gridbay {
 // The file that is written of an output of that extent.
 FileKind resultFileKind(Extent extent);
 
-// Lets the user choose the part of the grid and the steps in a dialog; true when he did. Without an area that
-// is told.
-bool chooseResultPart(CVdDoc& document, const ResultLimits& limits, USubArea& part, USubLine& steps);
+// Lets the user choose the part of an area's grid and the steps in a dialog; true when he did. Without the
+// area that is told. A part that is a line has no width when it is pointed at on a map.
+bool chooseResultPart(CVdDoc& document, const ResultLimits& limits, std::int32_t area, USubArea& part,
+                      USubLine& steps, bool isLine = false);
 // Whether there is an area; that there is none is told.
 bool hasAreaOrTells(CVdDoc& document, const ResultLimits& limits);
 

@@ -19,7 +19,8 @@ void TransportOutputColumns::ListOutput(const Output& output) {
   Range("Time", 70, [output](GridRow row) { return &output(row)->steps; });
   Button("...", 20, [this, output](GridRow row) {
     TransportOutput& it = *output(row);
-    if (chooseResultPart(document(), resultLimits(GetKvs(), kFirstArea), it.part, it.steps)) UpdateDoc();
+    if (chooseResultPart(document(), resultLimits(GetKvs(), kFirstArea), it.areaNumber, it.part, it.steps))
+      UpdateDoc();
   });
   ResultFile("Data File", 160, file);
   BrowseBeside(file);

@@ -1,5 +1,6 @@
 #include "hydrodynamic/boundary_page.h"
 
+#include <algorithm>
 #include <array>
 #include <cmath>
 
@@ -62,9 +63,9 @@ void CNhdBoundaryGrid::LayOut() {
   NewLine();
   List("", 0, object, &Object::tiltType,
        Choices::lines("No tilting\r\nNon-linear tilting about:\r\nLinear tilting about:\r\n", -1));
-  Integer("", 0, object, &Object::tiltingPoint).EnabledIf([object](GridRow row) {
-    return object(row)->tiltType >= 0;
-  });
+  Integer("", 0, object, &Object::tiltingPoint)
+      .EnabledIf([object](GridRow row) { return object(row)->tiltType >= 0; })
+      .Picks(tiltingPick());
   NewLine();
   List("", 0, object, &Object::enableUserDirections,
        Choices::lines("No user defined flow direction\r\nFlow direction from file:\r\n"));
@@ -72,6 +73,29 @@ void CNhdBoundaryGrid::LayOut() {
   const FileChoice file =
       fileOf(object, &Object::directionFile, texts::flowDirectionFile, &Object::RequestDirectionFile);
   File({.file = file, .browse = "...", .enabled = hasDirections}).EnabledIf({});
+}
+
+// The point of the boundary's line that is nearest to the place along it. A slanting line has no such points.
+Column::Pick CNhdBoundaryGrid::tiltingPick() {
+  const auto object = itemOf(&HydrodynamicParts::nhdBoundary);
+  const auto lineOf = itemOf(&BasicParts::boundary);
+  const auto isAlongK = [](const CBoundaryObjectKvs& line) { return line.first.j == line.last.j; };
+  const auto wanted = [=](GridRow row) -> std::optional<CellPick> {
+    const CBoundaryObjectKvs* line = lineOf({row.item});
+    if (line == nullptr || (line->first.j != line->last.j && line->first.k != line->last.k))
+      return std::nullopt;
+    const std::int32_t held = object(row)->tiltingPoint;
+    const GridPoint point = isAlongK(*line) ? GridPoint{line->first.j, held} : GridPoint{held, line->first.k};
+    return CellPick{.of = CellPick::Of::border, .held = {{.point = point}}};
+  };
+  const auto take = [=](GridRow row, std::span<const PickedPlace> places) {
+    const CBoundaryObjectKvs& line = *lineOf({row.item});
+    const auto along = [&](GridPoint point) { return isAlongK(line) ? point.k : point.j; };
+    const auto [least, most] = std::minmax({along(line.first), along(line.last)});
+    object(row)->tiltingPoint = std::clamp(along(places.front().point), least, most);
+    return Stored::taken;
+  };
+  return {wanted, take};
 }
 
 void CNhdBoundaryGrid::layOutData() {

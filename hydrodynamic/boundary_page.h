@@ -22,6 +22,7 @@ class CNhdBoundaryGrid final : public BlockGrid {
   void LayOut() override;
   std::string editName(int row, int col) override;
 
+  Column::Pick tiltingPick();
   void layOutData();
   std::string dataText(const CNhdBoundaryObjectKvs& object);
   Stored storeData(CNhdBoundaryObjectKvs& object, std::string_view text);

@@ -163,7 +163,9 @@ Column::Pick CResultGrid::pointsOrPart(const std::function<Output*(GridRow)>& ou
 void CResultGrid::choosePart(Output& output) {
   const ResultLimits limits = output.Limits();
   if (output.type != Output::kPoints) {
-    if (chooseResultPart(document(), limits, output.part, output.steps)) UpdateDoc();
+    const bool isLine = output.type == Output::kLine;
+    if (chooseResultPart(document(), limits, Output::kAreaNumber, output.part, output.steps, isLine))
+      UpdateDoc();
     return;
   }
   if (!hasAreaOrTells(document(), limits)) return;

@@ -4,9 +4,9 @@
 
 #include <algorithm>
 #include <charconv>
-#include <tuple>
 #include <utility>
 
+#include "pages/part_pick.h"
 #include "pages/scan.h"
 
 namespace gridbay {
@@ -218,26 +218,12 @@ Column& CellGrid::addPoint(std::string_view header, int width, std::function<Gri
                   }});
 }
 
-// An interval stays as it is.
 Column::Pick CellGrid::partPick(std::function<USubArea*(GridRow)> part,
                                 std::function<std::int32_t(GridRow)> area,
                                 std::function<bool(GridRow)> isLine) {
-  const auto wanted = [part, area](GridRow row) {
-    const USubArea& held = *part(row);
-    return std::optional(
-        CellPick{.name = "J and K",
-                 .area = area(row),
-                 .shape = CellPick::Shape::part,
-                 .most = 2,
-                 .held = {{.point = {held.x.first, held.y.first}}, {.point = {held.x.last, held.y.last}}}});
-  };
+  const auto wanted = [part, area](GridRow row) { return std::optional(pickOfPart(*part(row), area(row))); };
   const auto take = [part, isLine](GridRow row, std::span<const PickedPlace> places) {
-    const GridPoint first = places.front().point;
-    const GridPoint last =
-        isLine && isLine(row) ? alongAxis(first, places.back().point) : places.back().point;
-    USubArea& held = *part(row);
-    std::tie(held.x.first, held.x.last) = std::minmax({first.j, last.j});
-    std::tie(held.y.first, held.y.last) = std::minmax({first.k, last.k});
+    takePart(*part(row), places, isLine && isLine(row));
     return Stored::taken;
   };
   return {wanted, take};

@@ -21,7 +21,15 @@ int CV27SetupDialog::DoModal() {
   form_.load();
   form_.show(document_.units());
   form_.applyRules();
-  return document_.host().editForm(title_, form_, [this] { return fault(); }) ? 1 : 0;
+  return editForm(document_.host(), title_, form_, picks_, [this] { return fault(); }) ? 1 : 0;
+}
+
+void CV27SetupDialog::AddPick(FieldPick pick) {
+  pick.take = [this, take = std::move(pick.take)](std::span<const PickedPlace> places) {
+    take(places);
+    Refresh();
+  };
+  picks_.push_back(std::move(pick));
 }
 
 // A grid has changed the copy.

@@ -3,7 +3,9 @@
 #include <functional>
 #include <string>
 #include <string_view>
+#include <vector>
 
+#include "pages/field_picks.h"
 #include "pages/form.h"
 #include "pages/grid_host.h"
 
@@ -21,6 +23,8 @@ class CV27SetupDialog : public GridHost {
   Form& form() { return form_; }
   // What is wrong with the copy, beyond what a field shows of itself; empty for nothing. Asked on OK.
   void SetCheck(std::function<std::string()> check) { check_ = std::move(check); }
+  // Fields that hold points together, whose picks change the copy.
+  void AddPick(FieldPick pick);
   // Shows the dialog; 1 for OK, when the copy holds what was wanted.
   int DoModal();
 
@@ -36,6 +40,7 @@ class CV27SetupDialog : public GridHost {
   CVdDoc& document_;
   std::string title_;
   Form form_;
+  std::vector<FieldPick> picks_;
   std::function<std::string()> check_;
 };
 

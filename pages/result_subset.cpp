@@ -2,6 +2,8 @@
 
 #include <fmt/format.h>
 
+#include "pages/part_pick.h"
+
 namespace gridbay {
 namespace {
 
@@ -36,8 +38,31 @@ CV27SetupResultSubsetDialog::CV27SetupResultSubsetDialog(const Range& range, std
   form_.show(UnitChoices());
 }
 
+void CV27SetupResultSubsetDialog::SetPick(std::int32_t area, bool isLine) {
+  std::vector<Control*> fields;
+  for (Control& control : form_.controls()) {
+    if (control.name() == "First" || control.name() == "Last") fields.push_back(&control);
+  }
+  fields.resize(4);  // of time steps there are none on a map
+  // The other fields keep what is typed there.
+  const auto wanted = [this, area] {
+    form_.store(UnitChoices());
+    USubArea part;
+    USubLine steps;
+    copyBack(shown_, part, steps);
+    return pickOfPart(part, area);
+  };
+  const auto take = [fields, isLine](std::span<const PickedPlace> places) {
+    USubArea part;
+    takePart(part, places, isLine);
+    const std::array values{part.x.first, part.x.last, part.y.first, part.y.last};
+    for (std::size_t i = 0; i < values.size(); ++i) fields[i]->text = std::to_string(values[i]);
+  };
+  picks_ = {{fields, wanted, take}};
+}
+
 int CV27SetupResultSubsetDialog::DoModal(SetupHost& host) {
-  if (!host.editForm(kTitle, form_, [this] { return fault(); })) return 0;
+  if (!editForm(host, kTitle, form_, picks_, [this] { return fault(); })) return 0;
   range_ = shown_;
   return 1;
 }

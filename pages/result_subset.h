@@ -3,8 +3,10 @@
 #include <array>
 #include <cstdint>
 #include <string>
+#include <vector>
 
 #include "core/selections.h"
+#include "pages/field_picks.h"
 #include "pages/host.h"
 
 namespace gridbay {
@@ -24,6 +26,8 @@ class CV27SetupResultSubsetDialog {
   CV27SetupResultSubsetDialog(const Range& range, std::int32_t lastJ, std::int32_t lastK,
                               std::int32_t lastStep);
 
+  // The part can be pointed at on a map, on the grid of an area; one that is a line has no width.
+  void SetPick(std::int32_t area, bool isLine);
   // Shows the dialog; 1 for OK, with the choice in `range`. Nothing changes otherwise.
   int DoModal(SetupHost& host);
   const Range& range() const { return range_; }
@@ -35,6 +39,7 @@ class CV27SetupResultSubsetDialog {
   Range shown_;
   std::array<std::int32_t, 3> limits_;
   Form form_;
+  std::vector<FieldPick> picks_;
 };
 
 }  // namespace gridbay

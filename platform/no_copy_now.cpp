@@ -21,4 +21,8 @@ NoCopyNow::NoCopyNow() {
   lock_ = std::unique_lock(librariesAtWork());
 }
 
+bool NoCopyNow::isHeld() {
+  return !std::unique_lock(librariesAtWork(), std::try_to_lock).owns_lock();
+}
+
 }  // namespace gridbay

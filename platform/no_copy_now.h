@@ -10,6 +10,9 @@ class NoCopyNow {
  public:
   NoCopyNow();
 
+  // Whether one is held now, for who would rather come back later than wait.
+  static bool isHeld();
+
  private:
   std::unique_lock<std::mutex> lock_;
 };

@@ -2,11 +2,27 @@
 
 #include <utility>
 
+#include "platform/no_copy_now.h"
+
 namespace gridbay::shell {
+
+BackgroundWork::BackgroundWork(QObject* parent) : QObject(parent) {
+  constexpr int kMoment = 20;  // milliseconds
+  retry_.setSingleShot(true);
+  retry_.setInterval(kMoment);
+  connect(&retry_, &QTimer::timeout, this, &BackgroundWork::tryToBegin);
+}
 
 void BackgroundWork::begin(const WorkApart::Work& work, const QString& file) {
   stop();
-  Result<WorkApart> begun = WorkApart::begin(work, file.toStdString());
+  wanted_ = work;
+  file_ = file;
+  tryToBegin();
+}
+
+void BackgroundWork::tryToBegin() {
+  if (NoCopyNow::isHeld()) return retry_.start();
+  Result<WorkApart> begun = WorkApart::begin(std::exchange(wanted_, nullptr), file_.toStdString());
   if (!begun) {
     QMetaObject::invokeMethod(
         this,
@@ -23,6 +39,8 @@ void BackgroundWork::begin(const WorkApart::Work& work, const QString& file) {
 
 void BackgroundWork::stop() {
   ++round_;
+  retry_.stop();
+  wanted_ = nullptr;
   notifier_.reset();
   work_.reset();
 }

@@ -2,14 +2,16 @@
 
 #include <QApplication>
 #include <QDialog>
-#include <QDialogButtonBox>
+#include <QEventLoop>
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QGridLayout>
 #include <QInputDialog>
 #include <QMessageBox>
+#include <QMetaMethod>
 #include <QPointer>
 #include <QProgressDialog>
+#include <QPushButton>
 #include <QSettings>
 #include <QVBoxLayout>
 #include <algorithm>
@@ -163,11 +165,16 @@ bool DocumentTab::choose(CVdFileSelectorDlg& selector) {
 }
 
 bool DocumentTab::editForm(std::string_view title, Form& form, const std::function<std::string()>& fault) {
+  return editFormWithPicks(title, form, {}, fault);
+}
+
+bool DocumentTab::editFormWithPicks(std::string_view title, Form& form, std::span<const FieldPick> picks,
+                                    const std::function<std::string()>& fault) {
   QDialog dialog(this);
   dialog.setWindowTitle(QString::fromUtf8(title.data(), static_cast<qsizetype>(title.size())));
   auto* layout = new QVBoxLayout(&dialog);
   auto* pane = new PagePane(&dialog);
-  pane->showForm({}, form);
+  pane->showForm({}, form, picks);
   auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, &dialog);
   connect(buttons, &QDialogButtonBox::accepted, &dialog, [&] {
     pane->commit();
@@ -184,7 +191,31 @@ bool DocumentTab::editForm(std::string_view title, Form& form, const std::functi
   connect(buttons, &QDialogButtonBox::rejected, &dialog, &QDialog::reject);
   layout->addWidget(pane);
   layout->addWidget(buttons);
-  return dialog.exec() == QDialog::Accepted;
+  if (isSignalConnected(QMetaMethod::fromSignal(&DocumentTab::pickWanted))) offerPick(*pane, *buttons);
+  // It is hidden while the map is pointed at for it, which does not end it.
+  QEventLoop untilItEnds;
+  connect(&dialog, &QDialog::finished, &untilItEnds, &QEventLoop::quit);
+  dialog.setModal(true);
+  dialog.show();
+  untilItEnds.exec();
+  return dialog.result() == QDialog::Accepted;
+}
+
+// A button beside those of a dialog, where that has points, for the ones that are at work.
+void DocumentTab::offerPick(PagePane& pane, QDialogButtonBox& buttons) {
+  connect(&pane, &PagePane::pickWanted, this, [this, &pane] { emit pickWanted(&pane); });
+  QPushButton* button = buttons.addButton(tr("Pick on the map"), QDialogButtonBox::ActionRole);
+  button->setShortcut(Qt::CTRL | Qt::SHIFT | Qt::Key_M);
+  button->setToolTip(tr("Pick on the map what the current cell or field is to hold (%1)")
+                         .arg(button->shortcut().toString(QKeySequence::NativeText)));
+  button->setFocusPolicy(Qt::NoFocus);  // the cell or field keeps it
+  connect(button, &QPushButton::clicked, &pane, &PagePane::pickWanted);
+  const auto show = [&pane, button] {
+    button->setVisible(pane.hasPoints());
+    button->setEnabled(pane.pointPlace().has_value());
+  };
+  connect(&pane, &PagePane::cellChosen, button, show);
+  show();
 }
 
 bool DocumentTab::isShiftHeld() {

@@ -95,7 +95,7 @@ DocumentTab::DocumentTab(std::function<std::unique_ptr<SetupEditor>(SetupHost&)>
   fillTree();
   showFirstView();
   connect(pane_, &PagePane::cellChosen, this, &DocumentTab::cellChosen);
-  connect(pane_, &PagePane::pickWanted, this, &DocumentTab::pickWanted);
+  connect(pane_, &PagePane::pickWanted, this, [this] { emit pickWanted(pane_); });
   connect(filter_, &QLineEdit::textChanged, this, [this] { applyVisibility(); });
   connect(tree_, &QTreeWidget::currentItemChanged, this, [this] { showCurrentPage(); });
   connect(notice_, &FileNotice::readAgain, this, [this] { open(QString::fromStdString(editor_->path())); });

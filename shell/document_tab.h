@@ -1,5 +1,6 @@
 #pragma once
 
+#include <QDialogButtonBox>
 #include <QHash>
 #include <QLineEdit>
 #include <QSplitter>
@@ -29,7 +30,7 @@ QString faultsText(unsigned faults);
 
 // One open document: the tree with its search box beside what the chosen item shows, which is a page or a
 // cover; before one is chosen, the first view with a summary of the setup below it.
-class DocumentTab final : public QSplitter, public SetupHost {
+class DocumentTab final : public QSplitter, public SetupHost, public MapHost {
   Q_OBJECT
  public:
   // Commands of the editor that have a key and a tool here.
@@ -111,6 +112,8 @@ class DocumentTab final : public QSplitter, public SetupHost {
   bool chooseFile(std::string_view filter, std::string_view extension, std::string* name) override;
   bool chooseSaveFile(std::string_view filter, std::string_view extension, std::string* name) override;
   bool editForm(std::string_view title, Form& form, const std::function<std::string()>& fault) override;
+  bool editFormWithPicks(std::string_view title, Form& form, std::span<const FieldPick> picks,
+                         const std::function<std::string()>& fault) override;
   bool chooseFileWithForm(const FileQuestion& question, Form& panel, std::string* name) override;
   void doLongWork(std::string_view title, const std::function<void(const Progress&)>& work) override;
   void openFile(const std::string& path, int item) override { services_.openFile(path, item); }
@@ -123,8 +126,8 @@ class DocumentTab final : public QSplitter, public SetupHost {
   void documentChanged();
   // Another page, or another cell of it.
   void cellChosen();
-  // Points of the page's current cell are to be pointed at on the map.
-  void pickWanted();
+  // Points of the current cell of a page, or of a dialog, are to be pointed at on the map.
+  void pickWanted(gridbay::shell::PagePane* pane);
   // The setup was checked, or there is another one whose check is not known.
   void checked();
   void saved();
@@ -136,6 +139,7 @@ class DocumentTab final : public QSplitter, public SetupHost {
   void advised();
 
  private:
+  void offerPick(PagePane& pane, QDialogButtonBox& buttons);
   void lookForAdvice();
   void readForAdvice();
   void showAdvice();

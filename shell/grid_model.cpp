@@ -125,6 +125,15 @@ std::optional<CellPick> GridModel::pick(const QModelIndex& index) const {
   return grid_.PickRowCol(index.row() + 1, index.column() + 1);
 }
 
+bool GridModel::hasPicks() const {
+  for (int row = 0; row < shownRows_; ++row) {
+    for (int column = 0; column < shownColumns_; ++column) {
+      if (pick(index(row, column))) return true;
+    }
+  }
+  return false;
+}
+
 bool GridModel::storePick(const QModelIndex& index, std::span<const PickedPlace> places) {
   if (readOnly_ || !index.isValid()) return false;
   const QPointer<GridModel> self(this);

@@ -32,8 +32,10 @@ class GridModel final : public QAbstractTableModel {
   void setReadOnly(bool readOnly) { readOnly_ = readOnly; }
   // Lets the user browse for a cell's file, where it has one.
   bool browse(const QModelIndex& index);
-  // What can be pointed at on a map for a cell, and the storing of it; true when it was taken.
+  // What can be pointed at on a map for a cell, whether there is any such, and the storing of it; true when
+  // it was taken.
   std::optional<CellPick> pick(const QModelIndex& index) const;
+  bool hasPicks() const;
   bool storePick(const QModelIndex& index, std::span<const PickedPlace> places);
   CV27SetupGridWnd& grid() const { return grid_; }
   // The grid or the model behind it has changed. Rows and columns come and go at the end, so that the current

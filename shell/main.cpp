@@ -3,6 +3,7 @@
 #include <QDir>
 #include <QMessageBox>
 #include <QPixmap>
+#include <QTextStream>
 #include <functional>
 
 #include "core/page_place.h"
@@ -14,14 +15,33 @@ using gridbay::PageId;
 
 namespace {
 
-void openFiles(MainWindow& window, const QStringList& paths) {
-  for (const QString& path : paths) {
-    if (DataWindow::isDataFile(path)) {
-      window.openData(path);
-    } else {
-      window.openDocument(path);
+void tellOutside(const QString& text) {
+  QTextStream(stderr) << text << '\n';
+}
+
+// Where no one is there to answer, what a box says is told outside, and the box is left.
+class Unattended final : public QObject {
+ public:
+  using QObject::QObject;
+  bool eventFilter(QObject* watched, QEvent* event) override {
+    auto* box = event->type() == QEvent::Show ? qobject_cast<QMessageBox*>(watched) : nullptr;
+    if (box != nullptr) {
+      tellOutside(box->text());
+      QMetaObject::invokeMethod(box, &QDialog::reject, Qt::QueuedConnection);
     }
+    return QObject::eventFilter(watched, event);
   }
+};
+
+// False where one can't be opened.
+bool openFiles(MainWindow& window, const QStringList& paths) {
+  bool isOpen = true;
+  for (const QString& path : paths) {
+    const bool isOne = DataWindow::isDataFile(path) ? window.openData(path) != nullptr
+                                                    : window.openDocument(path) != nullptr;
+    isOpen = isOpen && isOne;
+  }
+  return isOpen;
 }
 
 // Pictures of the map beside the page of its areas, and of the innermost area with its cells.
@@ -69,20 +89,28 @@ void takeComparison(MainWindow& window, const std::function<void(const QString&)
 }
 
 // Pictures of the start view, of a setup's first view and each page that its tree shows, of the map, of the
-// help, and of each data file that is open.
-void takeScreenshots(MainWindow& window, const QStringList& paths, const QString& other,
+// help, and of each data file that is open. False where a file can't be opened, or a picture written.
+bool takeScreenshots(MainWindow& window, const QStringList& paths, const QString& other,
                      const QString& folder) {
-  const auto take = [&window, &folder](const QString& name) {
+  bool isDone = true;
+  const auto keep = [&](QWidget& shown, const QString& name) {
     QApplication::processEvents();
-    window.grab().save(QString("%1/%2.png").arg(folder, name));
+    const QString path = QString("%1/%2.png").arg(folder, name);
+    if (!isDone || shown.grab().save(path)) return;
+    tellOutside(QString("Cannot write %1").arg(path));
+    isDone = false;
   };
+  const auto take = [&](const QString& name) { keep(window, name); };
   QDir().mkpath(folder);
   window.show();
   take("start");
-  openFiles(window, paths);
+  if (!isDone || !openFiles(window, paths)) return false;
   if (window.currentDocument() == nullptr) window.newDocument(0);
   take("first-view");
-  if (!other.isEmpty() && window.compareWith(other)) takeComparison(window, take);
+  if (!other.isEmpty()) {
+    if (!window.compareWith(other)) return false;
+    takeComparison(window, take);
+  }
   for (const auto& item : window.currentDocument()->editor().items()) {
     if (!item.visible || !window.currentDocument()->goToPage(item.id)) continue;
     take(QString("page-%1").arg(item.id));
@@ -91,12 +119,11 @@ void takeScreenshots(MainWindow& window, const QStringList& paths, const QString
   if (QString error; window.help().showTopic(0, "Overview", &error)) {
     take("help");
   } else {
-    qWarning("%s", qPrintable(error));
+    tellOutside(error);
   }
-  for (DataWindow* data : window.findChildren<DataWindow*>()) {
-    QApplication::processEvents();
-    data->grab().save(QString("%1/data-%2.png").arg(folder, data->windowTitle()));
-  }
+  for (DataWindow* data : window.findChildren<DataWindow*>())
+    keep(*data, QString("data-%1").arg(data->windowTitle()));
+  return isDone;
 }
 
 }  // namespace
@@ -122,6 +149,8 @@ int main(int argc, char** argv) {
   parser.addOption({"appearance", "Colours for this time: light or dark.", "colours"});
   parser.addPositionalArgument("file", "Setups and data files to open.");
   parser.process(application);
+  const bool isUnattended = parser.isSet("screenshots") || parser.isSet("exit-when-shown");
+  if (isUnattended) application.installEventFilter(new Unattended(&application));
 
   std::vector<std::unique_ptr<EditorLibrary>> libraries;
   QStringList names{"v27nested", "v27nestedwsk"};
@@ -139,11 +168,11 @@ int main(int argc, char** argv) {
   if (parser.isSet("appearance"))
     setAppearance(parser.value("appearance") == "dark" ? Appearance::dark : Appearance::light);
   if (parser.isSet("screenshots")) {
-    takeScreenshots(window, parser.positionalArguments(), parser.value("compare"),
-                    parser.value("screenshots"));
-    return 0;
+    const bool isDone = takeScreenshots(window, parser.positionalArguments(), parser.value("compare"),
+                                        parser.value("screenshots"));
+    return isDone ? 0 : 2;
   }
-  openFiles(window, parser.positionalArguments());
+  if (!openFiles(window, parser.positionalArguments()) && isUnattended) return 2;
   if (parser.isSet("compare")) window.compareWith(parser.value("compare"));
   if (parser.isSet("new") && window.currentDocument() == nullptr) window.newDocument(0);
   window.show();

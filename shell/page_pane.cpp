@@ -1,7 +1,9 @@
 #include "shell/page_pane.h"
 
 #include <QApplication>
+#include <QContextMenuEvent>
 #include <QLabel>
+#include <QLineEdit>
 #include <QMenu>
 #include <QMetaMethod>
 #include <QScreen>
@@ -39,6 +41,10 @@ QLabel* makeHeading(QWidget* parent) {
   return heading;
 }
 
+bool holds(const FieldPick& pick, const Control& control) {
+  return std::ranges::find(pick.fields, &control) != pick.fields.end();
+}
+
 class Picture final : public QLabel {
  public:
   Picture(const QString& path, const QString& text, QWidget* parent) : QLabel(text, parent), picture_(path) {
@@ -66,6 +72,8 @@ void PagePane::clear() {
   if (form_ != nullptr) commit();
   parts_.clear();
   form_ = nullptr;
+  picks_ = {};
+  lastFields_ = nullptr;
   keys_ = {};
   delete takeWidget();
 }
@@ -97,9 +105,10 @@ void PagePane::showPicture(const QString& path, const QString& text) {
   setWidget(new Picture(path, text, this));
 }
 
-void PagePane::showForm(const QString& caption, Form& form) {
+void PagePane::showForm(const QString& caption, Form& form, std::span<const FieldPick> picks) {
   QWidget* page = startPage(caption);
   form_ = &form;
+  picks_ = picks;
   auto* body = new QWidget(page);
   auto* bodyLayout = new FieldLayout(body);
   bodyLayout->setContentsMargins(0, 0, 0, 0);
@@ -142,6 +151,7 @@ PagePane::Part PagePane::makePart(Control& control, QWidget* parent, bool hasBod
     connect(grid, &GridView::edited, this, &PagePane::refresh);
     connect(grid, &GridView::cellChosen, this, [this, grid] {
       lastGrid_ = grid;
+      lastFields_ = nullptr;
       emit cellChosen();
     });
     grid->setContextMenuPolicy(Qt::CustomContextMenu);
@@ -151,6 +161,8 @@ PagePane::Part PagePane::makePart(Control& control, QWidget* parent, bool hasBod
   }
   Part part{&control, nullptr, makeField(control, keys_, parent)};
   part.widget = part.field->input();
+  if (std::ranges::any_of(picks_, [&](const FieldPick& pick) { return holds(pick, control); }))
+    part.widget->installEventFilter(this);
   return part;
 }
 
@@ -302,15 +314,70 @@ PagePane::Cell PagePane::currentCell() const {
   return cell;
 }
 
-std::optional<QModelIndex> PagePane::pointCell() const {
-  if (lastGrid_ == nullptr || !lastGrid_->currentIndex().isValid()) return std::nullopt;
-  const QModelIndex index = lastGrid_->currentIndex();
-  return lastGrid_->cells().pick(index) ? std::optional(index) : std::nullopt;
+std::optional<PagePane::PointPlace> PagePane::pointPlace() const {
+  PointPlace place{.fields = lastFields_};
+  if (lastFields_ == nullptr && lastGrid_ != nullptr) place.cell = lastGrid_->currentIndex();
+  return pick(place) ? std::optional(place) : std::nullopt;
+}
+
+bool PagePane::hasPoints() const {
+  return !picks_.empty() || std::ranges::any_of(parts_, [](const Part& part) {
+    return part.grid != nullptr && part.grid->cells().hasPicks();
+  });
+}
+
+std::optional<CellPick> PagePane::pick(const PointPlace& place) const {
+  if (place.fields != nullptr && !readOnly_) {
+    const auto found =
+        std::ranges::find_if(picks_, [&](const FieldPick& each) { return &each == place.fields; });
+    return found == picks_.end() ? std::nullopt : std::optional(found->wanted());
+  }
+  const auto* cells = static_cast<const GridModel*>(place.cell.model());
+  return cells == nullptr ? std::nullopt : cells->pick(place.cell);
+}
+
+bool PagePane::storePick(const PointPlace& place, std::span<const PickedPlace> places) {
+  if (!pick(place)) return false;
+  if (place.fields == nullptr)
+    return const_cast<GridModel*>(static_cast<const GridModel*>(place.cell.model()))
+        ->storePick(place.cell, places);
+  const bool isStored = gridbay::storePick(*place.fields, places);
+  refresh();
+  return isStored;
+}
+
+bool PagePane::isPickHeard() const {
+  return isSignalConnected(QMetaMethod::fromSignal(&PagePane::pickWanted));
+}
+
+// Of fields that hold points: which are at work, and their menu.
+bool PagePane::eventFilter(QObject* watched, QEvent* event) {
+  if (event->type() != QEvent::FocusIn && event->type() != QEvent::ContextMenu)
+    return QScrollArea::eventFilter(watched, event);
+  const auto part = std::ranges::find(parts_, watched, &Part::widget);
+  if (part == parts_.end()) return QScrollArea::eventFilter(watched, event);
+  const auto pick =
+      std::ranges::find_if(picks_, [&](const FieldPick& each) { return holds(each, *part->control); });
+  if (pick == picks_.end()) return QScrollArea::eventFilter(watched, event);
+  lastFields_ = &*pick;
+  emit cellChosen();
+  auto* edit = qobject_cast<QLineEdit*>(watched);
+  if (event->type() == QEvent::FocusIn || edit == nullptr || !isPickHeard())
+    return QScrollArea::eventFilter(watched, event);
+  offerPick(*edit, static_cast<QContextMenuEvent*>(event)->globalPos());
+  return true;
+}
+
+void PagePane::offerPick(QLineEdit& edit, QPoint at) {
+  const std::unique_ptr<QMenu> menu(edit.createStandardContextMenu());
+  menu->addSeparator();
+  menu->addAction(tr("Pick on the map"), this, &PagePane::pickWanted);
+  menu->exec(at);
 }
 
 void PagePane::offerPick(GridView& grid, QPoint at) {
   const QModelIndex index = grid.indexAt(at);
-  if (!isSignalConnected(QMetaMethod::fromSignal(&PagePane::pickWanted)) || !grid.cells().pick(index)) return;
+  if (!isPickHeard() || !grid.cells().pick(index)) return;
   grid.goToCell(index.row(), index.column());
   QMenu menu(this);
   menu.addAction(tr("Pick on the map"), this, &PagePane::pickWanted);

@@ -1,16 +1,20 @@
 #pragma once
 
-#include <QModelIndex>
+#include <QPersistentModelIndex>
 #include <QPointer>
 #include <QScrollArea>
 #include <memory>
 #include <optional>
+#include <span>
 #include <vector>
 
 #include "core/page_place.h"
+#include "pages/field_picks.h"
 #include "shell/fields/accelerators.h"
 #include "shell/fields/field.h"
 #include "shell/fields/field_layout.h"
+
+class QLineEdit;
 
 namespace gridbay::shell {
 
@@ -25,8 +29,8 @@ class PagePane final : public QScrollArea {
 
   // What is shown from now on can be read only; its form says the same of its controls.
   void setReadOnly(bool readOnly) { readOnly_ = readOnly; }
-  // With no caption there is none above the form.
-  void showForm(const QString& caption, Form& form);
+  // With no caption there is none above the form. The picks of its fields, if any, stay for as long as it.
+  void showForm(const QString& caption, Form& form, std::span<const FieldPick> picks = {});
   void showText(const QString& caption, const QString& text);
   // A picture in the whole pane, or a text in its middle where there is no picture.
   void showPicture(const QString& path, const QString& text);
@@ -53,19 +57,33 @@ class PagePane final : public QScrollArea {
     int rows = 0;
   };
   Cell currentCell() const;
-  // The cell that is at work, where its points can be pointed at on a map.
-  std::optional<QModelIndex> pointCell() const;
+  // A cell of a table, or fields, that hold points which can be pointed at on a map.
+  struct PointPlace {
+    QPersistentModelIndex cell{};
+    const FieldPick* fields = nullptr;
+    bool operator==(const PointPlace&) const = default;
+  };
+  // The one that is at work.
+  std::optional<PointPlace> pointPlace() const;
+  // Whether there is any.
+  bool hasPoints() const;
+  // What is pointed at for it, and the storing of that; nothing for one that is gone.
+  std::optional<CellPick> pick(const PointPlace& place) const;
+  bool storePick(const PointPlace& place, std::span<const PickedPlace> places);
 
   // The whole page, as far as the screen has the room.
   QSize sizeHint() const override;
 
  signals:
-  // Another cell of a table is at work.
+  // Another cell of a table is at work, or other fields that hold points.
   void cellChosen();
-  // The points of the cell that is at work are to be pointed at on a map. Who never hears of it has no map.
+  // The points of the cell or fields that are at work are to be pointed at on a map. Who never hears of it
+  // has no map.
   void pickWanted();
 
  private:
+  bool eventFilter(QObject* watched, QEvent* event) override;
+
   // A control with what shows it: a field, a table, a frame, or a heading.
   struct Part {
     Control* control;
@@ -82,10 +100,14 @@ class PagePane final : public QScrollArea {
   QWidget* startPage(const QString& caption);
   void changed(Control& control);
   void offerPick(GridView& grid, QPoint at);
+  void offerPick(QLineEdit& edit, QPoint at);
+  bool isPickHeard() const;
 
   Form* form_ = nullptr;
+  std::span<const FieldPick> picks_;
   std::vector<Part> parts_;
   QPointer<GridView> lastGrid_;
+  const FieldPick* lastFields_ = nullptr;  // where fields were at work after the table
   Accelerators keys_;
   bool refreshing_ = false;
   bool readOnly_ = false;

@@ -67,7 +67,7 @@ Column& LineStructureGrid::LevelWidthColumn(const Structure& structure) {
 }
 
 void LineStructureGrid::editPoints(LineStructure& structure) {
-  CPointImportDlg dialog(document(), structure.x, structure.y);
+  CPointImportDlg dialog(document(), structure.coordinateType, structure.x, structure.y);
   if (dialog.DoModal() != 1) return;
   dialog.OnOK(structure.x, structure.y);
   UpdateDoc();

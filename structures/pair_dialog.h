@@ -25,13 +25,19 @@ class PairGrid : public ColumnGrid {
   PairGrid(Pairs& pairs, std::string_view firstHeader, std::string_view secondHeader, int quantity)
       : pairs_(pairs), firstHeader_(firstHeader), secondHeader_(secondHeader), quantity_(quantity) {}
 
+ protected:
+  // How a pair that is a place is pointed at on a map.
+  virtual Column::Pick pairPick() { return {}; }
+  NumberPair<Real>& pairAt(GridRow row) { return pairs_[static_cast<std::size_t>(row.item) - 1]; }
+
  private:
   void LayOut() override {
     constexpr int kWidth = 90;
     Rows([this] { return static_cast<int>(pairs_.size()); });
-    const auto pair = [this](GridRow row) { return &pairs_[static_cast<std::size_t>(row.item) - 1]; };
-    Number(firstHeader_, kWidth, pair, &NumberPair<Real>::first, quantity_);
-    Number(secondHeader_, kWidth, pair, &NumberPair<Real>::second, quantity_);
+    const auto pair = [this](GridRow row) { return &pairAt(row); };
+    const Column::Pick pick = pairPick();
+    Number(firstHeader_, kWidth, pair, &NumberPair<Real>::first, quantity_).Picks(pick);
+    Number(secondHeader_, kWidth, pair, &NumberPair<Real>::second, quantity_).Picks(pick);
   }
 
   Pairs& pairs_;
@@ -56,6 +62,7 @@ class PairDialog : public CV27SetupDialog {
                  most);
     form().Grid(gridLabel, grid_);
   }
+  Grid& grid() { return grid_; }
   void OnOK(std::vector<Real>& first, std::vector<Real>& second) const {
     first.clear();
     second.clear();

@@ -17,7 +17,7 @@
 #include "platform/files/read_file.h"
 #include "shell/import/file_drop.h"
 #include "shell/import/work_host.h"
-#include "shell/import/work_results.h"
+#include "shell/work_results.h"
 #include "shell/shades.h"
 
 namespace gridbay::shell {

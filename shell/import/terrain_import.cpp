@@ -16,7 +16,7 @@
 #include "shell/import/file_drop.h"
 #include "shell/import/terrain_plan.h"
 #include "shell/import/work_host.h"
-#include "shell/import/work_results.h"
+#include "shell/work_results.h"
 #include "shell/shades.h"
 
 namespace gridbay::shell {

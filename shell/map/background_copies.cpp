@@ -1,29 +1,30 @@
 #include "shell/map/background_copies.h"
 
+#include <QDir>
 #include <QFile>
+#include <QFileInfo>
 #include <algorithm>
 #include <utility>
 
-#include "shell/import/work_results.h"
+#include "shell/work_results.h"
 
 namespace gridbay::shell {
 namespace {
 
-void removeFile(const QString& path) {
-  if (!path.isEmpty()) QFile::remove(path);
+// With all that its library has put beside it.
+void removeCopy(const QString& path) {
+  if (path.isEmpty()) return;
+  const QFileInfo copy(path);
+  for (const QFileInfo& each : copy.dir().entryInfoList({copy.baseName() + ".*"}, QDir::Files))
+    QFile::remove(each.filePath());
 }
 
 }  // namespace
 
-BackgroundCopies::BackgroundCopies(std::function<bool()> mayBegin, QObject* parent)
-    : QObject(parent), mayBegin_(std::move(mayBegin)), work_(this) {
-  constexpr int kMoment = 20;  // milliseconds
-  retry_.setSingleShot(true);
-  retry_.setInterval(kMoment);
-  connect(&retry_, &QTimer::timeout, this, &BackgroundCopies::beginNext);
-  connect(&work_, &BackgroundWork::progressed, this,
-          [this](double done) { emit progressed(current_, done); });
-  connect(&work_, &BackgroundWork::ended, this, &BackgroundCopies::take);
+BackgroundCopies::BackgroundCopies(QObject* parent) : QObject(parent) {
+  next_.setSingleShot(true);
+  next_.setInterval(0);
+  connect(&next_, &QTimer::timeout, this, &BackgroundCopies::beginNext);
 }
 
 bool BackgroundCopies::isOf(const Copy& copy, const Wanted& wanted) {
@@ -43,17 +44,26 @@ bool BackgroundCopies::suits(const Copy& copy, const Wanted& wanted) {
   return isFine && (copy.is.isWhole || reach.contains(wanted.frame.in(made.frame)));
 }
 
+// Before the first copy of a file the raster that it shows has no name yet.
+bool BackgroundCopies::isAtWorkFor(const Copy& copy, const Wanted& wanted) {
+  const auto nameOf = [&copy](const Wanted& each) {
+    return each.source.raster.isEmpty() ? QString::fromStdString(copy.is.rasters.shown) : each.source.raster;
+  };
+  return nameOf(copy.atWork) == nameOf(wanted) && copy.atWork.projection == wanted.projection;
+}
+
 QString BackgroundCopies::of(const BackgroundSource& source, const MapFrame& frame,
                              const std::string& projection) {
   Copy& copy = copies_[source.id];
   const Wanted wanted{source, frame, projection};
   const bool isFaulty =
       copy.failed && copy.failed->source.raster == source.raster && copy.failed->projection == projection;
+  if (!copy.making.isEmpty() && !isAtWorkFor(copy, wanted)) giveUp(copy);
   if (suits(copy, wanted)) {
     copy.wanted.reset();
   } else if (!isFaulty) {
     copy.wanted = wanted;
-    if (current_ == 0) retry_.start();
+    next_.start();
   }
   return isOf(copy, wanted) ? QString::fromStdString(copy.is.file) : QString();
 }
@@ -62,68 +72,100 @@ const RasterNames& BackgroundCopies::rastersOf(int id) const {
   return copies_.at(id).is.rasters;
 }
 
-bool BackgroundCopies::isWaiting() const {
-  return std::ranges::any_of(copies_, [](const auto& each) { return each.second.wanted.has_value(); });
+QString BackgroundCopies::faultOf(int id) const {
+  const auto found = copies_.find(id);
+  return found != copies_.end() && found->second.failed ? found->second.why : QString();
+}
+
+int BackgroundCopies::firstAtWork() const {
+  const auto first =
+      std::ranges::find_if(copies_, [](const auto& each) { return !each.second.making.isEmpty(); });
+  return first == copies_.end() ? 0 : first->first;
+}
+
+bool BackgroundCopies::isIdle() const {
+  return firstAtWork() == 0 &&
+         std::ranges::none_of(copies_, [](const auto& each) { return each.second.wanted.has_value(); });
 }
 
 void BackgroundCopies::beginNext() {
-  if (current_ != 0) return;
-  const auto next =
-      std::ranges::find_if(copies_, [](const auto& each) { return each.second.wanted.has_value(); });
-  if (next == copies_.end()) return emit ended();
-  if (!mayBegin_()) return retry_.start();
+  constexpr std::ptrdiff_t kAtOnce = 2;
+  const auto isAtWork = [](const auto& each) { return !each.second.making.isEmpty(); };
+  const auto isNext = [&](const auto& each) { return each.second.wanted.has_value() && !isAtWork(each); };
+  while (std::ranges::count_if(copies_, isAtWork) < kAtOnce) {
+    const auto next = std::ranges::find_if(copies_, isNext);
+    if (next == copies_.end()) break;
+    begin(next->first, next->second);
+  }
+  if (isIdle()) emit ended();
+}
+
+void BackgroundCopies::begin(int id, Copy& copy) {
+  copy.atWork = *std::exchange(copy.wanted, std::nullopt);
   if (folder_ == nullptr) folder_ = std::make_unique<QTemporaryDir>();
   if (!folder_->isValid()) {
     const QString why = folder_->errorString();
     folder_.reset();
-    next->second.failed = std::exchange(next->second.wanted, std::nullopt);
-    emit failed(next->first, tr("cannot make a temporary folder: %1").arg(why));
-    return beginNext();
+    return fail(id, copy, tr("cannot make a temporary folder: %1").arg(why));
   }
-  current_ = next->first;
-  atWork_ = *std::exchange(next->second.wanted, std::nullopt);
-  emit progressed(current_, 0);
-  work_.begin([wanted = atWork_, made = folder_->filePath(QString::number(++count_)).toStdString()](
-                  const WorkApart::Progress& progress) {
-    return packed(copyBackground(wanted.source.path.toStdString(), wanted.source.raster.toStdString(),
-                                 wanted.projection, pixelsOf(wanted.frame), made, progress));
-  });
+  copy.making = folder_->filePath(QString::number(++count_));
+  if (copy.work == nullptr) {
+    copy.work = std::make_unique<BackgroundWork>(nullptr);
+    connect(copy.work.get(), &BackgroundWork::progressed, this, [this, id](double done) {
+      if (id == firstAtWork()) emit progressed(id, done);
+    });
+    connect(copy.work.get(), &BackgroundWork::ended, this,
+            [this, id](const std::optional<std::string>& bytes) { take(id, bytes); });
+  }
+  copy.work->begin(
+      [wanted = copy.atWork, made = copy.making.toStdString()](const WorkApart::Progress& progress) {
+        return packed(copyBackground(wanted.source.path.toStdString(), wanted.source.raster.toStdString(),
+                                     wanted.projection, pixelsOf(wanted.frame), made, progress));
+      });
+  emit progressed(id, 0);
 }
 
-void BackgroundCopies::take(const std::optional<std::string>& bytes) {
-  const int id = std::exchange(current_, 0);
-  const auto found = copies_.find(id);
-  if (found != copies_.end()) {
-    Copy& copy = found->second;
-    Result<BackgroundCopy> made = bytes ? unpackedCopy(*bytes)
-                                        : Failure{"cannot show \"" + atWork_.source.path.toStdString() +
-                                                  "\": its reader came to a sudden end"};
-    if (made) {
-      removeFile(std::exchange(copy.before, QString::fromStdString(copy.is.file)));
-      copy.is = std::move(*made);
-      copy.made = atWork_;
-      copy.failed.reset();
-      if (copy.wanted && suits(copy, *copy.wanted)) copy.wanted.reset();
-      emit this->made(id);
-    } else {
-      copy.wanted.reset();
-      copy.failed = atWork_;
-      emit failed(id, QString::fromStdString(made.error()));
-    }
+void BackgroundCopies::take(int id, const std::optional<std::string>& bytes) {
+  Copy& copy = copies_.at(id);
+  Result<BackgroundCopy> made = bytes ? unpackedCopy(*bytes)
+                                      : Failure{"cannot show \"" + copy.atWork.source.path.toStdString() +
+                                                "\": its reader came to a sudden end"};
+  if (made) {
+    removeCopy(std::exchange(copy.before, QString::fromStdString(copy.is.file)));
+    copy.is = std::move(*made);
+    copy.made = copy.atWork;
+    copy.making.clear();
+    copy.failed.reset();
+    if (copy.wanted && suits(copy, *copy.wanted)) copy.wanted.reset();
+    emit this->made(id);
+  } else {
+    giveUp(copy);
+    fail(id, copy, QString::fromStdString(made.error()));
   }
-  beginNext();
+  next_.start();
+}
+
+void BackgroundCopies::fail(int id, Copy& copy, const QString& why) {
+  copy.wanted.reset();
+  copy.failed = copy.atWork;
+  copy.why = why;
+  emit failed(id, why);
+}
+
+// Nothing is left of what is half made.
+void BackgroundCopies::giveUp(Copy& copy) {
+  if (copy.work != nullptr) copy.work->stop();
+  removeCopy(std::exchange(copy.making, QString()));
 }
 
 void BackgroundCopies::forget(int id) {
   const auto found = copies_.find(id);
   if (found == copies_.end()) return;
-  removeFile(found->second.before);
-  removeFile(QString::fromStdString(found->second.is.file));
+  giveUp(found->second);
+  removeCopy(found->second.before);
+  removeCopy(QString::fromStdString(found->second.is.file));
   copies_.erase(found);
-  if (current_ != id) return;
-  work_.stop();
-  current_ = 0;
-  beginNext();
+  next_.start();
 }
 
 void BackgroundCopies::forgetAll() {
@@ -133,13 +175,13 @@ void BackgroundCopies::forgetAll() {
 }
 
 std::vector<int> BackgroundCopies::stop() {
-  work_.stop();
-  retry_.stop();
+  next_.stop();
   std::vector<int> stopped;
   for (auto& [id, copy] : copies_) {
-    if (std::exchange(copy.wanted, std::nullopt) || id == current_) stopped.push_back(id);
+    if (copy.wanted || !copy.making.isEmpty()) stopped.push_back(id);
+    copy.wanted.reset();
+    giveUp(copy);
   }
-  current_ = 0;
   emit ended();
   return stopped;
 }

@@ -1,6 +1,7 @@
 #include "shell/map/background_worker.h"
 
 #include <QPainter>
+#include <algorithm>
 #include <utility>
 
 #include "platform/no_copy_now.h"
@@ -132,27 +133,39 @@ BackgroundWorker::Opened* BackgroundWorker::openedOf(const BackgroundSource& sou
 }
 
 void BackgroundWorker::work(const std::stop_token& stop) {
-  while (const std::optional<BackgroundRequest> request = next(stop)) {
+  while (std::optional<BackgroundRequest> request = next(stop)) {
     const auto isOutOfDate = [this, &stop] {
       if (stop.stop_requested()) return true;
       const std::lock_guard lock(mutex_);
       return request_.has_value();
     };
-    // The reading of a whole file goes on while the map moves.
-    const auto isStopped = [&stop] { return stop.stop_requested(); };
+    // The reading of a whole file goes on while the map moves, for as long as the file is wanted.
+    const auto isUnwanted = [this, &stop, &request](const BackgroundSource& source) {
+      if (stop.stop_requested()) return true;
+      const std::lock_guard lock(mutex_);
+      return request_ &&
+             (request_->projection != request->projection ||
+              std::ranges::find(request_->sources, keyOf(source), keyOf) == request_->sources.end());
+    };
     std::optional<NoCopyNow> whileTheyAreClosed(std::in_place);
     std::erase_if(opened_, [&request](const auto& each) {
       return std::ranges::none_of(
           request->sources, [&each](const BackgroundSource& source) { return keyOf(source) == each.first; });
     });
     whileTheyAreClosed.reset();
+    // What is open already does not wait for what is not.
+    std::ranges::stable_partition(request->sources, [&](const BackgroundSource& source) {
+      return request->projection == projection_ && opened_.contains(keyOf(source));
+    });
     for (const BackgroundSource& source : request->sources) {
       if (isOutOfDate()) break;
       const NoCopyNow whileItIsRead;
-      Opened* opened = openedOf(source, request->projection, isStopped);
-      if (opened == nullptr) return;
+      Opened* opened =
+          openedOf(source, request->projection, [&isUnwanted, &source] { return isUnwanted(source); });
+      if (opened == nullptr) break;
       BackgroundPicture picture;
       picture.id = source.id;
+      picture.projection = request->projection;
       picture.frame = request->frame;
       picture.fault = opened->fault;
       picture.needsCopy = opened->needsCopy;

@@ -39,6 +39,7 @@ struct BackgroundPicture {
   bool needsCopy = false;  // it can be read from a copy alone, and there is none: no picture
   QStringList rasters;     // in the file, where there are several
   QString raster;          // the one that is shown
+  std::string projection;  // of the map
 };
 
 // The upper left corner and the pixels of a frame.

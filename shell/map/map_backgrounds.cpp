@@ -13,8 +13,7 @@ constexpr std::array<QRgb, 5> kColours{0xFF202020, 0xFF0B3C8C, 0xFF9C1C1C, 0xFF2
 
 }  // namespace
 
-MapBackgrounds::MapBackgrounds(QObject* parent)
-    : QObject(parent), copies_([this] { return worker_->isIdle(); }, this) {
+MapBackgrounds::MapBackgrounds(QObject* parent) : QObject(parent), copies_(this) {
   connect(&copies_, &BackgroundCopies::made, this, &MapBackgrounds::requestAgain);
   connect(&copies_, &BackgroundCopies::failed, this, &MapBackgrounds::fail);
   connect(&copies_, &BackgroundCopies::progressed, this, [this](int id, double done) {
@@ -180,6 +179,7 @@ void MapBackgrounds::fail(int id, const QString& why) {
   BackgroundPicture none;
   none.id = id;
   none.frame = frame_;
+  none.projection = projection_;
   none.fault = why;
   take(std::move(none));
 }
@@ -201,14 +201,20 @@ void MapBackgrounds::take(BackgroundPicture picture) {
     for (const std::string& name : names.all) picture.rasters << QString::fromStdString(name);
   }
   const QString before = told(background);
-  const bool hasOtherRasters = background.rasters != picture.rasters && picture.fault.isEmpty();
+  if (!picture.fault.isEmpty()) {
+    takeFault(background, std::move(picture));
+    if (before != told(background)) emit changed();
+    return emit painted();
+  }
+  if (background.needsCopy) picture.fault = copies_.faultOf(picture.id);
+  const bool hasOtherRasters = background.rasters != picture.rasters;
   if (hasOtherRasters) {
     background.rasters = picture.rasters;
     background.raster = picture.raster;
   }
   background.picture = picture;
   bool isMoved = hasOtherRasters;
-  if (!background.hasPlace && picture.fault.isEmpty()) {
+  if (!background.hasPlace) {
     background.hasPlace = true;
     isMoved = true;
     if (!picture.isRaster && place < below_) {
@@ -222,10 +228,26 @@ void MapBackgrounds::take(BackgroundPicture picture) {
   emit painted();
 }
 
+// A picture of the same raster in the same projection, which is not as fine or of another part, stays.
+void MapBackgrounds::takeFault(MapBackground& background, BackgroundPicture picture) const {
+  const std::optional<BackgroundPicture>& last = background.picture;
+  const bool isSame = last && last->projection == picture.projection &&
+                      (background.raster.isEmpty() || last->raster == background.raster);
+  if (isSame && !last->image.isNull()) {
+    background.picture->fault = picture.fault;
+  } else {
+    background.picture = std::move(picture);
+  }
+}
+
 void MapBackgrounds::paint(QPainter& painter, const MapFrame& frame, bool above) const {
+  const std::span all(all_);
+  paintBackgrounds(painter, frame, above ? all.subspan(below_) : all.first(below_));
+}
+
+void paintBackgrounds(QPainter& painter, const MapFrame& frame, std::span<const MapBackground> backgrounds) {
   const QRectF all({0, 0}, frame.size);
-  for (std::size_t i = above ? below_ : 0; i < (above ? all_.size() : below_); ++i) {
-    const MapBackground& each = all_[i];
+  for (const MapBackground& each : backgrounds) {
     if (!each.isShown || !each.picture || each.picture->image.isNull()) continue;
     const QRectF place = each.picture->frame.in(frame);
     if (!place.intersects(all)) continue;

@@ -3,6 +3,7 @@
 #include <QPainter>
 #include <QVariantList>
 #include <optional>
+#include <span>
 #include <vector>
 
 #include "shell/map/background_copies.h"
@@ -23,6 +24,9 @@ struct MapBackground {
   bool needsCopy = false;  // it is read from a copy
   std::optional<BackgroundPicture> picture = {};
 };
+
+// Draws their pictures, the later ones on top.
+void paintBackgrounds(QPainter& painter, const MapFrame& frame, std::span<const MapBackground> backgrounds);
 
 // The backgrounds of a map, from the bottom to the top, and the pictures of them: the last one is shown in
 // its place until a newer one has been painted.
@@ -71,6 +75,7 @@ class MapBackgrounds final : public QObject {
 
  private:
   void take(BackgroundPicture picture);
+  void takeFault(MapBackground& background, BackgroundPicture picture) const;
   // No picture, but why there is none.
   void fail(int id, const QString& why);
   void requestAgain();

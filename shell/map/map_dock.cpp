@@ -2,6 +2,7 @@
 
 #include <QActionGroup>
 #include <QCoreApplication>
+#include <QDialog>
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QHBoxLayout>
@@ -11,7 +12,6 @@
 #include <algorithm>
 
 #include "core/page_id.h"
-#include "shell/grid_view.h"
 #include "shell/map/map_rows.h"
 #include "shell/map/map_settings.h"
 
@@ -96,7 +96,7 @@ MapDock::MapDock(QWidget* parent)
   refreshTimer_.setSingleShot(true);
   connect(&refreshTimer_, &QTimer::timeout, this, [this] {
     if (tab_ == nullptr) return;
-    pickCell_ = QPersistentModelIndex();  // what it is to hold may be another thing now
+    pickPlace_.reset();  // what it is to hold may be another thing now
     followSetup();
     canvas_->refresh();
     canvas_->setMarks(marksOf(tab_->advice(), canvas_->scene()));
@@ -213,6 +213,7 @@ void MapDock::showTool() {
                       ? tr("Place")
                       : tr("Place: %1").arg(QCoreApplication::translate("Map", placing->name)));
   pick_->setChecked(canvas_->tool() == MapTool::pick);
+  if (canvas_->tool() != MapTool::pick) aside_.reset();
   const QString hint = canvas_->hint();
   hint_->setText(hint);
   hint_->setToolTip(hint);
@@ -231,7 +232,7 @@ void MapDock::showTools() {
 void MapDock::showDocument(DocumentTab* tab) {
   if (tab != wanted_) {
     disconnect(pickLink_);
-    if (tab != nullptr) pickLink_ = connect(tab, &DocumentTab::pickWanted, this, &MapDock::startPick);
+    if (tab != nullptr) pickLink_ = connect(tab, &DocumentTab::pickWanted, this, &MapDock::pickFor);
   }
   wanted_ = tab;
   follow();
@@ -334,41 +335,48 @@ void MapDock::goToRow(std::int32_t page, int row, int column) {
 
 void MapDock::startPick() {
   showTool();  // the press of the button has not changed it
-  if (wanted_ == nullptr) return;
-  const std::optional<QModelIndex> cell = wanted_->pane().pointCell();
-  if (!cell) return emit failed(tr("Choose a cell of the page that holds a point first."));
+  if (wanted_ != nullptr) pickFor(&wanted_->pane());
+}
+
+void MapDock::pickFor(PagePane* pane) {
+  const std::optional<PagePane::PointPlace> place = pane->pointPlace();
+  if (!place) return emit failed(tr("Choose a cell of the page that holds a point first."));
   show();
   raise();
   if (tab_ == nullptr) return;
-  // What is typed in the cell is entered first, and may be what it is about.
-  const QPersistentModelIndex kept(*cell);
-  tab_->commit();
-  if (!kept.isValid()) return;
-  aim(kept);
+  // What is typed there is entered first, and may be what it is about.
+  pickPane_ = pane;
+  pane->commit();
+  if (pickPane_ == nullptr || !pane->pick(*place)) return;
+  aim(*place);
+  if (auto* dialog = qobject_cast<QDialog*>(pane->window())) {
+    adviceStrip_->showAdvice({}, {});  // no fix of the model meanwhile
+    aside_ = std::make_unique<DialogAside>(*dialog, *canvas_);
+  }
+  canvas_->window()->activateWindow();
   canvas_->setFocus();
 }
 
-void MapDock::aim(const QModelIndex& cell) {
-  pickCell_ = cell;
-  if (const auto pick = static_cast<const GridModel*>(cell.model())->pick(cell)) canvas_->startPick(*pick);
+void MapDock::aim(const PagePane::PointPlace& place) {
+  pickPlace_ = place;
+  if (const auto pick = pickPane_->pick(place)) canvas_->startPick(*pick);
 }
 
 // A pick goes on with another cell that is chosen, and ends with the page.
 void MapDock::followPick() {
   if (canvas_->tool() != MapTool::pick) return;
-  const std::optional<QModelIndex> cell = tab_->pane().pointCell();
-  if (!cell) {
+  const auto place = pickPane_ == nullptr ? std::nullopt : pickPane_->pointPlace();
+  if (!place) {
     canvas_->setTool(MapTool::select);
-  } else if (pickCell_ != *cell) {
-    aim(*cell);
+  } else if (pickPlace_ != *place) {
+    aim(*place);
   }
 }
 
 void MapDock::takePick(const std::vector<PickedPlace>& places) {
-  const QModelIndex cell = std::exchange(pickCell_, {});
-  if (tab_ == nullptr || !cell.isValid()) return;
-  auto* model = const_cast<GridModel*>(static_cast<const GridModel*>(cell.model()));
-  if (!model->storePick(cell, places)) emit failed(tr("The cell does not take this."));
+  const auto place = std::exchange(pickPlace_, std::nullopt);
+  if (tab_ == nullptr || pickPane_ == nullptr || !place || !pickPane_->pick(*place)) return;
+  if (!pickPane_->storePick(*place, places)) emit failed(tr("The cell does not take this."));
 }
 
 // What drives a new boundary is a level of 0 until its page says otherwise.

@@ -4,14 +4,15 @@
 #include <QDockWidget>
 #include <QHash>
 #include <QLabel>
-#include <QPersistentModelIndex>
 #include <QPointer>
 #include <QTimer>
 #include <QToolBar>
 #include <QToolButton>
 #include <map>
+#include <memory>
 
 #include "shell/document_tab.h"
+#include "shell/map/dialog_aside.h"
 #include "shell/map/layer_panel.h"
 #include "shell/map/map_canvas.h"
 #include "shell/map/map_export.h"
@@ -65,7 +66,8 @@ class MapDock final : public QDockWidget {
   void goToRow(std::int32_t page, int row, int column);
   void refreshSoon();
   void showTool();
-  void aim(const QModelIndex& cell);
+  void pickFor(PagePane* pane);
+  void aim(const PagePane::PointPlace& place);
   void followPick();
   void takePick(const std::vector<PickedPlace>& places);
   void showMade(const MapFeature& feature);
@@ -90,8 +92,10 @@ class MapDock final : public QDockWidget {
   QToolButton* place_ = nullptr;
   QMetaObject::Connection pickLink_;  // to the one that is wanted
   QTimer refreshTimer_;
-  QPersistentModelIndex pickCell_;
-  bool isShown_ = false;  // to the user: neither hidden nor behind another dock
+  QPointer<PagePane> pickPane_;  // of a page or a dialog, which is pointed for
+  std::optional<PagePane::PointPlace> pickPlace_;
+  std::unique_ptr<DialogAside> aside_;  // while it is for a dialog
+  bool isShown_ = false;                // to the user: neither hidden nor behind another dock
 };
 
 }  // namespace gridbay::shell

@@ -212,7 +212,7 @@ void MapDrawing::paintAreas(QPainter& painter, const MapFrame& frame, Labels& la
     painter.drawPolygon(outline);
     const QString number = QString::number(area.number);
     paintBadge(painter, badgeOf(outline), number, isWrong ? kFault : layerColour(MapLayer::outlines));
-    labels.taken.push_back(boxOfBadge(painter, badgeOf(outline), number));
+    labels.room.take(boxOfBadge(painter, badgeOf(outline), number));
   }
 }
 
@@ -284,7 +284,7 @@ void MapDrawing::paintFeature(QPainter& painter, const MapFrame& frame, const Ma
     drawLine();
   }
   paintMarks(painter, feature, line, colour);
-  addLabel(feature, line, colour, labels);
+  addLabel(frame, feature, line, colour, labels);
   if (isLit) paintHandles(painter, frame, *feature.points);
 }
 
@@ -330,16 +330,44 @@ void MapDrawing::paintMarks(QPainter& painter, const MapFeature& feature, const 
   }
 }
 
-void MapDrawing::addLabel(const MapFeature& feature, const QPolygonF& line, const QColor& colour,
-                          Labels& labels) const {
+QRect MapDrawing::Room::squaresOf(const QRectF& box) {
+  constexpr double kSquare = 64;  // pixels
+  const auto square = [](double at) { return static_cast<int>(std::floor(at / kSquare)); };
+  return {QPoint(square(box.left()), square(box.top())), QPoint(square(box.right()), square(box.bottom()))};
+}
+
+void MapDrawing::Room::take(const QRectF& box) {
+  const QRect squares = squaresOf(box);
+  for (int x = squares.left(); x <= squares.right(); ++x) {
+    for (int y = squares.top(); y <= squares.bottom(); ++y) taken_[{x, y}] << box;
+  }
+}
+
+bool MapDrawing::Room::isFree(const QRectF& box) const {
+  const QRect squares = squaresOf(box);
+  for (int x = squares.left(); x <= squares.right(); ++x) {
+    for (int y = squares.top(); y <= squares.bottom(); ++y) {
+      const auto found = taken_.find({x, y});
+      if (found != taken_.end() &&
+          std::ranges::any_of(*found, [&](const QRectF& each) { return each.intersects(box); }))
+        return false;
+    }
+  }
+  return true;
+}
+
+void MapDrawing::addLabel(const MapFrame& frame, const MapFeature& feature, const QPolygonF& line,
+                          const QColor& colour, Labels& labels) const {
   constexpr double kLabelled = 40;  // pixels
   constexpr double kMark = 6;
-  constexpr qsizetype kMostMarks = 64;
   const bool isLit = selection.feature == feature.id;
   const bool isOfPoints = feature.id.kind == MapKind::source || feature.id.kind == MapKind::outputPoints;
   if (isOfPoints) {
-    for (const QPointF& point : line.mid(0, kMostMarks))
-      labels.taken.push_back({point.x() - kMark, point.y() - kMark, 2 * kMark, 2 * kMark});
+    const QRectF view({0, 0}, frame.size);
+    for (const QPointF& point : line) {
+      const QRectF mark(point.x() - kMark, point.y() - kMark, 2 * kMark, 2 * kMark);
+      if (mark.intersects(view)) labels.room.take(mark);
+    }
   }
   const bool isWide = line.boundingRect().width() + line.boundingRect().height() > kLabelled;
   if (feature.label.empty() || !(isWide || isLit || line.size() == 1)) return;
@@ -351,28 +379,22 @@ void MapDrawing::addLabel(const MapFeature& feature, const QPolygonF& line, cons
 
 // The one that is lit up first. What has no room but on another one is left out, until one looks closer.
 void MapDrawing::paintLabels(QPainter& painter, const MapFrame& frame, Labels& labels) {
-  constexpr std::size_t kMost = 300;
   constexpr double kApart = 10;
   const QRectF all({0, 0}, frame.size);
   std::ranges::stable_partition(labels.all, [](const Label& label) { return label.isLit; });
-  std::size_t painted = 0;
   for (const Label& label : labels.all) {
-    if (painted == kMost) return;
     const QRectF box = boxOfBadge(painter, label.place, label.text);
     if (!box.intersects(all)) continue;
     const QPointF aside(box.width() / 2 + kApart, 0);
     const QPointF above(0, -(label.isBeside ? 2 : 1) * box.height());
     std::array<QPointF, 5> shifts{QPointF(), above, -above, aside, -aside};
     if (label.isBeside) shifts = {aside, -aside, above, -above, aside + above};
-    const auto free = std::ranges::find_if(shifts, [&](QPointF shift) {
-      const QRectF there = box.translated(shift);
-      return std::ranges::none_of(labels.taken, [&](const QRectF& each) { return each.intersects(there); });
-    });
+    const auto free = std::ranges::find_if(
+        shifts, [&](QPointF shift) { return labels.room.isFree(box.translated(shift)); });
     if (free == shifts.end() && !label.isLit) continue;
     const QPointF shift = free == shifts.end() ? shifts.front() : *free;
     paintBadge(painter, label.place + shift, label.text, label.colour);
-    labels.taken.push_back(box.translated(shift));
-    ++painted;
+    labels.room.take(box.translated(shift));
   }
 }
 

@@ -1,6 +1,8 @@
 #pragma once
 
+#include <QHash>
 #include <QPainter>
+#include <QPoint>
 #include <optional>
 #include <vector>
 
@@ -70,10 +72,20 @@ class MapDrawing {
     bool isBeside = false;  // the mark at the place stays free
     bool isLit = false;
   };
+  // What of a picture is taken, by the squares that it reaches into.
+  class Room {
+   public:
+    void take(const QRectF& box);
+    bool isFree(const QRectF& box) const;
+
+   private:
+    static QRect squaresOf(const QRectF& box);
+    QHash<QPoint, QList<QRectF>> taken_;
+  };
   // What a picture has labels of, and what of it they leave free.
   struct Labels {
     std::vector<Label> all;
-    std::vector<QRectF> taken;
+    Room room;
   };
   bool shows(MapLayer layer) const { return layers.test(placeOf(layer)); }
   void paintAreas(QPainter& painter, const MapFrame& frame, Labels& labels) const;
@@ -82,7 +94,8 @@ class MapDrawing {
                     Labels& labels) const;
   void paintMarks(QPainter& painter, const MapFeature& feature, const QPolygonF& line,
                   const QColor& colour) const;
-  void addLabel(const MapFeature& feature, const QPolygonF& line, const QColor& colour, Labels& labels) const;
+  void addLabel(const MapFrame& frame, const MapFeature& feature, const QPolygonF& line, const QColor& colour,
+                Labels& labels) const;
   static void paintLabels(QPainter& painter, const MapFrame& frame, Labels& labels);
   static void paintScale(QPainter& painter, const QRectF& bar, TerrainColours colours,
                          const TerrainScale& scale);

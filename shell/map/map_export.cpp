@@ -16,23 +16,25 @@ QString tr(const char* text) {
   return QCoreApplication::translate("MapExport", text);
 }
 
-// What is written: the map, the part of it, and the terrain there, if any.
+// What is written: what is drawn of which part of the map, and the terrain there, if any.
 struct Shown {
-  const MapCanvas& canvas;
+  const MapDrawing& drawing;
+  const TerrainStyle& style;
   MapFrame frame;
+  std::span<const MapBackground> below;
+  std::span<const MapBackground> above;
   const std::optional<TerrainPicture>& terrain;
 };
 
 // In the pixels of the screen, whatever the painter's device.
 void draw(QPainter& painter, const Shown& shown) {
-  const auto& [canvas, frame, terrain] = shown;
+  const auto& [drawing, style, frame, below, above, terrain] = shown;
   painter.setClipRect(QRectF({0, 0}, frame.size));
-  canvas.backgrounds().paint(painter, frame, false);
+  paintBackgrounds(painter, frame, below);
   if (terrain) painter.drawImage(terrain->frame.in(frame), terrain->image);
-  canvas.backgrounds().paint(painter, frame, true);
-  canvas.drawing().paint(painter, frame);
-  canvas.drawing().paintLegend(painter, frame, canvas.terrainStyle(),
-                               terrain ? std::optional(terrain->scale) : std::nullopt);
+  paintBackgrounds(painter, frame, above);
+  drawing.paint(painter, frame);
+  drawing.paintLegend(painter, frame, style, terrain ? std::optional(terrain->scale) : std::nullopt);
 }
 
 bool writePicture(const Shown& shown, QIODevice& file) {
@@ -100,9 +102,16 @@ void MapExport::begin(const QString& path) {
   if (writerOf(path) == nullptr)
     return end(tr("A map is exported to a file that ends in .png, .svg or .pdf."));
   frame_ = canvas_.frame();
-  if (canvas_.drawing().layers.test(placeOf(MapLayer::terrain))) terrain_ = canvas_.terrain();
+  style_ = canvas_.terrainStyle();
+  drawing_.layers = canvas_.drawing().layers;
+  drawing_.selection = canvas_.drawing().selection;
+  drawing_.marks = canvas_.drawing().marks;
+  drawing_.setScene(canvas_.scene());
+  backgrounds_ = canvas_.backgrounds().all();
+  below_ = canvas_.backgrounds().below();
+  if (drawing_.layers.test(placeOf(MapLayer::terrain))) terrain_ = canvas_.terrain();
   if (!terrain_.empty()) {
-    TerrainRequest request{terrain_, frame_, canvas_.terrainStyle()};
+    TerrainRequest request{terrain_, frame_, style_};
     request.frame.size *= kFiner;
     request.frame.metresPerPixel /= kFiner;
     if (!request.style.scale) request.style.scale = canvas_.scale();
@@ -121,6 +130,7 @@ void MapExport::cancel() {
   worker_.reset();
   picture_.reset();
   terrain_.clear();
+  backgrounds_.clear();
   MapBackgrounds& backgrounds = canvas_.backgrounds();
   if (canvas_.editor() != nullptr && !path_.isEmpty() && !(backgrounds.frame() == canvas_.frame()))
     backgrounds.request(canvas_.frame(), canvas_.scene().projectionText);
@@ -142,7 +152,7 @@ void MapExport::look() {
   MapBackgrounds& backgrounds = canvas_.backgrounds();
   if (terrain_.empty() || picture_) {
     if (!(backgrounds.frame() == frame_)) {  // the map has moved on
-      backgrounds.request(frame_, canvas_.scene().projectionText);
+      backgrounds.request(frame_, drawing_.scene().projectionText);
     } else if (backgrounds.isSettled()) {
       return end(write());
     }
@@ -150,10 +160,19 @@ void MapExport::look() {
   emit progressed(path_, done());
 }
 
-QString MapExport::write() const {
+QString MapExport::write() {
+  for (MapBackground& each : backgrounds_) {
+    // One that is hidden or shows another raster by now is drawn as it was.
+    const MapBackground* now = canvas_.backgrounds().of(each.id);
+    const bool isSame =
+        now != nullptr && now->isShown && (each.raster.isEmpty() || now->raster == each.raster);
+    if (isSame) each.picture = now->picture;
+  }
   QSaveFile file(path_);
   if (!file.open(QIODevice::WriteOnly)) return tr("cannot write \"%1\": %2").arg(path_, file.errorString());
-  if (!writerOf(path_)({canvas_, frame_, picture_}, file) || !file.commit())
+  const std::span all(backgrounds_);
+  const Shown shown{drawing_, style_, frame_, all.first(below_), all.subspan(below_), picture_};
+  if (!writerOf(path_)(shown, file) || !file.commit())
     return tr("cannot write \"%1\": %2").arg(path_, file.errorString());
   return {};
 }

@@ -11,7 +11,7 @@ namespace gridbay::shell {
 
 // Writes the part of a map that is shown: to a picture (png) of twice the screen's resolution, a drawing
 // (svg) or a page (pdf), by the file's ending. The terrain is opened and painted in a thread of its own,
-// and backgrounds are waited for.
+// and backgrounds are waited for. All is as it was shown at the begin, whatever is changed meanwhile.
 class MapExport final : public QObject {
   Q_OBJECT
  public:
@@ -32,12 +32,16 @@ class MapExport final : public QObject {
   void look();
   double done() const;
   void end(const QString& fault);
-  QString write() const;
+  QString write();
 
   MapCanvas& canvas_;
   QTimer timer_;
   QString path_;
   MapFrame frame_;
+  MapDrawing drawing_;
+  TerrainStyle style_;
+  std::vector<MapBackground> backgrounds_;
+  std::size_t below_ = 0;             // of the backgrounds, below the terrain
   std::vector<TerrainArea> terrain_;  // that is in the picture
   std::unique_ptr<TerrainWorker> worker_;
   std::optional<TerrainPicture> picture_;

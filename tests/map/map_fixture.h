@@ -6,6 +6,7 @@
 
 #include "basic/bathymetry.h"
 #include "map/setup_map.h"
+#include "pages/field_picks.h"
 #include "platform/cartography/cartography.h"
 #include "setup/setup_doc.h"
 #include "tests/support/grids.h"
@@ -13,6 +14,18 @@
 #include "tests/support/temporary_folder.h"
 
 namespace gridbay::test {
+
+// A user with a map: a form that he fills can be pointed for.
+class UserWithMap final : public TestHost, public MapHost {
+ public:
+  bool editFormWithPicks(std::string_view title, Form& form, std::span<const FieldPick> offered,
+                         const std::function<std::string()>& fault) override {
+    picks.assign(offered.begin(), offered.end());
+    return editForm(title, form, fault);
+  }
+
+  std::vector<FieldPick> picks;  // of the form that is shown
+};
 
 // A document with areas of grid files that the test makes, in UTM-32 from (500000,6000000).
 class MapFixture : public ::testing::Test {
@@ -55,7 +68,7 @@ class MapFixture : public ::testing::Test {
   }
 
   TemporaryFolder folder;
-  TestHost host;
+  UserWithMap host;
   CV27SetupDoc document{host};
 };
 

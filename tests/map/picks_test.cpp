@@ -1,5 +1,6 @@
 // Cells that hold points, and what is pointed at on the map for them.
 
+#include <algorithm>
 #include <array>
 #include <set>
 
@@ -7,6 +8,7 @@
 #include "basic/mass_budget.h"
 #include "basic/module_selection.h"
 #include "basic/source_sink.h"
+#include "hydrodynamic/boundary.h"
 #include "hydrodynamic/result.h"
 #include "map/document_map.h"
 #include "map/module_outputs.h"
@@ -30,6 +32,7 @@ class MapPicks : public test::MapFixture {
     root().boundary->defaultPosition = 0;
     root().boundary->SetNoBoundaries(1);
     root().boundary->at(1).Set(0, 2, 0, 9);
+    root().nhdBoundary->at(1).tiltType = 1;
     root().sourceSink->SetNoSources(1);
     root().sourceSink->at(1).type = CSourceSinkObjectKvs::kPair;
     root().massBudget->SetNoPolygons(1);
@@ -39,11 +42,16 @@ class MapPicks : public test::MapFixture {
     root().nhdDike->at(1).SetNoPoints(2);
     root().nhdDike->at(1).coordinateType = "UTM-33";
     root().nhdWeir->SetCount(1);
+    root().nhdWeir->at(1).x = {400000, 400100};
+    root().nhdWeir->at(1).y = {6000000, 6000050};
+    root().nhdWeir->at(1).coordinateType = "UTM-33";
     root().nhdCulvert->SetCount(1);
     root().nhdResult->outputs.SetCount(3);
     root().nhdResult->outputs.at(1).part = {{1, 4, 2}, {2, 6, 1}};
     root().nhdResult->outputs.at(2).type = CNhdResultObjectKvs::kLine;
     root().nhdResult->outputs.at(3).type = CNhdResultObjectKvs::kPoints;
+    root().nhdResult->outputs.at(3).pointsJ = {3, 5};
+    root().nhdResult->outputs.at(3).pointsK = {9, 3};
   }
   void choose(std::int32_t simulationType) {
     root().moduleSelection->simulationType = simulationType;
@@ -102,10 +110,13 @@ TEST_F(MapPicks, EachCellOfAPointOnEachPageIsPicked) {
                                     (pointOfText(style.value) || isNameOfPlace(header));
             const std::optional<CellPick> pick = grid.PickRowCol(row, col);
             const bool leadsToPoints = header == "Location" && style.kind == CellKind::button;
-            EXPECT_EQ(pick.has_value(), holdsPoint || leadsToPoints) << header << ", row " << row;
+            const bool isOnLine = entry.pageClass == "CNhdBoundaryDlg" && row == 5 && col == 2;
+            EXPECT_EQ(pick.has_value(), holdsPoint || leadsToPoints || isOnLine) << header << ", row " << row;
             if (!pick) continue;
             EXPECT_FALSE(pick->held.empty() && header != "Location") << header;
-            const std::string name = header.empty() ? grid.GetRowHeader(row) : header;
+            const std::string name = isOnLine         ? "Tilting point"
+                                     : header.empty() ? grid.GetRowHeader(row)
+                                                      : header;
             found.insert(std::to_string(entry.id) + " " + name + ": " + pick->name);
           }
         }
@@ -123,6 +134,7 @@ TEST_F(MapPicks, EachCellOfAPointOnEachPageIsPicked) {
                                        "27 Origin: Origin, row 2",
                                        "28 First point: First point, row 1",
                                        "28 Last point: Last point, row 1",
+                                       "29 Tilting point: Boundary 1, tilting",
                                        "30 Location: Location, row 1",
                                        "31 Easting: Point, row 1",
                                        "31 Easting: Point, row 2",
@@ -150,6 +162,147 @@ TEST_F(MapPicks, EachCellOfAPointOnEachPageIsPicked) {
                                        "94 Last: Last, row 1",
                                        "99 J: J and K, row 1",
                                        "99 K: J and K, row 1"}));
+}
+
+// What a form has cells and fields of points of, each with the name of its pick.
+std::set<std::string> pointsOf(Form& form, const std::vector<FieldPick>& picks) {
+  std::set<std::string> found;
+  for (Control& control : form.controls()) {
+    const auto pick = std::ranges::find_if(picks, [&](const FieldPick& each) {
+      return std::ranges::find(each.fields, &control) != each.fields.end();
+    });
+    const std::string frame = control.group == nullptr ? "" : control.group->name() + " ";
+    const bool isOfPart = frame.starts_with("X direction") || frame.starts_with("Y direction");
+    const bool holdsPlace = isNameOfPlace(control.name()) || (isOfPart && control.name() != "Interval");
+    EXPECT_EQ(pick != picks.end(), control.isEdit() && holdsPlace) << frame << control.name();
+    if (pick != picks.end()) found.insert(frame + control.name() + ": " + pick->wanted().name);
+    if (control.grid == nullptr) continue;
+    CV27SetupGridWnd& grid = *control.grid;
+    for (int row = 1; row <= grid.GetRowCount(); ++row) {
+      for (int col = 1; col <= grid.GetColCount(); ++col) {
+        const std::optional<CellPick> cell = grid.PickRowCol(row, col);
+        EXPECT_EQ(cell.has_value(), isNameOfPlace(grid.GetColHeader(col))) << grid.GetColHeader(col);
+        if (cell) found.insert(grid.GetColHeader(col) + ": " + cell->name);
+      }
+    }
+  }
+  return found;
+}
+
+TEST_F(MapPicks, EachPointInEachDialogIsPicked) {
+  fill();
+  std::set<std::string> found;
+  host.fillForm = [&](Form& form) {
+    for (const std::string& each : pointsOf(form, host.picks)) found.insert(host.titles.back() + ": " + each);
+    return false;
+  };
+  for (const std::int32_t simulation : {module::kAdvectionDispersion, module::kEcological}) {
+    choose(simulation);
+    for (const PageEntry& entry : CDlgEnumerator().pages()) {
+      page = entry.pageClass.empty() ? nullptr : makePage(entry.pageClass, document);
+      if (page == nullptr) continue;
+      for (Control& control : page->form().controls()) {
+        if (control.kind == ControlKind::button && control.usable()) page->form().act(control);
+        if (control.grid == nullptr) continue;
+        CV27SetupGridWnd& grid = *control.grid;
+        for (int row = 1; row <= grid.GetRowCount(); ++row) {
+          for (int col = 1; col <= grid.GetColCount(); ++col) grid.OnClickedButtonRowCol(row, col);
+        }
+      }
+    }
+  }
+  EXPECT_THAT(found, ElementsAreArray({"?"}));
+}
+
+TEST_F(MapPicks, WhatIsPickedInADialogIsOneStepOfTheDialog) {
+  fill();
+  choose(module::kAdvectionDispersion);
+  document.RecordEdit(PageId::hdResult, "filled");
+  struct Case {
+    std::string_view page;
+    int row;
+    std::string_view button;
+    std::function<void(Form&)> pick;
+    std::string step;
+    std::vector<std::pair<int, std::string>> cells;  // by their columns
+  };
+  const auto fields = [this](std::size_t n, std::vector<PickedPlace> places) {
+    return [this, n, places = std::move(places)](Form&) {
+      EXPECT_FALSE(storePick(host.picks.at(n), {}));
+      for (Control* field : host.picks[n].fields) field->fault = "what was typed";
+      EXPECT_TRUE(storePick(host.picks[n], places));
+      for (const Control* field : host.picks[n].fields) EXPECT_EQ(field->fault, "");
+    };
+  };
+  const auto cellOf = [](int row, int col, PickedPlace place) {
+    return [=](Form& form) {
+      CV27SetupGridWnd& grid = *form.find("Points")->grid;
+      EXPECT_FALSE(grid.PickRowCol(row, col)->held.empty());
+      EXPECT_EQ(grid.StorePickRowCol(row, col, std::array{place}), 1);
+    };
+  };
+  const std::vector<Case> cases{
+      {"CResultDlg",
+       1,
+       "...",
+       fields(0, {point(8, 4), point(3, 9)}),
+       "..., row 1",
+       {{3, "3-8,2"}, {4, "4-9,1"}}},
+      {"CResultDlg",
+       2,
+       "...",
+       fields(0, {point(8, 4), point(3, 5)}),
+       "..., row 2",
+       {{3, "3-8,1"}, {4, "4-4,1"}}},
+      {"CResultDlg", 3, "...", cellOf(2, 1, point(7, 8)), "..., row 3", {{3, "3,7"}, {4, "9,8"}}},
+      {"CNadResultDlg", 1, "...", fields(0, {point(2, 3), point(4, 5)}), "..., row 1", {}},
+      {"CNadLineDischargeDlg", 1, "...", fields(1, {point(6, 2)}), "..., row 1", {{4, "(6,2)"}}},
+      {"CNhdWeirDlg", 1, "Location", cellOf(2, 2, {.x = 7, .y = 8}), "Location, row 1", {}},
+  };
+  for (const Case& each : cases) {
+    SCOPED_TRACE(std::string(each.page) + " " + each.step);
+    for (const bool isTaken : {false, true}) {
+      CV27SetupGridWnd& grid = open(each.page);
+      int row = 1;
+      int col = 1;
+      while (grid.GetColHeader(col) != each.button) ++col;
+      CellStyle style;
+      while (grid.GetStyleRowCol(row, col, style) != 0 && style.kind != CellKind::button) ++row;
+      row += each.row - 1;
+      host.fillForm = [&](Form& form) {
+        each.pick(form);
+        return isTaken;
+      };
+      host.formFault = "not asked";
+      grid.OnClickedButtonRowCol(row, col);
+      EXPECT_EQ(lastStep(), isTaken ? each.step : "filled") << host.formFault;
+      for (const auto& [column, text] : each.cells)
+        EXPECT_EQ(cell(grid, row, column) == text, isTaken) << cell(grid, row, column);
+    }
+    document.Undo();
+    EXPECT_EQ(lastStep(), "filled");
+  }
+}
+
+TEST_F(MapPicks, ATiltingPointIsOneOfItsBoundary) {
+  fill();
+  document.RecordEdit(PageId::hdBoundary, "filled");
+  const auto tilting = [this]() -> CV27SetupGridWnd& { return open("CNhdBoundaryDlg"); };
+  EXPECT_EQ(tilting().StorePickRowCol(5, 2, std::array{point(0, 6)}), 1);
+  EXPECT_EQ(root().nhdBoundary->at(1).tiltingPoint, 6);
+  EXPECT_EQ(lastStep(), "Boundary 1, tilting");
+  EXPECT_EQ(tilting().PickRowCol(5, 2)->held.front().point, (GridPoint{0, 6}));
+  // Beyond its ends the nearest end.
+  EXPECT_EQ(tilting().StorePickRowCol(5, 2, std::array{point(4, 15)}), 1);
+  EXPECT_EQ(root().nhdBoundary->at(1).tiltingPoint, 9);
+  root().boundary->at(1).Set(12, 0, 3, 0);
+  EXPECT_EQ(tilting().StorePickRowCol(5, 2, std::array{point(1, 0)}), 1);
+  EXPECT_EQ(root().nhdBoundary->at(1).tiltingPoint, 3);
+  root().boundary->at(1).Set(0, 2, 5, 9);
+  EXPECT_FALSE(tilting().PickRowCol(5, 2).has_value());
+  root().boundary->at(1).Set(0, 2, 0, 9);
+  root().nhdBoundary->at(1).tiltType = -1;
+  EXPECT_FALSE(tilting().PickRowCol(5, 2).has_value());
 }
 
 TEST_F(MapPicks, BothCellsOfAPointAreOneStep) {

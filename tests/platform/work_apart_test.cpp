@@ -35,7 +35,9 @@ TEST(NoCopyNow, ACopyWaitsForIt) {
     isDone = true;
   });
   while (!isHeld) std::this_thread::yield();
+  EXPECT_TRUE(NoCopyNow::isHeld());
   EXPECT_TRUE(holdsApart([&] { return isDone.load(); }, 5));
+  EXPECT_FALSE(NoCopyNow::isHeld());
   // Copies of a copy are made as ever.
   EXPECT_TRUE(holdsApart([] { return holdsApart([] { return true; }, 5); }, 5));
 }

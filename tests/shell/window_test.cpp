@@ -802,6 +802,27 @@ class WindowTest final : public DesktopFixture {
     }
     QVERIFY(QImage(file("pictures/start.png")) != QImage(file("pictures/first-view.png")));
   }
+
+  void picturesOfWhatCantBeOpenedEndWithAFault() {
+    write(file("other.v27"), "OTHER_MODEL { A 1 }\n");
+    write(file("damaged.tsb2"), "nothing of this kind");
+    const QStringList wanted{"--screenshots", file("pictures")};
+    for (const auto& [arguments, told] :
+         {std::pair(wanted + QStringList{file("nosuch.v27")}, "nosuch.v27"),
+          {wanted + QStringList{file("other.v27")}, "is not a setup"},
+          {wanted + QStringList{file("s.v27"), file("damaged.tsb2")}, "damaged.tsb2"},
+          {wanted + QStringList{file("s.v27"), "--compare", file("nosuch.v27")}, "nosuch.v27"},
+          {QStringList{"--screenshots", file("s.v27"), file("s.v27")}, "Cannot write"},
+          {QStringList{"--exit-when-shown", file("nosuch.v27")}, "nosuch.v27"}}) {
+      QProcess shell;
+      shell.start(QCoreApplication::applicationDirPath() + "/vanedeck-shell", arguments);
+      QVERIFY2(shell.waitForFinished(), told);
+      QCOMPARE(shell.exitStatus(), QProcess::NormalExit);
+      QCOMPARE(shell.exitCode(), 2);
+      const QString errors = QString::fromUtf8(shell.readAllStandardError());
+      QVERIFY2(errors.contains(told), qPrintable(errors));
+    }
+  }
 };
 
 }  // namespace gridbay::shell

@@ -23,7 +23,7 @@ class StructureDialogs : public test::ShapeTest {
     return 1;
   }
   int editPoints() {
-    CPointImportDlg dialog(document, x, y);
+    CPointImportDlg dialog(document, "UTM-32", x, y);
     if (dialog.DoModal() != 1) return 0;
     dialog.OnOK(x, y);
     return 1;

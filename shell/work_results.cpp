@@ -1,4 +1,4 @@
-#include "shell/import/work_results.h"
+#include "shell/work_results.h"
 
 #include <utility>
 
