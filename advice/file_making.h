@@ -31,11 +31,13 @@ struct SmoothedSeries {
 };
 
 // A file whose values go through a run: moved in time to begin with it, or with its own times, and with the
-// last values held until the run's end where they end before it.
+// last values held until the run's end where they end before it: once more there, or at each step of an axis
+// that keeps its equal ones.
 struct CoveringSeries {
   DateTime begin;  // of the run
   DateTime end;
   bool isMoved = false;
+  bool keepsSteps = false;
 
   bool operator==(const CoveringSeries&) const = default;
 };

@@ -130,12 +130,12 @@ Result<TsbTimeAxis> covering(const CoveringSeries& run, TsbTimeAxis time) {
   const double until = toUnit.Convert(run.end.linear() - origin.linear());
   const double last = time.at(time.count - 1);
   if (!(last < until - toUnit.Convert(kHalfSecond))) return time;
+  const double added = std::ceil((until - last) / time.step * (1 - 1e-9));
+  if (time.isEquidistant() && run.keepsSteps && added <= kMostSteps) {
+    time.count += static_cast<std::size_t>(added);
+    return time;
+  }
   if (time.isEquidistant()) {
-    const double added = std::ceil((until - last) / time.step * (1 - 1e-9));
-    if (added <= kMostSteps) {
-      time.count += static_cast<std::size_t>(added);
-      return time;
-    }
     for (std::size_t step = 0; step < time.count; ++step) time.values.push_back(time.at(step));
     time.type = time.isCalendar() ? TsbTimeAxisType::calendar : TsbTimeAxisType::relative;
   }

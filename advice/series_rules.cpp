@@ -185,7 +185,7 @@ AdviceFix coveringSeries(AdviceContext& context, const UsedSeries& used, const S
                      : isHeld ? "Begin with the run and hold the last value until its end"
                               : "Move the series to the run's begin";
   return otherFile(context, used, isMoved ? "moved" : "held", what,
-                   CoveringSeries{period.start, end, isMoved});
+                   CoveringSeries{period.start, end, isMoved, !used.isSmooth});
 }
 
 // Whether the file covers the run.
@@ -317,17 +317,26 @@ std::vector<std::uint32_t> itemsOf(const CheckedFile& file, const SeriesFacts& f
   return items;
 }
 
-// The keywords that name a data file: all, and the first on each page for the entries of its lists.
+// The keywords that name a data file. Those of results may be what is read on their own page.
 struct NamesOfFile {
   using Place = std::pair<PageId, std::vector<int>>;
 
   std::vector<std::string> keywords;
-  std::map<Place, std::string> first;
+  std::vector<std::pair<PageId, std::string>> ofResults;
+  std::map<Place, std::string> first;  // on each page, for the entries of its lists
+  std::map<PageId, std::vector<std::string>> byPage = {};
 
   static Place placeOf(PageId page, const std::vector<ListEntry>& entries) {
     Place place{page, {}};
     for (const ListEntry& entry : entries) place.second.push_back(entry.number);
     return place;
+  }
+  const std::vector<std::string>& keywordsFor(PageId page) {
+    const auto [at, isNew] = byPage.try_emplace(page, keywords);
+    for (const auto& [of, keyword] : ofResults) {
+      if (isNew && of == page) at->second.push_back(keyword);
+    }
+    return at->second;
   }
 };
 
@@ -336,9 +345,12 @@ std::map<std::string, NamesOfFile> namesOnFile(AdviceContext& context) {
   std::map<std::string, NamesOfFile> names;
   const std::string folder = folderOfFile(context.documentPath);
   for (const auto& [place, name, isResult] : context.fileKeywords()) {
-    if (isResult) continue;
     NamesOfFile& file = names[absolutePath(name, folder)];
-    file.keywords.push_back(place.keyword);
+    if (isResult) {
+      file.ofResults.emplace_back(place.page, place.keyword);
+    } else {
+      file.keywords.push_back(place.keyword);
+    }
     file.first.try_emplace(NamesOfFile::placeOf(place.page, place.entries), place.keyword);
   }
   return names;
@@ -380,12 +392,13 @@ void adviseSeries(AdviceContext& context) {
     if (!file.coversRun || file.path.empty()) continue;
     const SeriesFacts* facts = context.files.series(file.path);
     if (facts == nullptr || facts->file.time.count == 0) continue;
-    const NamesOfFile& named = names[file.path];
-    if (named.keywords.empty()) continue;  // of a setup that can't be written, which a save tells
+    NamesOfFile& named = names[file.path];
+    const std::vector<std::string>& keywords = named.keywordsFor(file.page);
+    if (keywords.empty()) continue;  // of a setup that can't be written, which a save tells
     PagePlace place = placeOf(file, named);
     // Of what goes on by levels, as a rating curve, nothing is known.
     const bool smooth = isSmooth(place) && momentAt(context, facts->file.time, 0).valid();
-    all.push_back({std::move(place), file, *facts, itemsOf(file, *facts), smooth, named.keywords});
+    all.push_back({std::move(place), file, *facts, itemsOf(file, *facts), smooth, keywords});
   }
   for (const UsedSeries& used : all) adviseOne(context, used, all);
 }

@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <string_view>
 
-#include "shell/import/work_results.h"
+#include "shell/work_results.h"
 
 namespace gridbay::shell {
 namespace {

@@ -310,13 +310,33 @@ TEST_F(SeriesFixTest, WhatHasNoPartOfTheRun) {
   EXPECT_EQ(dateTimeText(start()), "1990-01-01 12:00:00");
   const TsbDefinition moved = definitionOf("tide_moved.tsb0");
   EXPECT_EQ(moved.time.start, *start().parts());
-  EXPECT_EQ(moved.time.type, TsbTimeAxisType::calendarEquidistant);
-  ASSERT_EQ(moved.time.count, kWhole);
-  Values held = smooth(5);
-  held.resize(kWhole, held.back());
-  EXPECT_EQ(read("tide_moved.tsb0"), held);
+  EXPECT_EQ(moved.time.type, TsbTimeAxisType::calendar);
+  EXPECT_THAT(moved.time.values, ::testing::ElementsAre(0, 10, 20, 30, 40, ::testing::DoubleNear(120, 1e-6)));
+  const Values few = smooth(5);
+  EXPECT_EQ(read("tide_moved.tsb0"), (Values{few[0], few[1], few[2], few[3], few[4], few[4]}));
+  // Few values may jump, and do so after that.
+  speaks({{"series", "ends at 1990-01-01 12:00:12, in the run",
+           "Hold the last value until the run's end, in tide_held.tsb0", [&] {
+             TsbDefinition file = every10Minutes(3, start());
+             file.time.step = 0.1;
+             drive(write("tide.tsb0", file, {{0, 0, 9}}));
+           }}});
 
-  // On other axes one value more is enough; a map is held as a whole.
+  // Where the axis is to keep its steps it has more of them.
+  clean();
+  const CoveringSeries equal{start(), model->simulationPeriod->End(), false, true};
+  ASSERT_TRUE(
+      makeFix(*model,
+              {"Hold",
+               {},
+               {{write("five.tsb0", every10Minutes(5, start()), {few}), folder.file("held.tsb0"), equal}}},
+              path));
+  EXPECT_EQ(definitionOf("held.tsb0").time.type, TsbTimeAxisType::calendarEquidistant);
+  Values held = few;
+  held.resize(kWhole, held.back());
+  EXPECT_EQ(read("held.tsb0"), held);
+
+  // A map is held as a whole.
   clean();
   TsbDefinition waves = every10Minutes(2, start(), {{"Height", item::kSignificantWaveHeight, "m"}});
   waves.time.type = TsbTimeAxisType::calendar;
@@ -331,6 +351,25 @@ TEST_F(SeriesFixTest, WhatHasNoPartOfTheRun) {
               ::testing::ElementsAre(0, 0.1, ::testing::DoubleNear(120, 1e-6)));
   heights.insert(heights.end(), heights.begin() + 31 * 31, heights.end());
   EXPECT_EQ(read("held.tsb2"), heights);
+}
+
+// One that is read under a name of the other kind takes the new name, and what is written does not.
+TEST_F(SeriesFixTest, ASeriesThatIsTheResultOfAnotherRun) {
+  writeTide(with(smooth(kWhole), {{4, kNone}}), start());
+  model->nhdResult->outputs.SetCount(1);
+  model->nhdResult->outputs.GetItem(1)->file = folder.file("tide.tsb0");
+  std::string text = saved();
+  const std::string asInput = "(file)\"tide.tsb0\"";
+  ASSERT_NE(text.find(asInput), std::string::npos);
+  text.replace(text.find(asInput), asInput.size(), "(result)\"tide.tsb0\"");
+  const KvsHandle file = test::fileOf(text);
+  model->Load(&file->tree().root(), path);
+  const std::vector<Advice> found = look();
+  ASSERT_EQ(found.size(), 1U);
+  ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
+  EXPECT_TRUE(look().empty());
+  EXPECT_EQ(model->nhdBoundary->GetItem(1)->dataFile.fileName.text(), "tide_filled.tsb0");
+  EXPECT_EQ(model->nhdResult->outputs.GetItem(1)->file.text(), "tide.tsb0");
 }
 
 TEST_F(SeriesFixTest, WhatCantBeMadeLeavesNothing) {
@@ -369,7 +408,7 @@ TEST_F(SeriesFixTest, ALongRunTakesNoManySteps) {
   TsbDefinition file = every10Minutes(2, start());
   file.time.step = 1e-6;
   const std::string from = write("fine.tsb0", file, {{1, 2}});
-  const CoveringSeries run{start(), start().plusDays(1), false};
+  const CoveringSeries run{start(), start().plusDays(1), false, true};
   ASSERT_TRUE(makeFix(*model, {"Hold", {}, {{from, folder.file("held.tsb0"), run}}}, path));
   EXPECT_EQ(definitionOf("held.tsb0").time.type, TsbTimeAxisType::calendar);
   EXPECT_EQ(read("held.tsb0"), (Values{1, 2, 2}));
