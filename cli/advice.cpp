@@ -18,7 +18,7 @@ namespace {
 
 struct FixOptions {
   std::string file;
-  std::size_t number = 0;
+  std::int64_t number = 0;
 };
 
 std::string valueAt(SetupFile& setup, const std::string& keyword, const std::string& path) {
@@ -26,21 +26,27 @@ std::string valueAt(SetupFile& setup, const std::string& keyword, const std::str
   return found ? shownValues(found->node()) : std::string();
 }
 
+// As the file has it, which a save may write in another way; what it lacks as the model has it.
+std::string valueOnFile(SetupFile& setup, const std::string& keyword, const std::string& path) {
+  const Node* node = nodeAt(setup.source(), keyword);
+  return node != nullptr && !node->isSection() ? shownValues(*node) : valueAt(setup, keyword, path);
+}
+
 int fix(const FixOptions& options, const Console& console) {
   ConsoleMessageHost host(console);
   Result<SetupFile> setup = SetupFile::open(options.file, &host);
   if (!setup) return console.fail(setup.error());
   const std::vector<Advice> found = adviceOn(*setup, options.file);
-  if (options.number < 1 || options.number > found.size()) {
-    return console.fail(
-        fmt::format("There is no advice {}: there {} {}. \"{} validate --advice {}\" lists them",
-                    options.number, found.size() == 1 ? "is" : "are",
-                    found.empty() ? "none" : std::to_string(found.size()), toolName(), options.file));
+  if (options.number < 1 || options.number > std::ssize(found)) {
+    return console.fail(fmt::format(
+        "There is no advice {}: there {} {}. \"{} validate --advice {}\" lists them", options.number,
+        found.size() == 1 ? "is" : "are", found.empty() ? "none" : std::to_string(found.size()), toolName(),
+        shellText(options.file)));
   }
-  const Advice& advice = found[options.number - 1];
+  const Advice& advice = found[static_cast<std::size_t>(options.number) - 1];
   std::vector<std::string> before;
   for (const Setting& setting : advice.fix.settings)
-    before.push_back(valueAt(*setup, setting.path, options.file));
+    before.push_back(valueOnFile(*setup, setting.path, options.file));
   if (const Outcome done = makeFix(setup->model(), advice.fix, options.file); !done)
     return console.fail(done.error());
   if (const int status = saveSetup(*setup, options.file, console); status != kClean) {
@@ -55,16 +61,6 @@ int fix(const FixOptions& options, const Console& console) {
     console.out << fmt::format("  {}: {} -> {}\n", path, before[i], valueAt(*setup, path, options.file));
   }
   return kClean;
-}
-
-// A path as a shell takes it.
-std::string shellText(const std::string& path) {
-  constexpr std::string_view kPlain =
-      "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789_-./:=,+@%";
-  if (path.find_first_not_of(kPlain) == std::string::npos) return path;
-  std::string text = "'";
-  for (const char c : path) text += c == '\'' ? std::string("'\\''") : std::string(1, c);
-  return text + "'";
 }
 
 nlohmann::ordered_json siteJson(const AdviceSite& site) {

@@ -6,7 +6,9 @@
 #include "basic/bathymetry.h"
 #include "cli/commands.h"
 #include "core/grid_point.h"
+#include "map/nesting_words.h"
 #include "map/setup_map.h"
+#include "setup/entry_removal.h"
 
 namespace gridbay::cli {
 namespace {
@@ -18,6 +20,7 @@ struct AreaOptions {
   std::optional<int> enclosing;
   std::optional<std::string> at;
   bool snap = false;
+  bool force = false;  // an area that can't nest
 };
 
 Result<std::optional<GridPoint>> given(const AreaOptions& options) {
@@ -69,14 +72,20 @@ Outcome place(SetupMap& map, CGlobalKvs& root, int number, const std::optional<G
   return {};
 }
 
-// What stands against where the areas lie now; it is for the check to count.
-void tellFaults(SetupMap& map, CGlobalKvs& root, int number, const Console& console) {
-  const MapArea* area = map.scene(root).area(number);
-  if (area != nullptr && !area->fault.empty()) console.note(area->fault);
+// What stands against where the area lies now; empty where nothing does.
+std::string faultOf(SetupMap& map, CGlobalKvs& root, int number) {
+  const MapScene& scene = map.scene(root);
+  const MapArea& area = *scene.area(number);
+  const MapArea* outer = scene.area(area.enclosing);
+  if (area.fault.empty() || !area.isPlaced || outer == nullptr) return area.fault;
+  const std::string words = nestingWords(area, *outer);
+  return words.empty() ? area.fault : area.fault + "\n" + words;
 }
 
-int finish(SetupFile& setup, const AreaOptions& options, int number, SetupMap& map, const Console& console) {
-  tellFaults(map, setup.model(), number, console);
+// A fault is told here, and is for the check to count.
+int finish(SetupFile& setup, const AreaOptions& options, int number, const std::string& fault,
+           const Console& console) {
+  if (!fault.empty()) console.note(fault);
   if (const int status = saveSetup(setup, options.setup, console); status != kClean) return status;
   console.out << placeText(setup.model().bathymetry->at(number), number) << '\n';
   return kClean;
@@ -100,7 +109,10 @@ int add(const AreaOptions& options, SetupFile& setup, const std::optional<GridPo
   const int number = root.bathymetry->GetCount();
   if (const Outcome done = place(map, root, number, at, options.snap, console); !done)
     return console.fail(done.error() + "; the setup is unchanged");
-  return finish(setup, options, number, map, console);
+  const std::string fault = faultOf(map, root, number);
+  if (!fault.empty() && !options.force)
+    return console.fail(fault + "\nThe setup is unchanged; --force adds the area all the same");
+  return finish(setup, options, number, fault, console);
 }
 
 int move(const AreaOptions& options, SetupFile& setup, const std::optional<GridPoint>& at,
@@ -127,7 +139,7 @@ int move(const AreaOptions& options, SetupFile& setup, const std::optional<GridP
   const std::optional<GridPoint> held = at ? at : std::optional(root.bathymetry->at(options.number).origin);
   if (const Outcome done = place(map, root, options.number, held, options.snap, console); !done)
     return console.fail(done.error() + "; the setup is unchanged");
-  return finish(setup, options, options.number, map, console);
+  return finish(setup, options, options.number, faultOf(map, root, options.number), console);
 }
 
 int remove(const AreaOptions& options, SetupFile& setup, const std::optional<GridPoint>&,
@@ -137,12 +149,6 @@ int remove(const AreaOptions& options, SetupFile& setup, const std::optional<Gri
   if (options.number < 1 || options.number > count)
     return console.fail(fmt::format("There is no area {}: the setup has {}", options.number, count));
   if (count == 1) return console.fail("A setup keeps one area at least");
-  // What is said of each area stands by its number.
-  if (options.number != count)
-    return console.fail(
-        fmt::format("Area {} can't be removed before those behind it: all that is set up for them stands by "
-                    "their numbers",
-                    options.number));
   std::string inside;
   for (int other = 1; other <= count; ++other) {
     if (other != options.number && root.bathymetry->at(other).enclosingArea == options.number)
@@ -150,14 +156,23 @@ int remove(const AreaOptions& options, SetupFile& setup, const std::optional<Gri
   }
   if (!inside.empty())
     return console.fail(fmt::format("Area {} can't be removed: it encloses area {}", options.number, inside));
+  if (options.number == 1) return console.fail("Area 1, on which all others lie, can't be removed");
+  if (options.number < count && root.bathymetry->hotStart == 1)
+    return console.fail(
+        fmt::format("Area {} can't be removed before those behind it, whose hot start files name the areas "
+                    "that enclose them by their numbers",
+                    options.number));
   SetupMap map;
   for (const MapFeature& feature : map.scene(root).features) {
-    if (feature.area == options.number)
-      console.note(fmt::format("\"{}\" of page {} stands on it", feature.label, feature.id.page));
+    if (feature.area == options.number || feature.lastArea == options.number)
+      console.note(fmt::format("\"{}\" of page {} stands on it, and stands on no area then", feature.label,
+                               feature.id.page));
   }
-  root.bathymetry->SetNoAreas(count - 1);
+  removeArea(root, options.number);
   if (const int status = saveSetup(setup, options.setup, console); status != kClean) return status;
   console.out << fmt::format("Area {} is removed; its grid file is left\n", options.number);
+  if (options.number < count)
+    console.out << fmt::format("The areas behind it, up to {}, have numbers less by one now\n", count);
   return kClean;
 }
 
@@ -190,11 +205,15 @@ void addArea(CLI::App& tool, Action& action) {
   adding.add_option("FILE", options->setup, "The setup")->required();
   adding.add_option("GRID", options->grid, "The grid file (*.tsb2)")->required();
   addPosition(adding, *options);
+  adding.add_flag("--force", options->force, "Add an area that can't nest");
   CLI::App& moving = addCommand(area, action, "move", "Places an area anew", opened<move>, options);
   moving.add_option("FILE", options->setup, "The setup")->required();
   moving.add_option("AREA", options->number, "Its number, from 2")->required();
   addPosition(moving, *options);
-  CLI::App& removing = addCommand(area, action, "remove", "Removes the last area", opened<remove>, options);
+  CLI::App& removing = addCommand(area, action, "remove",
+                                  "Removes an area that encloses no other, with all that is set up for it; "
+                                  "those behind it take its number",
+                                  opened<remove>, options);
   removing.add_option("FILE", options->setup, "The setup")->required();
   removing.add_option("AREA", options->number, "Its number")->required();
 }

@@ -18,19 +18,8 @@ namespace {
 
 // A command line as a shell would take it again.
 std::string commandLineText(const std::string& tool, std::span<const char* const> words) {
-  constexpr std::string_view kPlain =
-      "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789_-./:=,+@%";
   std::string text = tool;
-  for (const std::string_view word : words) {
-    text += ' ';
-    if (!word.empty() && word.find_first_not_of(kPlain) == word.npos) {
-      text += word;
-      continue;
-    }
-    text += '\'';
-    for (const char c : word) text += c == '\'' ? std::string("'\\''") : std::string(1, c);
-    text += '\'';
-  }
+  for (const char* const word : words) text += ' ' + shellText(word);
   return text;
 }
 
@@ -65,6 +54,15 @@ CLI::Validator finite(double least) {
             if (!number || !(std::abs(*number) <= kMost))
               return fmt::format("\"{}\" is no finite number", text);
             return *number < least ? fmt::format("{} is below {:g}", text, least) : std::string();
+          },
+          ""};
+}
+
+CLI::Validator aboveZero() {
+  return {[](std::string& text) {
+            const std::string fault = finite()(text);
+            if (!fault.empty() || *doubleOfText(text) > 0) return fault;
+            return fmt::format("{} is not above 0", text);
           },
           ""};
 }

@@ -66,5 +66,6 @@ CLI::Option* addItemType(CLI::App& command, auto& itemType, std::string_view ofW
 
 // Takes numbers that are finite as 32-bit ones and not below the least one; the tool's own number texts only.
 CLI::Validator finite(double least = std::numeric_limits<double>::lowest());
+CLI::Validator aboveZero();
 
 }  // namespace gridbay::cli

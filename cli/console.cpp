@@ -13,6 +13,15 @@ void Console::note(std::string_view text) const {
   err << text << '\n' << std::flush;
 }
 
+std::string shellText(std::string_view word) {
+  constexpr std::string_view kPlain =
+      "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789_-./:=,+@%";
+  if (!word.empty() && word.find_first_not_of(kPlain) == word.npos) return std::string(word);
+  std::string text = "'";
+  for (const char c : word) text += c == '\'' ? std::string("'\\''") : std::string(1, c);
+  return text + "'";
+}
+
 std::string messageLine(const CMessage& message) {
   return fmt::format("page {}, severity {}: {}", static_cast<int>(message.page),
                      static_cast<int>(message.severity), message.text);

@@ -34,6 +34,9 @@ class ConsoleMessageHost : public MessageHost {
   const Console& console_;
 };
 
+// A word as a shell takes it.
+std::string shellText(std::string_view word);
+
 // A message of a validation on one line.
 std::string messageLine(const CMessage& message);
 

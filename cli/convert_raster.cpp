@@ -50,12 +50,12 @@ void addConvertRaster(CLI::App& convert, Action& action) {
   addItemType(command, options->itemType,
               "the values, which are in its base unit (default: as the file says, or else Bathymetry)");
   command.add_option("--band", options->band, "Number of the band to take, from 1 (default: the first)")
-      ->check(CLI::PositiveNumber);
+      ->check(finite(1));
   command
       .add_option(
           "--subdataset", options->subdataset,
           "Number of the raster to take, from 1, in a file that holds several; without it they are listed")
-      ->check(CLI::PositiveNumber);
+      ->check(finite(1));
   command
       .add_option("--nodata-as", options->missingAs,
                   "What stands for missing values (unit of the values; default: the land value)")
@@ -67,7 +67,7 @@ void addConvertRaster(CLI::App& convert, Action& action) {
   command
       .add_option("--resample", options->resample,
                   "The spacing to bring the raster to (m); a text of points needs one")
-      ->check(CLI::PositiveNumber & finite());
+      ->check(aboveZero());
   command
       .add_option(
           "--resampling", given->resampling,

@@ -5,16 +5,24 @@
 namespace gridbay::cli {
 namespace {
 
-int doConvertSeries(const SeriesConversion& options, const Console& console) {
-  return convertWith(convertSeries, options, console);
+struct SeriesConversionOptions {
+  SeriesConversion conversion;
+  std::string dateOrder;  // empty for none
+};
+
+int doConvertSeries(const SeriesConversionOptions& options, const Console& console) {
+  SeriesConversion conversion = options.conversion;
+  if (!options.dateOrder.empty()) conversion.dateOrder = dateOrderNames().at(options.dateOrder);
+  return convertWith(convertSeries, std::move(conversion), console);
 }
 
 }  // namespace
 
 void addConvertSeries(CLI::App& convert, Action& action) {
-  std::shared_ptr<SeriesConversion> options;
+  std::shared_ptr<SeriesConversionOptions> given;
   CLI::App& command = addCommand(convert, action, "series", "Makes a time series (tsb0) from delimited text",
-                                 doConvertSeries, options);
+                                 doConvertSeries, given);
+  SeriesConversion* options = &given->conversion;
   command
       .add_option("IN", options->in, "Lines of a time and values, between commas, semicolons, tabs or blanks")
       ->required();
@@ -29,7 +37,7 @@ void addConvertSeries(CLI::App& convert, Action& action) {
   command.add_option("--time-unit", options->timeUnit, "Unit of the times: s, min, h, d")
       ->capture_default_str();
   command.add_option("--skip-lines", options->skipLines, "Heading lines; the last one names the columns")
-      ->check(CLI::NonNegativeNumber)
+      ->check(finite(0))
       ->capture_default_str();
   command
       .add_option(
@@ -37,10 +45,8 @@ void addConvertSeries(CLI::App& convert, Action& action) {
           "A number that stands for missing values; may be given several times (default: -9999 and the "
           "like are recognised; with --start no value may be missing)")
       ->allow_extra_args(false);
-  command
-      .add_option("--dates", options->dateOrder,
-                  "The order of dates that do not tell it themselves: ymd, dmy, mdy")
-      ->transform(CLI::CheckedTransformer(dateOrderNames(), CLI::ignore_case));
+  command.add_option("--dates", given->dateOrder, "The order of dates that do not tell it themselves")
+      ->check(CLI::IsMember(dateOrderNames(), CLI::ignore_case));
   addForce(command, options->force);
 }
 

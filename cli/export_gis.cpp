@@ -1,4 +1,5 @@
 #include <fmt/format.h>
+#include <fmt/ranges.h>
 
 #include <filesystem>
 
@@ -40,18 +41,19 @@ int exportGis(const GisExportOptions& options, const Console& console) {
     return console.fail("Without the grid of Area 1 nothing has a place on the map");
   if (scene.projectionText.empty())
     console.note("The grid of Area 1 names no projection: the layers have local coordinates");
-  int leftOut = 0;
-  const VectorFile file = gisLayers(setup->model(), scene, &leftOut);
+  const GisExport made = gisLayers(setup->model(), scene, options.setup);
   for (const MapFeature& feature : scene.features) {
     if (!feature.fault.empty())
       console.note(fmt::format("Page {}, {}: {}", feature.id.page, feature.label, feature.fault));
   }
-  if (const Outcome written = writeGeoPackage(options.out, file); !written)
+  if (const Outcome written = writeGeoPackage(options.out, made.file); !written)
     return console.fail(written.error());
-  for (const VectorLayer& layer : file.layers)
+  for (const VectorLayer& layer : made.file.layers)
     console.out << fmt::format("{} {}\n", layer.name, layer.features.size());
-  if (leftOut > 0) console.note(fmt::format("Left out, as they can't be placed: {}", leftOut));
-  return kClean;
+  if (made.leftOut.empty()) return kClean;
+  console.note(fmt::format("{} is not whole. Left out, having no place on the map: {}", options.out,
+                           fmt::join(made.leftOut, "; ")));
+  return kFaultsFound;
 }
 
 }  // namespace
@@ -63,7 +65,7 @@ void addExport(CLI::App& tool, Action& action) {
   CLI::App& gis =
       addCommand(exporting, action, "gis",
                  "All that is placed, as a GeoPackage with a layer for each kind, in the projection "
-                 "of Area 1",
+                 "of Area 1; exit status 1 where something has no place and is left out",
                  exportGis, options);
   gis.add_option("FILE", options->setup, "The setup")->required();
   gis.add_option("OUT", options->out, "The file to write (*.gpkg)")->required();

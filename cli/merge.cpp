@@ -88,6 +88,8 @@ int merge(const MergeOptions& options, const Console& console) {
       questionsOf(merged.conflicts, *sources.base.setup.tree(options.out),
                   *sources.own.setup.tree(options.out), *sources.other.setup.tree(options.out), options.out);
   const bool isWritten = questions.empty() || options.takesOwn || options.takesOther;
+  const std::size_t count = questions.size();
+  const std::size_t taken = merged.takenFromOther + (options.takesOther ? count : 0);
   unsigned faults = 0;
   if (isWritten) {
     SetupFile result = SetupFile::fromTree(std::move(merged.file), options.out, &host);
@@ -96,7 +98,7 @@ int merge(const MergeOptions& options, const Console& console) {
   }
   if (options.json) {
     Json report{{"base", options.base}, {"a", options.own},           {"b", options.other},
-                {"out", options.out},   {"conflicts", Json::array()}, {"takenFromB", merged.takenFromOther},
+                {"out", options.out},   {"conflicts", Json::array()}, {"takenFromB", taken},
                 {"written", isWritten}};
     for (const MergeQuestion& question : questions) report["conflicts"].push_back(jsonOf(question));
     if (isWritten) report["faults"] = faults;
@@ -104,14 +106,13 @@ int merge(const MergeOptions& options, const Console& console) {
     return questions.empty() ? kClean : kFaultsFound;
   }
   for (const MergeQuestion& question : questions) console.out << lineOf(question);
-  const std::size_t count = questions.size();
   if (!isWritten) {
     console.note(fmt::format("{} conflict{}; nothing is written without --ours (A) or --theirs (B)", count,
                              count == 1 ? "" : "s"));
   } else {
     console.out << fmt::format("{}: {} change{} taken from B, {} conflict{}, {} fault{}\n", options.out,
-                               merged.takenFromOther, merged.takenFromOther == 1 ? "" : "s", count,
-                               count == 1 ? "" : "s", faults, faults == 1 ? "" : "s");
+                               taken, taken == 1 ? "" : "s", count, count == 1 ? "" : "s", faults,
+                               faults == 1 ? "" : "s");
   }
   return count == 0 ? kClean : kFaultsFound;
 }

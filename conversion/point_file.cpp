@@ -104,6 +104,22 @@ Columns columnsOf(std::string_view heading) {
   return count == kNames.size() ? named : columns;
 }
 
+// Whether a text has a line as it is wanted, below one heading at most.
+template <class IsWanted>
+bool beginsWith(const std::string& path, const IsWanted& isWanted) {
+  Result<LineReader> reader = LineReader::open(path);
+  if (!reader) return false;
+  int others = 0;
+  Columns columns{0, 1, 2};
+  while (const std::optional<std::string_view> line = reader->next()) {
+    if (isPassedOver(*line)) continue;
+    if (isWanted(Separation::of(*line), *line, columns)) return true;
+    if (++others > 1) return false;
+    columns = columnsOf(*line);
+  }
+  return false;
+}
+
 }  // namespace
 
 double PointSet::meanDistance() const {
@@ -130,17 +146,16 @@ bool PointSet::areInLine() const {
 }
 
 bool holdsPoints(const std::string& path) {
-  Result<LineReader> reader = LineReader::open(path);
-  if (!reader) return false;
-  int others = 0;
-  Columns columns{0, 1, 2};
-  while (const std::optional<std::string_view> line = reader->next()) {
-    if (isPassedOver(*line)) continue;
-    if (isPoint(Separation::of(*line), *line, columns)) return true;
-    if (++others > 1) return false;
-    columns = columnsOf(*line);
-  }
-  return false;
+  return beginsWith(path, isPoint);
+}
+
+bool holdsNumbers(const std::string& path) {
+  return beginsWith(path, [](const Separation& separation, std::string_view line, const Columns&) {
+    const std::vector<std::string_view> fields = separation.fieldsOf(line);
+    return fields.size() > 1 && std::ranges::all_of(fields, [&](std::string_view field) {
+             return separation.numberOf(field).has_value();
+           });
+  });
 }
 
 Result<PointSet> readPoints(const std::string& path, const std::function<bool(double)>& progress) {
@@ -188,8 +203,8 @@ Result<PointSet> readPoints(const std::string& path, const std::function<bool(do
   if (reader->hasFailed()) return Failure{fmt::format("cannot read \"{}\" behind line {}", path, number)};
   constexpr std::size_t kFewest = 3;
   if (points.x.size() < kFewest)
-    return Failure{
-        fmt::format("\"{}\" holds {} points; a grid needs at least {}", path, points.x.size(), kFewest)};
+    return Failure{fmt::format("\"{}\" holds {} point{}; a grid needs at least {}", path, points.x.size(),
+                               points.x.size() == 1 ? "" : "s", kFewest)};
   return points;
 }
 

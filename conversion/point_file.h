@@ -23,6 +23,8 @@ struct PointSet {
 
 // Whether a file begins as a text of points does: with three numbers on a line, below one heading at most.
 bool holdsPoints(const std::string& path);
+// Whether it begins with fewer of them, as a table of pairs does.
+bool holdsNumbers(const std::string& path);
 
 // Reads points from a text, one on a line: numbers between semicolons, tabs, commas or blanks, as the first
 // line has them; between all but commas a number may have a decimal comma. A heading may name the columns in

@@ -14,6 +14,7 @@
 #include "platform/cartography/cartography.h"
 #include "platform/cartography/grid_mapping.h"
 #include "platform/files/may_write.h"
+#include "platform/projection_search.h"
 #include "platform/tsb/tsb_writer.h"
 #include "platform/units/units.h"
 
@@ -84,6 +85,12 @@ Result<Selection> select(const RasterConversion& options, const Raster& raster, 
   }
   all.noJ = (all.noJ - 1) / all.every + 1;
   all.noK = (all.noK - 1) / all.every + 1;
+  constexpr int kFewest = 2;
+  if (all.noJ < kFewest || all.noK < kFewest)
+    return Failure{
+        fmt::format("Of the raster's {} x {} points the grid would have {} x {}, and it wants {} x {} at "
+                    "least: closer ones, or a larger part of the raster",
+                    raster.columns(), raster.rows(), all.noJ, all.noK, kFewest, kFewest)};
   return all;
 }
 
@@ -113,7 +120,7 @@ Result<Target> define(const RasterConversion& options, const Raster& raster, con
   const bool isOwn = options.crs.empty() || !options.reproject.empty();
   const std::string projection = isOwn ? raster.projection() : options.crs;
   const CVdMapProjection map(projection);
-  if (!map.IsValid()) return Failure{fmt::format("\"{}\" is no projection that is known here", projection)};
+  if (!map.IsValid()) return Failure{unknownProjection(projection)};
   if (Outcome metres = checkMetres(map); !metres) return Failure{metres.error()};
 
   const std::array<double, 2> first = layout.at(chosen.firstJ, chosen.firstK);
@@ -143,6 +150,21 @@ Result<Target> define(const RasterConversion& options, const Raster& raster, con
   }
   definition.geography = place;
   return target;
+}
+
+// A northern zone of UTM in which all northings are below 0 was hardly meant.
+void tellSouthernZone(const RasterConversion& options, const Target& target, ConversionHost& host) {
+  if (options.reproject.empty()) return;
+  const std::string zone = CVdMapProjection(options.reproject).Name();
+  const TsbGridAxis& y = target.definition.axes[1];
+  const double last = target.north + static_cast<double>(y.points - 1) * y.spacing;
+  if (last >= 0 || zone.find("UTM zone") == zone.npos || !zone.ends_with('N')) return;
+  const std::string southern = zone.substr(0, zone.size() - 1) + "S";
+  const std::vector<KnownProjection> known = findProjections(southern, 1);
+  host.note(
+      fmt::format("The map lies south of the equator, from northing {:.0f} of \"{}\": its southern zone is "
+                  "\"{}\"{}",
+                  target.north, zone, southern, known.empty() ? "" : ", " + known.front().code));
 }
 
 // Before hours of work: what the disk has no room for.
@@ -263,6 +285,7 @@ Result<ConvertedRaster> convertRaster(const RasterConversion& options, Conversio
   if (!chosen) return Failure{chosen.error()};
   const Result<Target> target = define(options, raster, *layout, *chosen, host);
   if (!target) return Failure{target.error()};
+  tellSouthernZone(options, *target, host);
   if (const Outcome fits = checkRoom(options.out, target->definition); !fits) return Failure{fits.error()};
   Result<TsbWriter> writer = TsbWriter::create(options.out, target->definition);
   if (!writer) return Failure{writer.error()};

@@ -11,6 +11,7 @@
 #include "platform/cartography/cartography.h"
 #include "platform/cartography/grid_mapping.h"
 #include "platform/cartography/transformation.h"
+#include "platform/projection_search.h"
 
 namespace gridbay {
 namespace {
@@ -69,8 +70,7 @@ Result<std::unique_ptr<Raster>> openRaster(const RasterConversion& options, Conv
 // The full text of a projection in metres that a user names.
 Result<std::string> projectionInMetres(const std::string& text) {
   const CVdMapProjection map(text);
-  if (!map.IsValid() || map.IsLocal())
-    return Failure{fmt::format("\"{}\" is no projection that is known here", text)};
+  if (!map.IsValid() || map.IsLocal()) return Failure{unknownProjection(text)};
   if (Outcome metres = checkMetres(map); !metres) return Failure{metres.error()};
   return map.Wkt2();
 }
@@ -80,11 +80,12 @@ Result<std::string> projectionOf(const RasterConversion& options) {
   if (options.crs.empty()) return std::string();
   const CVdMapProjection own(options.crs);
   if (own.IsValid()) return own.Wkt2();
-  return Failure{fmt::format("\"{}\" is no projection that is known here", options.crs)};
+  return Failure{unknownProjection(options.crs)};
 }
 
 // The raster brought to another projection or spacing, as the options ask.
-Result<std::unique_ptr<Raster>> warpedRaster(const RasterConversion& options, Raster& raster) {
+Result<std::unique_ptr<Raster>> warpedRaster(const RasterConversion& options, Raster& raster,
+                                             const ConversionHost& host) {
   WarpTarget target{.spacing = options.resample.value_or(0), .resampling = options.resampling};
   if (!options.reproject.empty()) {
     const Result<std::string> projection = projectionInMetres(options.reproject);
@@ -94,6 +95,11 @@ Result<std::unique_ptr<Raster>> warpedRaster(const RasterConversion& options, Ra
   const Result<std::string> own = projectionOf(options);
   if (!own) return Failure{own.error()};
   target.from = *own;
+  const bool hasProjection = !own->empty() || !CVdMapProjection(raster.projection()).IsLocal();
+  if (!target.projection.empty() && !hasProjection) {
+    return Failure{fmt::format("\"{}\" does not say in which projection it is: say so with {}", options.in,
+                               host.option("crs", "CRS"))};
+  }
   if (isTsbRaster(options.in)) {
     // A short name is not known to the raster library.
     if (target.from.empty()) target.from = CVdMapProjection(raster.projection()).Wkt2();
@@ -180,6 +186,17 @@ Result<std::unique_ptr<Raster>> griddedPoints(const RasterConversion& options, C
 
 }  // namespace
 
+std::string unknownProjection(const std::string& text) {
+  constexpr std::size_t kMost = 3;
+  std::string words = fmt::format("\"{}\" is no projection that is known here", text);
+  std::string_view between = "; known are ";
+  for (const KnownProjection& near : findProjections(text, kMost)) {
+    words += fmt::format("{}{} ({})", between, near.code, near.name);
+    between = ", ";
+  }
+  return words;
+}
+
 Outcome checkMetres(const CVdMapProjection& projection) {
   const std::string wanted = "a grid wants a projection in metres";
   if (const auto mapping = gridMappingOf(projection.Wkt2()); mapping && mapping->name == kGeographicMapping)
@@ -198,8 +215,16 @@ Result<RasterSource> openRasterSource(const RasterConversion& options, Conversio
   };
   if (options.gridding) return fromPoints();
   Result<std::unique_ptr<Raster>> opened = openRaster(options, host);
-  if (!opened && !isTsbRaster(options.in) && holdsPoints(options.in)) return fromPoints();
-  if (opened && (!options.reproject.empty() || options.resample)) opened = warpedRaster(options, **opened);
+  if (!opened && !isTsbRaster(options.in)) {
+    if (holdsPoints(options.in)) return fromPoints();
+    if (holdsNumbers(options.in))
+      return Failure{
+          fmt::format("{}. It is no text of points either, which has x, y and z on each line; {} takes it "
+                      "for one and says where it differs",
+                      opened.error(), host.option("gridding", "HOW"))};
+  }
+  if (opened && (!options.reproject.empty() || options.resample))
+    opened = warpedRaster(options, **opened, host);
   if (!opened) return Failure{opened.error()};
   return RasterSource{std::move(*opened)};
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <memory>
+#include <string>
 
 #include "conversion/conversion_host.h"
 #include "conversion/raster.h"
@@ -18,6 +19,9 @@ struct RasterSource {
 
 // An error where a unit of the projection is none of a metre.
 Outcome checkMetres(const CVdMapProjection& projection);
+
+// That a text names no projection, with those that it may mean.
+std::string unknownProjection(const std::string& text);
 
 // Opens what the options name, and chooses what they ask for; the host is told what else there would be.
 // Points that are given no spacing have one by their mean distance where `guessSpacing`, else they are an

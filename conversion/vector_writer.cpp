@@ -3,15 +3,20 @@
 #include <fmt/format.h>
 #include <unistd.h>
 
+#include <cerrno>
+#include <cstring>
 #include <filesystem>
 
 #include "conversion/raster_reader.h"
+#include "platform/files/unfinished_file.h"
 
 namespace gridbay {
 
 Outcome writeGeoPackage(const std::string& path, const VectorFile& file) {
   const Result<void*> entry = rasterModuleEntry(kWriteVectors);
   if (!entry) return Failure{entry.error()};
+  if (UnfinishedFile(path).path().empty())
+    return Failure{fmt::format("cannot write \"{}\": {}", path, std::strerror(errno))};
   const std::filesystem::path target(path);
   // Its library wants the extension, and a file that is not there.
   const std::filesystem::path made =

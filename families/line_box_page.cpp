@@ -11,11 +11,11 @@ PlaceDlg::PlaceDlg(CVdDoc& document, const PlaceTexts& texts, const LineOrBox& i
   const auto point = [&](std::string_view label, GridPoint LineOrBox::*member) {
     const auto held = [copy, member]() -> GridPoint& { return copy().*member; };
     FieldPick pick;
-    form().Group(label, [&] {
+    const Control& frame = form().Group(label, [&] {
       pick.fields = {&form().Number("J", held, &GridPoint::j),
                      &form().Number("K", held, &GridPoint::k).Beside()};
     });
-    pick.wanted = [copy, held, name = std::string(label)] {
+    pick.wanted = [copy, held, name = frame.name()] {
       return CellPick{.name = name, .area = copy().areaNumber, .held = {{.point = held()}}};
     };
     pick.take = [held](std::span<const PickedPlace> places) { held() = places.front().point; };

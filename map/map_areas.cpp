@@ -104,6 +104,11 @@ MapGrid gridWithin(const MapArea& outer, GridPoint origin, double dx, double dy)
           scaled(outer.grid.stepK, dy / outer.dy)};
 }
 
+bool nestsIn(const MapArea& inner, const MapArea& outer) {
+  ValidationList messages;
+  return CheckNestingGeometry(Probe(inner, {}).object(), Probe(outer, {}).object(), messages) == 0;
+}
+
 std::optional<MapPoint> ownPlace(const GridHeader& header, MapCoordinates& coordinates) {
   const bool isLocal = !header.geography || CVdMapProjection::IsLocal(header.geography->projection);
   if (isLocal != coordinates.isLocal()) return std::nullopt;

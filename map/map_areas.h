@@ -27,6 +27,9 @@ std::optional<GridPoint> pointAt(const MapArea& area, MapPoint place);
 // The number of the finest area at a place; 0 where there is none.
 std::int32_t finestAt(const std::vector<MapArea>& areas, MapPoint place);
 
+// Whether an area, alone, nests in another one as far as spacings, extent and position tell. Both have grids.
+bool nestsIn(const MapArea& inner, const MapArea& outer);
+
 // Area `number` with its first point at the point of its enclosing area that is nearest to a place, and
 // inside that area if it can be.
 AreaPlace placeArea(const CBathymetryKvs& setup, const std::vector<MapArea>& areas, std::int32_t number,

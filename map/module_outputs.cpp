@@ -4,13 +4,16 @@
 
 #include "advection_dispersion/box_summation.h"
 #include "advection_dispersion/line_discharge.h"
+#include "advection_dispersion/mass_budget.h"
 #include "advection_dispersion/result.h"
 #include "basic/module_selection.h"
+#include "ecology/mass_budget.h"
 #include "ecology/results.h"
 #include "mud_transport/box_summation.h"
 #include "mud_transport/line_discharge.h"
 #include "mud_transport/result.h"
 #include "mud_transport_expanded/line_discharge.h"
+#include "mud_transport_expanded/mass_budget.h"
 #include "mud_transport_expanded/result.h"
 
 namespace gridbay {
@@ -56,6 +59,19 @@ std::vector<LineOrBoxList*> linesAndBoxes(CGlobalKvs& root) {
       return {root.nmtExpLineDischarge.get()};
     default:
       return {};
+  }
+}
+
+MassFileList* massFiles(CGlobalKvs& root) {
+  switch (root.moduleSelection->simulationType) {
+    case module::kAdvectionDispersion:
+      return root.nadMassBudget.get();
+    case module::kMudTransportExpanded:
+      return root.nmtExpMassBudget.get();
+    case module::kEcological:
+      return root.wqsMassBudget.get();
+    default:
+      return nullptr;
   }
 }
 

@@ -5,6 +5,7 @@
 
 #include "core/page_id.h"
 #include "families/line_box.h"
+#include "families/mass_budget.h"
 #include "families/transport_results.h"
 #include "map/map_scene.h"
 #include "setup/global_kvs.h"
@@ -24,6 +25,8 @@ struct ModuleOutputs {
 // With no page where no module, or one without outputs, is chosen.
 ModuleOutputs moduleOutputs(CGlobalKvs& root);
 std::vector<LineOrBoxList*> linesAndBoxes(CGlobalKvs& root);
+// The masses in polygons; null where the module that is chosen has none.
+MassFileList* massFiles(CGlobalKvs& root);
 // The list on a page; null where the module that is chosen has none there.
 LineOrBoxList* lineOrBoxList(CGlobalKvs& root, std::int32_t page);
 

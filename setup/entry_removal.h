@@ -22,5 +22,8 @@ void removeEntry(List& list, int number) {
 // The same for an open boundary, and for a source or sink, with what all modules say of it.
 void removeBoundary(CGlobalKvs& root, int number);
 void removeSource(CGlobalKvs& root, int number);
+// The same for an area, from 2, that encloses none. Those behind it take its number everywhere; what stood on
+// it stands on an area that is not there, as the check will say.
+void removeArea(CGlobalKvs& root, int number);
 
 }  // namespace gridbay

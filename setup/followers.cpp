@@ -18,6 +18,7 @@
 #include "advection_dispersion/starting_conditions.h"
 #include "basic/bathymetry.h"
 #include "basic/boundary.h"
+#include "basic/mass_budget.h"
 #include "basic/simulation_period.h"
 #include "basic/source_sink.h"
 #include "ecology/boundary.h"
@@ -67,6 +68,7 @@
 #include "mud_transport_expanded/erosion_coefficient.h"
 #include "mud_transport_expanded/erosion_layer.h"
 #include "mud_transport_expanded/initial_conditions.h"
+#include "mud_transport_expanded/line_discharge.h"
 #include "mud_transport_expanded/power_of_erosion.h"
 #include "mud_transport_expanded/result.h"
 #include "mud_transport_expanded/sand_fractions.h"
@@ -76,6 +78,7 @@
 #include "mud_transport_expanded/task_selection.h"
 #include "mud_transport_expanded/transition.h"
 #include "mud_transport_expanded/var_friction_coef.h"
+#include "setup/area_lists.h"
 #include "setup/entry_removal.h"
 #include "setup/global_kvs.h"
 
@@ -141,52 +144,81 @@ const CKvsBase& leader(const G& root) {
   return *(root.*member);
 }
 
-constexpr std::array kOfAreas{
-    resize<&G::nhdEddyViscosity>,
-    resize<&G::nhdWaveRadiation>,
-    resize<&G::nhdSurfaceElevation>,
-    resize<&G::nhdResistance>,
-    resize<&G::nhdResult>,
-    resize<&G::nadStartingConditions>,
-    resizeAreas<&G::nadInitialConcentration>,
-    resizeAreas<&G::nadDepositionConcentration>,
-    resizeAreas<&G::nadDispersionCoef>,
-    resize<&G::nadResult>,
-    resize<&G::nmtStartingConditions>,
-    resizeAreas<&G::nmtInitialConcentration>,
-    resizeAreas<&G::nmtDispersionCoef>,
-    resizeAreas<&G::nmtSettlingAndDesposition>,
-    resizeAreas<&G::nmtMlSettlingAndDeposition>,
-    resizeAreas<&G::nmtErosionForEachLayerCritical>,
-    resizeAreas<&G::nmtErosionForEachLayerFactor>,
-    resizeAreas<&G::nmtErosionForEachLayerFactor1>,
-    resizeAreas<&G::nmtErosionForEachLayerFactor2>,
-    resizeAreas<&G::nmtErosionForEachLayerPower>,
-    resizeAreas<&G::nmtErosionForEachLayerDensity>,
-    resizeAreas<&G::nmtSliding>,
-    resizeAreas<&G::nmtTransitionBetweenLayers>,
-    resize<&G::nmtBedRoughness>,
-    resize<&G::nmtResult>,
-    resize<&G::nmtExpStartingConditions>,
-    resizeAreas<&G::nmtExpInitialConditions>,
-    resizeAreas<&G::nmtExpDispersionCoef>,
-    resizeAreas<&G::nmtExpDeposition>,
-    resizeAreas<&G::nmtExpSettlingPar>,
-    resizeAreas<&G::nmtExpErosionCoefficient>,
-    resizeAreas<&G::nmtExpCriticalShearStress>,
-    resizeAreas<&G::nmtExpBedDensity>,
-    resizeAreas<&G::nmtExpConstFrictionCoef>,
-    resize<&G::nmtExpVarFrictionCoef>,
-    resize<&G::nmtExpBedRoughness>,
-    resizeAreas<&G::nmtExpTransition>,
-    resize<&G::nmtExpResult>,
-    resize<&G::wqsStartingConditions>,
-    resizeAreas<&G::wqsInitialConditions>,
-    resizeAreas<&G::wqsAdDispersion>,
-    resizeAreas<&G::wqsAdDeposition>,
-    resizeAreas<&G::wqsConstants>,
-    resize<&G::wqsResults>,
+// Who follows the areas: it takes their count, and an area out of its middle.
+struct AreaFollower {
+  Follower resize;
+  void (*moveUp)(G& root, int area);
 };
+
+// The entries behind that of an area come forward by one, so that the last one can go.
+template <auto member>
+void moveAreasUp(G& root, int area) {
+  visitAreaLists(*(root.*member), [area](auto& list) {
+    if constexpr (requires { list.GetCount(); }) {
+      moveUp(list, area);
+    } else if (static_cast<std::size_t>(area) < list.size()) {
+      std::rotate(list.begin() + area - 1, list.begin() + area, list.end());
+    }
+  });
+}
+
+template <auto member>
+constexpr AreaFollower areaList{resize<member>, moveAreasUp<member>};
+// What has lists of areas inside.
+template <auto member>
+constexpr AreaFollower areaLists{resizeAreas<member>, moveAreasUp<member>};
+
+constexpr std::array kAreaFollowers{
+    areaList<&G::nhdEddyViscosity>,
+    areaList<&G::nhdWaveRadiation>,
+    areaList<&G::nhdSurfaceElevation>,
+    areaList<&G::nhdResistance>,
+    areaList<&G::nhdResult>,
+    areaList<&G::nadStartingConditions>,
+    areaLists<&G::nadInitialConcentration>,
+    areaLists<&G::nadDepositionConcentration>,
+    areaLists<&G::nadDispersionCoef>,
+    areaList<&G::nadResult>,
+    areaList<&G::nmtStartingConditions>,
+    areaLists<&G::nmtInitialConcentration>,
+    areaLists<&G::nmtDispersionCoef>,
+    areaLists<&G::nmtSettlingAndDesposition>,
+    areaLists<&G::nmtMlSettlingAndDeposition>,
+    areaLists<&G::nmtErosionForEachLayerCritical>,
+    areaLists<&G::nmtErosionForEachLayerFactor>,
+    areaLists<&G::nmtErosionForEachLayerFactor1>,
+    areaLists<&G::nmtErosionForEachLayerFactor2>,
+    areaLists<&G::nmtErosionForEachLayerPower>,
+    areaLists<&G::nmtErosionForEachLayerDensity>,
+    areaLists<&G::nmtSliding>,
+    areaLists<&G::nmtTransitionBetweenLayers>,
+    areaList<&G::nmtBedRoughness>,
+    areaList<&G::nmtResult>,
+    areaList<&G::nmtExpStartingConditions>,
+    areaLists<&G::nmtExpInitialConditions>,
+    areaLists<&G::nmtExpDispersionCoef>,
+    areaLists<&G::nmtExpDeposition>,
+    areaLists<&G::nmtExpSettlingPar>,
+    areaLists<&G::nmtExpErosionCoefficient>,
+    areaLists<&G::nmtExpCriticalShearStress>,
+    areaLists<&G::nmtExpBedDensity>,
+    areaLists<&G::nmtExpConstFrictionCoef>,
+    areaList<&G::nmtExpVarFrictionCoef>,
+    areaList<&G::nmtExpBedRoughness>,
+    areaLists<&G::nmtExpTransition>,
+    areaList<&G::nmtExpResult>,
+    areaList<&G::wqsStartingConditions>,
+    areaLists<&G::wqsInitialConditions>,
+    areaLists<&G::wqsAdDispersion>,
+    areaLists<&G::wqsAdDeposition>,
+    areaLists<&G::wqsConstants>,
+    areaList<&G::wqsResults>,
+};
+constexpr auto kOfAreas = [] {
+  std::array<Follower, kAreaFollowers.size()> all{};
+  std::ranges::transform(kAreaFollowers, all.begin(), &AreaFollower::resize);
+  return all;
+}();
 constexpr std::array kOfBoundaries{
     resize<&G::nhdBoundary>,    resize<&G::nadBoundary>,   resize<&G::nmtBoundary>,
     resize<&G::nmtExpBoundary>, resize<&G::wqsAdBoundary>,
@@ -296,6 +328,40 @@ void removeSource(CGlobalKvs& root, int number) {
   moveUp(*root.nmtExpSources, number);
   moveUp(*root.wqsAdSourceSink, number);
   removeEntry(*root.sourceSink, number);
+}
+
+void removeArea(CGlobalKvs& root, int number) {
+  const int last = root.bathymetry->GetCount();
+  for (const AreaFollower& follower : kAreaFollowers) follower.moveUp(root, number);
+  moveUp(*root.bathymetry, number);
+  root.bathymetry->SetNoAreas(last - 1);
+
+  const auto renumber = [number, last](std::int32_t& area) {
+    if (area == number) {
+      area = last;
+    } else if (area > number) {
+      --area;
+    }
+  };
+  const auto each = [](auto& entries, const auto& change) {
+    for (int entry = 1; entry <= entries.GetCount(); ++entry) change(entries.at(entry));
+  };
+  each(*root.bathymetry, [&](CBathymetryObjectKvs& area) { renumber(area.enclosingArea); });
+  each(*root.sourceSink, [&](CSourceSinkObjectKvs& source) {
+    renumber(source.sourceArea);
+    renumber(source.sinkArea);
+  });
+  each(*root.massBudget, [&](CMassBudgetItemKvs& polygon) { renumber(polygon.associatedArea); });
+  const auto written = [&](auto& entry) { renumber(entry.areaNumber); };
+  each(root.nadResult->outputs, written);
+  each(root.nmtResult->outputs, written);
+  each(root.nmtExpResult->outputs, written);
+  each(root.wqsResults->outputs, written);
+  each(*root.nadLineDischarge, written);
+  each(*root.nadBoxSummation, written);
+  each(*root.nmtLineDischarge, written);
+  each(*root.nmtBoxSummation, written);
+  each(*root.nmtExpLineDischarge, written);
 }
 
 void CGlobalKvs::TellFollowers(const CKvsBase& leader, std::span<const int> counts) {

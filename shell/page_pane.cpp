@@ -109,6 +109,7 @@ void PagePane::showForm(const QString& caption, Form& form, std::span<const Fiel
   QWidget* page = startPage(caption);
   form_ = &form;
   picks_ = picks;
+  lastFields_ = picks.empty() ? nullptr : picks.data();
   auto* body = new QWidget(page);
   auto* bodyLayout = new FieldLayout(body);
   bodyLayout->setContentsMargins(0, 0, 0, 0);

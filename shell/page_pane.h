@@ -107,7 +107,7 @@ class PagePane final : public QScrollArea {
   std::span<const FieldPick> picks_;
   std::vector<Part> parts_;
   QPointer<GridView> lastGrid_;
-  const FieldPick* lastFields_ = nullptr;  // where fields were at work after the table
+  const FieldPick* lastFields_ = nullptr;  // where fields are at work and no table
   Accelerators keys_;
   bool refreshing_ = false;
   bool readOnly_ = false;

@@ -5,6 +5,7 @@
 #include "platform/units/units.h"
 #include "structures/culvert.h"
 #include "structures/page_texts.h"
+#include "structures/structure_choices.h"
 #include "structures/structures_parts.h"
 
 namespace gridbay {
@@ -36,8 +37,7 @@ void CCulvertDataGrid::LayOut() {
   };
   const auto isCircular = isOf(Culvert::kCircular);
   const auto isRectangular = isOf(Culvert::kRectangular);
-  List("Geometry Type", 140, culvert, &Culvert::geometryType,
-       Choices::lines("Rectangular\r\nCircular\r\nIrregular, level-width"));
+  List("Geometry Type", 140, culvert, &Culvert::geometryType, culvertGeometries());
   LevelWidthColumn(culvert).EnabledIf(isOf(Culvert::kIrregular)).header = "Geometry";
   List("Section Type", 80, culvert, &Culvert::sectionType, Choices::lines("Closed\r\nOpen"))
       .EnabledIf([isCircular](GridRow row) { return !isCircular(row); });

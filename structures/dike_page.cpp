@@ -3,6 +3,7 @@
 #include "platform/files/paths.h"
 #include "platform/units/units.h"
 #include "structures/page_texts.h"
+#include "structures/structure_choices.h"
 #include "structures/structures_parts.h"
 #include "structures/xyz_import.h"
 
@@ -36,7 +37,7 @@ void CDikeGrid::LayOut() {
         // The one that is shown keeps its fraction.
         if (crest != dike(row)->crest()) dike(row)->crestLevelSpecification = crest;
       },
-      Choices::lines("Constant\r\nIn space\r\nIn space and time", Dike::kConstant));
+      crestVariations());
   Number("Crest level", 120, dike, &Dike::crestLevel, item::kCrestLevel);
 }
 

@@ -3,6 +3,7 @@
 #include "platform/units/units.h"
 #include "structures/level_width_dialog.h"
 #include "structures/point_import_dialog.h"
+#include "structures/structure_choices.h"
 
 namespace gridbay {
 
@@ -44,8 +45,7 @@ void LineStructureGrid::PlaceColumns(const Structure& structure) {
 }
 
 void LineStructureGrid::ValveColumn(const Structure& structure) {
-  List("Valve", 120, structure, &LineStructure::valve,
-       Choices::lines("None\r\nOnly negative flow\r\nOnly positive flow\r\nNo flow"));
+  List("Valve", 120, structure, &LineStructure::valve, valves());
 }
 
 void LineStructureGrid::AlphaZeroColumn(const Structure& structure) {

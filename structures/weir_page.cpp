@@ -4,6 +4,7 @@
 
 #include "platform/units/units.h"
 #include "structures/page_texts.h"
+#include "structures/structure_choices.h"
 #include "structures/structures_parts.h"
 #include "structures/weir.h"
 
@@ -17,19 +18,12 @@ static_assert(kLosses.size() == std::tuple_size_v<decltype(Weir::headLoss)>);
 
 constexpr int kNoQuantity = 0;
 
-// In the order of the grid.
-Choices types() {
-  return Choices::lines("Broad crested weir\r\nWeir formula 1\r\nWeir formula 2 (Honma)",
-                        {Weir::kBroadCrested, Weir::kFormula1, Weir::kFormula2})
-      .Otherwise(0);
-}
-
 }  // namespace
 
 void CWeirGrid::LayOut() {
   const auto weir = RowsOf(&StructureParts::nhdWeir);
   PlaceColumns(weir);
-  List("Type", 130, weir, &Weir::type, types());
+  List("Type", 130, weir, &Weir::type, weirTypes());
   ValveColumn(weir);
   AlphaZeroColumn(weir);
   HeadLossColumns(texts::weirHeadLosses.format, kLosses,
@@ -47,7 +41,7 @@ void CWeirDataGrid::LayOut() {
   };
   // The first column of a group has the type that it is for above it.
   const auto group = [](Column& column, Weir::Type type, int columns) {
-    column.HeaderSpan(columns).header = types().textOf(type);
+    column.HeaderSpan(columns).header = weirTypes().textOf(type);
   };
   const auto broad = isOf(Weir::kBroadCrested);
   group(number("Datum", &Weir::datum, item::kLevel).EnabledIf(broad), Weir::kBroadCrested, 2);

@@ -16,8 +16,8 @@
 #include "shell/import/file_drop.h"
 #include "shell/import/terrain_plan.h"
 #include "shell/import/work_host.h"
-#include "shell/work_results.h"
 #include "shell/shades.h"
+#include "shell/work_results.h"
 
 namespace gridbay::shell {
 namespace {

@@ -622,6 +622,19 @@ TEST_F(RunEngine, IsEndedWhenTheToolIsToldToStop) {
   EXPECT_NE(::kill(std::stoi(started), 0), 0);
 }
 
+TEST_F(Tool, AFixShowsTheNameThatStandsOnFile) {
+  makeSetup();
+  ASSERT_EQ(runTool({"set", setup, "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD/Time_Step_Interval=3"}).status, 0);
+  const std::string grid = folder.file("grid.tsb2");
+  std::string text = textOf(setup);
+  const std::size_t name = text.find("\"grid.tsb2\"");
+  ASSERT_NE(name, text.npos);
+  folder.write(fs::path(setup).filename().string(), text.replace(name + 1, 9, grid));
+  const ProgramRun run = runTool({"fix", setup, "1"});
+  EXPECT_EQ(run.status, 0) << run.err;
+  EXPECT_THAT(run.out, HasSubstr(": " + grid + " -> grid.tsb2\n"));
+}
+
 TEST_F(Tool, AdviceIsTakenByItsNumber) {
   makeSetup();
   ASSERT_EQ(runTool({"set", setup, "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD/Time_Step_Interval=3"}).status, 0);
@@ -649,6 +662,10 @@ TEST_F(Tool, AdviceIsTakenByItsNumber) {
 
   EXPECT_EQ(runTool({"fix", setup, "0"}).status, 2);
   EXPECT_EQ(runTool({"fix", setup, "2"}).status, 2);
+  EXPECT_EQ(runTool({"fix", setup, "-1"}).err,
+            "There is no advice -1: there is 1. \"" +
+                std::string(theEdition.wetlandSweepKit ? "v27setup-wsk" : "v27setup") +
+                " validate --advice '" + setup + "'\" lists them\n");
   run = runTool({"fix", setup, "1"});
   EXPECT_EQ(run.status, 0) << run.err;
   EXPECT_EQ(run.out, "Flooding depth\n  " + depth + ": 0.5 -> 0.04\n");

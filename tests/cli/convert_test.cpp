@@ -202,7 +202,7 @@ TEST_F(ConvertRaster, ToAnotherSpacingAndProjection) {
   EXPECT_THAT(refused({degrees, out, "--land", "1", "--reproject", "EPSG:4258"}), HasSubstr("is in degrees"));
   EXPECT_THAT(refused({plain, out, "--land", "1", "--reproject", "nonsense"}), HasSubstr("\"nonsense\""));
   EXPECT_THAT(refused({plain, out, "--land", "1", "--reproject", "UTM-32"}),
-              HasSubstr("in which projection"));
+              HasSubstr("does not say in which projection it is: say so with --crs CRS"));
   EXPECT_THAT(refused({plain, out, "--land", "1", "--resample", "1e-5"}), HasSubstr("points 1e-05 apart"));
   EXPECT_THAT(refused({plain, out, "--land", "1", "--resample", "0"}), HasSubstr("--resample"));
   EXPECT_THAT(refused({plain, out, "--land", "1", "--resampling", "best"}), HasSubstr("--resampling"));
@@ -211,6 +211,42 @@ TEST_F(ConvertRaster, ToAnotherSpacingAndProjection) {
               HasSubstr("--extent cannot be 1,2,0,4: it is the least easting"));
   EXPECT_THAT(refused({plain, out, "--land", "1", "--gridding", "linear"}),
               HasSubstr("line 2: \"nrows\" is no number for x"));
+}
+
+TEST_F(ConvertRaster, WhatWasMeantIsTold) {
+  const std::string raster = folder.write("r.asc", kRaster);
+  for (const auto& [option, value, why] : std::vector<std::array<std::string, 3>>{
+           {"--resample", "0", "--resample: 0 is not above 0"},
+           {"--resample", "-3", "--resample: -3 is not above 0"},
+           {"--resample", "nan", "is no finite number"},
+           {"--band", "0", "--band: 0 is below 1"},
+           {"--subdataset", "-1", "--subdataset: -1 is below 1"},
+           {"--crs", "utm-56s", "known are EPSG:32756 (WGS 84 / UTM zone 56S)"},
+           {"--crs", "UTM56S", "EPSG:32756 (WGS 84 / UTM zone 56S)"},
+           {"--reproject", "28355", "EPSG:28355 (GDA94 / MGA zone 55)"},
+           {"--resample", "1000",
+            "Of the raster's 1 x 1 points the grid would have 1 x 1, and it wants 2 x 2"},
+           {"--coarsen", "3", "Of the raster's 4 x 3 points the grid would have 2 x 1"}})
+    EXPECT_THAT(refused({raster, out, "--land", "1", option, value}), HasSubstr(why)) << value;
+  EXPECT_THAT(refused({folder.write("pairs.txt", "1 2\n3 4\n"), out, "--land", "1"}),
+              HasSubstr("has x, y and z on each line; --gridding HOW takes it for one"));
+  EXPECT_THAT(refused({folder.write("one.xyz", "1 2 3\n"), out, "--land", "1", "--resample", "1"}),
+              HasSubstr("holds 1 point; a grid needs at least 3"));
+}
+
+TEST_F(ConvertRaster, ANorthernZoneForTheSouthIsTold) {
+  std::string south(kRaster);
+  south.replace(south.find("yllcorner 200"), 13, "yllcorner 6300000");
+  south.replace(south.find("xllcorner 100"), 13, "xllcorner 500000");
+  const auto converted = [&](const std::string& projection) {
+    return runTool({"convert", "raster", folder.write("r.asc", south), out, "--land", "60", "--crs",
+                    "UTM-56S", "--reproject", projection, "--force"});
+  };
+  const ProgramRun north = converted("UTM-56");
+  EXPECT_EQ(north.status, 0) << north.err;
+  EXPECT_THAT(north.err, HasSubstr("lies south of the equator, from northing -37"));
+  EXPECT_THAT(north.err, HasSubstr("its southern zone is \"WGS 84 / UTM zone 56S\", EPSG:32756"));
+  EXPECT_THAT(converted("UTM-56S").err, Not(HasSubstr("equator")));
 }
 
 TEST_F(ConvertRaster, PointsAndAnExtent) {
@@ -702,6 +738,13 @@ TEST_F(ConvertSeries, WithoutAStartTheTableTellsWhatItHolds) {
               HasSubstr("may be day/month/year or month/day/year: the first is meant"));
   EXPECT_THAT(runTool({"convert", "series", open, out, "--force", "--dates", "mdy"}).out,
               HasSubstr("from 2020-01-02 00:00:00 to 2020-02-02 00:00:00"));
+}
+
+TEST_F(ConvertSeries, TheOrderOfDatesIsOneOfThree) {
+  const ProgramRun run = runTool({"convert", "series", "a.csv", out, "--dates", "yes"});
+  EXPECT_EQ(run.status, 2);
+  EXPECT_THAT(run.err, HasSubstr("--dates: yes not in {dmy,mdy,ymd}"));
+  EXPECT_THAT(runTool({"convert", "series", "--help"}).out, Not(HasSubstr("ENUM")));
 }
 
 TEST_F(ConvertSeries, MissingValuesAreTold) {

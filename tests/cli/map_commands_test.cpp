@@ -98,7 +98,7 @@ TEST_F(AreaCommands, WhatCanNotBeDoneLeavesTheSetupAlone) {
       {{"move", setup, "2"}, "--at J,K"},
       {{"move", setup, "2", "--in", "2"}, "can't lie in area 2"},
       {{"move", setup, "2", "--snap"}, "do not both have coordinates"},
-      {{"remove", setup, "1"}, "before those behind it"},
+      {{"remove", setup, "1"}, "it encloses area 2"},
       {{"remove", setup, "9"}, "There is no area 9"},
       {{"remove", setup, "x"}, "x"}};
   for (auto [words, why] : cases) {
@@ -111,7 +111,9 @@ TEST_F(AreaCommands, WhatCanNotBeDoneLeavesTheSetupAlone) {
 }
 
 TEST_F(AreaCommands, AreasNeitherLieInACircleNorLoseTheirEnclosingArea) {
-  ASSERT_EQ(runTool({"area", "add", setup, folder.file("in.tsb2"), "--in", "2", "--at", "2,2"}).status, 0);
+  ASSERT_EQ(
+      runTool({"area", "add", setup, folder.file("in.tsb2"), "--in", "2", "--at", "2,2", "--force"}).status,
+      0);
   ProgramRun run = runTool({"area", "move", setup, "2", "--in", "3"});
   EXPECT_EQ(run.status, 2);
   EXPECT_THAT(run.err, HasSubstr("Area 2 can't lie in area 3, which lies in it"));
@@ -120,6 +122,57 @@ TEST_F(AreaCommands, AreasNeitherLieInACircleNorLoseTheirEnclosingArea) {
   run = runTool({"area", "remove", setup, "3"});
   EXPECT_EQ(run.status, 2);
   EXPECT_THAT(run.err, HasSubstr("it encloses area 2"));
+}
+
+TEST_F(AreaCommands, AGridThatCanNotNestIsRefusedWithWhatWould) {
+  const std::string before = test::textOf(setup);
+  const auto refused = [this](const test::GridSpec& spec, const std::string& at) {
+    test::writeGrid(folder.file("n.tsb2"), spec);
+    const ProgramRun run = runTool({"area", "add", setup, folder.file("n.tsb2"), "--at", at});
+    EXPECT_EQ(run.status, 2);
+    EXPECT_THAT(run.err, HasSubstr("The setup is unchanged; --force adds the area all the same"));
+    return run.err;
+  };
+  EXPECT_THAT(
+      refused({.noJ = 8, .noK = 7, .dx = 10, .dy = 10}, "10,8"),
+      AllOf(HasSubstr("Grid dimension incorrect (jextr)."),
+            HasSubstr("Area 3 has 8 x 7 points, 10 x 10 m apart: it goes from (10,8) to (12.3333,10) of "
+                      "area 1, whose last point is (19,15)."),
+            HasSubstr("What nests there is 10 x 10 m apart and lies from (1,1) to (18,14), with 1 + a "
+                      "multiple of 3 points along each edge: 4, 7, 10 and so on, at most 25 x 19 from "
+                      "(10,8)")));
+  EXPECT_THAT(refused({.noJ = 28, .noK = 7, .dx = 10, .dy = 10}, "10,8"),
+              AllOf(HasSubstr("Illegal position of area."), HasSubstr("to (19,10) of area 1")));
+  EXPECT_THAT(refused({.noJ = 7, .noK = 7, .dx = 15, .dy = 15}, "0,8"),
+              AllOf(HasSubstr("15 x 15 m apart"), HasSubstr("along each edge\n")));
+  // Beside an area that it overlaps it would nest.
+  EXPECT_THAT(refused({.noJ = 7, .noK = 7, .dx = 10, .dy = 10}, "6,5"),
+              AllOf(HasSubstr("verlap"), testing::Not(HasSubstr("What nests there"))));
+  EXPECT_EQ(test::textOf(setup), before);
+  const ProgramRun run = runTool({"area", "add", setup, folder.file("n.tsb2"), "--at", "6,5", "--force"});
+  EXPECT_EQ(run.status, 0);
+  EXPECT_THAT(run.err, HasSubstr("verlap"));
+  EXPECT_EQ(placeOf(setup, 3), "n.tsb2 in 1 from (6,5)");
+}
+
+TEST_F(AreaCommands, AnyAreaThatEnclosesNoneIsRemoved) {
+  ASSERT_EQ(runTool({"area", "add", setup, folder.file("in.tsb2"), "--at", "10,8"}).status, 0);
+  ProgramRun run = runTool({"area", "remove", setup, "2"});
+  EXPECT_EQ(run.status, 0) << run.err;
+  EXPECT_THAT(run.out,
+              HasSubstr("Area 2 is removed; its grid file is left\nThe areas behind it, up to 3, have "
+                        "numbers less by one now\n"));
+  EXPECT_EQ(placeOf(setup, 2), "in.tsb2 in 1 from (10,8)");
+  EXPECT_EQ(placeOf(setup, 3), "none");
+}
+
+TEST_F(AreaCommands, HotStartFilesNameAreasByTheirNumbers) {
+  ASSERT_EQ(runTool({"area", "add", setup, folder.file("in.tsb2"), "--at", "10,8"}).status, 0);
+  ASSERT_EQ(runTool({"set", setup, "NESTED_MODEL_GLOBALS/BATHYMETRY_SELECTION/Hot_Start=1"}).status, 0);
+  const ProgramRun run = runTool({"area", "remove", setup, "2"});
+  EXPECT_EQ(run.status, 2);
+  EXPECT_THAT(run.err, HasSubstr("whose hot start files name the areas that enclose them"));
+  EXPECT_EQ(runTool({"area", "remove", setup, "3"}).status, 0);
 }
 
 TEST_F(AreaCommands, RemovalTellsWhatStoodOnTheArea) {

@@ -488,7 +488,9 @@ TEST_F(CompareCommands, MergeWritesConflictsOnlyWhenToldHow) {
   EXPECT_EQ(report["out"], out);
   for (const fs::directory_entry& file : fs::directory_iterator(folder.path()))
     EXPECT_THAT(file.path().filename().string(), Not(HasSubstr("out")));
-  EXPECT_EQ(runTool({"merge", base, own, other, "-o", out, "--theirs"}).status, 1);
+  run = runTool({"merge", base, own, other, "-o", out, "--theirs"});
+  EXPECT_EQ(run.status, 1);
+  EXPECT_THAT(run.out, HasSubstr("1 change taken from B, 1 conflict,"));
   EXPECT_EQ(test::textOf(out), test::textOf(other));
   EXPECT_EQ(runTool({"merge", base, own, other, "-o", out, "--ours", "--force"}).status, 1);
   EXPECT_EQ(test::textOf(out), test::textOf(own));

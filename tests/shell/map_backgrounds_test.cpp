@@ -1,7 +1,6 @@
 // Rasters and vector files with the map.
 
 #include <QDirIterator>
-#include <QImageReader>
 #include <atomic>
 #include <thread>
 
@@ -357,7 +356,7 @@ float depth(y,x); depth:coordinates = "lon lat"; float code(y,x); data: lat = %3
     // A file that is whole again is read when it is shown anew.
     netcdf("large.nc", {"-ot", "Byte", "-outsize", "200", "200"});
     layer("large.nc")->setCheckState(Qt::Unchecked);
-    QVERIFY2(copiesLeft().isEmpty(), qPrintable(copiesLeft().join(' ')));
+    QTRY_VERIFY2(copiesLeft().isEmpty(), qPrintable(copiesLeft().join(' ')));
     layer("large.nc")->setCheckState(Qt::Checked);
     QTRY_VERIFY(background.picture->fault.isEmpty());
     settle();
@@ -373,6 +372,10 @@ float depth(y,x); depth:coordinates = "lon lat"; float code(y,x); data: lat = %3
     BackgroundCopies copies(nullptr);
     QSignalSpy made(&copies, &BackgroundCopies::made);
     QSignalSpy progressed(&copies, &BackgroundCopies::progressed);
+    qsizetype madeBefore = -1;  // the second one began
+    connect(&copies, &BackgroundCopies::progressed, this, [&](int id, double) {
+      if (id == 2 && madeBefore < 0) madeBefore = made.count();
+    });
     MapFrame frame = canvas().frame();
     const std::string projection = canvas().scene().projectionText;
     // Another file is read beside the first, and another raster of the first in place of it.
@@ -381,7 +384,7 @@ float depth(y,x); depth:coordinates = "lon lat"; float code(y,x); data: lat = %3
     copies.of({.id = 2, .path = small}, frame, projection);
     copies.of({.id = 1, .path = large, .raster = "Band1"}, frame, projection);
     QTRY_COMPARE_WITH_TIMEOUT(made.count(), 2, 30000);
-    QCOMPARE(made[0][0].toInt(), 2);
+    QCOMPARE(madeBefore, 0);
     QVERIFY(copies.isIdle());
     QCOMPARE(copiesLeft().size(), 2);
     // What is given up half made is gone.
@@ -399,7 +402,7 @@ float depth(y,x); depth:coordinates = "lon lat"; float code(y,x); data: lat = %3
     copies.of({.id = 4, .path = large}, frame, projection);
     QTRY_COMPARE_WITH_TIMEOUT(made.count(), 3, 30000);
     const QString copy = copies.of({.id = 4, .path = large}, frame, projection);
-    QCOMPARE(QImageReader(copy).size(), QSize(1, 1));
+    QVERIFY2(QFileInfo(copy).size() < 10000, qPrintable(QString::number(QFileInfo(copy).size())));
     copies.forgetAll();
     QCOMPARE(copiesLeft(), QStringList());
     qunsetenv("TMPDIR");

@@ -26,6 +26,7 @@ class MapTest : public DesktopFixture {
   static constexpr int kSources = 40;
   static constexpr int kOutputs = 38;
   static constexpr int kModules = 35;
+  static constexpr int kWeirs = 45;
   static constexpr int kMassBudgets = 34;
 
   MapCanvas& canvas() { return window_->map().canvas(); }
