@@ -6,6 +6,8 @@
 #include <QHBoxLayout>
 #include <QVBoxLayout>
 #include <algorithm>
+#include <cmath>
+#include <limits>
 #include <utility>
 
 #include "map/map_names.h"
@@ -19,6 +21,24 @@ constexpr double kFarthest = 1e5;  // metres above and below
 constexpr int kWhole = 100;        // percent
 constexpr int kLayerRole = Qt::UserRole;
 constexpr int kBackgroundRole = Qt::UserRole + 1;
+
+constexpr int kLeastDecimals = 2;
+constexpr int kMostDecimals = 6;
+
+// By which a thousandth of the range between two limits is told.
+int decimalsFor(double least, double greatest) {
+  const double range = greatest - least;
+  if (!(range > 0)) return kLeastDecimals;
+  return static_cast<int>(
+      std::clamp(std::ceil(3 - std::log10(range)), 1.0 * kLeastDecimals, 1.0 * kMostDecimals));
+}
+
+// Whether a value says no more with all decimals than with some.
+bool isToldBy(double value, int decimals) {
+  constexpr double kRest = 1e-3;  // of the last one of them
+  const double last = value * std::pow(10, decimals);
+  return std::abs(last - std::round(last)) < kRest;
+}
 
 // With a border that is seen on any ground.
 QIcon swatch(const QColor& colour, const QColor& border) {
@@ -71,11 +91,12 @@ LayerPanel::LayerPanel(MapCanvas& canvas, QWidget* parent)
   const auto makeLimit = [&](const QString& name) {
     auto* limit = new QDoubleSpinBox(this);
     limit->setRange(-kFarthest, kFarthest);
-    limit->setDecimals(2);
+    limit->setDecimals(kLeastDecimals);
     limit->setSuffix(" m");
     limit->setAccessibleName(name);
     limit->setEnabled(false);
     connect(limit, &QDoubleSpinBox::valueChanged, this, &LayerPanel::takeStyle);
+    connect(limit, &QDoubleSpinBox::editingFinished, this, &LayerPanel::fitDecimals);
     return limit;
   };
   least_ = makeLimit(tr("Least"));
@@ -252,9 +273,10 @@ void LayerPanel::giveStyle() {
   style.zeroLine = zeroLine_->isChecked();
   style.hillShade = hillShade_->isChecked();
   if (!automatic_->isChecked()) {
-    constexpr float kLeastRange = 0.01F;
+    constexpr float kLeastRange = 1e-4F;
     const auto least = static_cast<float>(least_->value());
-    const float greatest = std::max(static_cast<float>(greatest_->value()), least + kLeastRange);
+    const float next = std::nextafter(least, std::numeric_limits<float>::infinity());
+    const float greatest = std::max({static_cast<float>(greatest_->value()), least + kLeastRange, next});
     style.scale = TerrainScale{least, greatest, steepest_};
   }
   for (QDoubleSpinBox* limit : {least_, greatest_}) limit->setEnabled(!automatic_->isChecked());
@@ -264,9 +286,27 @@ void LayerPanel::giveStyle() {
 void LayerPanel::showScale() {
   if (!automatic_->isChecked() || !canvas_.scale()) return;
   const bool outer = std::exchange(isShowing_, true);
-  steepest_ = canvas_.scale()->steepest;
-  least_->setValue(canvas_.scale()->least);
-  greatest_->setValue(canvas_.scale()->greatest);
+  const TerrainScale& scale = *canvas_.scale();
+  steepest_ = scale.steepest;
+  showLimits(scale.least, scale.greatest, decimalsFor(scale.least, scale.greatest));
+  isShowing_ = outer;
+}
+
+void LayerPanel::showLimits(double least, double greatest, int decimals) {
+  for (QDoubleSpinBox* limit : {least_, greatest_}) limit->setDecimals(decimals);
+  least_->setValue(least);
+  greatest_->setValue(greatest);
+}
+
+// As many as the range asks for, and no fewer than what has been typed.
+void LayerPanel::fitDecimals() {
+  if (automatic_->isChecked()) return;
+  const bool outer = std::exchange(isShowing_, true);
+  const double least = least_->value();
+  const double greatest = greatest_->value();
+  int decimals = decimalsFor(least, greatest);
+  while (decimals < kMostDecimals && !(isToldBy(least, decimals) && isToldBy(greatest, decimals))) ++decimals;
+  showLimits(least, greatest, decimals);
   isShowing_ = outer;
 }
 
@@ -307,8 +347,8 @@ void LayerPanel::showSetup(const QString& path) {
   const QVariant isAutomatic = settings.own("automatic");
   automatic_->setChecked(!isAutomatic.isValid() || isAutomatic.toBool());
   if (!automatic_->isChecked()) {
-    least_->setValue(settings.own("least").toDouble());
-    greatest_->setValue(settings.own("greatest").toDouble());
+    showLimits(settings.own("least").toDouble(), settings.own("greatest").toDouble(), kMostDecimals);
+    fitDecimals();
     const QVariant steepest = settings.own("steepest");
     steepest_ = steepest.isValid() && steepest.toFloat() > 0 ? steepest.toFloat() : TerrainScale{}.steepest;
   }

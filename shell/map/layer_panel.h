@@ -47,6 +47,8 @@ class LayerPanel final : public QWidget {
   void takeStyle();
   void giveStyle();
   void showScale();
+  void showLimits(double least, double greatest, int decimals);
+  void fitDecimals();
   void showButtons();
   void askBackground();
   void askColour();

@@ -233,7 +233,8 @@ void MapCanvas::takePicture(const TerrainPicture& picture) {
 }
 
 bool MapCanvas::isSettled() const {
-  if (!backgrounds_->isSettled()) return false;
+  const bool movesAlong = standStill_.isActive() && !placed_.isNull() && placedFrame_ != frame_;
+  if (!backgrounds_->isSettled() || movesAlong) return false;
   if (terrain_.empty() || !drawing_.layers.test(placeOf(MapLayer::terrain))) return true;
   const double ratio = devicePixelRatio();
   return fine_ && fine_->version == version_ && worker_->isIdle() && fine_->frame.centre == frame_.centre &&

@@ -370,29 +370,51 @@ void MapDrawing::addLabel(const MapFrame& frame, const MapFeature& feature, cons
     }
   }
   const bool isWide = line.boundingRect().width() + line.boundingRect().height() > kLabelled;
-  if (feature.label.empty() || !(isWide || isLit || line.size() == 1)) return;
+  const bool isKept = feature.id.kind == MapKind::boundary;
+  if (feature.label.empty() || !(isWide || isLit || isKept || line.size() == 1)) return;
   QPointF place = line.size() == 2 ? (line.front() + line.back()) / 2 : line[line.size() / 2];
   if (isOfPoints) place = line.front();
   if (feature.closed) place = line.boundingRect().center();
-  labels.all.push_back({place, QString::fromStdString(feature.label), colour, isOfPoints, isLit});
+  labels.all.push_back({place, QString::fromStdString(feature.label), colour, isOfPoints, isLit, isKept});
 }
 
-// The one that is lit up first. What has no room but on another one is left out, until one looks closer.
-void MapDrawing::paintLabels(QPainter& painter, const MapFrame& frame, Labels& labels) {
+// Where a label may stand, from its place on, the nearest first; one that is kept also further away.
+std::vector<QPointF> MapDrawing::shiftsOf(const Label& label, QSizeF size) {
   constexpr double kApart = 10;
+  constexpr int kFarthest = 12;  // sizes of the label
+  const QPointF aside(size.width() / 2 + kApart, 0);
+  const QPointF above(0, -(label.isBeside ? 2 : 1) * size.height());
+  std::vector<QPointF> shifts{QPointF(), above, -above, aside, -aside};
+  if (label.isBeside) shifts = {aside, -aside, above, -above, aside + above};
+  for (int ring = 1; label.isKept && ring <= kFarthest; ++ring) {
+    for (const auto& [across, up] :
+         {std::pair{1, 0}, {-1, 0}, {0, 1}, {0, -1}, {1, 1}, {-1, -1}, {1, -1}, {-1, 1}})
+      shifts.emplace_back(ring * across * size.width(), ring * up * size.height());
+  }
+  return shifts;
+}
+
+// The one that is lit up first, then those that are kept. What else has no room but on another one is left
+// out, until one looks closer.
+void MapDrawing::paintLabels(QPainter& painter, const MapFrame& frame, Labels& labels) {
   const QRectF all({0, 0}, frame.size);
-  std::ranges::stable_partition(labels.all, [](const Label& label) { return label.isLit; });
+  std::ranges::stable_sort(labels.all, {}, [](const Label& label) {
+    return label.isLit ? 0 : label.isKept ? 1 : 2;
+  });
   for (const Label& label : labels.all) {
     const QRectF box = boxOfBadge(painter, label.place, label.text);
     if (!box.intersects(all)) continue;
-    const QPointF aside(box.width() / 2 + kApart, 0);
-    const QPointF above(0, -(label.isBeside ? 2 : 1) * box.height());
-    std::array<QPointF, 5> shifts{QPointF(), above, -above, aside, -aside};
-    if (label.isBeside) shifts = {aside, -aside, above, -above, aside + above};
-    const auto free = std::ranges::find_if(
-        shifts, [&](QPointF shift) { return labels.room.isFree(box.translated(shift)); });
-    if (free == shifts.end() && !label.isLit) continue;
+    const std::vector<QPointF> shifts = shiftsOf(label, box.size());
+    const auto free = std::ranges::find_if(shifts, [&](QPointF shift) {
+      const QRectF there = box.translated(shift);
+      return (!label.isKept || all.contains(there)) && labels.room.isFree(there);
+    });
+    if (free == shifts.end() && !label.isLit && !label.isKept) continue;
     const QPointF shift = free == shifts.end() ? shifts.front() : *free;
+    if (std::hypot(shift.x(), shift.y()) > box.width() + box.height()) {
+      painter.setPen(QPen(label.colour, 1));
+      painter.drawLine(label.place, label.place + shift);
+    }
     paintBadge(painter, label.place + shift, label.text, label.colour);
     labels.room.take(box.translated(shift));
   }

@@ -71,6 +71,7 @@ class MapDrawing {
     QColor colour;
     bool isBeside = false;  // the mark at the place stays free
     bool isLit = false;
+    bool isKept = false;  // it has its place, however small its feature is
   };
   // What of a picture is taken, by the squares that it reaches into.
   class Room {
@@ -96,6 +97,7 @@ class MapDrawing {
                   const QColor& colour) const;
   void addLabel(const MapFrame& frame, const MapFeature& feature, const QPolygonF& line, const QColor& colour,
                 Labels& labels) const;
+  static std::vector<QPointF> shiftsOf(const Label& label, QSizeF size);
   static void paintLabels(QPainter& painter, const MapFrame& frame, Labels& labels);
   static void paintScale(QPainter& painter, const QRectF& bar, TerrainColours colours,
                          const TerrainScale& scale);
