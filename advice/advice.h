@@ -69,7 +69,7 @@ struct Advice {
   std::string reason;     // why that matters
   PagePlace place;
   AdviceSite site = {};
-  AdviceFix fix;
+  AdviceFix fix = {};
 
   bool operator==(const Advice&) const = default;
 };

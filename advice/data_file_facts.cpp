@@ -114,6 +114,7 @@ void DataFileFacts::Entry::startGrid() {
   }
   grid->lowest = INFINITY;
   grid->highest = -INFINITY;
+  grid->highestOfOthers = -INFINITY;
 }
 
 void DataFileFacts::Entry::readRows() {
@@ -141,6 +142,12 @@ void DataFileFacts::Entry::readRows() {
       lowest[block] = std::min(lowest[block], line[j]);
       grid->lowest = std::min(grid->lowest, line[j]);
       grid->highest = std::max(grid->highest, line[j]);
+      if (line[j] == grid->landValue) {
+        ++grid->pointsAtLand;
+      } else {
+        grid->highestOfOthers = std::max(grid->highestOfOthers, line[j]);
+        if (line[j] > 0) ++grid->pointsAboveSea;
+      }
     }
     grid->west.push_back(line.front());
     grid->east.push_back(line.back());
@@ -167,8 +174,11 @@ void DataFileFacts::Entry::readSteps() {
   SeriesFacts::Item& facts = series->items[number];
   for (std::size_t i = 0; i < values.size(); ++i) {
     if (i % points == 0) course.push_back(values[i]);
-    if (isMissing(values[i], definition.items[number]) && facts.missing++ == 0)
+    if (!isMissing(values[i], definition.items[number])) {
+      facts.highest = std::max(facts.highest, values[i]);
+    } else if (facts.missing++ == 0) {
       facts.firstMissing = first + i / points;
+    }
   }
   if (first + steps == definition.time.count) finishItem(number);
   next += steps;

@@ -2,6 +2,7 @@
 
 #include <array>
 #include <chrono>
+#include <cmath>
 #include <cstddef>
 #include <cstdint>
 #include <map>
@@ -29,6 +30,10 @@ struct GridFacts {
   float landValue = 0;  // below 0 where the file has none
   float lowest = 0;
   float highest = 0;
+  // Points that lie at the land value itself, as those do whose values were missing, and others.
+  std::size_t pointsAtLand = 0;
+  std::size_t pointsAboveSea = 0;
+  float highestOfOthers = 0;
   // The border, by rising J or K.
   std::vector<float> west, east, south, north;
   // The lowest and the highest value of each square block of points, which is a single point unless the grid
@@ -52,6 +57,7 @@ struct SeriesFacts {
   struct Item {
     std::size_t missing = 0;
     std::size_t firstMissing = 0;  // its time step
+    float highest = -INFINITY;
     // Of a profile that of its first point. Gaps lie on the line between their neighbours.
     std::optional<SeriesJump> jump = {};
     std::size_t jumping = 0;  // values that are others without jumps

@@ -183,10 +183,18 @@ Outcome makeFile(const PlacedGrid& making, const std::string& from, const std::s
 
 Outcome makeFile(const LandValueGrid& making, const std::string& from, const std::string& to,
                  const FileProgress& progress) {
+  const Result<float> old = landIn(from);
+  if (!old) return Failure{old.error()};
+  const auto change = [&](const TsbDefinition&, const auto& rows) -> Outcome {
+    if (rows.item != making.item || !(*old < making.landValue)) return {};
+    for (auto& value : rows.values) {
+      if (static_cast<float>(value) == *old) value = making.landValue;
+    }
+    return {};
+  };
   return copyGrid(
       from, to, progress, fmt::format("land value set to {:g}", making.landValue),
-      [&](TsbDefinition& file) { setLandValue(file, making.landValue); },
-      [](const TsbDefinition&, const auto&) { return Outcome(); });
+      [&](TsbDefinition& file) { setLandValue(file, making.landValue); }, change);
 }
 
 Outcome makeFile(const TurnedGrid& making, const std::string& from, const std::string& to,

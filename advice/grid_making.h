@@ -51,9 +51,11 @@ struct ResampledGrid {
   bool operator==(const ResampledGrid&) const = default;
 };
 
-// The same grid with another land value (metres).
+// The same grid with another land value (metres). What lies at a lower one of old, as points with no value
+// do, stays land.
 struct LandValueGrid {
   float landValue = 0;
+  std::size_t item = 1;  // of the elevations
 
   bool operator==(const LandValueGrid&) const = default;
 };

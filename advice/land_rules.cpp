@@ -50,17 +50,19 @@ float highestWater(AdviceContext& context) {
 
 // Depths that count downwards where all lies above the water, else the land value above the water, and at
 // most that of the highest point; of inland flooding above all, as all may be flooded.
-AdviceFix landFix(AdviceContext& context, int number, const GridFacts& grid, float water, bool isInland) {
+AdviceFix landFix(AdviceContext& context, int number, const GridFacts& grid, float highest, float water,
+                  bool isInland) {
   AdviceFix fix;
   if (!isInland && grid.lowest > water) {
     fix.name = fmt::format("Turn the depths of area {} to elevations, in {}", number,
                            addAreaFile(context, fix, number, "turned", TurnedGrid{context.elevationItem()}));
     return fix;
   }
-  float land = std::ceil(isInland ? grid.highest : water) + 1;
-  if (!isInland && grid.highest > water) land = std::min(land, grid.highest);
-  fix.name = fmt::format("Land value of {:.6g} m for area {}, in {}", land, number,
-                         addAreaFile(context, fix, number, "land", LandValueGrid{land}));
+  float land = std::ceil(isInland ? highest : water) + 1;
+  if (!isInland && highest > water) land = std::min(land, highest);
+  fix.name =
+      fmt::format("Land value of {:.6g} m for area {}, in {}", land, number,
+                  addAreaFile(context, fix, number, "land", LandValueGrid{land, context.elevationItem()}));
   return fix;
 }
 
@@ -71,12 +73,16 @@ void adviseLandValues(AdviceContext& context) {
   for (int number = 1; number <= context.model.bathymetry->GetCount(); ++number) {
     const GridFacts* grid = context.grid(number);
     if (grid == nullptr || grid->landValue < 0 || !std::isfinite(grid->lowest)) continue;
+    // A few points at the land value are gaps that a conversion has closed; many are the land itself.
+    constexpr std::size_t kFew = 100;  // times as many others lie above the sea
+    const bool areGaps = grid->pointsAtLand * kFew < grid->pointsAboveSea;
+    const float highest = areGaps ? grid->highestOfOthers : grid->highest;
     const bool isAllLand = grid->lowest >= grid->landValue;
     // Of an area that is all sea, or is to be flooded whole, it is meant that none of it is land.
-    const bool hasNoLand = number == 1 && !isInland && grid->highest > 0 && grid->highest < grid->landValue;
+    const bool hasNoLand = number == 1 && !isInland && highest > 0 && highest < grid->landValue;
     if (!isAllLand && !hasNoLand) continue;
     const float water = highestWater(context);
-    if (!isAllLand && grid->highest <= water) continue;
+    if (!isAllLand && highest <= water) continue;
     context.add(
         {{},
          isAllLand
@@ -84,12 +90,12 @@ void adviseLandValues(AdviceContext& context) {
                            number, grid->landValue)
              : fmt::format("The highest point of area 1 lies at {:.6g} m, below its land value of {:.6g} "
                            "m: none of it is land.",
-                           grid->highest, grid->landValue),
+                           highest, grid->landValue),
          isAllLand ? "There is nothing to calculate in it."
                    : "All of its border is open, the high ground too.",
          placeOfAreaFile(context, number),
          {},
-         landFix(context, number, *grid, water, isInland)});
+         landFix(context, number, *grid, highest, water, isInland)});
   }
 }
 

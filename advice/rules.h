@@ -135,6 +135,9 @@ void adviseSources(AdviceContext& context);
 void adviseStructures(AdviceContext& context);
 // Of what is read and written.
 void adviseSeries(AdviceContext& context);
+// The seconds from the start of the run until the first of its series ends; infinite where none is known to
+// end after the start.
+double secondsOfSeries(AdviceContext& context);
 void adviseFileNames(AdviceContext& context);
 void adviseOutputSize(AdviceContext& context);
 

@@ -186,12 +186,28 @@ Setting warmUpWithin(int steps) {
   return {fmt::format("{}/Warm_Up_Period", kPeriod), std::to_string(steps / kPart)};
 }
 
+// The last time step that anything of the setup goes to; 0 where nothing says so.
+int lastStepWritten(AdviceContext& context) {
+  const KvsFile* file = context.written();
+  if (file == nullptr) return 0;
+  long long last = 0;
+  eachKeyword(*file, [&](const PagePlace&, const Node& keyword) {
+    if (sameName("Warm_Up_Period", keyword.name())) return;
+    for (int i = 0; i < runStepsIn(keyword); ++i)
+      last = std::max(last, wholeOf(keyword.values()[static_cast<std::size_t>(i)]));
+  });
+  constexpr long long kMost = std::numeric_limits<std::int32_t>::max() - 1;
+  return static_cast<int>(std::min(last, kMost));
+}
+
 void adviseNumbersOfSteps(AdviceContext& context) {
   const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
   if (!isStep(period.timeStepInterval)) {
     constexpr double kUsual = 30;
-    const std::string usual =
-        fmt::format("{:.6g}", kUsual / stableDivisor(kUsual, worstCourant(context, kUsual)));
+    const double stable = kUsual / stableDivisor(kUsual, worstCourant(context, kUsual));
+    // In hundredths, and no longer than lets the run end with its series.
+    const double covered = std::floor(secondsOfSeries(context) / period.LastTimeStep() * 100) / 100;
+    const std::string usual = fmt::format("{:.6g}", covered > 0 ? std::min(stable, covered) : stable);
     context.add({{},
                  fmt::format("The time step is {:.6g} s.", period.timeStepInterval),
                  "No engine takes a step that is not above 0, or is longer than a day.",
@@ -202,9 +218,12 @@ void adviseNumbersOfSteps(AdviceContext& context) {
   }
   if (period.LastTimeStep() < 1) {
     constexpr int kUsual = 100;
-    AdviceFix fix{fmt::format("{} time steps", kUsual),
-                  {{fmt::format("{}/Number_Of_Timesteps", kPeriod), std::to_string(kUsual)}}};
-    if (period.warmUpPeriod > kUsual) fix.settings.push_back(warmUpWithin(kUsual));
+    const int written = lastStepWritten(context);
+    const int steps = written > 0 ? written : kUsual;
+    AdviceFix fix{
+        fmt::format("{} time steps{}", steps, written > 0 ? ", up to the last one that is written" : ""),
+        {{fmt::format("{}/Number_Of_Timesteps", kPeriod), std::to_string(steps)}}};
+    if (period.warmUpPeriod > steps) fix.settings.push_back(warmUpWithin(steps));
     context.add({{},
                  fmt::format("The simulation has {} time steps.", period.LastTimeStep()),
                  "The run ends where it begins, and calculates nothing.",

@@ -7,6 +7,7 @@
 #include <filesystem>
 #include <limits>
 #include <map>
+#include <memory>
 #include <set>
 #include <utility>
 
@@ -373,21 +374,26 @@ bool isSmooth(const PagePlace& place) {
          place.keyword.ends_with(fmt::format("/BOUNDARY_{}/File_Name", place.entries.front().number));
 }
 
-}  // namespace
+// The series that are known, and what they are of.
+struct UsedFiles {
+  ValidationList checked;
+  std::map<std::string, NamesOfFile> names;
+  std::vector<UsedSeries> all;
+};
 
 // Which files are in use, and for what, the checks know. They may change the model, which is to stay as it
 // is; that of the grids reads them whole, and has no series.
-void adviseSeries(AdviceContext& context) {
+std::unique_ptr<const UsedFiles> usedFiles(AdviceContext& context) {
   CGlobalKvs copy;
   copy.AssignState(context.model);
-  ValidationList checked;
+  auto used = std::make_unique<UsedFiles>();
+  auto& [checked, names, all] = *used;
   for (const CheckRow& row : checkingOrder()) {
     if (!holds(row.condition, copy)) continue;
     CKvsBase& object = row.object(copy);
     if (&object != copy.bathymetry.get()) object.Validate(checked, 1);
   }
-  std::map<std::string, NamesOfFile> names = namesOnFile(context);
-  std::vector<UsedSeries> all;
+  names = namesOnFile(context);
   for (const CheckedFile& file : checked.files) {
     if (!file.coversRun || file.path.empty()) continue;
     const SeriesFacts* facts = context.files.series(file.path);
@@ -400,7 +406,26 @@ void adviseSeries(AdviceContext& context) {
     const bool smooth = isSmooth(place) && momentAt(context, facts->file.time, 0).valid();
     all.push_back({std::move(place), file, *facts, itemsOf(file, *facts), smooth, keywords});
   }
-  for (const UsedSeries& used : all) adviseOne(context, used, all);
+  return used;
+}
+
+}  // namespace
+
+void adviseSeries(AdviceContext& context) {
+  const std::unique_ptr<const UsedFiles> files = usedFiles(context);
+  for (const UsedSeries& used : files->all) adviseOne(context, used, files->all);
+}
+
+double secondsOfSeries(AdviceContext& context) {
+  double shortest = INFINITY;
+  const DateTime& start = context.model.simulationPeriod->start;
+  const std::unique_ptr<const UsedFiles> files = usedFiles(context);
+  for (const UsedSeries& used : files->all) {
+    const std::optional<Span> span = spanOf(context, used.facts.file.time);
+    const double days = span ? span->last.linear() - start.linear() : 0;
+    if (days > 0) shortest = std::min(shortest, days * kDay);
+  }
+  return shortest;
 }
 
 }  // namespace gridbay

@@ -71,6 +71,8 @@ unsigned tellFaults(SetupFile& result, const Console& console) {
 int merge(const MergeOptions& options, const Console& console) {
   if (const Outcome may = mayWrite(options.out, options.force, {}, "--force"); !may)
     return console.fail(may.error());
+  const std::string names[] = {options.base, options.own, options.other, options.out};
+  if (const Outcome one = areOfOneEdition(names); !one) return console.fail(one.error());
   ConsoleMessageHost host(console);
   Result<SetupOnDisk> base = open(options.base, options, host);
   if (!base) return console.fail(base.error());

@@ -52,6 +52,8 @@ std::string packedFault(std::string fault) {
 
 std::string DocumentMerging::read(const std::string& base, const std::string& own,
                                   const std::string& other) const {
+  const std::string names[] = {own.empty() ? document_.path() : own, base, other};
+  if (const Outcome one = areOfOneEdition(names); !one) return packedFault(one.error());
   Result<SetupFile> baseSetup = SetupFile::open(base, nullptr);
   if (!baseSetup) return packedFault(baseSetup.error());
   Result<SetupFile> otherSetup = SetupFile::open(other, nullptr);

@@ -4,7 +4,6 @@
 
 #include <algorithm>
 #include <filesystem>
-#include <set>
 
 #include "compare/keyword_pages.h"
 #include "compare/page_difference.h"
@@ -48,16 +47,9 @@ KvsHandle plain(const KvsFile& file, const std::string& path) {
   return copy;
 }
 
-// The extension of a setup, which tells its edition.
-std::string kindOf(const std::string& path) {
-  return lowered(std::filesystem::path(path).extension().string());
-}
-
 void compareEditions(const std::string& own, const std::string& other, SetupDifference& found) {
-  const std::set<std::string> kinds{".v27", ".v27wsk"};
-  if (own == other || !kinds.contains(own) || !kinds.contains(other)) return;
-  found.differences.insert(found.differences.begin(),
-                           {.thing = "Edition", .own = own.substr(1), .other = other.substr(1)});
+  if (own == other || own.empty() || other.empty()) return;
+  found.differences.insert(found.differences.begin(), {.thing = "Edition", .own = own, .other = other});
 }
 
 // What a save would leave out, by what the files hold of it.
@@ -87,6 +79,11 @@ void compareUnknown(SetupFile* own, SetupFile& other, SetupDifference& found) {
 
 }  // namespace
 
+std::string editionNamed(const std::string& path) {
+  const std::string extension = lowered(std::filesystem::path(path).extension().string());
+  return extension == ".v27" || extension == ".v27wsk" ? extension.substr(1) : std::string();
+}
+
 SetupDifference compareFiles(const KvsFile& ownFile, const KvsFile& otherFile, const std::string& path,
                              const UnitChoices& units, const SetupDifference* before) {
   const KvsHandle plainOwn = plain(ownFile, path);
@@ -112,7 +109,7 @@ SetupDifference compareFiles(const KvsFile& ownFile, const KvsFile& otherFile, c
 void compareRest(SetupFile* own, SetupFile& other, const std::string& ownPath, const std::string& otherPath,
                  SetupDifference& found) {
   compareUnknown(own, other, found);
-  compareEditions(kindOf(ownPath), kindOf(otherPath), found);
+  compareEditions(editionNamed(ownPath), editionNamed(otherPath), found);
 }
 
 SetupDifference compareSetups(SetupOnDisk& own, SetupOnDisk& other) {

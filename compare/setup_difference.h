@@ -24,6 +24,9 @@ struct SetupDifference {
 SetupDifference compareFiles(const KvsFile& ownFile, const KvsFile& otherFile, const std::string& path,
                              const UnitChoices& units = {}, const SetupDifference* before = nullptr);
 
+// The edition that a setup's name tells, as "v27wsk"; empty for another name.
+std::string editionNamed(const std::string& path);
+
 // A setup on disk with the path that its file names start from.
 struct SetupOnDisk {
   SetupFile setup;

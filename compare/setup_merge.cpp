@@ -1,5 +1,7 @@
 #include "compare/setup_merge.h"
 
+#include <fmt/format.h>
+
 #include <map>
 
 namespace gridbay {
@@ -35,6 +37,19 @@ class PageWords {
 };
 
 }  // namespace
+
+Outcome areOfOneEdition(std::span<const std::string> paths) {
+  const std::string* first = nullptr;
+  for (const std::string& path : paths) {
+    const std::string edition = editionNamed(path);
+    if (edition.empty()) continue;
+    if (first == nullptr) first = &path;
+    if (editionNamed(*first) != edition)
+      return Failure{
+          fmt::format("\"{}\" and \"{}\" are setups of two editions, which can't be merged", *first, path)};
+  }
+  return {};
+}
 
 MergedTree mergeSetups(MergeSources& sources, const std::string& path, const MergeChoice& choose) {
   const KvsHandle base = sources.base.setup.tree(path);

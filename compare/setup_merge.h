@@ -1,11 +1,13 @@
 #pragma once
 
+#include <span>
 #include <string>
 #include <vector>
 
 #include "compare/setup_comparison.h"
 #include "compare/setup_difference.h"
 #include "compare/tree_merge.h"
+#include "platform/result.h"
 
 namespace gridbay {
 
@@ -15,6 +17,10 @@ struct MergeSources {
   SetupOnDisk own;
   SetupOnDisk other;
 };
+
+// Whether all of these setups are of one edition, by their names: what one of them lacks by its nature is no
+// edit of its user.
+Outcome areOfOneEdition(std::span<const std::string> paths);
 
 // The setup that the two make together, as the file at `path` will have it: file names lead from there to
 // where they led before. Sections that this version does not know are left out.

@@ -86,11 +86,12 @@ Result<Selection> select(const RasterConversion& options, const Raster& raster, 
   all.noJ = (all.noJ - 1) / all.every + 1;
   all.noK = (all.noK - 1) / all.every + 1;
   constexpr int kFewest = 2;
-  if (all.noJ < kFewest || all.noK < kFewest)
+  const bool isCoarser = options.resample || options.coarsen > 1;
+  if (isCoarser && (all.noJ < kFewest || all.noK < kFewest))
     return Failure{
-        fmt::format("Of the raster's {} x {} points the grid would have {} x {}, and it wants {} x {} at "
-                    "least: closer ones, or a larger part of the raster",
-                    raster.columns(), raster.rows(), all.noJ, all.noK, kFewest, kFewest)};
+        fmt::format("The grid would have {} x {} points, and wants {} x {} at least: closer ones, or a "
+                    "larger part of the raster",
+                    all.noJ, all.noK, kFewest, kFewest)};
   return all;
 }
 

@@ -218,10 +218,10 @@ Result<RasterSource> openRasterSource(const RasterConversion& options, Conversio
   if (!opened && !isTsbRaster(options.in)) {
     if (holdsPoints(options.in)) return fromPoints();
     if (holdsNumbers(options.in))
-      return Failure{
-          fmt::format("{}. It is no text of points either, which has x, y and z on each line; {} takes it "
-                      "for one and says where it differs",
-                      opened.error(), host.option("gridding", "HOW"))};
+      return Failure{fmt::format(
+          "\"{}\" is neither a raster nor a text of points, which has x, y and z on each line; {} "
+          "takes it for one and says where it differs",
+          options.in, host.option("gridding", "HOW"))};
   }
   if (opened && (!options.reproject.empty() || options.resample))
     opened = warpedRaster(options, **opened, host);

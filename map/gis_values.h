@@ -26,8 +26,7 @@ class GisSource {
   // Nothing for no name.
   VectorValue file(const FileNameValue& name) const { return file(name.absolute()); }
   VectorValue file(const std::string& absolute) const;
-  // Items by their numbers, and by their names in the file where that can
-  // be read: "1; 2".
+  // Items by their numbers, and by their names in the file where that can be read: "1; 2".
   VectorValue itemNumbers(std::span<const std::uint32_t> items) const;
   VectorValue itemNames(const FileNameValue& name, std::span<const std::uint32_t> items);
 

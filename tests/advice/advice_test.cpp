@@ -172,6 +172,17 @@ TEST_F(AdviceTest, TheRun) {
       {"engine", "The time step is 0 s.", "Time step of 15 s", [=] { step(0); }},
       {"engine", "The simulation has 0 time steps.", "100 time steps",
        [this] { model->simulationPeriod->noPointsInTime = 1; }},
+      {"engine", "The simulation has 0 time steps.", "240 time steps, up to the last one that is written",
+       [this] {
+         model->simulationPeriod->noPointsInTime = 1;
+         model->nhdResult->outputs.SetCount(1);
+         model->nhdResult->outputs.GetItem(1)->steps.last = 240;
+       }},
+      {"engine", "The time step is 0 s.", "Time step of 10 s",  // with which the run ends as the tide does
+       [=, this] {
+         writeTide(smooth(7), start());
+         step(0);
+       }},
       {"engine", "The code of the scheme is 4, which is none of 1, 5, -5, -1.", "Code of the scheme of 1",
        [this] { model->moduleSelection->adScheme = 4; }},
       {"engine", "The formulation of boundary 1 is 7, which is none of 1, 2.", "Formulation of 1",

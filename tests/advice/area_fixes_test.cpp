@@ -303,6 +303,37 @@ TEST_F(AreaFixes, AllThatNameAFileTakeItsCopy) {
   EXPECT_EQ(model->bathymetry->overlandFile.text(), "outer_land.tsb2");
 }
 
+// A conversion closes gaps with the land value, which is no terrain; a shore that is land throughout is.
+TEST_F(AreaFixes, AFewPointsAtTheLandValueAreGaps) {
+  const auto surface = [](int gaps) {
+    return [gaps](int j, int k) { return k < gaps && j == 20 ? 50.0F : j < 15 ? -5.0F : 3.0F; };
+  };
+  Area area{"outer.tsb2"};
+  area.land = 50;
+  write(area, surface(1));
+  std::vector<Advice> found = look();
+  ASSERT_EQ(found.size(), 1U);
+  EXPECT_THAT(found[0].doubt,
+              HasSubstr("The highest point of area 1 lies at 3 m, below its land value of 50 m"));
+  mend();
+  EXPECT_TRUE(look().empty());
+  write(area, surface(31));
+  EXPECT_TRUE(look().empty());
+}
+
+// What was land by lying at the land value stays land where that rises.
+TEST_F(AreaFixes, LandAtALandValueThatRisesStaysLand) {
+  model->boundary->SetNoBoundaries(0);
+  Area area{"outer.tsb2"};
+  area.land = 0;
+  write(area, [](int j, int) { return j == 0 ? 0.0F : 0.5F; });
+  model->moduleSelection->hydrodynamicFeatures = 0;
+  mend();
+  const Grid made = grid("outer_land.tsb2");
+  EXPECT_EQ(made.values[0], 2);
+  EXPECT_EQ(made.values[1], 0.5F);
+}
+
 TEST_F(AreaFixes, WhatIsNotToChangeStays) {
   TsbDefinition file = test::definitionOf({.noJ = 10, .noK = 12, .land = 6, .items = 2, .steps = 2});
   file.title = "A bay";

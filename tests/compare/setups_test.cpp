@@ -445,6 +445,19 @@ TEST_F(CompareCommands, DiffTellsAnotherEdition) {
   EXPECT_THAT(run.out, HasSubstr("Edition: v27 in A, v27wsk in B"));
 }
 
+TEST_F(CompareCommands, EditionsAreNotMerged) {
+  const std::string own = make("a.v27", "flood.v27");
+  const std::string other = folder.file("b.v27wsk");
+  fs::copy_file(own, other);
+  for (const auto& [base, b, out] : {std::tuple{own, other, "out.v27"}, std::tuple{other, own, "out.v27"},
+                                     std::tuple{own, own, "out.v27wsk"}}) {
+    const ProgramRun run = runTool({"merge", base, own, b, "-o", folder.file(out)});
+    EXPECT_EQ(run.status, 2);
+    EXPECT_THAT(run.err, HasSubstr("are setups of two editions"));
+    EXPECT_FALSE(fs::exists(folder.file(out)));
+  }
+}
+
 TEST_F(CompareCommands, MergeWritesWhatIsClean) {
   const std::string base = make("base.v27", "flood.v27");
   const std::string own = make("a.v27", "flood.v27", {kDrying + "=0.05"});
