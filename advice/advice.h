@@ -24,7 +24,7 @@ struct AdviceFile {
 // What a fix takes out of a list, by its number from 1: an entry, with what all modules say of it, or the
 // points of its line that lie where the one before them does.
 struct AdviceRemoval {
-  enum class List { boundary, source, weir, culvert, dike };
+  enum class List { boundary, source, weir, culvert, dike, output };
   enum class What { entry, equalPoints };
 
   List list;

@@ -9,6 +9,7 @@
 #include "advice/rules.h"
 #include "basic/boundary.h"
 #include "basic/boundary_overlap.h"
+#include "hydrodynamic/boundary.h"
 
 namespace gridbay {
 namespace {
@@ -26,6 +27,21 @@ AdviceFix movedBoundary(AdviceContext& context, int number, GridPoint first, Gri
   if (first != boundary.first)
     fix.settings.push_back({boundaryKeyword(number, "First_Point"), valueOf(first)});
   if (last != boundary.last) fix.settings.push_back({boundaryKeyword(number, "Last_Point"), valueOf(last)});
+  if (number > context.model.nhdBoundary->GetCount()) return fix;
+  const CNhdBoundaryObjectKvs& flow = *context.model.nhdBoundary->GetItem(number);
+  const bool isAlongJ = first.k == last.k;
+  if (flow.tiltType == 0 || flow.tiltType == 1) {
+    const int one = isAlongJ ? first.j : first.k;
+    const int other = isAlongJ ? last.j : last.k;
+    const int held = std::clamp(flow.tiltingPoint, std::min(one, other), std::max(one, other));
+    if (held != flow.tiltingPoint)
+      fix.settings.push_back(
+          {fmt::format("HYDRODYNAMIC_MODULE/OPEN_BOUNDARY/BOUNDARY_{}/Tilting_Point", number),
+           std::to_string(held)});
+  }
+  using Flow = CNhdBoundaryObjectKvs;
+  if (flow.dataFormat == Flow::kType1File || flow.dataFormat == Flow::kTransferFile)
+    fix.name += "; its file along the line is to be made again";
   return fix;
 }
 

@@ -188,6 +188,7 @@ void DataFileFacts::Entry::readSteps() {
 void DataFileFacts::Entry::finishItem(std::size_t number) {
   SeriesFacts::Item& facts = series->items[number];
   if (fillGaps(course, series->file.items[number], series->file.time)) {
+    if (const auto at = valueApart(course); at && series->file.axes.empty()) facts.apart = {*at, course[*at]};
     facts.jump = greatestJump(course);
     facts.jumping = takeOutJumps(course);
   }

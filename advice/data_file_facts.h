@@ -61,6 +61,8 @@ struct SeriesFacts {
     // Of a profile that of its first point. Gaps lie on the line between their neighbours.
     std::optional<SeriesJump> jump = {};
     std::size_t jumping = 0;  // values that are others without jumps
+    // A value that stands apart from all others of a series, and its time step.
+    std::optional<std::pair<std::size_t, double>> apart = {};
   };
 
   TsbDefinition file;

@@ -20,6 +20,9 @@ struct FileCopy {
 // A time series or profile whose missing values lie on the line between their neighbours in time, at each
 // point. A point with no value has those of the nearest one, an item with none is 0.
 struct FilledSeries {
+  std::vector<std::uint32_t> apart =
+      {};  // items (from 1) whose value that stands apart is one of the missing
+
   bool operator==(const FilledSeries&) const = default;
 };
 

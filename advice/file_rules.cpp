@@ -8,6 +8,7 @@
 #include "advice/fix_files.h"
 #include "advice/rules.h"
 #include "platform/files/paths.h"
+#include "setup/member_keyword.h"
 #include "setup/setup_path.h"
 
 namespace gridbay {
@@ -88,7 +89,8 @@ void adviseFileNames(AdviceContext& context) {
   if (context.source != nullptr) {
     for (const FileKeyword& each : fileKeywordsOf(*context.source)) {
       if (each.name.starts_with('/') && !isOption(each.place.keyword) && !outside.contains(each.name) &&
-          !pathOnFile(each.name, folder).starts_with("../"))
+          !pathOnFile(each.name, folder).starts_with("../") &&
+          findKeyword(context.model, each.place.keyword, context.documentPath))
         note(absolute, each);
     }
   }

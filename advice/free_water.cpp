@@ -67,6 +67,7 @@ std::optional<int> FreeWater::next(int j, int k, bool isUp) const {
 
 std::optional<FreeWater::Place> FreeWater::nearest(GridPoint from) const {
   std::optional<Place> nearest;
+  if (grid_.noJ < 3 || grid_.noK < 3) return nearest;
   const auto look = [&](int k) {
     if (k < 1 || k > grid_.noK - 2) return;
     for (const bool isUp : {false, true}) {

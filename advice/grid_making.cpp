@@ -199,10 +199,13 @@ Outcome makeFile(const LandValueGrid& making, const std::string& from, const std
 
 Outcome makeFile(const TurnedGrid& making, const std::string& from, const std::string& to,
                  const FileProgress& progress) {
+  const Result<float> land = landIn(from);
+  if (!land) return Failure{land.error()};
   const auto change = [&](const TsbDefinition& file, const auto& rows) -> Outcome {
     if (rows.item != making.item) return {};
     for (auto& value : rows.values) {
-      if (!hasNoValue(value, file.items[rows.item - 1])) value = -value;
+      // What lies at the land value is no depth.
+      if (!hasNoValue(value, file.items[rows.item - 1]) && static_cast<float>(value) != *land) value = -value;
     }
     return {};
   };

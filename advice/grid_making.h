@@ -51,11 +51,10 @@ struct ResampledGrid {
   bool operator==(const ResampledGrid&) const = default;
 };
 
-// The same grid with another land value (metres). What lies at a lower one of old, as points with no value
-// do, stays land.
+// The same grid with another land value (metres).
 struct LandValueGrid {
   float landValue = 0;
-  std::size_t item = 1;  // of the elevations
+  std::size_t item = 0;  // whose points at a lower value of old stay land; 0 for none
 
   bool operator==(const LandValueGrid&) const = default;
 };

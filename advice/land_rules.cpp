@@ -8,18 +8,24 @@
 #include "advice/area_fixes.h"
 #include "basic/bathymetry.h"
 #include "basic/module_selection.h"
+#include "basic/nesting.h"
 #include "hydrodynamic/boundary.h"
 #include "hydrodynamic/surface_elevation.h"
 
 namespace gridbay {
 namespace {
 
+struct Water {
+  float level = 0;      // metres
+  bool isKnown = true;  // else it may be higher somewhere
+};
+
 // The highest level that the water begins with or is given at boundaries, as far as that is known, and mean
-// sea level at least (metres).
-float highestWater(AdviceContext& context) {
-  float highest = 0;
-  const auto take = [&highest](float level) {
-    if (std::isfinite(level)) highest = std::max(highest, level);
+// sea level at least.
+Water highestWater(AdviceContext& context) {
+  Water water;
+  const auto take = [&water](float level) {
+    if (std::isfinite(level)) water.level = std::max(water.level, level);
   };
   const auto itemOf = [](const UTsbSelection& file) { return file.items.empty() ? 1 : file.items.front(); };
   CNhdSurfaceElevationKvs& surfaces = *context.model.nhdSurfaceElevation;
@@ -30,6 +36,8 @@ float highestWater(AdviceContext& context) {
     } else if (const GridFacts* map =
                    context.files.grid(surface.map.fileName.absolute(), itemOf(surface.map))) {
       take(map->highest);
+    } else {
+      water.isKnown = false;
     }
   }
   CNhdBoundaryKvs& boundaries = *context.model.nhdBoundary;
@@ -37,32 +45,61 @@ float highestWater(AdviceContext& context) {
     using Boundary = CNhdBoundaryObjectKvs;
     const Boundary& boundary = *boundaries.GetItem(number);
     if (boundary.formulation != Boundary::kLevel) continue;
-    if (boundary.dataFormat == Boundary::kConstant) take(boundary.value);
-    if (boundary.dataFormat == Boundary::kSineSeries) take(boundary.referenceLevel + boundary.range / 2);
-    if (boundary.dataFormat != Boundary::kType0File && boundary.dataFormat != Boundary::kType1File) continue;
-    const SeriesFacts* series = context.files.series(boundary.dataFile.fileName.absolute());
+    if (boundary.dataFormat == Boundary::kConstant) {
+      take(boundary.value);
+      continue;
+    }
+    if (boundary.dataFormat == Boundary::kSineSeries) {
+      take(boundary.referenceLevel + boundary.range / 2);
+      continue;
+    }
+    const bool isSeries =
+        boundary.dataFormat == Boundary::kType0File || boundary.dataFormat == Boundary::kType1File;
+    const SeriesFacts* series =
+        isSeries ? context.files.series(boundary.dataFile.fileName.absolute()) : nullptr;
     const std::size_t item = itemOf(boundary.dataFile);
-    if (series != nullptr && series->hasValues && item >= 1 && item <= series->items.size())
+    if (series != nullptr && series->hasValues && item >= 1 && item <= series->items.size()) {
       take(series->items[item - 1].highest);
+    } else {
+      water.isKnown = false;
+    }
   }
-  return highest;
+  return water;
+}
+
+// Whether the area around has water where the corners of an area lie.
+bool hasWaterAround(AdviceContext& context, int number) {
+  const CBathymetryObjectKvs& area = *context.model.bathymetry->GetArea(number);
+  const GridFacts* inner = context.grid(number);
+  const GridFacts* outer = context.grid(area.enclosingArea);
+  if (inner == nullptr || outer == nullptr) return false;
+  const int lastJ = area.origin.j + (inner->noJ - 1) / kNestingRatio;
+  const int lastK = area.origin.k + (inner->noK - 1) / kNestingRatio;
+  const GridPoint corners[] = {area.origin, {lastJ, area.origin.k}, {lastJ, lastK}, {area.origin.j, lastK}};
+  return std::ranges::any_of(corners, [&](GridPoint at) {
+    return outer->contains(at.j, at.k) &&
+           outer->lowestOfBlocks(at.j / outer->blockSize, at.k / outer->blockSize) < outer->landValue;
+  });
 }
 
 // Depths that count downwards where all lies above the water, else the land value above the water, and at
-// most that of the highest point; of inland flooding above all, as all may be flooded.
-AdviceFix landFix(AdviceContext& context, int number, const GridFacts& grid, float highest, float water,
-                  bool isInland) {
+// most that of the highest point. Where all may be flooded, or lies above the water for another reason, it is
+// above all.
+AdviceFix landFix(AdviceContext& context, int number, const GridFacts& grid, float highest, bool isInland) {
   AdviceFix fix;
-  if (!isInland && grid.lowest > water) {
+  const Water water = highestWater(context);
+  const bool isDry = grid.lowest > water.level;
+  if (!isInland && isDry && water.isKnown && (number == 1 || hasWaterAround(context, number))) {
     fix.name = fmt::format("Turn the depths of area {} to elevations, in {}", number,
                            addAreaFile(context, fix, number, "turned", TurnedGrid{context.elevationItem()}));
     return fix;
   }
-  float land = std::ceil(isInland ? highest : water) + 1;
-  if (!isInland && highest > water) land = std::min(land, highest);
-  fix.name =
-      fmt::format("Land value of {:.6g} m for area {}, in {}", land, number,
-                  addAreaFile(context, fix, number, "land", LandValueGrid{land, context.elevationItem()}));
+  const bool isAbove = isInland || isDry;
+  float land = std::ceil(isAbove ? highest : water.level) + 1;
+  if (!isAbove && highest > water.level) land = std::min(land, highest);
+  const std::size_t closed = isInland ? context.elevationItem() : 0;
+  fix.name = fmt::format("Land value of {:.6g} m for area {}, in {}", land, number,
+                         addAreaFile(context, fix, number, "land", LandValueGrid{land, closed}));
   return fix;
 }
 
@@ -81,8 +118,10 @@ void adviseLandValues(AdviceContext& context) {
     // Of an area that is all sea, or is to be flooded whole, it is meant that none of it is land.
     const bool hasNoLand = number == 1 && !isInland && highest > 0 && highest < grid->landValue;
     if (!isAllLand && !hasNoLand) continue;
-    const float water = highestWater(context);
-    if (!isAllLand && highest <= water) continue;
+    // Without terrain there is nothing that could be mended; how high the water comes a file may tell that is
+    // not read yet.
+    if (isAllLand && grid->highest == grid->landValue) continue;
+    if ((!isAllLand && highest <= highestWater(context).level) || !context.files.isComplete()) continue;
     context.add(
         {{},
          isAllLand
@@ -95,7 +134,7 @@ void adviseLandValues(AdviceContext& context) {
                    : "All of its border is open, the high ground too.",
          placeOfAreaFile(context, number),
          {},
-         landFix(context, number, *grid, highest, water, isInland)});
+         landFix(context, number, *grid, highest, isInland)});
   }
 }
 

@@ -206,6 +206,9 @@ class LessWriting {
     for (double times = 2; times <= kMostTimes; times *= 2) {
       if (AdviceFix found = fewerPoints(times); fits(found)) return found;
     }
+    const int outputs = context_.model.nhdResult->outputs.GetCount();
+    // Those that go elsewhere stay.
+    if (!disk_.outputs.empty() && std::ssize(disk_.outputs) < outputs) return lastOut();
     AdviceFix none = nothing();
     return fits(none) ? std::optional(std::move(none)) : std::nullopt;
   }
@@ -264,6 +267,13 @@ class LessWriting {
         fix.settings.push_back(
             {side.keyword, fmt::format("{},{},{}", side.first, side.last, longer(side, times))});
     }
+    return fix;
+  }
+  // One by one.
+  AdviceFix lastOut() const {
+    const int number = disk_.outputs.back();
+    AdviceFix fix{fmt::format("Output {} out", number)};
+    fix.removal = AdviceRemoval{AdviceRemoval::List::output, number};
     return fix;
   }
   // Of a disk that is full.

@@ -6,6 +6,7 @@
 #include <array>
 #include <utility>
 
+#include "hydrodynamic/result.h"
 #include "setup/entry_removal.h"
 #include "setup/global_kvs.h"
 #include "structures/culvert.h"
@@ -66,11 +67,13 @@ void makeRemoval(CGlobalKvs& model, const AdviceRemoval& removal) {
       return makeRemoval(*model.nhdCulvert, removal);
     case List::dike:
       return makeRemoval(*model.nhdDike, removal);
+    case List::output:
+      return removeEntry(model.nhdResult->outputs, removal.number);
   }
 }
 
 std::string textOf(const AdviceRemoval& removal) {
-  constexpr std::array kNames{"boundary", "source", "weir", "culvert", "dike"};
+  constexpr std::array kNames{"boundary", "source", "weir", "culvert", "dike", "output"};
   const bool isOfPoints = removal.what == AdviceRemoval::What::equalPoints;
   return fmt::format("{}{} {}", isOfPoints ? "equal points of " : "",
                      kNames[static_cast<std::size_t>(removal.list)], removal.number);

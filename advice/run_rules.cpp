@@ -186,6 +186,11 @@ Setting warmUpWithin(int steps) {
   return {fmt::format("{}/Warm_Up_Period", kPeriod), std::to_string(steps / kPart)};
 }
 
+// A hot start file says the start of the run and its step: others would last until the next check.
+bool isGivenByHotStart(AdviceContext& context) {
+  return context.model.bathymetry->hotStart == 1;
+}
+
 // The last time step that anything of the setup goes to; 0 where nothing says so.
 int lastStepWritten(AdviceContext& context) {
   const KvsFile* file = context.written();
@@ -202,11 +207,13 @@ int lastStepWritten(AdviceContext& context) {
 
 void adviseNumbersOfSteps(AdviceContext& context) {
   const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
-  if (!isStep(period.timeStepInterval)) {
+  if (!isStep(period.timeStepInterval) && !isGivenByHotStart(context)) {
     constexpr double kUsual = 30;
     const double stable = kUsual / stableDivisor(kUsual, worstCourant(context, kUsual));
     // In hundredths, and no longer than lets the run end with its series.
-    const double covered = std::floor(secondsOfSeries(context) / period.LastTimeStep() * 100) / 100;
+    constexpr double kRounding = 1e-4;
+    const double covered =
+        std::floor(secondsOfSeries(context) / period.LastTimeStep() * 100 + kRounding) / 100;
     const std::string usual = fmt::format("{:.6g}", covered > 0 ? std::min(stable, covered) : stable);
     context.add({{},
                  fmt::format("The time step is {:.6g} s.", period.timeStepInterval),
@@ -262,10 +269,12 @@ void adviseCounts(AdviceContext& context) {
 
 void adviseCourant(AdviceContext& context) {
   const double step = context.model.simulationPeriod->timeStepInterval;
-  if (!isStep(step)) return;
+  if (!isStep(step) || isGivenByHotStart(context)) return;
   const Courant worst = worstCourant(context, step);
   if (!(worst.number > kStableCourant)) return;
   const int divisor = stableDivisor(step, worst);
+  constexpr double kShortest = 0.01;  // that a check takes
+  if (step / divisor < kShortest) return;
   std::optional<AdviceFix> fix = withShorterSteps(context, divisor);
   if (!fix) return;
   context.add({{},

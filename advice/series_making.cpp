@@ -56,7 +56,7 @@ class ItemMending {
         values_(points_ * time_.count) {}
 
   // Progress goes from 0 to 1.
-  Outcome make(bool isSmooth, const FileProgress& progress) {
+  Outcome make(bool isSmooth, bool hasApart, const FileProgress& progress) {
     constexpr double kHalf = 0.5;
     if (Outcome read = eachPiece(progress, 0,
                                  [&](std::size_t step, std::span<double> values) {
@@ -64,7 +64,7 @@ class ItemMending {
                                  });
         !read)
       return read;
-    mend(isSmooth);
+    mend(isSmooth, hasApart);
     return eachPiece(progress, kHalf, [&](std::size_t step, std::span<double> values) {
       return writeSteps(to_, from_.definition(), number_, step, values);
     });
@@ -83,13 +83,17 @@ class ItemMending {
     return {};
   }
 
-  void mend(bool isSmooth) {
+  void mend(bool isSmooth, bool hasApart) {
     std::vector<double> course(time_.count);
     std::vector<std::size_t> known;
     std::vector<std::size_t> empty;
     for (std::size_t point = 0; point < points_; ++point) {
       for (std::size_t step = 0; step < time_.count; ++step) course[step] = values_[step * points_ + point];
-      const bool hasValues = fillGaps(course, item_, time_);
+      bool hasValues = fillGaps(course, item_, time_);
+      if (const auto at = hasApart && hasValues ? valueApart(course) : std::nullopt) {
+        course[*at] = NAN;
+        hasValues = fillGaps(course, item_, time_);
+      }
       (hasValues ? known : empty).push_back(point);
       if (hasValues && isSmooth) takeOutJumps(course);
       for (std::size_t step = 0; step < time_.count; ++step) values_[step * points_ + point] = course[step];
@@ -222,30 +226,33 @@ Outcome makeItems(const std::string& toPath, const TsbDefinition& definition, co
 }
 
 Outcome mend(const std::string& fromPath, const std::string& toPath,
-             const std::vector<std::uint32_t>& smoothItems, const FileProgress& progress) {
+             const std::vector<std::uint32_t>& smoothItems, const std::vector<std::uint32_t>& apartItems,
+             const FileProgress& progress) {
   const Result<TsbFile> from = TsbFile::open(fromPath);
   if (!from) return Failure{from.error()};
   TsbDefinition definition = from->definition();
   if (definition.axes.size() > 1) return Failure{fmt::format("{} is no time series", fromPath)};
   tell(definition, "missing values filled by the lines between their neighbours");
   if (!smoothItems.empty()) tell(definition, "jumps taken out");
+  if (!apartItems.empty()) tell(definition, "values that stand apart taken out");
   // What stands for a missing value may be what lies on such a line.
   for (TsbItem& item : definition.items) item.deleteValue = TsbItem().deleteValue;
   return makeItems(toPath, definition, progress, [&](TsbWriter& to, std::size_t number, const auto& part) {
-    return ItemMending(*from, to, number).make(std::ranges::count(smoothItems, number) > 0, part);
+    return ItemMending(*from, to, number)
+        .make(std::ranges::count(smoothItems, number) > 0, std::ranges::count(apartItems, number) > 0, part);
   });
 }
 
 }  // namespace
 
-Outcome makeFile(const FilledSeries&, const std::string& from, const std::string& to,
+Outcome makeFile(const FilledSeries& making, const std::string& from, const std::string& to,
                  const FileProgress& progress) {
-  return mend(from, to, {}, progress);
+  return mend(from, to, {}, making.apart, progress);
 }
 
 Outcome makeFile(const SmoothedSeries& making, const std::string& from, const std::string& to,
                  const FileProgress& progress) {
-  return mend(from, to, making.items, progress);
+  return mend(from, to, making.items, {}, progress);
 }
 
 Outcome makeFile(const CoveringSeries& making, const std::string& fromPath, const std::string& toPath,

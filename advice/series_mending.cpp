@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <functional>
 #include <vector>
 
 #include "platform/units/units.h"
@@ -126,6 +127,32 @@ bool fillGaps(std::span<double> values, const TsbItem& item, const TsbTimeAxis& 
     before = behind;
   }
   return true;
+}
+
+std::optional<std::size_t> valueApart(std::span<const double> values) {
+  constexpr double kFar = 300;  // times the range of all others
+  constexpr std::size_t kLeastOthers =
+      5;  // of different values: what is mostly at rest may have a single event
+  if (values.size() < kLeastSteps) return std::nullopt;
+  const auto apart = [&](auto isBefore) -> std::optional<std::size_t> {
+    const auto most = std::ranges::min_element(values, isBefore);
+    double next = isBefore(0.0, 1.0) ? INFINITY : -INFINITY;
+    double last = -next;
+    for (auto each = values.begin(); each != values.end(); ++each) {
+      if (each == most) continue;
+      if (isBefore(*each, next)) next = *each;
+      if (isBefore(last, *each)) last = *each;
+    }
+    const double range = std::abs(next - last);
+    if (!(range > 0 && std::abs(*most - next) > kFar * range)) return std::nullopt;
+    return static_cast<std::size_t>(most - values.begin());
+  };
+  std::vector<double> different(values.begin(), values.end());
+  std::ranges::sort(different);
+  different.erase(std::ranges::unique(different).begin(), different.end());
+  if (different.size() <= kLeastOthers) return std::nullopt;
+  const std::optional<std::size_t> highest = apart(std::greater<>());
+  return highest ? highest : apart(std::less<>());
 }
 
 std::optional<SeriesJump> greatestJump(std::span<const double> values) {

@@ -14,6 +14,10 @@ bool isMissing(double value, const TsbItem& item);
 // it; directions go by the shorter arc. False, with nothing changed, where there is no value at all.
 bool fillGaps(std::span<double> values, const TsbItem& item, const TsbTimeAxis& time);
 
+// The place of a value that lies very much further from all others than these do from each other; nothing for
+// a short series, or one that is constant but for it.
+std::optional<std::size_t> valueApart(std::span<const double> values);
+
 // Two values that follow each other and lie far apart for values that go on smoothly.
 struct SeriesJump {
   std::size_t step = 0;  // of the later one

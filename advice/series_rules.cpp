@@ -119,14 +119,29 @@ std::optional<Setting> beginningAt(const DateTime& moment) {
   return Setting{fmt::format("{}/Start_Time", kPeriodPath), fmt::format("{}", fmt::join(*parts, ","))};
 }
 
+// A hot start file says when the run begins.
+bool mayBeginElsewhere(AdviceContext& context) {
+  return context.model.bathymetry->hotStart != 1;
+}
+
+// What goes with another begin of the run: series with no dates begin with it.
+std::string withUndated(AdviceContext& context, std::span<const UsedSeries> all) {
+  const auto isUndated = [&](const UsedSeries& each) {
+    const std::optional<Span> span = spanOf(context, each.facts.file.time);
+    return span && !span->isCalendar;
+  };
+  return std::ranges::any_of(all, isUndated) ? ", and the series without dates with it" : "";
+}
+
 // A run that begins so many time steps later, and ends when it did.
-std::optional<AdviceFix> laterRun(AdviceContext& context, long long later) {
+std::optional<AdviceFix> laterRun(AdviceContext& context, long long later, std::span<const UsedSeries> all) {
+  if (!mayBeginElsewhere(context)) return std::nullopt;
   const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
   const long long steps = period.LastTimeStep() - later;
   std::optional<Setting> start =
       beginningAt(period.start.plusDays(static_cast<double>(later) * double{period.timeStepInterval} / kDay));
   if (!start) return std::nullopt;
-  AdviceFix fix = otherRun(context, "Begin with the series", steps,
+  AdviceFix fix = otherRun(context, "Begin with the series" + withUndated(context, all), steps,
                            [=](long long step) { return std::clamp(step - later, 0LL, steps); });
   fix.settings.insert(fix.settings.begin(), std::move(*start));
   return fix;
@@ -141,7 +156,7 @@ double stepsInDay(const CSimulationPeriodKvs& period) {
 std::optional<AdviceFix> movedRun(AdviceContext& context, const Span& span, std::span<const UsedSeries> all) {
   const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
   std::optional<Setting> start = beginningAt(span.first);
-  if (!span.isCalendar || !start) return std::nullopt;
+  if (!span.isCalendar || !start || !mayBeginElsewhere(context)) return std::nullopt;
   const DateTime begin = DateTime::of(*span.first.parts());
   const double fitting = std::floor((span.last.linear() - begin.linear() + kHalfSecond) * stepsInDay(period));
   const double steps = std::min(fitting, double{static_cast<double>(period.LastTimeStep())});
@@ -154,7 +169,7 @@ std::optional<AdviceFix> movedRun(AdviceContext& context, const Span& span, std:
   };
   if (std::ranges::any_of(all, isLeft)) return std::nullopt;
   const auto last = static_cast<long long>(steps);
-  AdviceFix fix = otherRun(context, "Move the run to the series", last,
+  AdviceFix fix = otherRun(context, "Move the run to the series" + withUndated(context, all), last,
                            [last](long long step) { return std::min(step, last); });
   fix.settings.insert(fix.settings.begin(), std::move(*start));
   return fix;
@@ -211,7 +226,8 @@ void advisePeriod(AdviceContext& context, const UsedSeries& used, const Span& sp
     const double later = std::ceil(stepsTo(span.first) - half);
     const bool isPartLeft = std::min(stepsTo(span.last) + half, lastStep) - later >= 1;
     std::optional<AdviceFix> fix;
-    if (span.isCalendar && later >= 1 && isPartLeft) fix = laterRun(context, static_cast<long long>(later));
+    if (span.isCalendar && later >= 1 && isPartLeft)
+      fix = laterRun(context, static_cast<long long>(later), all);
     context.add({{},
                  fmt::format("{} begins at {}, after the run does at {}.", used.file.name,
                              dateTimeText(span.first), dateTimeText(period.start)),
@@ -253,6 +269,23 @@ AdviceFix withoutGaps(AdviceContext& context, const UsedSeries& used) {
   return otherFile(context, used, "filled", what, FilledSeries{});
 }
 
+// Without the values that stand apart in all items that are not smooth, whoever takes them.
+AdviceFix withoutApart(AdviceContext& context, const UsedSeries& used, std::span<const UsedSeries> all) {
+  std::set<std::uint32_t> items;
+  for (const UsedSeries& each : all) {
+    if (each.isSmooth || each.file.path != used.file.path) continue;
+    for (const std::uint32_t number : each.items) {
+      if (used.facts.items[number - 1].apart) items.insert(number);
+    }
+  }
+  const std::string filling = fillingOf(used.facts);
+  const std::string what =
+      fmt::format("Put {} on the line between {} neighbours{}{}",
+                  items.size() == 1 ? "the value that stands apart" : "the values that stand apart",
+                  items.size() == 1 ? "its" : "their", filling.empty() ? "" : " and ", filling);
+  return otherFile(context, used, "filled", what, FilledSeries{{items.begin(), items.end()}});
+}
+
 // Without the jumps of all items that are to be smooth, whoever takes them.
 AdviceFix withoutJumps(AdviceContext& context, const UsedSeries& used, std::span<const UsedSeries> all) {
   std::set<std::uint32_t> smooth;
@@ -288,6 +321,15 @@ void adviseValues(AdviceContext& context, const UsedSeries& used, std::span<cons
          used.place,
          {},
          withoutGaps(context, used)});
+  }
+  if (!used.isSmooth && item.apart) {
+    context.add({{},
+                 fmt::format("\"{}\" of {} is {:.6g} {} at {}, far from all its other values.", named.name,
+                             used.file.name, item.apart->second, named.unit, moment(item.apart->first)),
+                 "Often such a value is mistyped, or stands for one that is missing.",
+                 used.place,
+                 {},
+                 withoutApart(context, used, all)});
   }
   if (!used.isSmooth || !item.jump) return;
   context.add({{},

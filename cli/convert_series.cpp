@@ -46,7 +46,7 @@ void addConvertSeries(CLI::App& convert, Action& action) {
           "like are recognised; with --start no value may be missing)")
       ->allow_extra_args(false);
   command.add_option("--dates", given->dateOrder, "The order of dates that do not tell it themselves")
-      ->check(CLI::IsMember(dateOrderNames(), CLI::ignore_case));
+      ->transform(CLI::IsMember(dateOrderNames(), CLI::ignore_case));
   addForce(command, options->force);
 }
 

@@ -269,8 +269,8 @@ class Warp {
     const auto lastBefore = [=](double edge) { return std::floor(edge / spacing - 0.5 - kInside); };
     const double west = firstBeyond(extent[0]) * spacing;
     const double north = (lastBefore(extent[3]) + 1) * spacing;
-    const double across = lastBefore(extent[2]) - firstBeyond(extent[0]) + 1;
-    const double down = lastBefore(extent[3]) - firstBeyond(extent[1]) + 1;
+    const double across = std::max(lastBefore(extent[2]) - firstBeyond(extent[0]) + 1, 1.0);
+    const double down = std::max(lastBefore(extent[3]) - firstBeyond(extent[1]) + 1, 1.0);
     constexpr double kMost = 1e6;  // columns or rows
     if (!(across >= 1 && down >= 1 && across <= kMost && down <= kMost)) {
       CPLError(CE_Failure, CPLE_AppDefined, "points %g apart would be %g x %g of them", spacing, across,

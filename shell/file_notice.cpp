@@ -33,12 +33,17 @@ FileNotice::FileNotice(Words words, QWidget* parent)
 }
 
 void FileNotice::watch(const QString& path) {
+  watch(path, fileStamp(path.toStdString()));
+}
+
+void FileNotice::watch(const QString& path, const std::optional<FileStamp>& then) {
   path_ = path;
-  stamp_ = fileStamp(path.toStdString());
+  stamp_ = then;
   hide();
   if (const QStringList old = watcher_.files() + watcher_.directories(); !old.isEmpty())
     watcher_.removePaths(old);
   if (!path.isEmpty() && QFileInfo::exists(path)) watcher_.addPath(path);
+  if (fileStamp(path.toStdString()) != then) look();
 }
 
 bool FileNotice::isChanged() const {

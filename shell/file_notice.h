@@ -26,6 +26,8 @@ class FileNotice final : public QFrame {
 
   // The file was read or written here just now; none for an empty path.
   void watch(const QString& path);
+  // It was read as it was then; what has been done to it since is seen at once.
+  void watch(const QString& path, const std::optional<FileStamp>& then);
   // Whether another program has written to it since.
   bool isChanged() const;
 

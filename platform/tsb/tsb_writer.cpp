@@ -1,6 +1,7 @@
 #include "platform/tsb/tsb_writer.h"
 
 #include <fmt/format.h>
+#include <hdf5.h>
 #include <netcdf.h>
 
 #include <algorithm>
@@ -21,6 +22,10 @@
 
 namespace gridbay {
 namespace {
+
+// A file that a full disk kept from being closed stays open for the library, which would fall over it at the
+// end of the program. All others are closed by then.
+[[maybe_unused]] const bool isLeftOpenAtEnd = H5dont_atexit() >= 0;
 
 // Gives up at the first call of the library that fails.
 struct LibraryError {

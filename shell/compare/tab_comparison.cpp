@@ -24,6 +24,7 @@ bool TabComparison::begin(DocumentTab& tab, const QString& path, QString& fault)
   SetupComparison& setups = tab.editor().comparison();
   const QString name = QFileInfo(path).fileName();
   bool isCancelled = false;
+  const std::optional<FileStamp> before = fileStamp(path.toStdString());
   const std::optional<std::string> read = workBeside(
       [&setups, file = path.toStdString()](const WorkApart::Progress&) { return setups.read(file); },
       tr("Reading %1...").arg(name), &tab, isCancelled);
@@ -34,7 +35,7 @@ bool TabComparison::begin(DocumentTab& tab, const QString& path, QString& fault)
                : tr("%1 could not be read: its reader came to a sudden end.").arg(name);
   if (fault.isEmpty()) {
     if (comparison == nullptr) comparison = new TabComparison(tab);
-    comparison->notice_->watch(path);
+    comparison->notice_->watch(path, before);
     comparison->differences_.clear();
     comparison->current_ = -1;
     comparison->showFound();

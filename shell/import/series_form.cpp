@@ -106,8 +106,9 @@ void SeriesForm::showForm(const TableForm& form) {
   QStringList missing;
   for (const double number : form.missing)
     missing << QString::number(number, 'g', QLocale::FloatingPointShortest);
-  missing_->setText(missing.join(' '));
-  start_->setText(QString::fromStdString(form.start));
+  // What is being typed stays.
+  if (!missing_->isModified()) missing_->setText(missing.join(' '));
+  if (!start_->isModified()) start_->setText(QString::fromStdString(form.start));
   timeUnit_->setCurrentText(QString::fromStdString(form.timeUnit));
   enable(form);
 }

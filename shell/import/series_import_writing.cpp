@@ -79,7 +79,10 @@ void SeriesImport::takeImport(const std::optional<std::string>& bytes) {
 }
 
 void SeriesImport::cancel() {
-  if (!work_.isRunning()) return reading_.stopRecognising();
+  if (!work_.isRunning()) {
+    isWanted_ = false;
+    return reading_.stopRecognising();
+  }
   work_.stop();
   showStage();
   tell(fileStamp(made_.toStdString()) == before_

@@ -58,6 +58,7 @@ QString BackgroundCopies::of(const BackgroundSource& source, const MapFrame& fra
   const Wanted wanted{source, frame, projection};
   const bool isFaulty =
       copy.failed && copy.failed->source.raster == source.raster && copy.failed->projection == projection;
+  if (!isFaulty) copy.failed.reset();  // it was of another raster or projection
   if (!copy.making.isEmpty() && !isAtWorkFor(copy, wanted)) giveUp(copy);
   if (suits(copy, wanted)) {
     copy.wanted.reset();

@@ -57,8 +57,9 @@ bool DialogAside::eventFilter(QObject* watched, QEvent* event) {
   if (!isOfUser(event->type()) || !isForWidget || isFree(watched)) return false;
   // What the map leaves comes back here from the widgets around it.
   if (event->type() == QEvent::KeyPress && !std::exchange(isPassedOn_, true)) {
+    const QPointer<DialogAside> self(this);  // the key may end the pick, and this with it
     QCoreApplication::sendEvent(&map_, event);
-    isPassedOn_ = false;
+    if (self != nullptr) isPassedOn_ = false;
   }
   event->setAccepted(event->type() != QEvent::Close && event->type() != QEvent::DragEnter);
   return true;

@@ -326,7 +326,7 @@ TEST_F(AdviceTest, Series) {
   const auto shorter = std::ranges::find_if(
       ends, [](const Advice& advice) { return advice.fix.name.starts_with("End with the series, at "); });
   ASSERT_NE(shorter, ends.end());
-  ASSERT_TRUE(makeFix(*model, *shorter->fix, path));
+  ASSERT_TRUE(makeFix(*model, shorter->fix, path));
   EXPECT_EQ(model->nadMassBudget->GetMassFile(1)->steps, (USubLine{0, 270, 7}));
 }
 

@@ -153,7 +153,7 @@ TEST_F(AreaFixes, EachMendsWhatItSpeaksOf) {
          model->bathymetry->projection = "UTM-99";
        }},
       {"projection", "There is no projection \"UTM-0\", in which weir 1 is given.",
-       "Projection of weir 1: WGS 84 / UTM zone 32N",
+       "Projection of weir 1: Local Coordinates",
        [this] {
          local("outer.tsb2");
          local("inner.tsb2");
@@ -317,6 +317,7 @@ TEST_F(AreaFixes, AFewPointsAtTheLandValueAreGaps) {
               HasSubstr("The highest point of area 1 lies at 3 m, below its land value of 50 m"));
   mend();
   EXPECT_TRUE(look().empty());
+  clean();
   write(area, surface(31));
   EXPECT_TRUE(look().empty());
 }
@@ -332,6 +333,68 @@ TEST_F(AreaFixes, LandAtALandValueThatRisesStaysLand) {
   const Grid made = grid("outer_land.tsb2");
   EXPECT_EQ(made.values[0], 2);
   EXPECT_EQ(made.values[1], 0.5F);
+}
+
+// What the file gives would be back with the next check.
+TEST_F(AreaFixes, AHotStartFileSaysTheStepAndTheStart) {
+  hotStart(0);
+  model->simulationPeriod->timeStepInterval = 300;
+  model->simulationPeriod->noPointsInTime = 25;  // two hours
+  EXPECT_TRUE(look().empty());
+  model->simulationPeriod->timeStepInterval = 20;
+  model->simulationPeriod->noPointsInTime = 361;
+  writeTide(smooth(14), start().plusDays(10.0 / 1440));
+  const std::vector<Advice> found = look();
+  ASSERT_EQ(found.size(), 1U);
+  EXPECT_THAT(found[0].fix.name, HasSubstr("tide_moved.tsb0"));
+}
+
+// A flat sea at a land value that is too low is no land to keep, and what is nothing but land is left alone.
+TEST_F(AreaFixes, ASeaAtTheLandValueBecomesWater) {
+  model->boundary->SetNoBoundaries(0);
+  Area area{"outer.tsb2"};
+  area.land = 0;
+  write(area, [](int j, int) { return j < 15 ? 0.0F : 4.0F; });
+  mend();
+  EXPECT_THAT(grid("outer_land.tsb2").values, ::testing::Each(::testing::AnyOf(0, 4)));
+  EXPECT_TRUE(look().empty());
+  clean();
+  model->boundary->SetNoBoundaries(0);
+  write(area, [](int, int) { return 0.0F; });
+  EXPECT_TRUE(look().empty());
+}
+
+// Land and closed gaps are no depths.
+TEST_F(AreaFixes, OfDepthsTheLandStays) {
+  model->boundary->SetNoBoundaries(0);
+  Area area{"outer.tsb2"};
+  area.land = 10;
+  write(area, [](int j, int) { return j < 15 ? 12.0F + static_cast<float>(j) : 10.0F; });
+  mend();
+  const Grid made = grid("outer_turned.tsb2");
+  EXPECT_EQ(made.values[0], -12);
+  EXPECT_EQ(made.values[20], 10);
+}
+
+// Where the water stands is not known of a rating curve, and an area ashore is no sea.
+TEST_F(AreaFixes, WhatMayBeLandIsNotTurned) {
+  model->boundary->SetNoBoundaries(0);
+  write({"outer.tsb2"}, [](int, int) { return 8.0F; });
+  CNhdBoundaryKvs& flow = *model->nhdBoundary;
+  model->boundary->SetNoBoundaries(1);
+  model->boundary->GetItem(1)->Set(0, 0, 0, 30);
+  flow.GetItem(1)->formulation = CNhdBoundaryObjectKvs::kLevel;
+  flow.GetItem(1)->dataFormat = CNhdBoundaryObjectKvs::kRatingCurve;
+  const std::vector<Advice> found = look();
+  const auto land = std::ranges::find(found, "land-value", &Advice::kind);
+  ASSERT_NE(land, found.end());
+  EXPECT_EQ(land->fix.name, "Land value of 9 m for area 1, in outer_land.tsb2");
+  clean();
+  write({"outer.tsb2"}, [](int j, int) { return j > 14 ? 8.0F : -5.0F; });
+  write({"inner.tsb2", kPoints, 30, kInner + 14 * 90, kInnerNorth}, [](int, int) { return 8.0F; });
+  model->bathymetry->GetArea(2)->origin = {20, 6};
+  ASSERT_EQ(look().size(), 1U);
+  EXPECT_EQ(look()[0].fix.name, "Land value of 9 m for area 2, in inner_land.tsb2");
 }
 
 TEST_F(AreaFixes, WhatIsNotToChangeStays) {

@@ -203,6 +203,9 @@ TEST_F(OutputFixTest, EachDiskForItself) {
   ASSERT_TRUE(makeFix(*model, found[0].fix, path));
   EXPECT_EQ(model->nhdResult->outputs.GetItem(1)->steps.interval, 1);
   EXPECT_EQ(model->nhdResult->outputs.GetItem(2)->steps.interval, 4);
+  // Where there is no room at all, what goes elsewhere stays.
+  advisor.setFreeMegabytes([=](const std::string& where) { return where == there ? 0 : 1e9; });
+  speaks({{"output-size", "MB to " + there, "Output 2 out", two}});
 }
 
 }  // namespace advice_files_test

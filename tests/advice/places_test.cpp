@@ -32,6 +32,19 @@ namespace advice_places_test {
 
 using test::AdviceTest;
 
+// The point that a boundary tilts about comes along to what is left of it.
+TEST_F(AdviceTest, AShorterBoundaryKeepsItsTiltingPoint) {
+  model->boundary->GetItem(1)->Set(0, 0, 0, 40);
+  CNhdBoundaryObjectKvs& flow = *model->nhdBoundary->GetItem(1);
+  flow.tiltType = 1;
+  flow.tiltingPoint = 38;
+  const std::vector<Advice> found = look();
+  ASSERT_EQ(found.size(), 1U);
+  ASSERT_TRUE(makeFix(*model, found[0].fix, path));
+  EXPECT_EQ(model->boundary->GetItem(1)->last, (GridPoint{0, 30}));
+  EXPECT_EQ(model->nhdBoundary->GetItem(1)->tiltingPoint, 30);
+}
+
 TEST_F(AdviceTest, WhatIsPlaced) {
   const auto boundary = [this](int n, int firstJ, int firstK, int lastJ, int lastK) {
     if (model->boundary->GetCount() < n) model->boundary->SetNoBoundaries(n);

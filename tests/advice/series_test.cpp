@@ -237,6 +237,34 @@ TEST_F(SeriesFixTest, GapsOfProfilesAndDirections) {
   EXPECT_NEAR(radians[1], 6.2 + (0.2 - 6.2 + 2 * 3.14159265358979) / 2 - 2 * 3.14159265358979, 1e-9);
 }
 
+// Of series that may jump a value that no other one comes near, as one that is mistyped.
+TEST_F(SeriesFixTest, ValuesThatStandApart) {
+  if (theEdition.wetlandSweepKit) GTEST_SKIP() << "no wind";
+  const std::vector<TsbItem> wind{{"Speed", item::kWindVelocity, "m s-1"},
+                                  {"Direction", item::kWindDirection, "degree"}};
+  const Values gusts{3, 4, 12, 5, 3, 0, 14, 6, 5, 5, 4, 3, 3};
+  const auto blows = [&](Values speeds) {
+    return [&, speeds = std::move(speeds)] {
+      const std::string file =
+          write("wind.tsb0", every10Minutes(kWhole, start(), wind), {speeds, Values(speeds.size(), 90)});
+      model->windConditions->SetDataFormat(CWindConditionsKvs::kConstantInSpace);
+      model->windConditions->windFile.fileName = file;
+    };
+  };
+  const char* mended =
+      "Put the value that stands apart on the line between its neighbours, in wind_filled.tsb0";
+  speaks({{"series", "is 9000 m s-1 at 1990-01-01 12:40:00, far from all its other values", mended,
+           blows(with(gusts, {{4, 9000.0F}}))},
+          {"series", "is -9999 m s-1 at 1990-01-01 12:00:00", mended, blows(with(gusts, {{0, -9999.0F}}))}});
+  isSilent({blows(gusts), blows(with(gusts, {{4, 500.0F}})), blows(Values(kWhole, 3)),
+            blows(with(Values(kWhole, 0), {{4, 60.0F}})), blows(with(gusts, {{4, 9000.0F}, {5, 9000.0F}}))});
+  clean();
+  blows(with(gusts, {{4, 9000.0F}}))();
+  fixFirst();
+  expectNear(read("wind_filled.tsb0", 1), with(gusts, {{4, 2.5F}}));
+  expectNear(read("wind_filled.tsb0", 2), Values(kWhole, 90));
+}
+
 TEST_F(SeriesFixTest, ASetupThatWasNeverSaved) {
   const std::filesystem::path before = std::filesystem::current_path();
   std::filesystem::current_path(folder.path());
@@ -366,7 +394,7 @@ TEST_F(SeriesFixTest, ASeriesThatIsTheResultOfAnotherRun) {
   model->Load(&file->tree().root(), path);
   const std::vector<Advice> found = look();
   ASSERT_EQ(found.size(), 1U);
-  ASSERT_TRUE(makeFix(*model, *found[0].fix, path));
+  ASSERT_TRUE(makeFix(*model, found[0].fix, path));
   EXPECT_TRUE(look().empty());
   EXPECT_EQ(model->nhdBoundary->GetItem(1)->dataFile.fileName.text(), "tide_filled.tsb0");
   EXPECT_EQ(model->nhdResult->outputs.GetItem(1)->file.text(), "tide.tsb0");

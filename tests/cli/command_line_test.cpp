@@ -649,7 +649,7 @@ TEST_F(Tool, AdviceIsTakenByItsNumber) {
   EXPECT_THAT(run.out,
               HasSubstr("0 faults\nadvice 1, page 26 (Flood and Dry): The flooding depth of 0.5 m is 25 "
                         "times the drying depth of 0.02 m."));
-  EXPECT_THAT(run.out, HasSubstr("\n  fix: Flooding depth (" +
+  EXPECT_THAT(run.out, HasSubstr("\n  fix: Flooding depth of 0.04 m (" +
                                  std::string(theEdition.wetlandSweepKit ? "v27setup-wsk" : "v27setup") +
                                  " fix '" + setup + "' 1)\n"));
   const nlohmann::json report = nlohmann::json::parse(runTool({"validate", setup, "--advice", "--json"}).out);
@@ -668,7 +668,7 @@ TEST_F(Tool, AdviceIsTakenByItsNumber) {
                 " validate --advice '" + setup + "'\" lists them\n");
   run = runTool({"fix", setup, "1"});
   EXPECT_EQ(run.status, 0) << run.err;
-  EXPECT_EQ(run.out, "Flooding depth\n  " + depth + ": 0.5 -> 0.04\n");
+  EXPECT_EQ(run.out, "Flooding depth of 0.04 m\n  " + depth + ": 0.5 -> 0.04\n");
   EXPECT_EQ(get(depth), "0.04\n");
   EXPECT_EQ(runTool({"validate", setup, "--advice"}).out, "0 faults\nno advice\n");
 

@@ -219,7 +219,7 @@ TEST_F(Points, APreviewHasTheGridOfTheConversionAtFewerPoints) {
   ASSERT_TRUE(coarse);
   EXPECT_EQ(coarse->points, (std::array{120, 80}));
   EXPECT_EQ(coarse->columns, 20);
-  EXPECT_EQ(coarse->rows, 14);
+  EXPECT_EQ(coarse->rows, 13);
   EXPECT_NEAR(coarse->values[10], 38.5, 1.5);
   EXPECT_FALSE(previewRaster({.in = folder.file("none.asc")}, 20, host));
 }

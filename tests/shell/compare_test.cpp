@@ -492,6 +492,17 @@ class CompareTest final : public DesktopFixture {
     QVERIFY(comparison().notice().isVisible());
   }
 
+  void aChangeOfTheOtherFileWhileItIsReadIsSeen() {
+    QVERIFY(tab().goToPage(kFloodAndDry));
+    signalCopy(1, SIGSTOP);
+    QTimer::singleShot(100, this, [this] {
+      run("v27setup", {"set", "o.v27", "NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.07"});
+      releaseCopies();
+    });
+    QVERIFY(compareWith("o.v27"));
+    QVERIFY(comparison().notice().isVisible());
+  }
+
   void threeFilesAreMergedIntoANewDocument() {
     makeOther("base.v27", {});
     makeOther("a.v27", {"NESTED_MODEL_GLOBALS/FLOOD_AND_DRY/Drying_Depth=0.01",

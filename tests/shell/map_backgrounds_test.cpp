@@ -1,6 +1,7 @@
 // Rasters and vector files with the map.
 
 #include <QDirIterator>
+#include <QScopeGuard>
 #include <atomic>
 #include <thread>
 
@@ -408,6 +409,23 @@ float depth(y,x); depth:coordinates = "lon lat"; float code(y,x); data: lat = %3
     qunsetenv("TMPDIR");
   }
 
+  void theFaultOfOneRasterIsNotThatOfAnother() {
+    const BackgroundSource one{.id = 1, .path = netcdf("small.nc"), .raster = "Band1"};
+    const BackgroundSource none{.id = 1, .path = file("gone.nc"), .raster = "other"};
+    const MapFrame frame = canvas().frame();
+    const std::string projection = canvas().scene().projectionText;
+    BackgroundCopies copies(nullptr);
+    const QSignalSpy made(&copies, &BackgroundCopies::made);
+    const QSignalSpy failed(&copies, &BackgroundCopies::failed);
+    copies.of(one, frame, projection);
+    QTRY_COMPARE(made.count(), 1);
+    copies.of(none, frame, projection);
+    QTRY_COMPARE(failed.count(), 1);
+    QVERIFY(!copies.faultOf(1).isEmpty());
+    QVERIFY(!copies.of(one, frame, projection).isEmpty());
+    QCOMPARE(copies.faultOf(1), QString());
+  }
+
   void theWindowDoesNotWaitForALibrary() {
     std::atomic<bool> isHeld = false;
     std::atomic<bool> mayEnd = false;
@@ -416,6 +434,7 @@ float depth(y,x); depth:coordinates = "lon lat"; float code(y,x); data: lat = %3
       isHeld = true;
       while (!mayEnd) std::this_thread::yield();
     });
+    const auto end = qScopeGuard([&] { mayEnd = true; });
     while (!isHeld) std::this_thread::yield();
     BackgroundWork work(nullptr);
     std::optional<std::string> told;

@@ -426,6 +426,20 @@ class SeriesImportTest final : public DesktopFixture {
     settle();
     QCOMPARE(dialog_->form().missing().text(), QString("-9999"));
     QVERIFY(!dialog_->doubts()->text().contains("Only the first"));
+    // What is being typed when the look is at its end stays.
+    QVERIFY(openSignalled(SIGSTOP));
+    focus(&dialog_->form().missing());
+    typeKeys("7");
+    releaseCopies();
+    settle();
+    QCOMPARE(dialog_->form().missing().text(), QString("7"));
+    pressKey(Qt::Key_Tab);
+    // Cancelled, the look takes the import that waits for it along.
+    QVERIFY(openSignalled(SIGSTOP));
+    QTest::mouseClick(dialog_->importButton(), Qt::LeftButton);
+    QTest::mouseClick(&part<QPushButton>("cancel"), Qt::LeftButton);
+    settle();
+    QVERIFY(!dialog_->isImporting() && folderFiles().isEmpty());
     QVERIFY(openSignalled(SIGSTOP));
     QVERIFY(dialog_->importButton()->isEnabled());
     QTest::mouseClick(dialog_->importButton(), Qt::LeftButton);

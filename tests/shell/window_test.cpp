@@ -480,7 +480,7 @@ class WindowTest final : public DesktopFixture {
     QVERIFY(adviceOf("flooding depth") < 0);
     QVERIFY(item->icon(0).isNull());
     QVERIFY(!tab().adviceStrip().isVisible());
-    QCOMPARE(window_->undoAction()->toolTip(), QString("Undo Flooding depth (Ctrl+Z)"));
+    QCOMPARE(window_->undoAction()->toolTip(), QString("Undo Flooding depth of 0.04 m (Ctrl+Z)"));
     window_->undoAction()->trigger();
     QCOMPARE(edit("Flooding depth:").text(), QString("0.5"));
     QTRY_VERIFY(adviceOf("flooding depth") >= 0);
@@ -537,11 +537,16 @@ class WindowTest final : public DesktopFixture {
     QTRY_VERIFY(adviceOf("flooding depth") >= 0);
     enter("Drying depth:", "0.03");
     fix();
+    QCOMPARE(flooding(), QString("0.5"));  // the other value is offered first
+    fix();
     QCOMPARE(flooding(), QString("0.06"));
     window_->undoAction()->trigger();
     QTRY_VERIFY(adviceOf("flooding depth") >= 0);
     type("Drying depth:", "0.04");
     QTest::mouseClick(tab().adviceStrip().findChild<QToolButton*>("fix"), Qt::LeftButton);
+    QCOMPARE(flooding(), QString("0.5"));
+    QCOMPARE(edit("Drying depth:").text(), QString("0.04"));
+    fix();
     QCOMPARE(flooding(), QString("0.08"));
     // Another fix than the one that was offered is offered first.
     QVERIFY(tab().goToPage(39));
