@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <numeric>
 
 #include "advice/area_fixes.h"
 #include "basic/bathymetry.h"
@@ -83,20 +84,24 @@ bool hasWaterAround(AdviceContext& context, int number) {
 }
 
 // Depths that count downwards where all lies above the water, else the land value above the water, and at
-// most that of the highest point. Where all may be flooded, or lies above the water for another reason, it is
-// above all.
+// most that of the highest point. Where all may be flooded, or is land and lies above the water for another
+// reason, it is above all; where none of what lies above the water is land, its higher half becomes land.
 AdviceFix landFix(AdviceContext& context, int number, const GridFacts& grid, float highest, bool isInland) {
   AdviceFix fix;
   const Water water = highestWater(context);
   const bool isDry = grid.lowest > water.level;
-  if (!isInland && isDry && water.isKnown && (number == 1 || hasWaterAround(context, number))) {
+  const bool isAllLand = grid.lowest >= grid.landValue;
+  if (isAllLand && !isInland && isDry && water.isKnown && (number == 1 || hasWaterAround(context, number))) {
     fix.name = fmt::format("Turn the depths of area {} to elevations, in {}", number,
                            addAreaFile(context, fix, number, "turned", TurnedGrid{context.elevationItem()}));
     return fix;
   }
-  const bool isAbove = isInland || isDry;
-  float land = std::ceil(isAbove ? highest : water.level) + 1;
-  if (!isAbove && highest > water.level) land = std::min(land, highest);
+  float land = std::ceil(isAllLand && (isInland || isDry) ? highest : water.level) + 1;
+  if (!isAllLand && isDry) {
+    const float half = std::midpoint(grid.lowest, highest);
+    land = std::max(std::floor(half), std::min(std::ceil(grid.lowest) + 1, half));
+  }
+  if (!isInland && !(isAllLand && isDry) && highest > water.level) land = std::min(land, highest);
   const std::size_t closed = isInland ? context.elevationItem() : 0;
   fix.name = fmt::format("Land value of {:.6g} m for area {}, in {}", land, number,
                          addAreaFile(context, fix, number, "land", LandValueGrid{land, closed}));

@@ -186,7 +186,7 @@ TEST_F(AreaFixes, EachMendsWhatItSpeaksOf) {
        }},
   });
   speaks({{"land-value", "The highest point of area 1 lies at 5 m",
-           "Turn the depths of area 1 to elevations, in outer_turned.tsb2",
+           "Land value of 3 m for area 1, in outer_land.tsb2",
            [=] { outer([](int j, int) { return j < 15 ? 5.0F : 2.0F; }); }}});
   isSilent({
       [=] {  // all of it is to be flooded
@@ -347,6 +347,20 @@ TEST_F(AreaFixes, AHotStartFileSaysTheStepAndTheStart) {
   const std::vector<Advice> found = look();
   ASSERT_EQ(found.size(), 1U);
   EXPECT_THAT(found[0].fix.name, HasSubstr("tide_moved.tsb0"));
+}
+
+// Terrain that is all dry is no sea, though none of it is land.
+TEST_F(AreaFixes, OfDryTerrainTheHigherHalfBecomesLand) {
+  Area area{"outer.tsb2"};
+  area.land = 50;
+  write(area, [](int j, int) { return 2.0F + static_cast<float>(j); });
+  model->boundary->SetNoBoundaries(0);
+  const std::vector<Advice> found = look();
+  const auto land = std::ranges::find(found, "land-value", &Advice::kind);
+  ASSERT_NE(land, found.end());
+  EXPECT_EQ(land->fix.name, "Land value of 17 m for area 1, in outer_land.tsb2");
+  ASSERT_TRUE(makeFix(*model, land->fix, path));
+  for (const Advice& left : look()) EXPECT_NE(left.kind, "land-value") << left.doubt;
 }
 
 // A flat sea at a land value that is too low is no land to keep, and what is nothing but land is left alone.
