@@ -96,8 +96,12 @@ std::vector<GridRectangle> AdviceContext::coverOf(int number) {
   return cover;
 }
 
+bool AdviceContext::isHotStart() const {
+  return model.bathymetry->hotStart == 1;
+}
+
 std::size_t AdviceContext::elevationItem() const {
-  return static_cast<std::size_t>(gridbay::elevationItem(model.bathymetry->hotStart == 1));
+  return static_cast<std::size_t>(gridbay::elevationItem(isHotStart()));
 }
 
 // Longitude and latitude are what counts: a projection may be without a zone.

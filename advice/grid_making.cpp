@@ -13,6 +13,7 @@
 #include <vector>
 
 #include "advice/fix_files.h"
+#include "advice/series_mending.h"
 #include "basic/grid_file.h"
 #include "conversion/history.h"
 #include "conversion/raster_sampler.h"
@@ -99,10 +100,6 @@ void setLocation(TsbDefinition& file, const GridLocation& location) {
   if (!CVdMapProjection::IsLocal(location.projection))
     file.geography =
         TsbGeography{location.projection, location.longitude, location.latitude, location.rotation};
-}
-
-bool hasNoValue(double value, const TsbItem& item) {
-  return !std::isfinite(value) || static_cast<float>(value) == static_cast<float>(item.deleteValue);
 }
 
 // A grid's elevations at other points; not-a-number beyond them.
@@ -205,7 +202,7 @@ Outcome makeFile(const TurnedGrid& making, const std::string& from, const std::s
     if (rows.item != making.item) return {};
     for (auto& value : rows.values) {
       // What lies at the land value is no depth.
-      if (!hasNoValue(value, file.items[rows.item - 1]) && static_cast<float>(value) != *land) value = -value;
+      if (!isMissing(value, file.items[rows.item - 1]) && static_cast<float>(value) != *land) value = -value;
     }
     return {};
   };

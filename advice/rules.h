@@ -60,6 +60,9 @@ class AdviceContext {
   const GridFacts* grid(int number);
   // The points of area n that areas embedded in it cover, by the grids that are known.
   std::vector<GridRectangle> coverOf(int number);
+  // Whether the areas begin as a hot start says, whose files give the start of the run and its step as well:
+  // others would last until the next check.
+  bool isHotStart() const;
   // The item of the areas' files that has their elevations, from 1.
   std::size_t elevationItem() const;
   // Where it lies; nothing without a projection.

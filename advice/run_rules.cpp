@@ -34,11 +34,12 @@
 namespace gridbay {
 namespace {
 
-constexpr const char* kPeriod = "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD";
-
 PagePlace onPeriod(std::string_view keyword, std::string_view field, int fieldNumber = 1) {
-  return {
-      PageId::simulationPeriod, {}, fmt::format("{}/{}", kPeriod, keyword), std::string(field), fieldNumber};
+  return {PageId::simulationPeriod,
+          {},
+          fmt::format("{}/{}", kPeriodPath, keyword),
+          std::string(field),
+          fieldNumber};
 }
 
 struct Deepest {
@@ -123,7 +124,7 @@ std::optional<AdviceFix> withShorterSteps(AdviceContext& context, int divisor) {
   const double step = double{period.timeStepInterval} / divisor;
   const bool fits = static_cast<long long>(period.LastTimeStep()) * divisor <= kMost;
   AdviceFix fix{fmt::format("Time step of {:.6g} s{}", step, fits ? "" : ", and a shorter run"),
-                {{fmt::format("{}/Time_Step_Interval", kPeriod), fmt::format("{:.7g}", step)}}};
+                {{fmt::format("{}/Time_Step_Interval", kPeriodPath), fmt::format("{:.7g}", step)}}};
   eachKeyword(*file, [&](const PagePlace& place, const Node& keyword) {
     const bool isCount =
         keyword.values().size() == 1 && keyword.values()[0].kind() == ValueKind::integer &&
@@ -183,12 +184,7 @@ void adviseCodesOf(AdviceContext& context, PageId page, std::string_view thing, 
 // A warm-up in the first part of a run of so many steps.
 Setting warmUpWithin(int steps) {
   constexpr int kPart = 10;
-  return {fmt::format("{}/Warm_Up_Period", kPeriod), std::to_string(steps / kPart)};
-}
-
-// A hot start file says the start of the run and its step: others would last until the next check.
-bool isGivenByHotStart(AdviceContext& context) {
-  return context.model.bathymetry->hotStart == 1;
+  return {fmt::format("{}/Warm_Up_Period", kPeriodPath), std::to_string(steps / kPart)};
 }
 
 // The last time step that anything of the setup goes to; 0 where nothing says so.
@@ -207,7 +203,7 @@ int lastStepWritten(AdviceContext& context) {
 
 void adviseNumbersOfSteps(AdviceContext& context) {
   const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
-  if (!isStep(period.timeStepInterval) && !isGivenByHotStart(context)) {
+  if (!isStep(period.timeStepInterval) && !context.isHotStart()) {
     constexpr double kUsual = 30;
     const double stable = kUsual / stableDivisor(kUsual, worstCourant(context, kUsual));
     // In hundredths, and no longer than lets the run end with its series.
@@ -221,7 +217,7 @@ void adviseNumbersOfSteps(AdviceContext& context) {
                  onPeriod("Time_Step_Interval", "Time step interval:"),
                  {},
                  AdviceFix{fmt::format("Time step of {} s", usual),
-                           {{fmt::format("{}/Time_Step_Interval", kPeriod), usual}}}});
+                           {{fmt::format("{}/Time_Step_Interval", kPeriodPath), usual}}}});
   }
   if (period.LastTimeStep() < 1) {
     constexpr int kUsual = 100;
@@ -229,7 +225,7 @@ void adviseNumbersOfSteps(AdviceContext& context) {
     const int steps = written > 0 ? written : kUsual;
     AdviceFix fix{
         fmt::format("{} time steps{}", steps, written > 0 ? ", up to the last one that is written" : ""),
-        {{fmt::format("{}/Number_Of_Timesteps", kPeriod), std::to_string(steps)}}};
+        {{fmt::format("{}/Number_Of_Timesteps", kPeriodPath), std::to_string(steps)}}};
     if (period.warmUpPeriod > steps) fix.settings.push_back(warmUpWithin(steps));
     context.add({{},
                  fmt::format("The simulation has {} time steps.", period.LastTimeStep()),
@@ -269,7 +265,7 @@ void adviseCounts(AdviceContext& context) {
 
 void adviseCourant(AdviceContext& context) {
   const double step = context.model.simulationPeriod->timeStepInterval;
-  if (!isStep(step) || isGivenByHotStart(context)) return;
+  if (!isStep(step) || context.isHotStart()) return;
   const Courant worst = worstCourant(context, step);
   if (!(worst.number > kStableCourant)) return;
   const int divisor = stableDivisor(step, worst);

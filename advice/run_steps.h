@@ -1,8 +1,12 @@
 #pragma once
 
+#include <string_view>
+
 #include "core/parameter_tree.h"
 
 namespace gridbay {
+
+inline constexpr std::string_view kPeriodPath = "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD";
 
 // How many of the first values of a keyword are time steps of the run: 1, 2 for "TRange", whose third is an
 // interval, and 0 for any other keyword.

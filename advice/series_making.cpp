@@ -10,6 +10,7 @@
 #include "advice/file_making.h"
 #include "advice/fix_files.h"
 #include "advice/series_mending.h"
+#include "conversion/history.h"
 #include "platform/tsb/tsb_file.h"
 #include "platform/tsb/tsb_writer.h"
 #include "platform/units/units.h"
@@ -19,8 +20,8 @@ namespace {
 
 constexpr std::size_t kValuesAtOnce = 1 << 18;  // values that are read or written at a time
 
-void tell(TsbDefinition& definition, std::string_view what) {
-  definition.history += fmt::format("{}{}", definition.history.empty() ? "" : "\n", what);
+void tell(TsbDefinition& definition, const std::string& what) {
+  definition.history = historyWith(definition.history, what);
 }
 
 Outcome tellProgress(const FileProgress& progress, double done) {

@@ -69,7 +69,6 @@ std::optional<Span> spanOf(AdviceContext& context, const TsbTimeAxis& time) {
   return span.first.valid() && span.last.valid() ? std::optional(span) : std::nullopt;
 }
 
-constexpr std::string_view kPeriodPath = "NESTED_MODEL_GLOBALS/SIMULATION_PERIOD";
 constexpr double kDay = 86400;  // seconds
 
 // Gives what counts the run's time steps other numbers: those of keywords that the model holds.
@@ -119,11 +118,6 @@ std::optional<Setting> beginningAt(const DateTime& moment) {
   return Setting{fmt::format("{}/Start_Time", kPeriodPath), fmt::format("{}", fmt::join(*parts, ","))};
 }
 
-// A hot start file says when the run begins.
-bool mayBeginElsewhere(AdviceContext& context) {
-  return context.model.bathymetry->hotStart != 1;
-}
-
 // What goes with another begin of the run: series with no dates begin with it.
 std::string withUndated(AdviceContext& context, std::span<const UsedSeries> all) {
   const auto isUndated = [&](const UsedSeries& each) {
@@ -135,7 +129,7 @@ std::string withUndated(AdviceContext& context, std::span<const UsedSeries> all)
 
 // A run that begins so many time steps later, and ends when it did.
 std::optional<AdviceFix> laterRun(AdviceContext& context, long long later, std::span<const UsedSeries> all) {
-  if (!mayBeginElsewhere(context)) return std::nullopt;
+  if (context.isHotStart()) return std::nullopt;
   const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
   const long long steps = period.LastTimeStep() - later;
   std::optional<Setting> start =
@@ -156,7 +150,7 @@ double stepsInDay(const CSimulationPeriodKvs& period) {
 std::optional<AdviceFix> movedRun(AdviceContext& context, const Span& span, std::span<const UsedSeries> all) {
   const CSimulationPeriodKvs& period = *context.model.simulationPeriod;
   std::optional<Setting> start = beginningAt(span.first);
-  if (!span.isCalendar || !start || !mayBeginElsewhere(context)) return std::nullopt;
+  if (!span.isCalendar || !start || context.isHotStart()) return std::nullopt;
   const DateTime begin = DateTime::of(*span.first.parts());
   const double fitting = std::floor((span.last.linear() - begin.linear() + kHalfSecond) * stepsInDay(period));
   const double steps = std::min(fitting, double{static_cast<double>(period.LastTimeStep())});
