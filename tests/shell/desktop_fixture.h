@@ -1,6 +1,8 @@
 #pragma once
 
+#include <QApplication>
 #include <QFile>
+#include <QFileDialog>
 #include <QLineEdit>
 #include <QMessageBox>
 #include <QProcess>
@@ -61,6 +63,18 @@ class DesktopFixture : public QObject {
     QCOMPARE(process.exitCode(), 0);
   }
   QString file(const QString& name) const { return folder_->filePath(name); }
+  // Chooses the files of the next dialogs, one after the other.
+  static void chooseFiles(QStringList names) {
+    auto* poll = new QTimer(qApp);
+    QObject::connect(poll, &QTimer::timeout, qApp, [poll, names = std::move(names)]() mutable {
+      auto* files = qobject_cast<QFileDialog*>(QApplication::activeModalWidget());
+      if (files == nullptr) return;
+      files->findChild<QLineEdit*>()->setText(names.takeFirst());
+      if (names.isEmpty()) poll->deleteLater();
+      QMetaObject::invokeMethod(files, "accept");
+    });
+    poll->start(20);
+  }
   static QString textOf(const QString& path) {
     QFile opened(path);
     return opened.open(QFile::ReadOnly) ? QString::fromUtf8(opened.readAll()) : QString();

@@ -139,18 +139,6 @@ class MapTest : public DesktopFixture {
   QString cell(int row, int column) {
     return QString::fromStdString(cells().style(cells().index(row - 1, column - 1)).value);
   }
-  // Chooses the file of the next dialogs, one after the other.
-  static void chooseFiles(QStringList names) {
-    auto* poll = new QTimer(qApp);
-    QObject::connect(poll, &QTimer::timeout, qApp, [poll, names = std::move(names)]() mutable {
-      auto* files = qobject_cast<QFileDialog*>(QApplication::activeModalWidget());
-      if (files == nullptr) return;
-      files->findChild<QLineEdit*>()->setText(names.takeFirst());
-      if (names.isEmpty()) poll->deleteLater();
-      QMetaObject::invokeMethod(files, "accept");
-    });
-    poll->start(20);
-  }
 
  private slots:
   void initTestCase() { makeFolder(); }

@@ -61,18 +61,6 @@ class NewUserTest final : public DesktopFixture {
     activate();
     QTest::keyClick(window_.get(), key, modifiers);
   }
-  // Chooses the files of the next dialogs, one after the other.
-  static void chooseFiles(QStringList names) {
-    auto* poll = new QTimer(qApp);
-    QObject::connect(poll, &QTimer::timeout, qApp, [poll, names = std::move(names)]() mutable {
-      auto* files = qobject_cast<QFileDialog*>(QApplication::activeModalWidget());
-      if (files == nullptr) return;
-      files->findChild<QLineEdit*>()->setText(names.takeFirst());
-      if (names.isEmpty()) poll->deleteLater();
-      QMetaObject::invokeMethod(files, "accept");
-    });
-    poll->start(20);
-  }
 
   // The map.
   MapCanvas& canvas() { return window_->map().canvas(); }
